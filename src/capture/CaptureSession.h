@@ -1,0 +1,49 @@
+#pragma once
+
+#include "capture/CaptureFields.h"
+#include "capture/HostAddresses.h"
+#include "capture/PacketAttribution.h"
+#include "forms/Desktop.h"
+#include "monitor/MonitorPage.h"
+#include "platform/Capture.h"
+#include "platform/Machine.h"
+
+#include <memory>
+
+namespace quendra::capture {
+
+/// The connection to the capture library: adapters, the control `vpacket`, sessions.
+class CaptureSession {
+ public:
+  CaptureSession(const platform::Machine& machine, forms::Desktop& desktop, monitor::MonitorPage page,
+                 CaptureFields& fields, PacketAttribution& attribution);
+  ~CaptureSession();
+
+  /// VBPcapInit, whose result goes to CaptureInitResult. Part of the main window's load.
+  void InitLibrary();
+  /// Makes `vpacket` and listens to its event. Lets fault 429 through.
+  void CreateControl();
+  /// LocalAddressLast, GatewayAddress and LocalAddressPrevious, in this order, fresh. First step of the page's start.
+  void ReadLocalAddresses();
+  /// The capture half of the page's start, behind the table's first pass: adapters, choice, session.
+  void StartCapture();
+  /// The capture half of the page's stop: from CaptureRunning on.
+  void StopCapture();
+  void main_cmbAdapters_Click();
+  /// The polling form of the capture loop; nothing calls it.
+  void main_DoCapture();
+  /// Called by main_DoCapture on a failed vpCapture: unloads the main window.
+  std::function<void()> UnloadMainWindow;
+
+ private:
+  void StartControl();
+
+  platform::Machine machine_;
+  forms::Desktop& desktop_;
+  monitor::MonitorPage page_;
+  CaptureFields& fields_;
+  PacketAttribution& attribution_;
+  std::unique_ptr<platform::CaptureControl> vpacket_;
+};
+
+} // namespace quendra::capture

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "forms/Control.h"
+
+namespace quendra::forms {
+
+/// A drop-down list of texts with one selected item or none. Items are numbered from 0.
+class ComboBox : public Control {
+ public:
+  using Control::Control;
+
+  void Clear();
+  void AddItem(Text item);
+  int ListCount() const { return static_cast<int>(items_.size()); }
+  /// The text of an item; fault 381's kin: an index outside the list raises fault 9.
+  const Text& List(int index) const;
+
+  /// The selected item, -1 for none.
+  int ListIndex() const { return selected_; }
+  /// Selects and raises Click, also when the item was the selected one already. An index that the list lacks selects
+  /// nothing and raises nothing.
+  void SelectItem(int index);
+  /// The selected item's text, empty for none.
+  Text SelectedText() const;
+
+ private:
+  std::vector<Text> items_;
+  int selected_ = -1;
+};
+
+} // namespace quendra::forms

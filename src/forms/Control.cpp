@@ -1,0 +1,45 @@
+#include "forms/Control.h"
+
+#include "forms/Form.h"
+
+#include <algorithm>
+
+namespace quendra::forms {
+
+void TellChanged(Control& owner, Aspect aspect) {
+  if (owner.view_) owner.view_->Changed(aspect);
+}
+
+Control::Control(Container& parent, Text name) : name_(std::move(name)), parent_(&parent) {
+  parent.children_.push_back(this);
+}
+
+Control::~Control() {
+  if (parent_) std::erase(parent_->children_, this);
+}
+
+Form& Control::OwnerForm() {
+  Control* top = this;
+  while (top->parent_) top = top->parent_;
+  return static_cast<Form&>(*top);
+}
+
+bool Control::IsShown() const {
+  for (const Control* control = this; control; control = control->parent_)
+    if (!control->Visible()) return false;
+  return true;
+}
+
+void Control::BringToFront() {
+  if (!parent_ || parent_->children_.back() == this) return;
+  std::erase(parent_->children_, this);
+  parent_->children_.push_back(this);
+  TellChanged(*this, Aspect::Order);
+}
+
+void Control::Attach(ControlView* view) {
+  view_ = view;
+  TellChanged(*this, Aspect::All);
+}
+
+} // namespace quendra::forms

@@ -1,0 +1,100 @@
+#pragma once
+
+#include "forms/Colour.h"
+#include "forms/Event.h"
+#include "forms/Property.h"
+#include "runtime/Text.h"
+
+#include <vector>
+
+namespace quendra::forms {
+
+class Container;
+class Form;
+
+/// Distances in twips, 1440 to the inch. Left runs from the leading edge of the container: from the right edge in a form
+/// that reads from right to left.
+struct Geometry {
+  int left = 0;
+  int top = 0;
+  int width = 0;
+  int height = 0;
+  friend bool operator==(const Geometry&, const Geometry&) = default;
+};
+
+struct Font {
+  int size = 9;  ///< points
+  bool bold = false;
+  bool underline = false;
+  friend bool operator==(const Font&, const Font&) = default;
+};
+
+/// What a view is told. One view at most is attached to a control.
+class ControlView {
+ public:
+  virtual ~ControlView() = default;
+  virtual void Changed(Aspect aspect) = 0;
+};
+
+enum MouseButton : int { kNoButton = 0, kLeftButton = 1, kRightButton = 2 };
+
+/// What all controls have in common. Made with its container, which must outlive it, and with its name.
+class Control {
+ public:
+  Control(Container& parent, Text name);
+  virtual ~Control();
+  Control(const Control&) = delete;
+  Control& operator=(const Control&) = delete;
+
+  const Text& Name() const { return name_; }
+  /// nullptr for a form.
+  Container* Parent() const { return parent_; }
+  Form& OwnerForm();
+
+  Property<bool, Aspect::Visible> Visible{*this, true};
+  Property<bool, Aspect::Enabled> Enabled{*this, true};
+  Property<Geometry, Aspect::Geometry> Position{*this};
+  Property<Text, Aspect::Tag> Tag{*this};
+  Property<Colour, Aspect::Colours> ForeColour{*this, kBlack};
+  Property<Colour, Aspect::Colours> BackColour{*this, kWhite};
+  Property<Font, Aspect::Font> TextFont{*this};
+
+  Event<> Click;
+  Event<> DoubleClick;
+  /// Button held (MouseButton), the state of Shift (1), Ctrl (2) and Alt (4), and the place in twips.
+  Event<int, int, int, int> MouseMove;
+  Event<int, int, int, int> MouseDown;
+
+  /// Visible itself and with all its containers.
+  bool IsShown() const;
+  void Move(int left, int top, int width, int height) { Position = Geometry{left, top, width, height}; }
+  /// In front of its siblings.
+  void BringToFront();
+
+  /// Attaching pushes the whole state: the view is told `Aspect::All` once. nullptr detaches.
+  void Attach(ControlView* view);
+  ControlView* View() const { return view_; }
+
+ protected:
+  explicit Control(Text name) : name_(std::move(name)) {}
+
+ private:
+  friend void TellChanged(Control& owner, Aspect aspect);
+
+  Text name_;
+  Container* parent_ = nullptr;
+  ControlView* view_ = nullptr;
+};
+
+/// A control that holds others; Children are in drawing order, the last in front.
+class Container : public Control {
+ public:
+  using Control::Control;
+  const std::vector<Control*>& Children() const { return children_; }
+
+ private:
+  friend class Control;
+  std::vector<Control*> children_;
+};
+
+} // namespace quendra::forms

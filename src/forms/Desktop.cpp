@@ -1,0 +1,30 @@
+#include "forms/Desktop.h"
+
+namespace quendra::forms {
+
+void Desktop::Load(Form& form) {
+  if (form.loaded_) return;
+  form.loaded_ = true;
+  ++loadedForms_;
+  form.Design();
+  form.Visible = false;
+  CreateView(form);
+  form.Form_Load();
+}
+
+void Desktop::Show(Form& form, Modality modality, Form* owner) {
+  Load(form);
+  form.Visible = true;
+  ShowView(form, modality, owner);
+}
+
+void Desktop::Unload(Form& form) {
+  if (!form.loaded_) return;
+  form.Form_Unload();
+  form.Visible = false;
+  DestroyView(form);
+  form.loaded_ = false;
+  if (--loadedForms_ == 0) LastFormGone();
+}
+
+} // namespace quendra::forms

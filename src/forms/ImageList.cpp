@@ -1,0 +1,23 @@
+#include "forms/ImageList.h"
+
+#include "runtime/Fault.h"
+
+namespace quendra::forms {
+
+void ImageList::Clear() {
+  images_.clear();
+  TellChanged(*this, Aspect::Items);
+}
+
+int ImageList::Add(Picture picture, Text tag) {
+  images_.push_back({std::move(picture), std::move(tag)});
+  TellChanged(*this, Aspect::Items);
+  return Count();
+}
+
+const ImageList::ListImage& ImageList::Item(int index) const {
+  if (index < 1 || index > Count()) throw Fault(Fault::kSubscript);
+  return images_[static_cast<std::size_t>(index - 1)];
+}
+
+} // namespace quendra::forms

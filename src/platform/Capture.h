@@ -1,0 +1,104 @@
+#pragma once
+
+#include "runtime/Fault.h"
+
+#include <array>
+#include <cstdint>
+#include <functional>
+#include <memory>
+#include <span>
+#include <string>
+
+namespace quendra::platform {
+
+/// A frame as a capture loop sees it: bytes by index from 0, checked. The bytes belong to whoever delivered them and
+/// hold until the next call for a frame. Starts as an array of two zero bytes.
+class FrameBytes {
+ public:
+  FrameBytes() = default;
+  FrameBytes(const std::uint8_t* bytes, int length) : bytes_(bytes), length_(length) {}
+
+  /// The last valid index, -1 for a frame without bytes.
+  int UpperBound() const { return length_ - 1; }
+  /// Fault 9 beyond the bounds.
+  std::uint8_t operator[](int index) const {
+    if (static_cast<unsigned>(index) >= static_cast<unsigned>(length_)) throw Fault(Fault::kSubscript);
+    return bytes_[index];
+  }
+  /// The bytes without a check, for those that have tested the bound.
+  const std::uint8_t* Data() const { return bytes_; }
+
+ private:
+  static constexpr std::uint8_t kFresh[2] = {0, 0};
+  const std::uint8_t* bytes_ = kFresh;
+  int length_ = 2;
+};
+
+/// An adapter in the capture library's exchange form.
+struct AdapterInfo {
+  std::array<char, 255> AdapterName{};         ///< zero bytes fill the end
+  std::array<char, 255> AdapterDescription{};  ///< likewise, in the system's code page
+  std::array<char, 2> alignment{};
+  std::uint32_t unread = 0;
+};
+static_assert(sizeof(AdapterInfo) == 516);
+
+/// Six words that the library fills with each frame and nobody reads.
+using CaptureHeader = std::array<std::uint32_t, 6>;
+
+/// The capture library: delivers single frames.
+class CaptureLibrary {
+ public:
+  virtual ~CaptureLibrary() = default;
+
+  /// The last adapter's index, -1 when capture isn't available.
+  virtual std::int32_t VBPcapInit() = 0;
+  virtual void VBPcapTerminate() = 0;
+  /// Leaves `info` as it was for an index that the library lacks.
+  virtual void vpGetAdapterInfo(std::int16_t adapter, AdapterInfo& info) = 0;
+  virtual void vpSetCurrentAdapter(std::int16_t adapter) = 0;
+  /// Opens a session on the current adapter.
+  virtual void vpBegin(std::int32_t value) = 0;
+  /// Never waits. Above 0, `frame` is the next frame; 0, none waits and `frame` is 60 zero bytes; below 0, failure.
+  virtual std::int32_t vpCapture(FrameBytes& frame, CaptureHeader& header) = 0;
+  virtual void vpEnd() = 0;
+  virtual void vpSetParam(std::int32_t parameter, std::int32_t value) = 0;
+  /// Why nothing can be captured, as a bit that the page turns into a sentence.
+  enum class Availability { Available, NoRights, NoAdapters, NoLibrary };
+  virtual Availability availability() const = 0;
+};
+
+/// The capture control: signals new traffic on the adapter it is bound to.
+class CaptureControl {
+ public:
+  virtual ~CaptureControl() = default;
+
+  virtual void BindAdapter(const std::string& adapterName, std::int32_t& result) = 0;
+  virtual void OpenChannel(std::int32_t& result) = 0;
+  virtual void SetChannelSize(std::int32_t size, std::int32_t& result) = 0;
+  virtual void ReleaseChannel(std::int32_t& result) = 0;
+  virtual void CloseChannel(std::int32_t& result) = 0;
+  /// The adapter's address as it lies in memory (network order), 0 for none.
+  virtual void AdapterAddress(const std::string& adapterName, std::uint32_t& address, std::uint32_t& second) = 0;
+  virtual void StartEvents(std::int32_t& result) = 0;
+  virtual void StopEvents(std::int32_t& result) = 0;
+  /// Writes the newest capture record over the start of `bytes`: a header in host order (seconds, microseconds, captured
+  /// length, length on the wire, 32 bits each, and a 16-bit header length), padding up to that header length, the frame.
+  virtual void ReadBuffer(std::span<std::uint8_t> bytes) = 0;
+  virtual void SetValueA(std::int32_t value) = 0;
+  virtual void SetValueB(std::int32_t value) = 0;
+  virtual void SetValueC(std::int32_t value) = 0;
+
+  /// Raised when frames have arrived, and once more through the queue after an event that took frames and left some.
+  std::function<void()> PacketReceived;
+};
+
+/// Makes capture controls.
+class CaptureControls {
+ public:
+  virtual ~CaptureControls() = default;
+  /// Fault 429 when the control's class isn't registered.
+  virtual std::unique_ptr<CaptureControl> Create() = 0;
+};
+
+} // namespace quendra::platform

@@ -1,0 +1,34 @@
+#pragma once
+
+namespace quendra::platform {
+
+class CaptureControls;
+class CaptureLibrary;
+class Handles;
+class HostNames;
+class Icons;
+class IpHelper;
+class Processes;
+class ShellStart;
+class Sockets;
+class System;
+class Tokens;
+class VersionInfo;
+
+/// All that the program asks of a machine, by family.
+struct Machine {
+  CaptureControls& captureControls;
+  CaptureLibrary& captureLibrary;
+  Handles& handles;
+  HostNames& hostNames;
+  Icons& icons;
+  IpHelper& ipHelper;
+  Processes& processes;
+  ShellStart& shellStart;
+  Sockets& sockets;
+  System& system;
+  Tokens& tokens;
+  VersionInfo& versionInfo;
+};
+
+} // namespace quendra::platform

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <string>
+
+namespace quendra::platform {
+
+/// Starts programs by command line.
+class ShellStart {
+ public:
+  virtual ~ShellStart() = default;
+
+  static constexpr int kNormalWindow = 1;
+
+  /// Doesn't wait. False when nothing could be started.
+  virtual bool Shell(const std::string& commandLine, int windowStyle) = 0;
+};
+
+} // namespace quendra::platform

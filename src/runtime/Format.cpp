@@ -1,0 +1,94 @@
+#include "runtime/Format.h"
+
+#include "runtime/Fault.h"
+
+#include <algorithm>
+#include <array>
+#include <charconv>
+#include <cmath>
+#include <cstdio>
+
+namespace quendra {
+
+namespace {
+
+/// 15 significant digits, which is what a double's decimal form has to the formats.
+struct Decimal {
+  bool negative = false;
+  std::string digits;  ///< without a point, no leading zeros save a single "0"
+  int pointAt = 0;     ///< digits before the point; may be negative or beyond the digits
+};
+
+Decimal DecimalOf(double value) {
+  std::array<char, 40> buffer{};
+  std::snprintf(buffer.data(), buffer.size(), "%.14e", std::fabs(value));
+  Decimal decimal;
+  decimal.negative = std::signbit(value) && value != 0;
+  const std::string text(buffer.data());
+  const auto exponentAt = text.find('e');
+  decimal.digits = text.substr(0, 1) + text.substr(2, exponentAt - 2);
+  decimal.pointAt = std::stoi(text.substr(exponentAt + 1)) + 1;
+  return decimal;
+}
+
+/// Rounds to `places` behind the point, half away from zero; gives the digits up to there, at least one before them.
+std::string RoundedDigits(const Decimal& decimal, int places) {
+  std::string digits(static_cast<std::size_t>(std::max(0, -decimal.pointAt)) + 1, '0');
+  digits += decimal.digits;
+  const int before = std::max(decimal.pointAt, 0) + 1;
+  const auto keep = static_cast<std::size_t>(before + places);
+  if (digits.size() < keep + 1) digits.append(keep + 1 - digits.size(), '0');
+  const bool up = digits[keep] >= '5';
+  digits.resize(keep);
+  if (!up) return digits;
+  auto digit = digits.rbegin();
+  while (*digit == '9') *digit++ = '0';
+  ++*digit;
+  return digits;
+}
+
+} // namespace
+
+Text Format(double value, TextView format) {
+  if (!std::isfinite(value)) throw Fault(Fault::kOverflow);
+  const auto point = format.find(u'.');
+  const TextView whole = format.substr(0, point);
+  const TextView fraction = point == TextView::npos ? TextView{} : format.substr(point + 1);
+  const auto places = fraction.size();
+  const Decimal decimal = DecimalOf(value);
+  const std::string digits = RoundedDigits(decimal, static_cast<int>(places));
+
+  std::string before = digits.substr(0, digits.size() - places);
+  std::string behind = digits.substr(digits.size() - places);
+  before.erase(0, std::min(before.find_first_not_of('0'), before.size()));
+  const auto firstZero = std::min(whole.find(u'0'), whole.size());
+  const auto needed = whole.size() - firstZero;
+  if (before.size() < needed) before.insert(0, needed - before.size(), '0');
+  while (!behind.empty() && behind.back() == '0' && fraction[behind.size() - 1] == u'#') behind.pop_back();
+
+  const bool zero = digits.find_first_not_of('0') == std::string::npos;
+  std::string text = (decimal.negative && !zero ? "-" : "") + before;
+  if (point != TextView::npos) text += "." + behind;
+  return Text(text.begin(), text.end());
+}
+
+double NumberOf(TextView text) {
+  const TextView trimmed = Trimmed(text);
+  std::string bytes;
+  for (const char16_t unit : trimmed) bytes.push_back(unit < 0x80 ? static_cast<char>(unit) : '?');
+  const char* first = bytes.c_str() + (bytes.starts_with('+') ? 1 : 0);
+  const char* last = bytes.c_str() + bytes.size();
+  double value = 0;
+  const auto [end, error] = std::from_chars(first, last, value);
+  if (error == std::errc::result_out_of_range) throw Fault(Fault::kOverflow);
+  if (error != std::errc{} || end != last || !std::isfinite(value)) throw Fault(Fault::kTypeMismatch);
+  return value;
+}
+
+Text NumberText(double value) {
+  std::array<char, 40> buffer{};
+  const int length = std::snprintf(buffer.data(), buffer.size(), "%.15G", value);
+  return Text(buffer.begin(), buffer.begin() + length);
+}
+
+} // namespace quendra
