@@ -15,6 +15,7 @@ Control::Control(Container& parent, Text name) : name_(std::move(name)), parent_
 }
 
 Control::~Control() {
+  if (view_) view_->ControlGone();
   if (parent_) std::erase(parent_->children_, this);
 }
 

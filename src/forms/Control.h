@@ -34,6 +34,8 @@ class ControlView {
  public:
   virtual ~ControlView() = default;
   virtual void Changed(Aspect aspect) = 0;
+  /// The control goes while the view is attached; it must not be touched any more.
+  virtual void ControlGone() {}
 };
 
 enum MouseButton : int { kNoButton = 0, kLeftButton = 1, kRightButton = 2 };

@@ -6,6 +6,7 @@ void Desktop::Load(Form& form) {
   if (form.loaded_) return;
   form.loaded_ = true;
   ++loadedForms_;
+  form.Tag = {};
   form.Design();
   form.Visible = false;
   CreateView(form);

@@ -1,0 +1,146 @@
+#pragma once
+
+#include "forms/ComboBox.h"
+#include "forms/Desktop.h"
+#include "forms/ListView.h"
+#include "forms/headless/HeadlessLoop.h"
+
+#include <map>
+#include <unordered_map>
+
+namespace quendra::forms {
+
+/// A desktop without a screen, for tests: boxes answer as scripted, what the program asks for is recorded,
+/// time moves when the test says so, and the user's actions are calls.
+class HeadlessDesktop : public Desktop, public HeadlessLoop {
+ public:
+  HeadlessDesktop();
+  ~HeadlessDesktop() override;
+
+  /// Pixels: how wide each character and how high each line is in any font.
+  static constexpr int CharacterWidth = 8;
+  static constexpr int LineHeight = 16;
+  static constexpr double TwipsPerPixel = 15;
+
+  // What the program showed and asked for.
+
+  struct Box {
+    Text text;
+    int flags = 0;
+    Text title;
+    friend bool operator==(const Box&, const Box&) = default;
+  };
+  std::vector<Box> Boxes;
+  /// One text a call: the operation's name and its numbers, as in "SetCursor 5"; windows and picture boxes
+  /// stand by their names, as in "SendMessage frmMenu 0xA1 2 0".
+  std::vector<std::string> Calls;
+  /// How often a text stands in Calls.
+  int CountOf(const std::string& call) const;
+  int YieldCount = 0;
+  bool Ended = false;
+  int EndStatus = 0;
+
+  // What the test scripts.
+
+  /// Boxes without a scripted answer are answered with 1 (OK).
+  void AnswerNextBox(int answer) { answers_.push_back(answer); }
+  CursorHandle CursorHandleToGive = 5;
+  /// Called at each DoEvents, before the queue is handled; not from within itself.
+  std::function<void()> OnYield;
+  /// What happens while a modal form stands. Without it a modal form returns at once and stays visible.
+  std::function<void(Form&)> OnModal;
+
+  // The user. Each is dispatched as an event; false when the user could not do it: the control isn't shown,
+  // or it or a container of it is disabled, or the program has ended.
+
+  bool Click(Control& control);
+  bool DoubleClick(Control& control);
+  bool MouseMove(Control& control, int button = 0, int shift = 0, int x = 0, int y = 0);
+  bool MouseDown(Control& control, int button = kLeftButton, int shift = 0, int x = 0, int y = 0);
+  bool KeyDown(Form& form, int keyCode, int shift = 0);
+  bool CloseBox(Form& form);
+  /// An item from 0; one that the list lacks can't be chosen.
+  bool ChooseItem(ComboBox& combo, int index);
+  /// A header from 1.
+  bool ClickHeader(ListView& list, int header);
+  /// A row from 1: selects it, then clicks the list.
+  bool ClickRow(ListView& list, int row);
+  /// Another window takes the focus, or this one gets it back.
+  bool Activate(Form& form);
+  bool Deactivate(Form& form);
+
+  /// Runs work as the dispatcher runs a handler: a fault shows the run-time's message and ends the program
+  /// with status 1; the program's end is kept in Ended and EndStatus. After the end nothing is run.
+  void Dispatch(const std::function<void()>& work) override;
+
+  // What stands on the screen.
+
+  /// The form as text: one line a visible control, those inside a container further in; a list as a table of
+  /// its rows.
+  std::string Render(Form& form) const;
+  /// What was drawn on a box since it was cleared, one text a drawing: "Box 0,-1 400,5 999999", "Print 0,20
+  /// FFFFFF text", "Icon 0,0 32x32 of 12 bytes". A copy that covers the whole box takes the source's drawings
+  /// in place of its own.
+  const std::vector<std::string>& DrawingOf(const PictureBox& box) const;
+  bool IsActive(const Form& form) const { return active_ == &form; }
+
+  // Desktop.
+
+  [[noreturn]] void End(int status = 0) override;
+  int MessageBox(const Text& text, int flags, const Text& title) override;
+  void DoEvents() override;
+  CursorHandle LoadCursor(int id) override;
+  void SetCursor(CursorHandle cursor) override;
+  WindowHandle HandleOf(Form& form) override;
+  void ReleaseCapture() override;
+  std::int32_t SendMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
+                           std::uint32_t lParam) override;
+  double TwipsPerPixelX() const override { return TwipsPerPixel; }
+  double TwipsPerPixelY() const override { return TwipsPerPixel; }
+  RegionHandle CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
+                                  int ellipseHeight) override;
+  void SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) override;
+  int ScaleWidth(const PictureBox& box) const override;
+  int ScaleHeight(const PictureBox& box) const override;
+  int TextWidth(const PictureBox& box, TextView text) const override;
+  int TextHeight(const PictureBox& box, TextView text) const override;
+  void Cls(PictureBox& box) override;
+  void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) override;
+  void Print(PictureBox& box, TextView text) override;
+  void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
+              int sourceY) override;
+  void Refresh(PictureBox& box) override;
+  /// Any bytes are an image here, none are not.
+  bool DrawIconEx(PictureBox& box, int x, int y, const std::vector<std::uint8_t>& image, int width,
+                  int height) override;
+  /// Two pixels that stand for the contents; equal contents give equal pictures.
+  Picture ImageOf(const PictureBox& box) const override;
+
+ protected:
+  void CreateView(Form& form) override;
+  void DestroyView(Form& form) override;
+  void ShowView(Form& form, Modality modality, Form* owner) override;
+  void LastFormGone() override { End(0); }
+
+ private:
+  class FormView;
+  class TimerView;
+
+  bool Act(Control& control, const std::function<void()>& action);
+  void Record(std::string call) { Calls.push_back(std::move(call)); }
+  void Draw(PictureBox& box, const std::string& drawing);
+  std::string NameOfWindow(WindowHandle window) const;
+  void Forget(const Form& form);
+
+  std::deque<int> answers_;
+  bool yielding_ = false;
+  Form* active_ = nullptr;
+  std::unordered_map<const Form*, std::unique_ptr<FormView>> views_;
+  std::unordered_map<const Form*, WindowHandle> windows_;
+  std::map<WindowHandle, std::string> windowNames_;
+  RegionHandle lastRegion_ = 0;
+  std::unordered_map<const PictureBox*, std::vector<std::string>> drawings_;
+  mutable std::map<std::string, Picture> images_;
+};
+
+} // namespace quendra::forms
