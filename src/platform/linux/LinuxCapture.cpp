@@ -1,0 +1,58 @@
+#include "platform/linux/LinuxCapture.h"
+
+#include "platform/linux/LinuxCaptureControl.h"
+#include "platform/linux/LinuxCaptureCore.h"
+#include "runtime/Text.h"
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+void CopyPadded(const std::string& text, std::array<char, 255>& field) {
+  field.fill('\0');
+  text.copy(field.data(), field.size() - 1);
+}
+
+} // namespace
+
+LinuxCapture::LinuxCapture(EventLoop& loop) : core_(std::make_shared<LinuxCaptureCore>(loop)) {}
+
+LinuxCapture::~LinuxCapture() { core_->End(); }
+
+std::int32_t LinuxCapture::VBPcapInit() {
+  core_->ListAdapters();
+  return static_cast<std::int32_t>(core_->Adapters().size()) - 1;
+}
+
+void LinuxCapture::VBPcapTerminate() { core_->End(); }
+
+void LinuxCapture::vpGetAdapterInfo(std::int16_t adapter, AdapterInfo& info) {
+  const auto& adapters = core_->Adapters();
+  if (adapter < 0 || static_cast<std::size_t>(adapter) >= adapters.size()) return;
+  CopyPadded(adapters[adapter].name, info.AdapterName);
+  CopyPadded(ToCodePage(FromUtf8(adapters[adapter].description)), info.AdapterDescription);
+}
+
+void LinuxCapture::vpSetCurrentAdapter(std::int16_t adapter) { core_->SelectAdapter(adapter); }
+
+void LinuxCapture::vpBegin(std::int32_t) { core_->Begin(); }
+
+std::int32_t LinuxCapture::vpCapture(FrameBytes& frame, CaptureHeader& header) {
+  return core_->Capture(frame, header);
+}
+
+void LinuxCapture::vpEnd() { core_->End(); }
+
+// Snapshot and buffer are chosen for the whole session; what a caller could set here makes no difference to
+// what it sees.
+void LinuxCapture::vpSetParam(std::int32_t, std::int32_t) {}
+
+CaptureLibrary::Availability LinuxCapture::availability() const { return core_->Availability(); }
+
+std::unique_ptr<CaptureControl> LinuxCapture::Create() {
+  return std::make_unique<LinuxCaptureControl>(core_);
+}
+
+CaptureCounters LinuxCapture::Counters() const { return core_->Counters(); }
+
+} // namespace quendra::platform::linux_

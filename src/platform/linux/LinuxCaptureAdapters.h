@@ -1,0 +1,26 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace quendra::platform::linux_ {
+
+/// A network interface that frames can be captured from.
+struct CaptureAdapter {
+  std::string name;        ///< the system's name, such as "eth0"
+  std::string description; ///< UTF-8, such as "Ethernet (eth0)"
+};
+
+/// The interfaces that are up and whose packets can be shown as Ethernet frames: the one of the default route
+/// first, loopback last, so that the first adapter with the host's address is the one that a subscriber
+/// means.
+std::vector<CaptureAdapter> ListCaptureAdapters();
+
+/// The interface's first IPv4 address as it lies in memory (network order), 0 for none.
+std::uint32_t AddressOfAdapter(const std::string& name);
+
+/// Whether this process may open a capture.
+bool MayCapture();
+
+} // namespace quendra::platform::linux_

@@ -1,0 +1,171 @@
+#include "platform/linux/LinuxCaptureCore.h"
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+constexpr std::uint8_t kBlankFrame[60] = {};
+
+} // namespace
+
+void LinuxCaptureCore::ListAdapters() {
+  using Availability = CaptureLibrary::Availability;
+  adapters_ = ListCaptureAdapters();
+  availability_ = adapters_.empty() ? Availability::NoAdapters
+                  : MayCapture()    ? Availability::Available
+                                    : Availability::NoRights;
+}
+
+const std::string& LinuxCaptureCore::CurrentName() const {
+  static const std::string none;
+  return current_ >= 0 && current_ < static_cast<int>(adapters_.size()) ? adapters_[current_].name : none;
+}
+
+void LinuxCaptureCore::SelectAdapter(int adapter) {
+  if (adapter == current_) return;
+  Close();
+  current_ = adapter;
+  if (begun_) Open();
+}
+
+void LinuxCaptureCore::Begin() {
+  begun_ = true;
+  if (!HasSession()) Open();
+}
+
+void LinuxCaptureCore::End() {
+  begun_ = false;
+  Close();
+}
+
+void LinuxCaptureCore::Open() {
+  Close();
+  if (!CurrentName().empty()) session_ = PcapSession::Open(CurrentName(), queue_);
+  UpdateWatch();
+}
+
+void LinuxCaptureCore::Close() {
+  watch_.reset();
+  if (session_ != nullptr) {
+    const auto statistics = session_->GetStatistics();
+    earlier_.received += statistics.received;
+    earlier_.droppedByKernel += statistics.dropped;
+  }
+  session_.reset();
+  queue_.Clear();
+}
+
+std::int32_t LinuxCaptureCore::Capture(FrameBytes& frame, CaptureHeader& header) {
+  frame = FrameBytes(kBlankFrame, sizeof kBlankFrame);
+  if (queue_.Empty()) {
+    if (!HasSession()) return -1;
+    queue_.Rewind();
+    if (session_->Fill() < 0) return -1;
+  }
+  const PcapRecord* record = queue_.Pop();
+  if (record == nullptr) return 0;
+  ++taken_;
+  frame = FrameBytes(record->bytes.data(), static_cast<int>(record->captured));
+  header = {record->seconds, record->microseconds, record->captured, record->wire, 0, 0};
+  return static_cast<std::int32_t>(record->captured);
+}
+
+void LinuxCaptureCore::Listen(CaptureControl& control, const std::string& adapterName) {
+  control_ = &control;
+  controlAdapter_ = adapterName;
+  UpdateWatch();
+}
+
+void LinuxCaptureCore::StopListening(const CaptureControl& control) {
+  if (control_ != &control) return;
+  control_ = nullptr;
+  UpdateWatch();
+}
+
+bool LinuxCaptureCore::MayRing() const {
+  return control_ != nullptr && HasSession() && controlAdapter_ == CurrentName();
+}
+
+void LinuxCaptureCore::UpdateWatch() {
+  if (!MayRing() || inEvent_ || secondRingPosted_) {
+    watch_.reset();
+    return;
+  }
+  if (watch_ != nullptr) return;
+  watch_ = loop_.WatchDescriptor(session_->Descriptor(), [weak = weak_from_this()] {
+    if (const auto core = weak.lock()) core->DescriptorReady();
+  });
+}
+
+void LinuxCaptureCore::DescriptorReady() {
+  if (!MayRing() || inEvent_ || secondRingPosted_) return;
+  // Events that take nothing let the queue grow; then the newest frames, by which the next event is judged,
+  // go first.
+  if (queue_.Empty()) queue_.Rewind();
+  if (queue_.Room() < PcapSession::kRoomOfBatch) {
+    queue_.DiscardOldest(PcapSession::kRoomOfBatch);
+    earlier_.droppedByQueue += PcapSession::kRoomOfBatch;
+  }
+  const int moved = session_->Fill();
+  if (moved > 0)
+    Ring();
+  else if (moved < 0)
+    UpdateWatch();
+}
+
+/// Marks an event as under way, also when its handler ends by an exception.
+class LinuxCaptureCore::Event {
+ public:
+  explicit Event(LinuxCaptureCore& core) : core_(core) {
+    core_.inEvent_ = true;
+    core_.taken_ = 0;
+    core_.UpdateWatch();
+  }
+  ~Event() { core_.inEvent_ = false; }
+  Event(const Event&) = delete;
+  Event& operator=(const Event&) = delete;
+
+ private:
+  LinuxCaptureCore& core_;
+};
+
+void LinuxCaptureCore::Ring() {
+  // The control may go while its own event runs, so its handler is held here.
+  const auto handler = control_->PacketReceived;
+  if (handler) {
+    const Event event(*this);
+    try {
+      handler();
+    } catch (const Fault& fault) {
+      if (fault.number != Fault::kSubscript) throw;
+      ++earlier_.rejected;
+    }
+  }
+  if (taken_ > 0 && !queue_.Empty() && MayRing()) {
+    secondRingPosted_ = true;
+    loop_.Post([weak = weak_from_this()] {
+      if (const auto core = weak.lock()) core->RingAgain();
+    });
+  }
+  UpdateWatch();
+}
+
+void LinuxCaptureCore::RingAgain() {
+  secondRingPosted_ = false;
+  if (MayRing() && !inEvent_ && !queue_.Empty())
+    Ring();
+  else
+    UpdateWatch();
+}
+
+CaptureCounters LinuxCaptureCore::Counters() const {
+  CaptureCounters result = earlier_;
+  if (session_ != nullptr) {
+    const auto statistics = session_->GetStatistics();
+    result.received += statistics.received;
+    result.droppedByKernel += statistics.dropped;
+  }
+  return result;
+}
+
+} // namespace quendra::platform::linux_

@@ -1,0 +1,68 @@
+#pragma once
+
+#include "platform/linux/LinuxCapture.h"
+#include "platform/linux/LinuxCaptureAdapters.h"
+#include "platform/linux/PcapSession.h"
+
+#include <vector>
+
+namespace quendra::platform::linux_ {
+
+/// The session that the capture library and its controls share, and the rules of when the event is raised:
+/// - when packets have moved from the kernel to the queue, which happens when the descriptor is ready;
+/// - once more through the loop's queue after an event that took frames and left some.
+/// During an event and while a second one is on its way the descriptor isn't watched, so that a handler which
+/// yields is never entered again from here and the kernel's ring does the waiting.
+class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
+ public:
+  explicit LinuxCaptureCore(EventLoop& loop) : loop_(loop) {}
+
+  void ListAdapters();
+  const std::vector<CaptureAdapter>& Adapters() const { return adapters_; }
+  CaptureLibrary::Availability Availability() const { return availability_; }
+
+  void SelectAdapter(int adapter);
+  void Begin();
+  void End();
+  std::int32_t Capture(FrameBytes& frame, CaptureHeader& header);
+
+  /// `control` rings from now on, as long as its adapter is the session's.
+  void Listen(CaptureControl& control, const std::string& adapterName);
+  /// Does nothing for a control that isn't the one that rings.
+  void StopListening(const CaptureControl& control);
+  const PcapRecord* Newest() const { return queue_.Newest(); }
+
+  CaptureCounters Counters() const;
+
+ private:
+  class Event;
+
+  const std::string& CurrentName() const;
+  void Open();
+  void Close();
+  bool HasSession() const { return session_ != nullptr && !session_->Failed(); }
+  bool MayRing() const;
+  void UpdateWatch();
+  void DescriptorReady();
+  void Ring();
+  void RingAgain();
+
+  EventLoop& loop_;
+  std::vector<CaptureAdapter> adapters_;
+  CaptureLibrary::Availability availability_ = CaptureLibrary::Availability::NoAdapters;
+  int current_ = -1;
+  bool begun_ = false;
+
+  PcapFrameQueue queue_;
+  std::unique_ptr<PcapSession> session_;
+  CaptureCounters earlier_; // of sessions that were closed; droppedByQueue and rejected of all
+
+  CaptureControl* control_ = nullptr;
+  std::string controlAdapter_;
+  std::unique_ptr<EventLoop::Subscription> watch_;
+  bool inEvent_ = false;
+  bool secondRingPosted_ = false;
+  std::uint32_t taken_ = 0; // frames that the event under way took
+};
+
+} // namespace quendra::platform::linux_

@@ -1,0 +1,87 @@
+#include "platform/linux/PcapSession.h"
+
+#include <pcap/pcap.h>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+// Enough for a TCP header inside a tunnel; the rest of a frame is of no use to the decoders.
+constexpr int kSnapLength = 128;
+// The kernel hands over a block of frames when it is full or this old, so that a wake-up brings many frames.
+constexpr int kBlockMilliseconds = 16;
+// Half a second of 300,000 frames a second.
+constexpr int kRingBytes = 32 << 20;
+
+} // namespace
+
+PcapSession::PcapSession(pcap* handle, PcapFrameQueue& queue) : handle_(handle), shaper_(queue) {}
+
+PcapSession::~PcapSession() { pcap_close(handle_); }
+
+std::unique_ptr<PcapSession> PcapSession::Open(const std::string& adapter, PcapFrameQueue& queue,
+                                               std::string* error) {
+  char buffer[PCAP_ERRBUF_SIZE] = "";
+  pcap_t* handle = pcap_create(adapter.c_str(), buffer);
+  std::string reason = buffer;
+  if (handle != nullptr) {
+    std::unique_ptr<PcapSession> session(new PcapSession(handle, queue));
+    if (session->Prepare(reason)) return session;
+  }
+  if (error != nullptr) *error = adapter + ": " + reason;
+  return nullptr;
+}
+
+bool PcapSession::Prepare(std::string& error) {
+  pcap_set_snaplen(handle_, kSnapLength);
+  pcap_set_promisc(handle_, 0);
+  pcap_set_timeout(handle_, kBlockMilliseconds);
+  pcap_set_buffer_size(handle_, kRingBytes);
+  if (const int status = pcap_activate(handle_); status < 0) {
+    error = pcap_statustostr(status);
+    return false;
+  }
+  const auto form = LinkFormOf(pcap_datalink(handle_));
+  if (!form) {
+    error = "a link of an unknown kind";
+    return false;
+  }
+  shaper_.SetForm(*form);
+
+  // A filter that takes everything: only with a filter does the kernel cut the frames before it copies them.
+  bpf_program everything{};
+  char buffer[PCAP_ERRBUF_SIZE] = "";
+  const bool ready = pcap_compile(handle_, &everything, "", 1, PCAP_NETMASK_UNKNOWN) == 0 &&
+                     pcap_setfilter(handle_, &everything) == 0 && pcap_setnonblock(handle_, 1, buffer) == 0;
+  pcap_freecode(&everything);
+  descriptor_ = pcap_get_selectable_fd(handle_);
+  if (!ready) error = pcap_geterr(handle_);
+  return ready && descriptor_ >= 0;
+}
+
+int PcapSession::Fill() {
+  if (failed_) return -1;
+  const int count =
+      pcap_dispatch(handle_, kBatch, &PcapSession::Take, reinterpret_cast<unsigned char*>(this));
+  if (count < 0) {
+    failed_ = true;
+    return -1;
+  }
+  received_ += static_cast<std::uint64_t>(count);
+  return count;
+}
+
+void PcapSession::Take(unsigned char* session, const pcap_pkthdr* header, const unsigned char* bytes) {
+  reinterpret_cast<PcapSession*>(session)->shaper_.Deliver(
+      {static_cast<std::uint32_t>(header->ts.tv_sec), static_cast<std::uint32_t>(header->ts.tv_usec)},
+      {bytes, header->caplen}, header->len);
+}
+
+PcapSession::Statistics PcapSession::GetStatistics() const {
+  Statistics result{received_, 0};
+  pcap_stat counted{};
+  if (pcap_stats(handle_, &counted) == 0) result.dropped = counted.ps_drop;
+  return result;
+}
+
+} // namespace quendra::platform::linux_
