@@ -3,6 +3,8 @@
 #include "forms/Control.h"
 #include "forms/Picture.h"
 
+#include <unordered_map>
+
 namespace quendra::forms {
 
 /// Pictures by index, from 1, each with a Tag.
@@ -21,9 +23,12 @@ class ImageList : public Control {
   int Count() const { return static_cast<int>(images_.size()); }
   /// Fault 9 for an index outside the list.
   const ListImage& Item(int index) const;
+  /// The first image with this Tag, 0 when there is none. Cheap in long lists too.
+  int IndexOfTag(const Text& tag) const;
 
  private:
   std::vector<ListImage> images_;
+  std::unordered_map<Text, int> firstOfTag_;
 };
 
 } // namespace quendra::forms
