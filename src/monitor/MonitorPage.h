@@ -22,8 +22,9 @@ struct MonitorPage {
 
 /// Fields of the main window that the parts of the monitor share.
 struct MonitorFields {
-  std::int32_t OsVersionCode = 0;    ///< 0, 32, 95, 98, 351, 40, 2000 or 2002; written when the main window loads
-  std::int32_t LastRefreshTick = 0;  ///< milliseconds; set by whoever runs a pass, never by the pass
+  std::int32_t OsVersionCode =
+      0; ///< 0, 32, 95, 98, 351, 40, 2000 or 2002; written when the main window loads
+  std::int32_t LastRefreshTick = 0; ///< milliseconds; set by whoever runs a pass, never by the pass
 };
 
 } // namespace quendra::monitor

@@ -2,6 +2,8 @@
 
 #include "forms/Desktop.h"
 #include "forms/ListView.h"
+#include "monitor/SocketHandleScan.h"
+#include "monitor/TcpOwnerEntry.h"
 #include "monitor/mdlFileInfo.h"
 #include "platform/IpHelper.h"
 #include "platform/Machine.h"
@@ -11,24 +13,32 @@
 
 namespace quendra::monitor {
 
+class PortsCells;
+
 /// Which process owns which local TCP port.
 class modProcPort {
  public:
-  struct PortOwner {
-    std::int32_t tcpOwner = 0;
-    std::int32_t udpOwner = 0;
-  };
+  using PortOwner = monitor::PortOwner;
 
   modProcPort(const platform::Machine& machine, forms::Desktop& desktop, forms::ListView& main_ListView1,
               mdlFileInfo& fileInfo);
 
+  /// Brings PortOwnerTable up to date from the handles of all processes. True when the walk has finished.
   bool ScanSocketHandles();
+  /// The local port behind an own handle, 0 when unknown.
   std::int32_t QueryHandlePort(std::uint32_t handle);
+  /// Takes the system's table of TCP connections and starts the walk over. On failure the table before stays.
   bool FetchTcpOwnerTable();
+  /// Puts every connection's local port into the ports cell of its owner's row. False without a table or
+  /// entries. Yields twice an entry.
   bool MergeTcpPorts();
+  /// Deletes the connections of foreign processes, up to the first that must stay. False without a table or
+  /// entries. Yields twice an entry.
   bool SweepConnections();
+  /// Addresses and ports as they lie in memory. Does nothing while ConnectionDeleteEnabled is false.
   void DeleteConnection(std::uint32_t localAddress, std::uint32_t localPort, std::uint32_t remoteAddress,
                         std::uint32_t remotePort);
+  /// The four bytes as they lie in memory, dotted, the first byte first.
   static Text IpAddressText(std::uint32_t address);
   /// The module's name of a state number from 1 to 12; empty for any other.
   static Text StateName(std::uint32_t state);
@@ -40,13 +50,21 @@ class modProcPort {
   Boolean16 SystemPidsLoaded = kFalse16;
 
  private:
+  bool HasEntries() const { return TcpOwnerSnapshot_ && entryCount_ != 0; }
+  void ReadEntry();
+  void NextEntry();
+  void MergeCurrentEntry(PortsCells& cells);
+  bool SweepEndsAtCurrentEntry();
+
   platform::Machine machine_;
   forms::Desktop& desktop_;
   forms::ListView& main_ListView1_;
   mdlFileInfo& fileInfo_;
   platform::IpHelper::TcpTable TcpOwnerSnapshot_;
   std::int32_t entryCount_ = 0;
+  // One place for both walks: a walk that starts while another yields moves the other's place too.
   std::int32_t walkOffset_ = 0;
+  TcpOwnerEntry currentEntry_;
 };
 
 } // namespace quendra::monitor

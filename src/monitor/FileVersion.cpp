@@ -1,0 +1,68 @@
+#include "monitor/mdlFileInfo.h"
+#include "platform/VersionInfo.h"
+
+#include <algorithm>
+
+namespace quendra::monitor {
+
+namespace {
+
+constexpr std::size_t kValueRoom = 255;
+
+struct VersionName {
+  const char* name;
+  Text FileVersionInfo::*field;
+};
+
+constexpr std::array<VersionName, 8> kVersionNames{{
+    {"CompanyName", &FileVersionInfo::CompanyName},
+    {"FileDescription", &FileVersionInfo::FileDescription},
+    {"FileVersion", &FileVersionInfo::FileVersion},
+    {"InternalName", &FileVersionInfo::InternalName},
+    {"LegalCopyright", &FileVersionInfo::LegalCopyright},
+    {"OriginalFileName", &FileVersionInfo::OriginalFileName},
+    {"ProductName", &FileVersionInfo::ProductName},
+    {"ProductVersion", &FileVersionInfo::ProductVersion},
+}};
+
+/// Language before code page, each a 16-bit number with its low byte first; bytes that are missing count as
+/// 0.
+std::string TranslationText(const std::vector<std::uint8_t>& translation) {
+  std::array<std::uint32_t, 4> b{};
+  std::copy_n(translation.begin(), std::min(translation.size(), b.size()), b.begin());
+  const std::uint32_t number = (b[1] << 24) + (b[0] << 16) + (b[3] << 8) + b[2];
+  return ToCodePage(PaddedLeft(HexText(number), 8, u'0'));
+}
+
+Text ValueText(const std::optional<std::vector<std::uint8_t>>& value) {
+  if (!value) return u"?";
+  const std::string_view bytes(reinterpret_cast<const char*>(value->data()), value->size());
+  return FromCodePage(CutAtNul(bytes.substr(0, kValueRoom)));
+}
+
+} // namespace
+
+FileVersionInfo mdlFileInfo::ReadFileVersionInfo(const Text& path) {
+  FileVersionInfo info;
+  if (path.empty()) return info;
+  platform::VersionInfo& versions = machine_.versionInfo;
+  const std::string file = ToCodePage(path);
+  const auto size = static_cast<std::int32_t>(versions.GetFileVersionInfoSizeA(file));
+  if (size <= 0) return info;
+  std::vector<std::uint8_t> block(static_cast<std::size_t>(size));
+  if (!versions.GetFileVersionInfoA(file, block)) return info;
+  const auto translation = versions.VerQueryValueA(block, "\\VarFileInfo\\Translation");
+  if (!translation) return info;
+  const std::string section = "\\StringFileInfo\\" + TranslationText(*translation) + "\\";
+  for (const VersionName& version : kVersionNames)
+    info.*version.field = ValueText(versions.VerQueryValueA(block, section + version.name));
+  return info;
+}
+
+Text mdlFileInfo::ApplicationNameOf(const Text& path) {
+  const Text product = ReadFileVersionInfo(path).ProductName;
+  const Text shortened = Replaced(product, u"Microsoft® Windows® Operating System", u"MS® Windows");
+  return Replaced(shortened, u"Windows®", u"");
+}
+
+} // namespace quendra::monitor

@@ -1,0 +1,117 @@
+#include "monitor/SocketHandleScan.h"
+
+#include "monitor/OwnedHandle.h"
+#include "platform/Handles.h"
+#include "runtime/Integers.h"
+
+#include <cstring>
+
+namespace quendra::monitor {
+
+namespace {
+
+constexpr std::uint32_t kSystemHandles = 16;
+constexpr std::size_t kFirstRoom = 20;
+constexpr std::size_t kCountBytes = 4;
+constexpr std::size_t kEntryBytes = 16;
+constexpr std::size_t kHandleOffset = 6;
+
+constexpr std::uint32_t kMayDuplicate = 0x40;
+constexpr std::uint32_t kDuplicateAccess = 0x101F0000;
+
+constexpr std::uint32_t kNameInformation = 1;
+constexpr std::size_t kNameRoom = 32;
+constexpr std::size_t kNameOffset = 8;
+constexpr std::uint16_t kDeviceNameBytes = 22;
+
+constexpr std::uint32_t kQueryInformation = 0x210012;
+constexpr std::size_t kQueryTypeOffset = 16;
+constexpr std::uint8_t kQueryAddressInfo = 3;
+constexpr std::size_t kPortOffset = 12;
+
+template <typename Number> Number NumberAt(const std::uint8_t* bytes) {
+  Number number{};
+  std::memcpy(&number, bytes, sizeof number);
+  return number;
+}
+
+Text Capitals(TextView text) {
+  Text capitals(text);
+  for (char16_t& unit : capitals)
+    if (unit >= u'a' && unit <= u'z') unit = static_cast<char16_t>(unit - 32);
+  return capitals;
+}
+
+} // namespace
+
+void SocketHandleScan::Run(std::vector<PortOwner>& owners) {
+  for (const HandleEntry& entry : AllHandles()) Examine(entry, owners);
+}
+
+std::vector<SocketHandleScan::HandleEntry> SocketHandleScan::AllHandles() {
+  platform::Handles& handles = machine_.handles;
+  std::vector<HandleEntry> entries;
+  std::uint32_t status = 0;
+  do {
+    std::uint32_t returned = 0;
+    std::vector<std::uint8_t> buffer(kFirstRoom);
+    // What fits in the first room is not looked at: a success here means a list of one handle at most.
+    if (handles.NtQuerySystemInformation(kSystemHandles, buffer, returned) == 0) break;
+    const auto count = NumberAt<std::uint32_t>(buffer.data());
+    const std::int32_t room =
+        ToInt32(std::int64_t{count} * std::int64_t{kEntryBytes} + std::int64_t{kCountBytes});
+    buffer.assign(static_cast<std::size_t>(room), 0);
+    status = handles.NtQuerySystemInformation(kSystemHandles, buffer, returned);
+    entries.resize(count);
+    const std::uint8_t* bytes = buffer.data() + kCountBytes;
+    for (HandleEntry& entry : entries) {
+      entry = {NumberAt<std::uint32_t>(bytes), NumberAt<std::uint16_t>(bytes + kHandleOffset)};
+      bytes += kEntryBytes;
+    }
+  } while (status == platform::Handles::kStatusInfoLengthMismatch);
+  return entries;
+}
+
+void SocketHandleScan::Examine(const HandleEntry& entry, std::vector<PortOwner>& owners) {
+  if (entry.processId == 0) return;
+  platform::Processes& processes = machine_.processes;
+  const platform::Handle opened = processes.OpenProcess(kMayDuplicate, false, entry.processId);
+  if (opened == platform::kInvalidHandle) return;
+  const OwnedHandle process(processes, opened);
+  platform::Handle copy = platform::kNoHandle;
+  // The pseudo handle of the own process is the invalid handle's value.
+  if (!machine_.handles.DuplicateHandle(process.Get(), entry.handle, platform::kInvalidHandle, copy,
+                                        kDuplicateAccess, false, 0))
+    return;
+  const OwnedHandle duplicate(processes, copy);
+  const std::optional<Text> name = DeviceName(duplicate.Get());
+  if (!name) return;
+  const std::int32_t port = QueryHandlePort(duplicate.Get());
+  if (port == 0) return;
+  PortOwner& owner = owners[static_cast<std::size_t>(port)];
+  const bool tcp = name->find(u"TCP") != Text::npos;
+  (tcp ? owner.tcpOwner : owner.udpOwner) = static_cast<std::int32_t>(entry.processId);
+}
+
+std::optional<Text> SocketHandleScan::DeviceName(platform::Handle handle) {
+  std::array<std::uint8_t, kNameRoom> buffer{};
+  std::uint32_t returned = 0;
+  const std::uint32_t status = machine_.handles.NtQueryObject(handle, kNameInformation, buffer, returned);
+  if (status != 0 || NumberAt<std::uint16_t>(buffer.data()) != kDeviceNameBytes) return std::nullopt;
+  Text name(kDeviceNameBytes / sizeof(char16_t), u'\0');
+  std::memcpy(name.data(), buffer.data() + kNameOffset, kDeviceNameBytes);
+  return Capitals(CutAtNul(TextView(name)));
+}
+
+std::int32_t SocketHandleScan::QueryHandlePort(platform::Handle handle) {
+  std::array<std::uint8_t, 24> input{};
+  std::array<std::uint8_t, 52> output{};
+  input[kQueryTypeOffset] = kQueryAddressInfo;
+  const OwnedHandle event(machine_.processes, machine_.handles.CreateEventW(true, false, u"0"));
+  const std::uint32_t status =
+      machine_.handles.NtDeviceIoControlFile(handle, event.Get(), kQueryInformation, input, output);
+  if (status != 0) return 0;
+  return output[kPortOffset] << 8 | output[kPortOffset + 1];
+}
+
+} // namespace quendra::monitor

@@ -1,0 +1,111 @@
+#include "monitor/mdlFileInfo.h"
+
+#include "monitor/OwnedHandle.h"
+#include "platform/Processes.h"
+#include "platform/Tokens.h"
+
+#include <algorithm>
+
+namespace quendra::monitor {
+
+namespace {
+
+constexpr std::uint32_t kAdjustAndQuery = 40;
+constexpr std::uint32_t kQueryAndRead = 1040;
+constexpr std::size_t kModuleTableBytes = 200;
+constexpr std::size_t kPathRoom = 260;
+constexpr std::uint32_t kStatedPathSize = 500;
+
+constexpr std::array<TextView, 5> kSystemNames{u"system", u"smss.exe", u"winlogon.exe", u"csrss.exe",
+                                               u"lsass.exe"};
+
+/// Needs a text with room for `kPathRoom` characters, fewer than the size that it states.
+Text FirstModulePath(platform::Processes& processes, platform::Handle process) {
+  std::array<std::uint32_t, kModuleTableBytes / sizeof(std::uint32_t)> modules{};
+  if (!processes.EnumProcessModules(process, modules)) return {};
+  std::string path(kPathRoom, ' ');
+  const std::uint32_t length = processes.GetModuleFileNameExA(process, modules[0], path, kStatedPathSize);
+  return FromCodePage(std::string_view(path).substr(0, length));
+}
+
+} // namespace
+
+Boolean16 mdlFileInfo::EnablePrivilege(TextView name, std::uint32_t attributes) {
+  platform::Processes& processes = machine_.processes;
+  const auto failed = [&](TextView step) {
+    // Judged by the last error and not by the call's result, so an error left over from before fails the
+    // first step.
+    const auto error = static_cast<std::int32_t>(processes.GetLastError());
+    if (error != 0) desktop_.MessageBox(Text(step) + u", Error: " + DecimalText(error), 0, {});
+    return error != 0;
+  };
+
+  const platform::Handle process = processes.GetCurrentProcess();
+  if (failed(u"GetCurrentProcess")) return kFalse16;
+  platform::Handle opened = platform::kNoHandle;
+  machine_.tokens.OpenProcessToken(process, kAdjustAndQuery, opened);
+  const OwnedHandle token(processes, opened);
+  if (failed(u"OpenProcessToken")) return kFalse16;
+  std::uint64_t luid = 0;
+  machine_.tokens.LookupPrivilegeValueA("", ToCodePage(name), luid);
+  if (failed(u"LookupPrivilegeValue")) return kFalse16;
+  std::array<std::uint8_t, 16> previousState{};
+  machine_.tokens.AdjustTokenPrivileges(token.Get(), false, luid, attributes, previousState);
+  return failed(u"AdjustTokenPrivileges") ? kFalse16 : kTrue16;
+}
+
+Text mdlFileInfo::ModulePathOf(std::uint32_t processId) {
+  const platform::Handle process = machine_.processes.OpenProcess(kQueryAndRead, false, processId);
+  const Text path = FirstModulePath(machine_.processes, process);
+  machine_.processes.CloseHandle(process);
+  return path;
+}
+
+Text mdlFileInfo::ModulePathOrSystem(std::uint32_t processId) {
+  const platform::Handle process = machine_.processes.OpenProcess(kQueryAndRead, false, processId);
+  const Text path = process == platform::kNoHandle ? Text() : FirstModulePath(machine_.processes, process);
+  machine_.processes.CloseHandle(process);
+  return path.empty() ? u"SYSTEM" : path;
+}
+
+void mdlFileInfo::LoadSystemPids(const Text&) {
+  platform::Processes& processes = machine_.processes;
+  const OwnedHandle snapshot(processes,
+                             processes.CreateToolhelp32Snapshot(platform::Processes::kSnapProcess, 0));
+  platform::Processes::Entry entry;
+  for (bool more = processes.Process32First(snapshot.Get(), entry); more;
+       more = processes.Process32Next(snapshot.Get(), entry)) {
+    const Text name = ExeNameOf(entry);
+    RecordWellKnown(name, entry.processId);
+    if (name == u"quendra.exe") OwnPid = entry.processId;
+  }
+}
+
+void mdlFileInfo::RecordWellKnown(TextView exeName, std::uint32_t processId) {
+  if (SameIgnoringCase(exeName, u"services.exe")) {
+    ServicesPid = processId;
+  } else if (SameIgnoringCase(exeName, u"explorer.exe")) {
+    ExplorerPid = processId;
+  } else {
+    const auto found = std::find_if(kSystemNames.begin(), kSystemNames.end(),
+                                    [&](TextView name) { return SameIgnoringCase(exeName, name); });
+    if (found != kSystemNames.end())
+      SystemPids[static_cast<std::size_t>(found - kSystemNames.begin())] = processId;
+  }
+}
+
+const char16_t* mdlFileInfo::ClassOfParent(std::uint32_t parentProcessId) const {
+  if (parentProcessId == ServicesPid) return u"Service";
+  if (parentProcessId == ExplorerPid) return u"User";
+  return IsSystemPid(parentProcessId) ? u"System" : nullptr;
+}
+
+bool mdlFileInfo::IsSystemPid(std::uint32_t processId) const {
+  return std::find(SystemPids.begin(), SystemPids.end(), processId) != SystemPids.end();
+}
+
+Text ExeNameOf(const platform::Processes::Entry& entry) {
+  return FromCodePage(CutAtNul(std::string_view(entry.exeFile.data(), entry.exeFile.size())));
+}
+
+} // namespace quendra::monitor

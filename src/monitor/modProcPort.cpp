@@ -1,0 +1,87 @@
+#include "monitor/modProcPort.h"
+
+#include "monitor/PortsCells.h"
+#include "monitor/ProcessRow.h"
+
+#include <array>
+
+namespace quendra::monitor {
+
+namespace {
+
+constexpr std::size_t kPorts = 65536;
+
+constexpr std::array<TextView, 12> kStateNames{
+    u"Closed",     u"Listening",  u"SYN Sent", u"SYN Recieved", u"Established", u"FIN Wait 1",
+    u"FIN Wait 2", u"Close Wait", u"Closing",  u"Last ACK",     u"Time Wait",   u"Delete TCB",
+};
+
+} // namespace
+
+modProcPort::modProcPort(const platform::Machine& machine, forms::Desktop& desktop,
+                         forms::ListView& main_ListView1, mdlFileInfo& fileInfo)
+    : PortOwnerTable(kPorts), machine_(machine), desktop_(desktop), main_ListView1_(main_ListView1),
+      fileInfo_(fileInfo) {}
+
+bool modProcPort::ScanSocketHandles() {
+  SocketHandleScan(machine_).Run(PortOwnerTable);
+  return true;
+}
+
+std::int32_t modProcPort::QueryHandlePort(std::uint32_t handle) {
+  return SocketHandleScan(machine_).QueryHandlePort(handle);
+}
+
+bool modProcPort::FetchTcpOwnerTable() {
+  walkOffset_ = 0;
+  platform::IpHelper::TcpTable table;
+  if (machine_.ipHelper.AllocateAndGetTcpExTableFromStack(table) != 0) return false;
+  TcpOwnerSnapshot_ = std::move(table);
+  entryCount_ = TcpEntryCount(TcpOwnerSnapshot_);
+  return true;
+}
+
+bool modProcPort::MergeTcpPorts() {
+  SystemPortsText.clear();
+  if (!HasEntries()) return false;
+  PortsCells cells(main_ListView1_);
+  // The count itself included: one entry more than the table holds.
+  const std::int32_t last = entryCount_;
+  for (std::int32_t i = 0; i <= last; ++i) {
+    ReadEntry();
+    if (!currentEntry_.IsBlank()) MergeCurrentEntry(cells);
+    NextEntry();
+  }
+  return true;
+}
+
+void modProcPort::MergeCurrentEntry(PortsCells& cells) {
+  forms::ListRow* row = main_ListView1_.Find(KeyOfProcess(currentEntry_.owner));
+  if (!row) return;
+  const Text port = DecimalText(currentEntry_.LocalPortNumber());
+  if (cells.Contains(*row, port)) return;
+  cells.Append(*row, port);
+  if (fileInfo_.IsSystemPid(currentEntry_.owner)) SystemPortsText += port;
+}
+
+void modProcPort::ReadEntry() {
+  currentEntry_ = TcpEntryAt(TcpOwnerSnapshot_, walkOffset_);
+  desktop_.DoEvents();
+}
+
+void modProcPort::NextEntry() {
+  walkOffset_ += kTcpEntryBytes;
+  desktop_.DoEvents();
+}
+
+Text modProcPort::IpAddressText(std::uint32_t address) {
+  Text text = DecimalText(address & 0xFF);
+  for (int shift = 8; shift < 32; shift += 8) text += u"." + DecimalText(address >> shift & 0xFF);
+  return text;
+}
+
+Text modProcPort::StateName(std::uint32_t state) {
+  return state >= 1 && state <= kStateNames.size() ? Text(kStateNames[state - 1]) : Text();
+}
+
+} // namespace quendra::monitor
