@@ -135,12 +135,12 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   std::deque<int> answers_;
   bool yielding_ = false;
   Form* active_ = nullptr;
-  std::unordered_map<const Form*, std::unique_ptr<FormView>> views_;
   std::unordered_map<const Form*, WindowHandle> windows_;
   std::map<WindowHandle, std::string> windowNames_;
   RegionHandle lastRegion_ = 0;
   std::unordered_map<const PictureBox*, std::vector<std::string>> drawings_;
   mutable std::map<std::string, Picture> images_;
+  std::unordered_map<const Form*, std::unique_ptr<FormView>> views_;  // last: a view that goes drops its drawings
 };
 
 } // namespace quendra::forms

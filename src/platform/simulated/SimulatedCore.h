@@ -1,0 +1,54 @@
+#pragma once
+
+#include "platform/Processes.h"
+
+#include <map>
+#include <string>
+#include <vector>
+
+namespace quendra::platform::simulated {
+
+/// What the families of one simulated machine share: the open handles, the last error and the record of
+/// calls.
+struct Core {
+  enum class Kind { Snapshot, Process, Token, Event, Duplicate };
+  struct Opened {
+    Kind kind;
+    /// Process id, or the index that the family gave.
+    std::uint32_t number = 0;
+  };
+
+  Handle Open(Kind kind, std::uint32_t number = 0) {
+    nextHandle += 4;
+    opened[nextHandle] = {kind, number};
+    return nextHandle;
+  }
+  const Opened* Find(Handle handle, Kind kind) const {
+    const auto found = opened.find(handle);
+    return found == opened.end() || found->second.kind != kind ? nullptr : &found->second;
+  }
+
+  std::map<Handle, Opened> opened;
+  Handle nextHandle = 0x100;
+  std::uint32_t lastError = 0;
+  std::uint32_t tickCount = 0x00100000;
+  std::vector<std::string> calls;
+};
+
+inline void Put32(std::span<std::uint8_t> bytes, std::size_t at, std::uint32_t value) {
+  for (std::size_t i = 0; i < 4; ++i) bytes[at + i] = static_cast<std::uint8_t>(value >> 8 * i);
+}
+inline void Put16(std::span<std::uint8_t> bytes, std::size_t at, std::uint16_t value) {
+  bytes[at] = static_cast<std::uint8_t>(value);
+  bytes[at + 1] = static_cast<std::uint8_t>(value >> 8);
+}
+inline std::uint32_t Get32(std::span<const std::uint8_t> bytes, std::size_t at) {
+  std::uint32_t value = 0;
+  for (std::size_t i = 0; i < 4; ++i) value |= static_cast<std::uint32_t>(bytes[at + i]) << 8 * i;
+  return value;
+}
+
+/// A dotted text as an address lies in memory: the first part in the low byte. 0 for a text that is none.
+std::uint32_t AddressInMemory(const std::string& dotted);
+
+} // namespace quendra::platform::simulated

@@ -1,0 +1,67 @@
+#pragma once
+
+#include "platform/Machine.h"
+#include "platform/simulated/SimulatedCapture.h"
+#include "platform/simulated/SimulatedNetwork.h"
+#include "platform/simulated/SimulatedProcesses.h"
+#include "platform/simulated/SimulatedSystem.h"
+
+namespace quendra::platform::simulated {
+
+/// A machine made of plain data: a test says what runs on it, and asks afterwards what the program did to it.
+/// It must outlive what uses its operations; capture controls may outlive it.
+class SimulatedMachine {
+ public:
+  SimulatedMachine()
+      : processes(core_), tokens(core_), handles(core_), sockets(core_), capture(core_), system(core_),
+        shellStart(core_) {}
+  SimulatedMachine(const SimulatedMachine&) = delete;
+
+  Machine Operations() {
+    return {capture,   capture,    handles, hostNames, icons,  ipHelper,
+            processes, shellStart, sockets, system,    tokens, versionInfo};
+  }
+
+ private:
+  Core core_;
+
+ public:
+  // The families, each with its own script.
+  SimulatedProcesses processes;
+  SimulatedTokens tokens;
+  SimulatedVersionInfo versionInfo;
+  SimulatedIcons icons;
+  SimulatedHandles handles;
+  SimulatedIpHelper ipHelper;
+  SimulatedHostNames hostNames;
+  SimulatedSockets sockets;
+  SimulatedCapture capture;
+  SimulatedSystem system;
+  SimulatedShellStart shellStart;
+
+  /// Calls whose order counts: capture library and control, Sleep, Shell, sockets.
+  std::vector<std::string>& Calls = core_.calls;
+
+  // What tests say most.
+
+  void AddProcess(Process process) { processes.Add(std::move(process)); }
+  void EndProcess(std::uint32_t id) { processes.End(id); }
+  void AddVersionBlock(const std::string& path, std::vector<std::uint8_t> translation,
+                       std::map<std::string, std::string> texts) {
+    versionInfo.Add(path, std::move(translation), std::move(texts));
+  }
+  void SetIcon(const std::string& path, std::vector<std::uint8_t> image) {
+    icons.Set(path, std::move(image));
+  }
+  void AddHandle(SystemHandle handle) { handles.Add(std::move(handle)); }
+  void AddConnection(Connection connection) { ipHelper.Connections.push_back(std::move(connection)); }
+  void AddCaptureAdapter(CaptureAdapter adapter) { capture.Adapters.push_back(std::move(adapter)); }
+  void Deliver(std::vector<std::uint8_t> frame, std::uint32_t wireLength = 0) {
+    capture.Deliver(std::move(frame), wireLength);
+  }
+  bool SignalPackets() { return capture.SignalPackets(); }
+  void SetTick(std::uint32_t tick) { system.SetTick(tick); }
+  void AdvanceTick(std::uint32_t milliseconds) { system.AdvanceTick(milliseconds); }
+};
+
+} // namespace quendra::platform::simulated
