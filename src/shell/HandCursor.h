@@ -1,0 +1,26 @@
+#pragma once
+
+#include "forms/Desktop.h"
+
+namespace quendra::shell {
+
+/// The system's hand, shown while the mouse moves over a label that acts as a button.
+class HandCursor {
+ public:
+  explicit HandCursor(forms::Desktop& desktop) : desktop_(desktop) {}
+
+  void Load() { handle_ = desktop_.LoadCursor(kHand); }
+  /// Nothing where the system has no such cursor.
+  void Show() const {
+    if (handle_ > 0) desktop_.SetCursor(handle_);
+  }
+  forms::CursorHandle Handle() const { return handle_; }
+
+ private:
+  static constexpr int kHand = 32649;
+
+  forms::Desktop& desktop_;
+  forms::CursorHandle handle_ = 0;
+};
+
+} // namespace quendra::shell

@@ -1,0 +1,44 @@
+#pragma once
+
+#include "forms/Controls.h"
+
+/// Colours and letter sizes that the forms share.
+namespace quendra::shell::looks {
+
+inline constexpr forms::Colour kLime = forms::Rgb(162, 233, 93);
+inline constexpr forms::Colour kForest = forms::Rgb(24, 61, 16);
+inline constexpr forms::Colour kLeaf = forms::Rgb(46, 125, 50);
+inline constexpr forms::Colour kPaper = forms::Rgb(250, 253, 247);
+inline constexpr forms::Colour kInk = forms::Rgb(33, 37, 41);
+inline constexpr forms::Colour kQuiet = forms::Rgb(90, 105, 84);
+inline constexpr forms::Colour kAlert = forms::Rgb(176, 42, 24);
+
+inline constexpr forms::Font kBody{10, false, false};
+inline constexpr forms::Font kStrong{10, true, false};
+inline constexpr forms::Font kSmall{9, false, false};
+inline constexpr forms::Font kHeading{15, true, false};
+inline constexpr forms::Font kEntry{12, true, false};
+inline constexpr forms::Font kFigure{14, true, false};
+
+/// A plain text that lets what lies under it shine through.
+inline void Text(forms::Label& label, const char16_t* caption, forms::Font font,
+                 forms::Colour colour = kInk) {
+  label.Caption = quendra::Text(caption);
+  label.TextFont = font;
+  label.ForeColour = colour;
+  label.Transparent = true;
+}
+
+inline void Link(forms::Label& label, const char16_t* caption, forms::Font font,
+                 forms::Colour colour = kForest) {
+  Text(label, caption, font, colour);
+  label.Style = forms::Label::Look::Link;
+}
+
+inline void Button(forms::Label& label, const char16_t* caption) {
+  Text(label, caption, kBody);
+  label.Style = forms::Label::Look::Button;
+  label.Align = forms::Alignment::Centre;
+}
+
+} // namespace quendra::shell::looks

@@ -1,0 +1,20 @@
+#include "shell/frmAbout.h"
+
+#include "shell/Twips.h"
+
+namespace quendra::shell {
+
+frmAbout::frmAbout(forms::Desktop& desktop) : Form(u"frmAbout"), desktop_(desktop) {
+  Image1.Click = [this] { desktop_.Unload(*this); };
+}
+
+void frmAbout::Design() {
+  Caption = u"About Quendra Monitor";
+  Border = forms::BorderStyle::None;
+  MinimizeBox = false;
+  Move(0, 0, Px(420), Px(280));
+  Image1.Contents = forms::Picture::Artwork("about");
+  Image1.Move(0, 0, Px(420), Px(280));
+}
+
+} // namespace quendra::shell

@@ -1,0 +1,102 @@
+#include "shell/Looks.h"
+#include "shell/Twips.h"
+#include "shell/frmMenu.h"
+
+namespace quendra::shell {
+
+namespace {
+
+constexpr int kPageWidth = 1118;
+constexpr int kInset = 6;
+constexpr int kTableTop = 54;
+constexpr int kTableHeight = 446;
+constexpr int kActionsTop = kTableTop + kTableHeight + 10;
+constexpr int kAdaptersTop = kActionsTop + 44;
+
+struct Meter {
+  forms::Label& caption;
+  forms::Label& figure;
+  forms::Label& unit;
+};
+
+void Place(const Meter& meter, const char16_t* caption, int left) {
+  looks::Text(meter.caption, caption, looks::kBody, looks::kQuiet);
+  meter.caption.Align = forms::Alignment::Trailing;
+  meter.caption.Move(Px(left), Px(18), Px(70), Px(22));
+  looks::Text(meter.figure, u"0.0", looks::kFigure, looks::kForest);
+  meter.figure.Align = forms::Alignment::Centre;
+  meter.figure.Move(Px(left + 72), Px(12), Px(90), Px(30));
+  looks::Text(meter.unit, u"ק\"ב לשנייה", looks::kSmall, looks::kQuiet);
+  meter.unit.Move(Px(left + 164), Px(19), Px(76), Px(20));
+}
+
+} // namespace
+
+void frmMenu::DesignMonitorPage() {
+  looks::Text(main_Label4, u"תהליכים פעילים:", looks::kHeading, looks::kForest);
+  main_Label4.Move(Px(18), Px(12), Px(320), Px(32));
+  DesignMeters();
+  DesignTable();
+  DesignActions();
+  DesignAdapters();
+}
+
+void frmMenu::DesignMeters() {
+  Place({main_Label2, main_lblUpload, main_lblUploadUnit}, u"העלאה:", kPageWidth - 500);
+  Place({main_Label3, main_lblDownload, main_lblDownloadUnit}, u"הורדה:", kPageWidth - 254);
+}
+
+void frmMenu::DesignTable() {
+  main_ListView1.Clear();
+  main_ListView1.ClearColumns();
+  main_ListView1.SmallIcons = &main_ImList;
+  main_ListView1.HeaderIcons = &main_headersIL;
+  main_ListView1.TextFont = looks::kSmall;
+  main_ListView1.Move(Px(kInset), Px(kTableTop), Px(kPageWidth - 2 * kInset), Px(kTableHeight));
+  main_ImList.Clear();
+  main_ImList.Add(forms::Picture::Artwork("default_process"));
+  main_headersIL.Clear();
+  main_headersIL.Add(forms::Picture::Artwork("header_upload"));
+  main_headersIL.Add(forms::Picture::Artwork("header_download"));
+  main_Pic.Visible = false;
+  main_Pic.ScaleMode = 3;
+  main_Pic.BackColour = forms::kWhite;
+  main_Pic.Move(0, 0, Px(32), Px(32));
+}
+
+void frmMenu::DesignActions() {
+  struct Action {
+    Label& label;
+    const char16_t* caption;
+    int left;
+    int width;
+  };
+  const Action actions[] = {
+      {main_lblEndProcess, u"סיים תהליך", 6, 130},
+      {main_lblJumpToPath, u"אתר קובץ", 146, 130},
+      {main_cmdChecks, u"בדיקת פורטים", 308, 150},
+      {main_cmdMemInfo, u"מידע על הזיכרון", 468, 160},
+      {main_cmdAddRemove, u"הוספה/הסרה של תוכניות", 638, 210},
+      {main_cmdRpt, u"שלח דוח", kPageWidth - 166, 160},
+  };
+  for (const Action& action : actions) {
+    looks::Button(action.label, action.caption);
+    action.label.Move(Px(action.left), Px(kActionsTop), Px(action.width), Px(34));
+  }
+  main_cmdRpt.TextFont = looks::kStrong;
+}
+
+void frmMenu::DesignAdapters() {
+  main_Frame1.Caption = Text(u" עקוב אחרי התקן ");
+  main_Frame1.Border = true;
+  main_Frame1.BackColour = looks::kPaper;
+  main_Frame1.TextFont = looks::kSmall;
+  main_Frame1.Move(Px(kInset), Px(kAdaptersTop), Px(kPageWidth - 2 * kInset), Px(62));
+  main_cmbAdapters.Clear();
+  main_cmbAdapters.TextFont = looks::kSmall;
+  main_cmbAdapters.Move(Px(12), Px(22), Px(480), Px(28));
+  looks::Text(main_lblCaptureState, u"", looks::kSmall, looks::kAlert);
+  main_lblCaptureState.Move(Px(508), Px(26), Px(580), Px(22));
+}
+
+} // namespace quendra::shell

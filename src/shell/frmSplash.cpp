@@ -1,0 +1,41 @@
+#include "shell/frmSplash.h"
+
+#include "shell/Agreement.h"
+#include "shell/frmMenu.h"
+
+namespace quendra::shell {
+
+namespace {
+
+/// Room that the agreement leaves free beside its lines, in pixels.
+constexpr int kSideRoom = 30;
+
+} // namespace
+
+frmSplash::frmSplash(forms::Desktop& desktop, frmMenu& menu)
+    : Form(u"frmSplash"), desktop_(desktop), menu_(menu), handCursor_(desktop),
+      roll_(desktop, {picOut, picBuffer, picBackBuffer}, ReDrawTimer, lines_) {
+  Label1.Click = [this] { roll_.Show(); };
+  Label2.Click = [this] { Label2_Click(); };
+  Label3.Click = [this] { desktop_.Unload(*this); };
+  picOut.Click = [this] { roll_.Hide(); };
+  ReDrawTimer.Tick = [this] { roll_.Tick(); };
+  for (forms::Label* button : {&Label1, &Label2, &Label3})
+    button->MouseMove = [this](int, int, int, int) { handCursor_.Show(); };
+}
+
+void frmSplash::Form_Load() {
+  handCursor_.Load();
+  lines_.Wrap(AgreementText(), desktop_.ScaleWidth(picBuffer) - kSideRoom,
+              [this](TextView text) { return desktop_.TextWidth(picBuffer, text); });
+  roll_.Hide();
+}
+
+void frmSplash::Label2_Click() {
+  Tag = Text();
+  desktop_.Show(menu_);
+  if (!menu_.Tag().empty()) desktop_.Unload(menu_);
+  if (Tag().empty()) desktop_.Unload(*this);
+}
+
+} // namespace quendra::shell
