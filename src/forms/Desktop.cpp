@@ -20,8 +20,15 @@ void Desktop::Show(Form& form, Modality modality, Form* owner) {
 }
 
 void Desktop::Unload(Form& form) {
-  if (!form.loaded_) return;
-  form.Form_Unload();
+  if (!form.loaded_ || form.unloading_) return;
+  form.unloading_ = true;
+  try {
+    form.Form_Unload();
+  } catch (...) {
+    form.unloading_ = false;
+    throw;
+  }
+  form.unloading_ = false;
   form.Visible = false;
   DestroyView(form);
   form.loaded_ = false;

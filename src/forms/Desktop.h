@@ -36,11 +36,11 @@ class Desktop {
 
   // Forms.
 
-  /// Design, then Form_Load. Does nothing for a loaded form. A fault that Form_Load lets escape leaves the form loaded.
+  /// An empty Tag, Design, then Form_Load. Does nothing for a loaded form. A fault that Form_Load lets escape leaves the form loaded.
   void Load(Form& form);
   /// Loads where needed and makes visible. Modal returns when the form is hidden or unloaded; `owner` may be nullptr.
   void Show(Form& form, Modality modality = Modality::Modeless, Form* owner = nullptr);
-  /// Form_Unload, then the view goes. Does nothing for a form that isn't loaded. When the last form has gone the program
+  /// Form_Unload, then the view goes. Does nothing for a form that isn't loaded or that unloads already. When the last form has gone the program
   /// ends with status 0.
   void Unload(Form& form);
   /// Ends the program at once: no further unloading. Throws ProgramEnded.

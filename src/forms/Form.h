@@ -40,6 +40,7 @@ class Form : public Container {
  private:
   friend class Desktop;
   bool loaded_ = false;
+  bool unloading_ = false;
 };
 
 } // namespace quendra::forms

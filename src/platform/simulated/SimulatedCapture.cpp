@@ -13,7 +13,7 @@ class SimulatedCapture::Control : public CaptureControl {
   ~Control() override {
     if (!capture_) return;
     capture_->Record("drop control");
-    if (capture_->control_ == this) capture_->control_ = nullptr;
+    std::erase(capture_->controls_, this);
   }
 
   void BindAdapter(const std::string& adapterName, std::int32_t& result) override {
@@ -85,7 +85,7 @@ void SimulatedCapture::Control::ReadBuffer(std::span<std::uint8_t> bytes) {
 }
 
 SimulatedCapture::~SimulatedCapture() {
-  if (control_) control_->Orphan();
+  for (Control* control : controls_) control->Orphan();
 }
 
 void SimulatedCapture::Deliver(std::vector<std::uint8_t> frame, std::uint32_t wireLength) {
@@ -99,9 +99,9 @@ void SimulatedCapture::FailCapture(std::int32_t result) {
 }
 
 bool SimulatedCapture::SignalPackets() {
-  if (!control_ || !control_->started || !control_->PacketReceived) return false;
+  if (controls_.empty() || !controls_.back()->started || !controls_.back()->PacketReceived) return false;
   // A copy: the handler may drop the control.
-  const auto handler = control_->PacketReceived;
+  const auto handler = controls_.back()->PacketReceived;
   handler();
   return true;
 }
@@ -185,9 +185,8 @@ std::unique_ptr<CaptureControl> SimulatedCapture::Create() {
   Record("create control");
   if (CreateFault != 0) throw Fault(CreateFault);
   ++ControlsMade;
-  if (control_) control_->Orphan();
   auto control = std::make_unique<Control>(*this);
-  control_ = control.get();
+  controls_.push_back(control.get());
   return control;
 }
 

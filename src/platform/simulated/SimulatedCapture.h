@@ -54,7 +54,8 @@ class SimulatedCapture : public CaptureLibrary, public CaptureControls {
   int ControlsMade = 0;
   bool SessionOpen = false;
   std::int16_t SelectedAdapter = -1;
-  bool HasControl() const { return control_ != nullptr; }
+  /// Controls that were made and not dropped.
+  int LiveControls() const { return static_cast<int>(controls_.size()); }
 
   std::int32_t VBPcapInit() override;
   void VBPcapTerminate() override;
@@ -82,7 +83,7 @@ class SimulatedCapture : public CaptureLibrary, public CaptureControls {
   std::deque<Frame> waiting_;
   Frame current_;
   Frame newest_;
-  Control* control_ = nullptr;
+  std::vector<Control*> controls_; ///< in the order in which they were made
 };
 
 } // namespace quendra::platform::simulated

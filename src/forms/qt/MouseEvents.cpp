@@ -1,0 +1,112 @@
+#include "forms/qt/MouseEvents.h"
+
+#include <QApplication>
+#include <QCursor>
+#include <QMouseEvent>
+
+namespace quendra::forms::qt {
+
+namespace {
+
+int ButtonOf(Qt::MouseButtons buttons) {
+  return (buttons & Qt::LeftButton ? kLeftButton : 0) | (buttons & Qt::RightButton ? kRightButton : 0);
+}
+
+bool IsMouseEvent(QEvent::Type type) {
+  return type == QEvent::MouseMove || type == QEvent::MouseButtonPress || type == QEvent::MouseButtonRelease ||
+         type == QEvent::MouseButtonDblClick;
+}
+
+} // namespace
+
+int ShiftStateOf(Qt::KeyboardModifiers modifiers) {
+  return (modifiers & Qt::ShiftModifier ? kShift : 0) | (modifiers & Qt::ControlModifier ? kCtrl : 0) |
+         (modifiers & Qt::AltModifier ? kAlt : 0);
+}
+
+void MouseEvents::Watch(QWidget& widget, WidgetView& view) {
+  views_.insert(&widget, &view);
+  widget.setMouseTracking(true);
+  widget.installEventFilter(this);
+}
+
+void MouseEvents::Forget(const WidgetView& view) {
+  views_.removeIf([&](const auto& entry) { return entry.value() == &view; });
+  if (pressed_ == &view) pressed_ = nullptr;
+}
+
+void MouseEvents::SetCursor(Qt::CursorShape shape) {
+  cursorWasSet_ = true;
+  QWidget* widget = moving_ ? moving_.data() : QApplication::widgetAt(QCursor::pos());
+  if (widget) widget->setCursor(shape);
+}
+
+void MouseEvents::DragWindow(QWidget& window) {
+  dragged_ = &window;
+  grip_ = QCursor::pos() - window.pos();
+}
+
+bool MouseEvents::eventFilter(QObject* watched, QEvent* event) {
+  if (!IsMouseEvent(event->type())) return false;
+  WidgetView* view = views_.value(watched);
+  if (!view) return false;
+  const bool takes = view->TakesMouse();
+  return Handle(*view, static_cast<QMouseEvent&>(*event)) || takes;
+}
+
+bool MouseEvents::Handle(WidgetView& view, QMouseEvent& event) {
+  if (dragged_) {
+    if (event.type() == QEvent::MouseMove && event.buttons() & Qt::LeftButton) {
+      dragged_->move(event.globalPosition().toPoint() - grip_);
+      return true;
+    }
+    dragged_ = nullptr;
+  }
+  if (!view.Widget().isEnabled()) return true;
+  switch (event.type()) {
+    case QEvent::MouseButtonPress: Pressed(view, event); break;
+    case QEvent::MouseButtonDblClick: DoubleClicked(view, event); break;
+    case QEvent::MouseButtonRelease: Released(view, event); break;
+    default: Moved(view, event); break;
+  }
+  return false;
+}
+
+void MouseEvents::Raise(WidgetView& view, const Event<int, int, int, int>& raised, int button,
+                        const QMouseEvent& event) {
+  if (!raised) return;
+  const double x = event.position().x();
+  const double fromLeading = view.ReadsFromRightToLeft() ? view.Widget().width() - x : x;
+  dispatcher_.Dispatch([&] {
+    raised(button, ShiftStateOf(event.modifiers()), scale_.TwipsX(fromLeading), scale_.TwipsY(event.position().y()));
+  });
+}
+
+void MouseEvents::Pressed(WidgetView& view, const QMouseEvent& event) {
+  if (event.button() == Qt::LeftButton) pressed_ = &view;
+  view.Widget().update();
+  Raise(view, view.TheControl()->MouseDown, ButtonOf(event.button()), event);
+}
+
+void MouseEvents::DoubleClicked(WidgetView& view, const QMouseEvent& event) {
+  // Without a handler the second of two quick clicks is a click like the first.
+  if (!view.TheControl()->DoubleClick || event.button() != Qt::LeftButton) return Pressed(view, event);
+  dispatcher_.Dispatch([&] { view.TheControl()->DoubleClick(); });
+}
+
+void MouseEvents::Released(WidgetView& view, const QMouseEvent& event) {
+  view.Widget().update();
+  if (event.button() != Qt::LeftButton || std::exchange(pressed_, nullptr) != &view) return;
+  if (view.Widget().rect().contains(event.position().toPoint())) view.Press();
+}
+
+void MouseEvents::Moved(WidgetView& view, const QMouseEvent& event) {
+  QPointer<QWidget> widget = &view.Widget();
+  cursorWasSet_ = false;
+  moving_ = widget;
+  Raise(view, view.TheControl()->MouseMove, ButtonOf(event.buttons()), event);
+  moving_ = nullptr;
+  if (!cursorWasSet_ && widget && widget->testAttribute(Qt::WA_SetCursor)) widget->unsetCursor();
+}
+
+} // namespace quendra::forms::qt
