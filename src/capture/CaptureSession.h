@@ -8,7 +8,9 @@
 #include "platform/Capture.h"
 #include "platform/Machine.h"
 
+#include <functional>
 #include <memory>
+#include <vector>
 
 namespace quendra::capture {
 
@@ -23,27 +25,41 @@ class CaptureSession {
   void InitLibrary();
   /// Makes `vpacket` and listens to its event. Lets fault 429 through.
   void CreateControl();
-  /// LocalAddressLast, GatewayAddress and LocalAddressPrevious, in this order, fresh. First step of the page's start.
+  /// LocalAddressLast, GatewayAddress and LocalAddressPrevious, in this order, fresh. First step of the
+  /// page's start.
   void ReadLocalAddresses();
-  /// The capture half of the page's start, behind the table's first pass: adapters, choice, session.
+  /// The capture half of the page's start, behind the table's first pass: adapters, choice, session. Fault 91
+  /// without `vpacket`, here and at the stop.
   void StartCapture();
-  /// The capture half of the page's stop: from CaptureRunning on.
+  /// The capture half of the page's stop: from CaptureRunning on. Blocks for 300 ms.
   void StopCapture();
   void main_cmbAdapters_Click();
   /// The polling form of the capture loop; nothing calls it.
   void main_DoCapture();
-  /// Called by main_DoCapture on a failed vpCapture: unloads the main window.
+  /// Called by main_DoCapture on a failed vpCapture. Unloads the form of the page unless another handler is
+  /// put here.
   std::function<void()> UnloadMainWindow;
 
  private:
+  void FillAdapterList();
+  void ListAdapter(std::int16_t adapter);
+  void AddDescription(const platform::AdapterInfo& info);
+  bool CarriesKnownAddress(const platform::AdapterInfo& info);
   void StartControl();
+  void ShowCaptureState();
+  platform::CaptureControl& Control();
+  void RetireControl();
+  void OnPacketReceived(const platform::CaptureControl* sender);
 
   platform::Machine machine_;
   forms::Desktop& desktop_;
   monitor::MonitorPage page_;
   CaptureFields& fields_;
   PacketAttribution& attribution_;
-  std::unique_ptr<platform::CaptureControl> vpacket_;
+  /// Controls that were replaced while they may have been raising their event: they go when no event is under
+  /// way.
+  std::vector<std::unique_ptr<platform::CaptureControl>> retired_;
+  int eventsUnderWay_ = 0;
 };
 
 } // namespace quendra::capture

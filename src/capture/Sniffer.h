@@ -1,0 +1,66 @@
+#pragma once
+
+#include "capture/CaptureFields.h"
+#include "forms/Controls.h"
+#include "forms/ListView.h"
+#include "platform/Machine.h"
+#include "platform/Sockets.h"
+
+#include <functional>
+#include <optional>
+#include <span>
+
+namespace quendra::capture {
+
+/// What the sniffer makes of one IPv4 packet. Ports are signed words, as in the frame decoders.
+struct SniffedPacket {
+  Text protocolName;
+  std::int16_t payloadSize = 0; ///< the packet's length without the headers that its protocol counts
+  std::uint32_t source = 0;     ///< as it lies in memory
+  bool tunnelled = false;
+  struct Ports {
+    std::int16_t source = 0;
+    std::int16_t destination = 0;
+  };
+  std::optional<Ports> ports;
+};
+
+/// The buffer counts as filled with zeros behind its end.
+SniffedPacket ReadSniffedPacket(std::span<const std::uint8_t, 2000> buffer);
+
+/// A second way to the packets, over raw sockets. Complete but asleep: nothing opens its sockets or lets it
+/// see window messages, so its flag stays false.
+class Sniffer {
+ public:
+  Sniffer(const platform::Machine& machine, forms::ListView& main_ListView1, forms::Timer& main_Timer1,
+          CaptureFields& capture)
+      : machine_(machine), main_ListView1_(main_ListView1), main_Timer1_(main_Timer1), capture_(capture) {}
+
+  bool Active = false;
+  std::array<platform::SocketHandle, 2> Sockets{};
+  std::uint32_t Window = 0;
+  /// Releases the window's subclass; dropped behind the teardown.
+  std::function<void()> UnSubclass;
+
+  /// Before the window's own procedure: does nothing.
+  void iSubCls_Antes(std::int32_t& bHandled, std::int32_t& lReturn, std::uint32_t hWnd, std::uint32_t uMsg,
+                     std::uint32_t wParam, std::uint32_t lParam);
+  /// Behind it: reads the socket `wParam` to its end when `lParam` tells that it can be read.
+  void iSubCls_Despues(std::int32_t& lReturn, std::uint32_t hWnd, std::uint32_t uMsg, std::uint32_t wParam,
+                       std::uint32_t lParam);
+  /// Does nothing unless Active.
+  void Teardown();
+
+ private:
+  void Charge(const SniffedPacket& packet);
+  bool IsOutgoing(const SniffedPacket& packet) const;
+  forms::ListRow* OwnerOf(const SniffedPacket& packet, bool outgoing);
+  void DeselectAndCloseSockets();
+
+  platform::Machine machine_;
+  forms::ListView& main_ListView1_;
+  forms::Timer& main_Timer1_;
+  CaptureFields& capture_;
+};
+
+} // namespace quendra::capture

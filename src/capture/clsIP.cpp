@@ -1,0 +1,57 @@
+#include "capture/clsIP.h"
+
+#include "capture/Protocols.h"
+#include "capture/modVBPcap.h"
+#include "capture/mod_functions.h"
+
+#include <bit>
+
+namespace quendra::capture {
+
+namespace {
+
+std::uint32_t AddressAt(const platform::FrameBytes& frame, int index) {
+  return std::bit_cast<std::uint32_t>(
+      std::array<std::uint8_t, 4>{frame[index], frame[index + 1], frame[index + 2], frame[index + 3]});
+}
+
+} // namespace
+
+Text clsIP::Decode(const platform::FrameBytes& frame) {
+  using modVBPcap::WordFromBytes;
+  const int offset = frame[kProtocolIndex] == kGre ? kTunnelOffset : 0;
+  Ver_ = frame[offset + 14] >> 4;
+  IHL_ = frame[offset + 14] & 15;
+  TotalLength_ = WordFromBytes(frame[offset + 16], frame[offset + 17]);
+  // The positions themselves and not the bytes that stand there: so it has always been, and nothing depends
+  // on it.
+  Identification_ =
+      WordFromBytes(static_cast<std::uint8_t>(offset + 18), static_cast<std::uint8_t>(offset + 19));
+  FragmentOffset_ = WordFromBytes(frame[offset + 20], frame[offset + 21]) & 0x1FFF;
+  TTL_ = frame[offset + 22];
+  Protocol_ = frame[offset + 23];
+  ResolveProtocolName();
+  HD_Cheksum_ = WordFromBytes(frame[offset + 24], frame[offset + 25]);
+  SrcIP_ = AddressAt(frame, offset + 26);
+  DestIP_ = AddressAt(frame, offset + 30);
+  return {};
+}
+
+void clsIP::ResolveProtocolName() {
+  switch (Protocol_) {
+  case kIcmp: sProtocol_ = u"ICMP"; break;
+  case kTcp: sProtocol_ = u"TCP"; break;
+  case kUdp: sProtocol_ = u"UDP"; break;
+  default: sProtocol_ = u"UNKNOWN";
+  }
+}
+
+Text clsIP::HD_Cheksum() const {
+  return HD_Cheksum_ ? HexText(static_cast<std::uint16_t>(*HD_Cheksum_)) : Text{};
+}
+
+Text clsIP::AddressText(const std::optional<std::uint32_t>& address) {
+  return address ? mod_functions::IpFromLong(*address) : Text{};
+}
+
+} // namespace quendra::capture

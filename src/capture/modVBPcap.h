@@ -1,0 +1,32 @@
+#pragma once
+
+#include "platform/Capture.h"
+#include "runtime/Text.h"
+
+/// Byte helpers of the frame decoders.
+namespace quendra::capture::modVBPcap {
+
+/// high * 256 + low as a signed value: 0xFF, 0xFF gives -1.
+constexpr std::int16_t WordFromBytes(std::uint8_t high, std::uint8_t low) {
+  return static_cast<std::int16_t>(high << 8 | low);
+}
+
+/// The same bytes in the opposite order.
+constexpr std::int16_t WordFromLowHigh(std::uint8_t low, std::uint8_t high) {
+  return WordFromBytes(high, low);
+}
+
+/// high * 65536 + low, both taken without a sign, as a 32-bit pattern.
+constexpr std::int32_t LongFromWords(std::int16_t low, std::int16_t high) {
+  return static_cast<std::int32_t>(static_cast<std::uint32_t>(static_cast<std::uint16_t>(high)) << 16 |
+                                   static_cast<std::uint16_t>(low));
+}
+
+/// Whether the run of bytes from `first` to `first + countLessOne` lies within the array. Indexes have 16
+/// bits: a sum beyond them is fault 6.
+bool RunIsInside(const platform::FrameBytes& bytes, std::int16_t first, std::int16_t countLessOne);
+
+/// The bytes of that run in upper-case hexadecimal with ":" between them; "0" for a run that isn't inside.
+Text HexRun(const platform::FrameBytes& bytes, std::int16_t first, std::int16_t countLessOne);
+
+} // namespace quendra::capture::modVBPcap
