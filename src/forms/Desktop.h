@@ -7,8 +7,8 @@
 
 namespace quendra::forms {
 
-/// Thrown by `Desktop::End` and by whatever pumps messages once the program has ended: unwinds every handler under way.
-/// Only desktops catch it.
+/// Thrown by `Desktop::End` and by whatever pumps messages once the program has ended: unwinds every handler
+/// under way. Only desktops catch it.
 struct ProgramEnded {
   int status = 0;
 };
@@ -36,12 +36,14 @@ class Desktop {
 
   // Forms.
 
-  /// An empty Tag, Design, then Form_Load. Does nothing for a loaded form. A fault that Form_Load lets escape leaves the form loaded.
+  /// An empty Tag, Design, then Form_Load. Does nothing for a loaded form. A fault that Form_Load lets escape
+  /// leaves the form loaded.
   void Load(Form& form);
-  /// Loads where needed and makes visible. Modal returns when the form is hidden or unloaded; `owner` may be nullptr.
+  /// Loads where needed and makes visible. Modal returns when the form is hidden or unloaded; `owner` may be
+  /// nullptr.
   void Show(Form& form, Modality modality = Modality::Modeless, Form* owner = nullptr);
-  /// Form_Unload, then the view goes. Does nothing for a form that isn't loaded or that unloads already. When the last form has gone the program
-  /// ends with status 0.
+  /// Form_Unload, then the view goes. Does nothing for a form that isn't loaded or that unloads already. When
+  /// the last form has gone the program ends with status 0.
   void Unload(Form& form);
   /// Ends the program at once: no further unloading. Throws ProgramEnded.
   [[noreturn]] virtual void End(int status = 0) = 0;
@@ -78,16 +80,16 @@ class Desktop {
   virtual void Cls(PictureBox& box) = 0;
   /// A filled box with both corners in it.
   virtual void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) = 0;
-  /// Prints at CurrentX and CurrentY in ForeColour and moves to the start of the next line. A box of a form that reads
-  /// from right to left prints from its right edge.
+  /// Prints at CurrentX and CurrentY in ForeColour and moves to the start of the next line. A box of a form
+  /// that reads from right to left prints from its right edge.
   virtual void Print(PictureBox& box, TextView text) = 0;
   /// Copies in pixels, as SRCCOPY does.
-  virtual void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
-                      int sourceY) = 0;
+  virtual void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source,
+                      int sourceX, int sourceY) = 0;
   /// Shows what was drawn.
   virtual void Refresh(PictureBox& box) = 0;
-  /// Draws an icon's image, in any format that desktops know (PNG, SVG or XPM bytes), scaled to width by height.
-  /// False when the bytes are no image; nothing is drawn then.
+  /// Draws an icon's image, in any format that desktops know (PNG, SVG or XPM bytes), scaled to width by
+  /// height. False when the bytes are no image; nothing is drawn then.
   virtual bool DrawIconEx(PictureBox& box, int x, int y, const std::vector<std::uint8_t>& image, int width,
                           int height) = 0;
   /// What the box holds now, drawings included.

@@ -12,7 +12,17 @@ namespace {
 
 constexpr const char* kUtf16 = std::endian::native == std::endian::little ? "UTF-16LE" : "UTF-16BE";
 
-/// The page as two tables, asked of iconv once: the page has 256 places, and a table look-up has no state to share.
+/// Where the system puts the places that the page leaves unassigned, so that they survive the way there and
+/// back: below 0xA0 the control characters of the same number, 0xCA a point, the others in the private area.
+char16_t UnassignedUnit(unsigned char place) {
+  if (place == 0xCA) return u'\u05BA';
+  if (place >= 0xD9 && place <= 0xDF) return static_cast<char16_t>(0xF88D + (place - 0xD9));
+  if (place == 0xFB || place == 0xFC) return static_cast<char16_t>(0xF894 + (place - 0xFB));
+  return place == 0xFF ? u'\uF896' : static_cast<char16_t>(place);
+}
+
+/// The page as two tables, asked of iconv once: the page has 256 places, and a table look-up has no state to
+/// share.
 class CodePage {
  public:
   CodePage() {
@@ -32,7 +42,8 @@ class CodePage {
 
  private:
   void Learn(iconv_t converter, char byte) {
-    // Without composing: a letter and the point behind it stay two code units, as in the system's own conversion.
+    // Without composing: a letter and the point behind it stay two code units, as in the system's own
+    // conversion.
     iconv(converter, nullptr, nullptr, nullptr, nullptr);
     char* in = &byte;
     std::size_t inLeft = 1;
@@ -41,9 +52,8 @@ class CodePage {
     std::size_t outLeft = sizeof unit;
     const bool known = iconv(converter, &in, &inLeft, &out, &outLeft) != static_cast<std::size_t>(-1);
     if (known) iconv(converter, nullptr, nullptr, &out, &outLeft);
-    // The system maps the page's unassigned places to the control characters of the same number.
     const auto index = static_cast<unsigned char>(byte);
-    unitOf_[index] = known ? unit : static_cast<char16_t>(index);
+    unitOf_[index] = known ? unit : UnassignedUnit(index);
     byteOf_[unitOf_[index]] = byte;
   }
 

@@ -6,7 +6,6 @@
 #include <array>
 #include <charconv>
 #include <cmath>
-#include <cstdio>
 
 namespace quendra {
 
@@ -15,23 +14,26 @@ namespace {
 /// 15 significant digits, which is what a double's decimal form has to the formats.
 struct Decimal {
   bool negative = false;
-  std::string digits;  ///< without a point, no leading zeros save a single "0"
-  int pointAt = 0;     ///< digits before the point; may be negative or beyond the digits
+  std::string digits; ///< without a point, no leading zeros save a single "0"
+  int pointAt = 0;    ///< digits before the point; may be negative or beyond the digits
 };
 
 Decimal DecimalOf(double value) {
+  // Not printf: its point is the locale's.
   std::array<char, 40> buffer{};
-  std::snprintf(buffer.data(), buffer.size(), "%.14e", std::fabs(value));
+  const auto written = std::to_chars(buffer.data(), buffer.data() + buffer.size(), std::fabs(value),
+                                     std::chars_format::scientific, 14);
   Decimal decimal;
   decimal.negative = std::signbit(value) && value != 0;
-  const std::string text(buffer.data());
+  const std::string text(buffer.data(), written.ptr);
   const auto exponentAt = text.find('e');
   decimal.digits = text.substr(0, 1) + text.substr(2, exponentAt - 2);
   decimal.pointAt = std::stoi(text.substr(exponentAt + 1)) + 1;
   return decimal;
 }
 
-/// Rounds to `places` behind the point, half away from zero; gives the digits up to there, at least one before them.
+/// Rounds to `places` behind the point, half away from zero; gives the digits up to there, at least one
+/// before them.
 std::string RoundedDigits(const Decimal& decimal, int places) {
   std::string digits(static_cast<std::size_t>(std::max(0, -decimal.pointAt)) + 1, '0');
   digits += decimal.digits;
@@ -76,7 +78,8 @@ double NumberOf(TextView text) {
   const TextView trimmed = Trimmed(text);
   std::string bytes;
   for (const char16_t unit : trimmed) bytes.push_back(unit < 0x80 ? static_cast<char>(unit) : '?');
-  const char* first = bytes.c_str() + (bytes.starts_with('+') ? 1 : 0);
+  const bool plus = bytes.starts_with('+') && !bytes.starts_with("+-");
+  const char* first = bytes.c_str() + (plus ? 1 : 0);
   const char* last = bytes.c_str() + bytes.size();
   double value = 0;
   const auto [end, error] = std::from_chars(first, last, value);
@@ -87,8 +90,11 @@ double NumberOf(TextView text) {
 
 Text NumberText(double value) {
   std::array<char, 40> buffer{};
-  const int length = std::snprintf(buffer.data(), buffer.size(), "%.15G", value);
-  return Text(buffer.begin(), buffer.begin() + length);
+  const auto written =
+      std::to_chars(buffer.data(), buffer.data() + buffer.size(), value, std::chars_format::general, 15);
+  Text text(buffer.data(), written.ptr);
+  std::replace(text.begin(), text.end(), u'e', u'E');
+  return text;
 }
 
 } // namespace quendra
