@@ -10,8 +10,9 @@ constexpr char16_t kReplacement = u'\uFFFD';
 constexpr char16_t kEllipsis = u'\u2026';
 
 bool ChangesDirectionOrHides(char16_t unit) {
-  return unit == u'\u00AD' || unit == u'\u061C' || unit == u'\uFEFF' || (unit >= u'\u200B' && unit <= u'\u200F') ||
-         (unit >= u'\u2028' && unit <= u'\u202E') || (unit >= u'\u2060' && unit <= u'\u206F');
+  return unit == u'\u00AD' || unit == u'\u061C' || unit == u'\uFEFF' ||
+         (unit >= u'\u200B' && unit <= u'\u200F') || (unit >= u'\u2028' && unit <= u'\u202E') ||
+         (unit >= u'\u2060' && unit <= u'\u206F');
 }
 
 char16_t VisibleUnit(char16_t unit) {
@@ -38,7 +39,8 @@ QString VisibleText(TextView text, LineBreaks lineBreaks, qsizetype limit) {
   visible.reserve(static_cast<qsizetype>(text.size()) + 1);
   for (std::size_t i = 0; i < text.size(); ++i) {
     const char16_t unit = text[i];
-    const bool pair = QChar::isHighSurrogate(unit) && i + 1 < text.size() && QChar::isLowSurrogate(text[i + 1]);
+    const bool pair =
+        QChar::isHighSurrogate(unit) && i + 1 < text.size() && QChar::isLowSurrogate(text[i + 1]);
     if (pair) {
       visible.append(QChar(unit)).append(QChar(text[++i]));
     } else if (QChar::isSurrogate(unit)) {

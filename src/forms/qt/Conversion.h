@@ -23,13 +23,16 @@ QFont ToQFont(const Font& font);
 
 enum class LineBreaks { Keep, Show };
 
-/// The text as it can be shown without harm: control characters, direction marks and broken code units become visible
-/// signs, and what goes beyond `limit` code units is cut with an ellipsis. Line breaks stay or are made visible too.
+/// The text as it can be shown without harm: control characters, direction marks and broken code units become
+/// visible signs, and what goes beyond `limit` code units is cut with an ellipsis. Line breaks stay or are
+/// made visible too.
 QString VisibleText(TextView text, LineBreaks lineBreaks = LineBreaks::Show, qsizetype limit = 1024);
 
-/// Right to left for a text that holds Hebrew, left to right for any other: addresses, paths and names keep their order.
+/// Right to left for a text that holds Hebrew, left to right for any other: addresses, paths and names keep
+/// their order.
 Qt::LayoutDirection DirectionOf(QStringView text);
-/// The text set apart from its surroundings when it reads from left to right, for widgets that lay out by themselves.
+/// The text set apart from its surroundings when it reads from left to right, for widgets that lay out by
+/// themselves.
 QString Isolated(const QString& text);
 
 /// The side that an alignment means in a form that reads in this direction.

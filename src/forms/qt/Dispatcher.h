@@ -9,9 +9,9 @@
 
 namespace quendra::forms::qt {
 
-/// The one gate through which the toolkit's events enter handlers. No exception leaves it: the toolkit's frames between
-/// a handler and the loop cannot be unwound. The end of the program is marked here, and whoever pumps messages further
-/// down the stack asks for the mark and goes on unwinding.
+/// The one gate through which the toolkit's events enter handlers. No exception leaves it: the toolkit's
+/// frames between a handler and the loop cannot be unwound. The end of the program is marked here, and
+/// whoever pumps messages further down the stack asks for the mark and goes on unwinding.
 class Dispatcher {
  public:
   /// Shows the text of a fault that nobody trapped.

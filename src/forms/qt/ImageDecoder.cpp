@@ -15,15 +15,16 @@ bool IsKnownFormat(const QByteArray& format) {
 }
 
 bool IsSane(QSize size) {
-  return size.width() > 0 && size.height() > 0 && size.width() <= kLargestSide && size.height() <= kLargestSide;
+  return size.width() > 0 && size.height() > 0 && size.width() <= kLargestSide &&
+         size.height() <= kLargestSide;
 }
 
 } // namespace
 
 QImage DecodeIcon(const std::vector<std::uint8_t>& bytes, QSize bounds) {
   if (bytes.empty() || bytes.size() > kMostBytes || !IsSane(bounds)) return {};
-  QByteArray data =
-      QByteArray::fromRawData(reinterpret_cast<const char*>(bytes.data()), static_cast<qsizetype>(bytes.size()));
+  QByteArray data = QByteArray::fromRawData(reinterpret_cast<const char*>(bytes.data()),
+                                            static_cast<qsizetype>(bytes.size()));
   QBuffer buffer(&data);
   buffer.open(QIODevice::ReadOnly);
   QImageReader reader(&buffer);

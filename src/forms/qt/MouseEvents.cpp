@@ -13,8 +13,8 @@ int ButtonOf(Qt::MouseButtons buttons) {
 }
 
 bool IsMouseEvent(QEvent::Type type) {
-  return type == QEvent::MouseMove || type == QEvent::MouseButtonPress || type == QEvent::MouseButtonRelease ||
-         type == QEvent::MouseButtonDblClick;
+  return type == QEvent::MouseMove || type == QEvent::MouseButtonPress ||
+         type == QEvent::MouseButtonRelease || type == QEvent::MouseButtonDblClick;
 }
 
 } // namespace
@@ -64,10 +64,10 @@ bool MouseEvents::Handle(WidgetView& view, QMouseEvent& event) {
   }
   if (!view.Widget().isEnabled()) return true;
   switch (event.type()) {
-    case QEvent::MouseButtonPress: Pressed(view, event); break;
-    case QEvent::MouseButtonDblClick: DoubleClicked(view, event); break;
-    case QEvent::MouseButtonRelease: Released(view, event); break;
-    default: Moved(view, event); break;
+  case QEvent::MouseButtonPress: Pressed(view, event); break;
+  case QEvent::MouseButtonDblClick: DoubleClicked(view, event); break;
+  case QEvent::MouseButtonRelease: Released(view, event); break;
+  default: Moved(view, event); break;
   }
   return false;
 }
@@ -78,7 +78,8 @@ void MouseEvents::Raise(WidgetView& view, const Event<int, int, int, int>& raise
   const double x = event.position().x();
   const double fromLeading = view.ReadsFromRightToLeft() ? view.Widget().width() - x : x;
   dispatcher_.Dispatch([&] {
-    raised(button, ShiftStateOf(event.modifiers()), scale_.TwipsX(fromLeading), scale_.TwipsY(event.position().y()));
+    raised(button, ShiftStateOf(event.modifiers()), scale_.TwipsX(fromLeading),
+           scale_.TwipsY(event.position().y()));
   });
 }
 

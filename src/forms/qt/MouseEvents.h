@@ -13,7 +13,8 @@ namespace quendra::forms::qt {
 /// State of the modifier keys as handlers get it, a sum of ShiftState.
 int ShiftStateOf(Qt::KeyboardModifiers modifiers);
 
-/// Turns the toolkit's mouse events into those of the controls, holds the cursor that handlers set, and drags windows.
+/// Turns the toolkit's mouse events into those of the controls, holds the cursor that handlers set, and drags
+/// windows.
 class MouseEvents : public QObject {
  public:
   MouseEvents(Dispatcher& dispatcher, const Scale& scale) : dispatcher_(dispatcher), scale_(scale) {}
@@ -22,8 +23,8 @@ class MouseEvents : public QObject {
   void Watch(QWidget& widget, WidgetView& view);
   void Forget(const WidgetView& view);
 
-  /// Sets the cursor over the control whose event is being handled, else over the one under the mouse. It stays until
-  /// the mouse moves over a control whose handler sets none.
+  /// Sets the cursor over the control whose event is being handled, else over the one under the mouse. It
+  /// stays until the mouse moves over a control whose handler sets none.
   void SetCursor(Qt::CursorShape shape);
   /// The pressed control gets no click any more.
   void ReleaseCapture() { pressed_ = nullptr; }

@@ -7,7 +7,8 @@
 #include <cstdio>
 #include <cstring>
 
-// Resources of a static library register themselves only when somebody asks for them; the name has no namespace.
+// Resources of a static library register themselves only when somebody asks for them; the name has no
+// namespace.
 static void RegisterArtwork() { Q_INIT_RESOURCE(artwork); }
 
 namespace quendra::forms::qt {

@@ -35,7 +35,8 @@ void QtEventLoop::Post(std::function<void()> work) {
     const std::scoped_lock lock(mutex_);
     queue_.push_back(std::move(work));
   }
-  // One event for each piece of work: the toolkit keeps their order and gives other events their turn between pumps.
+  // One event for each piece of work: the toolkit keeps their order and gives other events their turn between
+  // pumps.
   posted_.store(true, std::memory_order_relaxed);
   QCoreApplication::postEvent(this, new QEvent(QEvent::User));
 }

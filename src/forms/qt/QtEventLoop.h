@@ -18,14 +18,16 @@ class QtEventLoop : public QObject {
   explicit QtEventLoop(Dispatcher& dispatcher) : dispatcher_(dispatcher) {}
 
   void Post(std::function<void()> work);
-  std::unique_ptr<platform::EventLoop::Subscription> WatchDescriptor(int descriptor, std::function<void()> ready);
+  std::unique_ptr<platform::EventLoop::Subscription> WatchDescriptor(int descriptor,
+                                                                     std::function<void()> ready);
   std::unique_ptr<platform::EventLoop::Subscription> StartTimer(int milliseconds, std::function<void()> tick);
   void PumpOnce();
 
-  /// PumpOnce when that can matter. Handlers yield after every captured frame, some hundred thousand times a second,
-  /// while asking the toolkit costs microseconds even when nothing waits. So work posted from within the program is
-  /// seen by a flag, and what comes from outside (the user, descriptors, timers) is looked for when the kernel's coarse
-  /// clock has moved on, every few milliseconds: reading that clock costs some nanoseconds, and nobody sees the delay.
+  /// PumpOnce when that can matter. Handlers yield after every captured frame, some hundred thousand times a
+  /// second, while asking the toolkit costs microseconds even when nothing waits. So work posted from within
+  /// the program is seen by a flag, and what comes from outside (the user, descriptors, timers) is looked for
+  /// when the kernel's coarse clock has moved on, every few milliseconds: reading that clock costs some
+  /// nanoseconds, and nobody sees the delay.
   void PumpIfDue() {
     if (!posted_.load(std::memory_order_relaxed) && CoarseNow() == lastPump_) return;
     PumpOnce();

@@ -15,8 +15,12 @@ WidgetView::WidgetView(ViewContext& context, Control& control, QWidget& widget)
 
 void WidgetView::Release() {
   if (!control_) return;
-  context_.mouse.Forget(*this);
   control_->Attach(nullptr);
+  ControlGone();
+}
+
+void WidgetView::ControlGone() {
+  context_.mouse.Forget(*this);
   control_ = nullptr;
 }
 

@@ -36,6 +36,7 @@ class WidgetView : public View {
 
   void Changed(Aspect aspect) override;
   void Release() override;
+  void ControlGone() override;
 
   /// nullptr once released.
   Control* TheControl() const { return control_; }

@@ -1,0 +1,128 @@
+#include "forms/qt/FormView.h"
+
+#include "forms/qt/FrameView.h"
+#include "forms/qt/ViewFactory.h"
+
+#include <QCloseEvent>
+#include <QEventLoop>
+#include <QGuiApplication>
+#include <QPointer>
+#include <QScreen>
+#include <QWindow>
+
+namespace quendra::forms::qt {
+
+namespace {
+
+Qt::WindowFlags WindowFlagsOf(const Form& form) {
+  if (form.Border == BorderStyle::None) return Qt::Window | Qt::FramelessWindowHint;
+  Qt::WindowFlags flags = Qt::Window | Qt::CustomizeWindowHint | Qt::WindowTitleHint |
+                          Qt::WindowSystemMenuHint | Qt::WindowCloseButtonHint;
+  if (form.Border == BorderStyle::FixedDialog) return flags;
+  if (form.MinimizeBox) flags |= Qt::WindowMinimizeButtonHint;
+  if (form.MaximizeBox) flags |= Qt::WindowMaximizeButtonHint;
+  return flags;
+}
+
+} // namespace
+
+FormView::FormView(ViewContext& context, Form& form, WindowHandle handle)
+    : QWidget(nullptr, WindowFlagsOf(form)), WidgetView(context, form, *this), handle_(handle) {
+  setLayoutDirection(form.RightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
+  setAutoFillBackground(true);
+  AddViews(form, *this);
+}
+
+FormView::~FormView() = default;
+
+void FormView::AddViews(const Container& container, QWidget& parent) {
+  for (Control* child : container.Children()) {
+    const MadeView made = MakeView(Context(), *child, parent);
+    if (!made.view) continue;
+    views_.push_back(made.view);
+    if (!made.widget) ownedViews_.emplace_back(made.view);
+    child->Attach(made.view);
+    if (const auto* inner = dynamic_cast<const Container*>(child)) AddViews(*inner, *made.widget);
+  }
+}
+
+void FormView::Release() {
+  if (!TheControl()) return;
+  for (View* view : views_) view->Release();
+  WidgetView::Release();
+  if (modalLoop_) modalLoop_->quit();
+  hide();
+}
+
+void FormView::Apply(Aspect aspect) {
+  if (Concerns(aspect, Aspect::Caption)) setWindowTitle(VisibleText(TheForm()->Caption()));
+  if (Concerns(aspect, Aspect::Colours)) {
+    QPalette colours = palette();
+    colours.setColor(QPalette::Window, ToQColor(TheForm()->BackColour()));
+    setPalette(colours);
+  }
+  if (aspect == Aspect::Geometry) PlaceChildren(*TheForm());
+}
+
+void FormView::Place() {
+  const Geometry place = TheForm()->Position();
+  const QSize size(Context().scale.PixelsX(place.width), Context().scale.PixelsY(place.height));
+  if (TheForm()->Border == BorderStyle::Sizable)
+    resize(size);
+  else
+    setFixedSize(size);
+}
+
+// Showing is the desktop's, which knows how and over what; hiding is the form's own.
+void FormView::Show() {
+  if (TheForm()->Visible()) return;
+  hide();
+  if (modalLoop_) modalLoop_->quit();
+}
+
+QString FormView::AccessibleName() const { return VisibleText(TheForm()->Caption()); }
+
+void FormView::ShowOver(const QWidget* owner) {
+  if (!std::exchange(wasPlaced_, true)) {
+    const QRect around =
+        owner ? owner->frameGeometry() : QGuiApplication::primaryScreen()->availableGeometry();
+    move(around.center() - rect().center());
+  }
+  show();
+  raise();
+  activateWindow();
+}
+
+void FormView::RunModal(QWidget* owner) {
+  setWindowModality(Qt::ApplicationModal);
+  QEventLoop loop;
+  modalLoop_ = &loop;
+  ShowOver(owner);
+  if (owner && windowHandle()) windowHandle()->setTransientParent(owner->windowHandle());
+  const QPointer<FormView> self(this);
+  // Coming up may have run a handler that was done with the form at once.
+  if (TheForm() && TheForm()->Visible() && !Context().dispatcher.Ended()) loop.exec();
+  if (!self) return;
+  modalLoop_ = nullptr;
+  setWindowModality(Qt::NonModal);
+}
+
+void FormView::changeEvent(QEvent* event) {
+  QWidget::changeEvent(event);
+  if (event->type() != QEvent::ActivationChange || !TheForm()) return;
+  Context().dispatcher.Dispatch([this] {
+    if (isActiveWindow())
+      TheForm()->Form_Activate();
+    else
+      TheForm()->Form_Deactivate();
+  });
+}
+
+void FormView::closeEvent(QCloseEvent* event) {
+  event->ignore();
+  Context().dispatcher.Dispatch([this] {
+    if (TheForm()) Context().desktop.Unload(*TheForm());
+  });
+}
+
+} // namespace quendra::forms::qt

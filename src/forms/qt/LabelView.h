@@ -1,0 +1,34 @@
+#pragma once
+
+#include "forms/qt/WidgetView.h"
+
+namespace quendra::forms::qt {
+
+class LabelView : public QWidget, public WidgetView {
+ public:
+  LabelView(ViewContext& context, Label& label, QWidget* parent);
+
+  /// A label with a Click handler is a button.
+  bool IsButton() const;
+  QAccessible::Role Role() const override {
+    return IsButton() ? QAccessible::Button : QAccessible::StaticText;
+  }
+
+ protected:
+  void Apply(Aspect aspect) override;
+  QString AccessibleName() const override;
+
+  bool event(QEvent* event) override;
+  void keyPressEvent(QKeyEvent* event) override;
+  void paintEvent(QPaintEvent* event) override;
+
+ private:
+  const Label* TheLabel() const { return static_cast<const Label*>(TheControl()); }
+  void PaintFace(QPainter& painter) const;
+  void PaintText(QPainter& painter) const;
+  void PaintFocus(QPainter& painter) const;
+  QColor InkColour() const;
+  bool IsHeldDown() const;
+};
+
+} // namespace quendra::forms::qt

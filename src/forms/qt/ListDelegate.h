@@ -1,0 +1,28 @@
+#pragma once
+
+#include "forms/qt/ListModel.h"
+
+#include <QStyledItemDelegate>
+
+namespace quendra::forms::qt {
+
+/// Draws the cells. By hand, as every cell chooses its own reading direction and all are drawn anew each
+/// second.
+class ListDelegate : public QStyledItemDelegate {
+ public:
+  ListDelegate(const ListModel& model, bool rightToLeft, QObject* parent)
+      : QStyledItemDelegate(parent), model_(model), rightToLeft_(rightToLeft) {}
+
+  void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+  QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+
+  static int RowHeight(const QFontMetrics& metrics);
+
+ private:
+  QRect DrawIcon(QPainter& painter, const QRect& room, const ListRow& row) const;
+
+  const ListModel& model_;
+  bool rightToLeft_;
+};
+
+} // namespace quendra::forms::qt

@@ -1,0 +1,43 @@
+#pragma once
+
+#include "forms/ListView.h"
+#include "forms/qt/ListModel.h"
+#include "forms/qt/WidgetView.h"
+
+#include <QTreeView>
+
+namespace quendra::forms::qt {
+
+class ListViewView : public QTreeView, public WidgetView, public ListViewObserver {
+ public:
+  ListViewView(ViewContext& context, ListView& list, QWidget* parent);
+
+  bool TakesMouse() const override { return false; }
+  void Release() override;
+  void ControlGone() override;
+
+  void RowAdded(int index) override;
+  void RowRemoved(int index) override;
+  void RowChanged(int index, int cell) override;
+  void RowsMoved() override;
+  void RowsCleared() override;
+  void ColumnsChanged() override;
+
+ protected:
+  void Apply(Aspect aspect) override;
+  void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
+  void keyPressEvent(QKeyEvent* event) override;
+
+ private:
+  ListView& List() const { return static_cast<ListView&>(*TheControl()); }
+  /// Changes the model without taking the toolkit's own moves of the selection for the user's.
+  template <typename Change> void Quietly(Change change);
+  void SizeColumns();
+  void ShowSelection();
+  void HeaderClicked(int section);
+
+  ListModel model_;
+  bool quiet_ = false;
+};
+
+} // namespace quendra::forms::qt

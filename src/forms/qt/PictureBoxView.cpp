@@ -1,0 +1,50 @@
+#include "forms/qt/PictureBoxView.h"
+
+#include "forms/qt/FrameView.h"
+#include "forms/qt/ImageView.h"
+#include "forms/qt/Palette.h"
+
+#include <QPainter>
+
+namespace quendra::forms::qt {
+
+PictureBoxView::PictureBoxView(ViewContext& context, PictureBox& box, QWidget* parent)
+    : QWidget(parent), WidgetView(context, box, *this) {
+  setAttribute(Qt::WA_OpaquePaintEvent);
+}
+
+QSize PictureBoxView::SurfaceSize() const {
+  return (QSizeF(size()) * devicePixelRatioF()).toSize().expandedTo({1, 1});
+}
+
+QImage& PictureBoxView::Surface() {
+  if (surface_.isNull()) {
+    surface_ = QImage(SurfaceSize(), QImage::Format_ARGB32_Premultiplied);
+    surface_.setDevicePixelRatio(devicePixelRatioF());
+    surface_.fill(Qt::transparent);
+  }
+  return surface_;
+}
+
+void PictureBoxView::Apply(Aspect aspect) {
+  // A new size or picture drops the drawings, as the ground that they were made for is gone.
+  if (Concerns(aspect, Aspect::Picture) || surface_.size() != SurfaceSize()) ClearSurface();
+  if (Concerns(aspect, Aspect::Geometry)) PlaceChildren(Box());
+}
+
+void PictureBoxView::PaintLayers(QPainter& painter, Ground ground) const {
+  if (ground == Ground::Drawn) painter.fillRect(rect(), ToQColor(Box().BackColour()));
+  DrawStretched(painter, rect(), Context().pictures.PixmapOf(Box().Contents()));
+  if (!surface_.isNull()) painter.drawImage(0, 0, surface_);
+}
+
+void PictureBoxView::paintEvent(QPaintEvent* /*event*/) {
+  QPainter painter(this);
+  if (!TheControl()) return;
+  PaintLayers(painter, Ground::Drawn);
+  if (!Box().Border()) return;
+  painter.setPen(palette::kBorder);
+  painter.drawRect(rect().adjusted(0, 0, -1, -1));
+}
+
+} // namespace quendra::forms::qt

@@ -1,0 +1,154 @@
+#include "forms/qt/QtDesktop.h"
+
+#include "forms/qt/Boxes.h"
+#include "forms/qt/Palette.h"
+#include "forms/qt/Shapes.h"
+
+#include <QImageReader>
+#include <QScreen>
+#include <QWindow>
+
+namespace quendra::forms {
+
+namespace {
+
+constexpr Qt::CursorShape kNoShape = Qt::BlankCursor;
+
+Qt::CursorShape ShapeOf(int cursor) {
+  switch (cursor) {
+  case 32512: return Qt::ArrowCursor;
+  case 32513: return Qt::IBeamCursor;
+  case 32514: return Qt::WaitCursor;
+  case 32649: return Qt::PointingHandCursor;
+  default: return kNoShape;
+  }
+}
+
+std::unique_ptr<QApplication> MakeApplication(int& argc, char** argv) {
+  if (QCoreApplication::instance()) return nullptr;
+  return std::make_unique<QApplication>(argc, argv);
+}
+
+} // namespace
+
+QtDesktop::QtDesktop(int& argc, char** argv)
+    : application_(MakeApplication(argc, argv)), dispatcher_([](const Text& text) {
+        qt::ShowBox(QApplication::activeWindow(), text, kCritical, u"Quendra");
+      }),
+      mouse_(dispatcher_, scale_),
+      keys_(dispatcher_), context_{*this, dispatcher_, scale_, pictures_, mouse_}, drawing_(scale_),
+      loop_(dispatcher_) {
+  qt::DressApplication(*qApp);
+  qt::InstallAccessibility();
+  const QScreen* screen = QGuiApplication::primaryScreen();
+  scale_ = {1440 / screen->logicalDotsPerInchX(), 1440 / screen->logicalDotsPerInchY()};
+  constexpr int kMostImageMegabytes = 32;
+  QImageReader::setAllocationLimit(kMostImageMegabytes);
+  QApplication::setWindowIcon(QIcon(pictures_.PixmapOf(Picture::Artwork("quendra"))));
+  qApp->installEventFilter(&keys_);
+}
+
+QtDesktop::~QtDesktop() {
+  for (const auto& [handle, view] : windows_) delete view;
+  QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+}
+
+int QtDesktop::Run(std::function<void()> start) {
+  if (start) Post(std::move(start));
+  if (!dispatcher_.Ended()) QApplication::exec();
+  while (!windows_.empty()) DestroyView(*windows_.begin()->second->TheForm());
+  return dispatcher_.Status();
+}
+
+void QtDesktop::End(int status) {
+  dispatcher_.Quit(status);
+  throw ProgramEnded{dispatcher_.Status()};
+}
+
+int QtDesktop::MessageBox(const Text& text, int flags, const Text& title) {
+  const int answer = qt::ShowBox(QApplication::activeWindow(), text, flags, title);
+  dispatcher_.UnwindIfEnded();
+  return answer;
+}
+
+CursorHandle QtDesktop::LoadCursor(int id) {
+  return ShapeOf(id) == kNoShape ? 0 : static_cast<CursorHandle>(id);
+}
+
+void QtDesktop::SetCursor(CursorHandle cursor) {
+  const Qt::CursorShape shape = ShapeOf(static_cast<int>(cursor));
+  if (shape != kNoShape) mouse_.SetCursor(shape);
+}
+
+WindowHandle QtDesktop::HandleOf(Form& form) {
+  const qt::FormView* view = ViewOf(form);
+  return view ? view->Handle() : 0;
+}
+
+qt::FormView* QtDesktop::ViewOf(WindowHandle window) const {
+  const auto found = windows_.find(window);
+  return found == windows_.end() ? nullptr : found->second;
+}
+
+std::int32_t QtDesktop::SendMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
+                                    std::uint32_t /*lParam*/) {
+  constexpr std::uint32_t kNonClientLeftButtonDown = 0xA1;
+  constexpr std::uint32_t kCaption = 2;
+  qt::FormView* view = ViewOf(window);
+  if (!view || message != kNonClientLeftButtonDown || wParam != kCaption) return 0;
+  QWindow* native = view->windowHandle();
+  // Without a window manager that moves windows, the desktop moves it itself.
+  if (!native || !native->startSystemMove()) mouse_.DragWindow(*view);
+  return 0;
+}
+
+RegionHandle QtDesktop::CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
+                                           int ellipseHeight) {
+  regions_[++lastRegion_] = qt::RoundedRegion(left, top, right, bottom, ellipseWidth, ellipseHeight);
+  return lastRegion_;
+}
+
+void QtDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) {
+  qt::FormView* view = ViewOf(window);
+  if (!view) return;
+  // A window owns the region that it was given, so the handle ends here; none takes the shape away.
+  const auto found = regions_.extract(region);
+  if (found)
+    view->setMask(found.mapped());
+  else
+    view->clearMask();
+  if (redraw) view->update();
+}
+
+void QtDesktop::CreateView(Form& form) {
+  auto* view = new qt::FormView(context_, form, ++lastWindow_);
+  windows_[view->Handle()] = view;
+  form.Attach(view);
+}
+
+void QtDesktop::DestroyView(Form& form) {
+  qt::FormView* view = ViewOf(form);
+  if (!view) return;
+  windows_.erase(view->Handle());
+  view->Release();
+  // Later: an event of this window may be what led here.
+  view->deleteLater();
+}
+
+void QtDesktop::ShowView(Form& form, Modality modality, Form* owner) {
+  qt::FormView* view = ViewOf(form);
+  if (!view) return;
+  QWidget* over = owner ? ViewOf(*owner) : nullptr;
+  if (modality == Modality::Modeless) return view->ShowOver(over);
+  view->RunModal(over);
+  dispatcher_.UnwindIfEnded();
+}
+
+// Behind what the handler does next: a program that shows another form at once goes on.
+void QtDesktop::LastFormGone() {
+  Post([this] {
+    if (windows_.empty()) dispatcher_.Quit(0);
+  });
+}
+
+} // namespace quendra::forms

@@ -1,0 +1,104 @@
+#pragma once
+
+#include "forms/Desktop.h"
+#include "forms/qt/FormView.h"
+#include "forms/qt/KeyEvents.h"
+#include "forms/qt/MouseEvents.h"
+#include "forms/qt/QtDrawing.h"
+#include "forms/qt/QtEventLoop.h"
+
+#include <QApplication>
+#include <QRegion>
+
+#include <map>
+
+namespace quendra::forms {
+
+/// The desktop of the Linux edition. Its window toolkit is Qt 6 Widgets.
+class QtDesktop : public Desktop, public platform::EventLoop {
+ public:
+  /// Makes the toolkit's application object where the process has none yet. `argc` must outlive the desktop.
+  QtDesktop(int& argc, char** argv);
+  ~QtDesktop() override;
+
+  /// Runs `start` as the first handler and then the loop, until the last form has gone or the program ends.
+  /// Gives the exit status. The forms must still be alive; their views go before this returns.
+  int Run(std::function<void()> start = {});
+
+  [[noreturn]] void End(int status = 0) override;
+  int MessageBox(const Text& text, int flags, const Text& title) override;
+  void DoEvents() override { loop_.PumpIfDue(); }
+
+  CursorHandle LoadCursor(int id) override;
+  void SetCursor(CursorHandle cursor) override;
+  WindowHandle HandleOf(Form& form) override;
+  void ReleaseCapture() override { mouse_.ReleaseCapture(); }
+  std::int32_t SendMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
+                           std::uint32_t lParam) override;
+  double TwipsPerPixelX() const override { return scale_.twipsPerPixelX; }
+  double TwipsPerPixelY() const override { return scale_.twipsPerPixelY; }
+  RegionHandle CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
+                                  int ellipseHeight) override;
+  void SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) override;
+
+  int ScaleWidth(const PictureBox& box) const override { return drawing_.ScaleWidth(box); }
+  int ScaleHeight(const PictureBox& box) const override { return drawing_.ScaleHeight(box); }
+  int TextWidth(const PictureBox& box, TextView text) const override { return drawing_.TextWidth(box, text); }
+  int TextHeight(const PictureBox& box, TextView text) const override {
+    return drawing_.TextHeight(box, text);
+  }
+  void Cls(PictureBox& box) override { drawing_.Cls(box); }
+  void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) override {
+    drawing_.FillBox(box, x1, y1, x2, y2, colour);
+  }
+  void Print(PictureBox& box, TextView text) override { drawing_.Print(box, text); }
+  void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
+              int sourceY) override {
+    drawing_.BitBlt(target, x, y, width, height, source, sourceX, sourceY);
+  }
+  void Refresh(PictureBox& box) override { drawing_.Refresh(box); }
+  bool DrawIconEx(PictureBox& box, int x, int y, const std::vector<std::uint8_t>& image, int width,
+                  int height) override {
+    return drawing_.DrawIconEx(box, x, y, image, width, height);
+  }
+  Picture ImageOf(const PictureBox& box) const override { return drawing_.ImageOf(box); }
+
+  void Post(std::function<void()> work) override { loop_.Post(std::move(work)); }
+  std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override {
+    return loop_.WatchDescriptor(descriptor, std::move(ready));
+  }
+  std::unique_ptr<Subscription> StartTimer(int milliseconds, std::function<void()> tick) override {
+    return loop_.StartTimer(milliseconds, std::move(tick));
+  }
+  void PumpOnce() override { loop_.PumpOnce(); }
+
+  /// Whether the program has ended, and with which status.
+  bool Ended() const { return dispatcher_.Ended(); }
+  int Status() const { return dispatcher_.Status(); }
+
+ protected:
+  void CreateView(Form& form) override;
+  void DestroyView(Form& form) override;
+  void ShowView(Form& form, Modality modality, Form* owner) override;
+  void LastFormGone() override;
+
+ private:
+  qt::FormView* ViewOf(WindowHandle window) const;
+  static qt::FormView* ViewOf(const Form& form) { return static_cast<qt::FormView*>(form.View()); }
+
+  std::unique_ptr<QApplication> application_;
+  qt::Dispatcher dispatcher_;
+  qt::Scale scale_;
+  qt::PictureStore pictures_;
+  qt::MouseEvents mouse_;
+  qt::KeyEvents keys_;
+  qt::ViewContext context_;
+  qt::QtDrawing drawing_;
+  qt::QtEventLoop loop_;
+  std::map<WindowHandle, qt::FormView*> windows_;
+  WindowHandle lastWindow_ = 0;
+  std::map<RegionHandle, QRegion> regions_;
+  RegionHandle lastRegion_ = 0;
+};
+
+} // namespace quendra::forms

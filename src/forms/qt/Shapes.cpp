@@ -1,0 +1,22 @@
+#include "forms/qt/Shapes.h"
+
+#include <algorithm>
+
+namespace quendra::forms::qt {
+
+QRegion RoundedRegion(int left, int top, int right, int bottom, int ellipseWidth, int ellipseHeight) {
+  const QRect box(QPoint(std::min(left, right), std::min(top, bottom)),
+                  QPoint(std::max(left, right) - 1, std::max(top, bottom) - 1));
+  const int width = std::clamp(ellipseWidth, 0, box.width());
+  const int height = std::clamp(ellipseHeight, 0, box.height());
+  if (box.isEmpty() || width == 0 || height == 0) return box;
+  QRegion region(box.adjusted(width / 2, 0, -(width / 2), 0));
+  region += box.adjusted(0, height / 2, 0, -(height / 2));
+  const QRect ellipse(0, 0, width, height);
+  for (const int x : {box.left(), box.right() + 1 - width})
+    for (const int y : {box.top(), box.bottom() + 1 - height})
+      region += QRegion(ellipse.translated(x, y), QRegion::Ellipse);
+  return region;
+}
+
+} // namespace quendra::forms::qt
