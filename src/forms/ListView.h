@@ -58,12 +58,12 @@ enum class SortOrder { Ascending, Descending };
 
 /// A row of the columns' table: what stands in the header and how the cells below it are laid out.
 struct ColumnHeader {
-  Text caption;
+  Text caption{};
   int width = 0;  ///< twips
   Alignment alignment = Alignment::Leading;
   int icon = 0;  ///< index in the list of header icons, 0 for none
   /// For header icons: what assistive technology says in place of a caption.
-  Text description;
+  Text description{};
 };
 
 /// What a view of a list is told, besides what every control tells.

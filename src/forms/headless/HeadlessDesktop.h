@@ -25,9 +25,9 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   // What the program showed and asked for.
 
   struct Box {
-    Text text;
+    Text text{};
     int flags = 0;
-    Text title;
+    Text title{};
     friend bool operator==(const Box&, const Box&) = default;
   };
   std::vector<Box> Boxes;

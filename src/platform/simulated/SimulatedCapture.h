@@ -10,9 +10,9 @@ namespace quendra::platform::simulated {
 
 /// An adapter of the capture library; `address` is a dotted text, empty for none.
 struct CaptureAdapter {
-  std::string name;
-  std::string description;
-  std::string address;
+  std::string name{};
+  std::string description{};
+  std::string address{};
 };
 
 /// The capture library and the maker of its controls. Calls of both stand in the machine's Calls, in order,

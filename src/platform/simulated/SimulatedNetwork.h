@@ -15,7 +15,7 @@ namespace quendra::platform::simulated {
 struct SystemHandle {
   std::uint32_t pid = 0;
   std::uint16_t handle = 0;
-  std::u16string deviceName;      ///< such as u"\\Device\\Tcp"; empty for an object without a name
+  std::u16string deviceName{};    ///< such as u"\\Device\\Tcp"; empty for an object without a name
   std::uint16_t port = 0;         ///< what the transport driver answers
   bool duplicable = true;         ///< false: DuplicateHandle fails
   std::uint32_t driverStatus = 0; ///< what the transport driver's query ends with
@@ -55,7 +55,7 @@ class SimulatedHandles : public Handles {
 /// A TCP connection: addresses are dotted texts, ports plain numbers.
 struct Connection {
   std::uint32_t state = 5;
-  std::string localAddress;
+  std::string localAddress{};
   std::uint16_t localPort = 0;
   std::string remoteAddress = "0.0.0.0";
   std::uint16_t remotePort = 0;

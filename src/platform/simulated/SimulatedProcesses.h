@@ -13,8 +13,8 @@ namespace quendra::platform::simulated {
 struct Process {
   std::uint32_t id = 0;
   std::uint32_t parent = 0;
-  std::string name;
-  std::string path;
+  std::string name{};
+  std::string path{};
 };
 
 class SimulatedProcesses : public Processes {
