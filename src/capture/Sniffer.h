@@ -15,7 +15,7 @@ namespace quendra::capture {
 /// What the sniffer makes of one IPv4 packet. Ports are signed words, as in the frame decoders.
 struct SniffedPacket {
   Text protocolName;
-  std::int16_t payloadSize = 0; ///< the packet's length without the headers that its protocol counts
+  std::int32_t payloadSize = 0; ///< the packet's length without the headers that its protocol counts
   std::uint32_t source = 0;     ///< as it lies in memory
   bool tunnelled = false;
   struct Ports {

@@ -2,24 +2,109 @@
 
 #include <cstdint>
 #include <span>
+#include <string>
 
 namespace quendra::platform {
 
 using SocketHandle = std::uint32_t;
+inline constexpr SocketHandle kNoSocket = 0xFFFFFFFF;
+inline constexpr std::int32_t kSocketError = -1;
 
-/// Winsock operations, as far as the program's parts ask for them so far.
+/// Events of WSAAsyncSelect, as its mask and its messages number them.
+enum SocketEvent : std::int32_t { kFdRead = 1, kFdWrite = 2, kFdAccept = 8, kFdConnect = 16, kFdClose = 32 };
+
+/// Error numbers that the program's logic or its backends name; the others pass through.
+enum SocketErrorNumber : std::int32_t {
+  kInvalidArgument = 10022,
+  kWouldBlock = 10035,
+  kNotASocket = 10038,
+  kMessageTooLong = 10040,
+  kFamilyNotSupported = 10047,
+  kAddressNotAvailable = 10049,
+  kNetworkDown = 10091,
+  kHostNotFound = 11001,
+};
+
+/// An IPv4 address as it lies in memory (network order) and a port in host order.
+struct SocketAddress {
+  std::uint32_t address = 0;
+  std::uint16_t port = 0;
+  friend bool operator==(const SocketAddress&, const SocketAddress&) = default;
+};
+
+/// Winsock 1.1 with its notification by window messages. Numbers that fail give kSocketError (or kNoSocket) and leave
+/// the reason for WSAGetLastError. A machine without a network answers as these defaults do.
+///
+/// WSAAsyncSelect makes the socket non-blocking and announces each event of the mask as the message, with the socket as
+/// wParam, the event in the low and an error number in the high word of lParam. An event is announced once until the
+/// call that re-enables it: FD_READ until recv or recvfrom (and again at once while data remains), FD_WRITE after the
+/// connection and after a send that was refused with kWouldBlock, FD_ACCEPT until accept (again while connections
+/// wait), FD_CONNECT once, FD_CLOSE once, after the last data was read. An accepted socket has its listener's selection.
 class Sockets {
  public:
   virtual ~Sockets() = default;
 
-  /// The number of bytes read, 0 at the end of the stream, -1 on failure.
+  /// 0, or the reason itself. `version` is the minor version in the high byte and the major one in the low.
+  virtual std::int32_t WSAStartup(std::uint16_t /*version*/) { return kNetworkDown; }
+  virtual std::int32_t WSACleanup() = 0;
+  virtual std::int32_t WSAGetLastError() { return kNetworkDown; }
+
+  virtual SocketHandle socket(std::int32_t /*family*/, std::int32_t /*type*/, std::int32_t /*protocol*/) {
+    return kNoSocket;
+  }
+  virtual std::int32_t closesocket(SocketHandle socket) = 0;
+  virtual std::int32_t bind(SocketHandle, const SocketAddress&) { return kSocketError; }
+  virtual std::int32_t listen(SocketHandle, std::int32_t /*backlog*/) { return kSocketError; }
+  virtual SocketHandle accept(SocketHandle) { return kNoSocket; }
+  virtual std::int32_t connect(SocketHandle, const SocketAddress&) { return kSocketError; }
+  virtual std::int32_t getsockname(SocketHandle, SocketAddress&) { return kSocketError; }
+  virtual std::int32_t getpeername(SocketHandle, SocketAddress&) { return kSocketError; }
+  virtual std::int32_t getsockopt(SocketHandle, std::int32_t /*level*/, std::int32_t /*option*/,
+                                  std::int32_t& /*value*/) {
+    return kSocketError;
+  }
+  virtual std::int32_t setsockopt(SocketHandle, std::int32_t /*level*/, std::int32_t /*option*/,
+                                  std::int32_t /*value*/) {
+    return kSocketError;
+  }
+  /// Command 0x4004667F (FIONREAD): the bytes of the stream, or of the next datagram, that wait.
+  virtual std::int32_t ioctlsocket(SocketHandle, std::uint32_t /*command*/, std::uint32_t& /*value*/) {
+    return kSocketError;
+  }
+
+  /// The number of bytes taken by the system.
+  virtual std::int32_t send(SocketHandle, std::span<const std::uint8_t> /*bytes*/, std::int32_t /*flags*/) {
+    return kSocketError;
+  }
+  virtual std::int32_t sendto(SocketHandle, std::span<const std::uint8_t> /*bytes*/, std::int32_t /*flags*/,
+                              const SocketAddress&) {
+    return kSocketError;
+  }
+  /// The number of bytes read, 0 at the end of the stream. Flag 2 peeks.
   virtual std::int32_t recv(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags) = 0;
+  /// A datagram longer than the buffer fills it and fails with kMessageTooLong.
+  virtual std::int32_t recvfrom(SocketHandle, std::span<std::uint8_t> /*buffer*/, std::int32_t /*flags*/,
+                                SocketAddress& /*from*/) {
+    return kSocketError;
+  }
+
   virtual std::int32_t WSAAsyncSelect(SocketHandle socket, std::uint32_t window, std::uint32_t message,
                                       std::int32_t events) = 0;
-  virtual std::int32_t closesocket(SocketHandle socket) = 0;
+  /// Starts a look-up and gives its handle, 0 on failure. When it ends the window gets the message with the handle as
+  /// wParam and an error number in the high word of lParam; without an error `buffer` starts with the count of the
+  /// name's addresses (32 bits, host order) and the addresses as they lie in memory.
+  virtual std::uint32_t WSAAsyncGetHostByName(std::uint32_t /*window*/, std::uint32_t /*message*/,
+                                              const std::string& /*name*/, std::span<std::uint8_t> /*buffer*/) {
+    return 0;
+  }
+  /// 0 when the look-up was under way: its message will not come and its buffer is not touched any more.
+  virtual std::int32_t WSACancelAsyncRequest(std::uint32_t /*lookUp*/) { return kSocketError; }
+
   virtual bool WSAIsBlocking() = 0;
   virtual std::int32_t WSACancelBlockingCall() = 0;
-  virtual std::int32_t WSACleanup() = 0;
+
+  /// The address of a dotted text as it lies in memory, 0xFFFFFFFF for any other text.
+  static std::uint32_t inet_addr(const std::string& text);
 };
 
 } // namespace quendra::platform

@@ -44,7 +44,7 @@ void AgreementWrap::Wrap(TextView text, int limit, const TextWidth& textWidth) {
     Store(std::exchange(paragraph.line, {}));
   };
   const auto takeLinesWhileTooWide = [&](Paragraph& paragraph) {
-    while (textWidth(paragraph.rest) > limit) {
+    while (!paragraph.rest.empty() && textWidth(paragraph.rest) > limit) {
       paragraph.MoveOne();
       if (textWidth(paragraph.line) > limit) finish(paragraph);
     }

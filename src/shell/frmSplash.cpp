@@ -1,5 +1,6 @@
 #include "shell/frmSplash.h"
 
+#include "runtime/Integers.h"
 #include "shell/Agreement.h"
 #include "shell/frmMenu.h"
 
@@ -29,6 +30,18 @@ void frmSplash::Form_Load() {
   lines_.Wrap(AgreementText(), desktop_.ScaleWidth(picBuffer) - kSideRoom,
               [this](TextView text) { return desktop_.TextWidth(picBuffer, text); });
   roll_.Hide();
+  PlaceLinkOnItsWord();
+}
+
+/// The warning's last word is the link's caption: where it lies depends on the letters that the system has.
+void frmSplash::PlaceLinkOnItsWord() {
+  const TextView warning = lblWarning.Caption();
+  const TextView before = warning.substr(0, warning.rfind(Label1.Caption()));
+  const double twips = desktop_.TwipsPerPixelX();
+  forms::Geometry place = lblWarning.Position;
+  place.left += RoundToInt32(desktop_.TextWidth(picBuffer, before) * twips);
+  place.width = RoundToInt32(desktop_.TextWidth(picBuffer, Label1.Caption()) * twips);
+  Label1.Position = place;
 }
 
 void frmSplash::Label2_Click() {

@@ -39,6 +39,7 @@ class frmSplash : public forms::Form {
 
  private:
   void Label2_Click();
+  void PlaceLinkOnItsWord();
   void DesignTexts();
   void DesignPictures();
 

@@ -50,6 +50,10 @@ void FormView::Release() {
   if (!TheControl()) return;
   for (View* view : views_) view->Release();
   WidgetView::Release();
+}
+
+void FormView::ControlGone() {
+  WidgetView::ControlGone();
   if (modalLoop_) modalLoop_->quit();
   hide();
 }

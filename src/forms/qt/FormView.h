@@ -15,6 +15,7 @@ class FormView : public QWidget, public WidgetView {
   ~FormView() override;
 
   void Release() override;
+  void ControlGone() override;
   QAccessible::Role Role() const override { return QAccessible::Window; }
 
   Form* TheForm() const { return static_cast<Form*>(TheControl()); }

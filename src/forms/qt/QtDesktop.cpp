@@ -56,7 +56,7 @@ QtDesktop::~QtDesktop() {
 int QtDesktop::Run(std::function<void()> start) {
   if (start) Post(std::move(start));
   if (!dispatcher_.Ended()) QApplication::exec();
-  while (!windows_.empty()) DestroyView(*windows_.begin()->second->TheForm());
+  while (!windows_.empty()) Close(*windows_.begin()->second);
   return dispatcher_.Status();
 }
 
@@ -127,12 +127,14 @@ void QtDesktop::CreateView(Form& form) {
 }
 
 void QtDesktop::DestroyView(Form& form) {
-  qt::FormView* view = ViewOf(form);
-  if (!view) return;
-  windows_.erase(view->Handle());
-  view->Release();
+  if (qt::FormView* view = ViewOf(form)) Close(*view);
+}
+
+void QtDesktop::Close(qt::FormView& view) {
+  windows_.erase(view.Handle());
+  view.Release();
   // Later: an event of this window may be what led here.
-  view->deleteLater();
+  view.deleteLater();
 }
 
 void QtDesktop::ShowView(Form& form, Modality modality, Form* owner) {

@@ -83,6 +83,7 @@ class QtDesktop : public Desktop, public platform::EventLoop {
   void LastFormGone() override;
 
  private:
+  void Close(qt::FormView& view);
   qt::FormView* ViewOf(WindowHandle window) const;
   static qt::FormView* ViewOf(const Form& form) { return static_cast<qt::FormView*>(form.View()); }
 

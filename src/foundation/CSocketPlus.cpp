@@ -1,0 +1,161 @@
+#include "foundation/CSocketPlus.h"
+
+#include "foundation/SocketErrors.h"
+#include "foundation/SocketTexts.h"
+
+#include <algorithm>
+
+namespace quendra::foundation {
+
+namespace {
+
+std::int32_t CheckedPort(const Value& port, const char16_t* source) {
+  if (!IsNumeric(port)) throw Misuse(kUnsupportedType, source);
+  const std::int32_t number = ToInt32(port);
+  if (number < 0 || number > 65535) throw Misuse(kInvalidArgumentFault, source);
+  return number;
+}
+
+} // namespace
+
+CSocketPlus::CSocketPlus(modSocketPlus& module) : module_(module), records_(1) { module_.InitiateProcesses(); }
+
+CSocketPlus::~CSocketPlus() {
+  try {
+    Release();
+  } catch (const Fault&) {
+    // An ending object has nobody to raise it to; who wants to know calls Release.
+  }
+}
+
+void CSocketPlus::Release() {
+  if (std::exchange(released_, true)) return;
+  life_.reset();
+  for (Slot slot = 1; slot < records_.size(); ++slot) {
+    CancelResolves(slot);
+    if (!acceptClass_) DestroySocket(slot);
+  }
+  module_.FinalizeProcesses();
+}
+
+std::int32_t CSocketPlus::WndProc(forms::WindowHandle, std::uint32_t message, std::uint32_t wParam, std::uint32_t lParam) {
+  const auto high = static_cast<std::int32_t>(lParam >> 16);
+  if (message == modSocketPlus::kResolveMessage) PostResolution(wParam, high);
+  if (message == modSocketPlus::kSocketMessage) PostSocket(wParam, static_cast<std::int32_t>(lParam & 0xFFFF), high);
+  return 0;
+}
+
+std::int32_t CSocketPlus::RemotePort(const Value& index) { return At(GetSocketIndex(index)).RemotePort; }
+
+void CSocketPlus::SetRemotePort(const Value& index, const Value& port) {
+  constexpr auto kSource = u"CSocketPlus.RemotePort";
+  SocketRecord& record = At(GetSocketIndex(index));
+  if (record.Protocol == sckTCPProtocol && record.State != sckClosed) throw Misuse(kInvalidAtCurrentState, kSource);
+  record.RemotePort = CheckedPort(port, kSource);
+}
+
+Text CSocketPlus::RemoteHost(const Value& index) { return At(GetSocketIndex(index)).RemoteHost; }
+
+void CSocketPlus::SetRemoteHost(const Value& index, const Text& host) {
+  SocketRecord& record = At(GetSocketIndex(index));
+  if (record.Protocol == sckTCPProtocol && record.State != sckClosed)
+    throw Misuse(kInvalidAtCurrentState, u"CSocketPlus.RemoteHost");
+  record.RemoteHost = host;
+}
+
+Text CSocketPlus::RemoteHostIP(const Value& index) { return At(GetSocketIndex(index)).RemoteHostIP; }
+
+std::int32_t CSocketPlus::LocalPort(const Value& index) {
+  const SocketRecord& record = At(GetSocketIndex(index));
+  return record.LocalPortBind != 0 ? record.LocalPortBind : record.LocalPort;
+}
+
+void CSocketPlus::SetLocalPort(const Value& index, const Value& port) {
+  constexpr auto kSource = u"CSocketPlus.LocalPort";
+  SocketRecord& record = At(GetSocketIndex(index));
+  if (record.State != sckClosed) throw Misuse(kInvalidAtCurrentState, kSource);
+  record.LocalPort = CheckedPort(port, kSource);
+}
+
+SocketState CSocketPlus::State(const Value& index) { return At(GetSocketIndex(index)).State; }
+
+Text CSocketPlus::LocalHostName() {
+  const auto name = module_.Names().gethostname();
+  if (!name) throw SystemError(module_.Library().WSAGetLastError(), u"CSocketPlus.GetLocalHostName");
+  return FromCodePage(CutAtNul(std::string_view(*name).substr(0, 256)));
+}
+
+Text CSocketPlus::LocalIP(const Value& index) {
+  const SocketRecord& record = At(GetSocketIndex(index));
+  if (record.State == sckConnected) return record.LocalIP;
+  const auto addresses = module_.Names().gethostbyname(ToCodePage(LocalHostName()));
+  if (!addresses || addresses->empty())
+    throw SystemError(module_.Library().WSAGetLastError(), u"CSocketPlus.GetLocalIP");
+  return DottedAddress(addresses->front());
+}
+
+std::int32_t CSocketPlus::BytesReceived(const Value& index) { return AmountWaiting(GetSocketIndex(index)); }
+
+std::int32_t CSocketPlus::SocketHandle(const Value& index) {
+  return static_cast<std::int32_t>(At(GetSocketIndex(index)).SocketHandle);
+}
+
+Text CSocketPlus::Tag(const Value& index) { return At(GetSocketIndex(index)).Tag; }
+
+void CSocketPlus::SetTag(const Value& index, const Text& tag) { At(GetSocketIndex(index)).Tag = tag; }
+
+SocketProtocol CSocketPlus::Protocol(const Value& index) { return At(GetSocketIndex(index)).Protocol; }
+
+void CSocketPlus::SetProtocol(const Value& index, SocketProtocol protocol) {
+  SocketRecord& record = At(GetSocketIndex(index));
+  if (record.State != sckClosed) throw Misuse(kInvalidAtCurrentState, u"CSocketPlus.Protocol");
+  record.Protocol = protocol;
+}
+
+void CSocketPlus::CloseSck(const Value& index) { CloseSlot(GetSocketIndex(index)); }
+
+void CSocketPlus::CloseSlot(Slot slot) {
+  At(slot).State = sckClosing;
+  CancelResolves(slot);
+  DestroySocket(slot);
+  SocketRecord& record = At(slot);
+  record.LocalPortBind = 0;
+  record.RemoteHostIP.clear();
+  record.RecvBuffer.Clear();
+  record.SendBuffer.Clear();
+  record.SendBufferSize = record.RecvBufferSize = 0;
+  record.State = sckClosed;
+}
+
+void CSocketPlus::CancelResolves(Slot slot) {
+  for (const std::uint32_t handle : std::exchange(At(slot).ResolveRequests, {})) {
+    module_.Library().WSACancelAsyncRequest(handle);
+    module_.UnregisterResolve(handle);
+    slotsByResolve_.erase(handle);
+  }
+  At(slot).LookUpBuffer.reset();
+}
+
+void CSocketPlus::DestroySocket(Slot slot) {
+  SocketRecord& record = At(slot);
+  if (record.SocketHandle == platform::kNoSocket) return;
+  if (module_.Library().closesocket(record.SocketHandle) == platform::kSocketError) {
+    record.State = sckError;
+    throw SystemError(module_.Library().WSAGetLastError(), u"CSocketPlus.DestroySocket");
+  }
+  const platform::SocketHandle socket = std::exchange(record.SocketHandle, platform::kNoSocket);
+  slotsBySocket_.erase(socket);
+  module_.UnregisterSocket(socket);
+}
+
+void CSocketPlus::Fail(Slot slot, std::int32_t number, const char16_t* source) {
+  At(slot).State = sckError;
+  const Value index = At(slot).Index;
+  const Text description = SystemErrorText(number);
+  const auto showError = ShowError;
+  bool cancelDisplay = true;
+  Events.Error(index, static_cast<std::int16_t>(number), description, 0, source, {}, 0, cancelDisplay);
+  if (!cancelDisplay && showError) showError(description, source);
+}
+
+} // namespace quendra::foundation

@@ -1,0 +1,127 @@
+#include "foundation/modSocketPlus.h"
+
+#include "foundation/CSocketPlus.h"
+#include "foundation/SocketErrors.h"
+
+namespace quendra::foundation {
+
+namespace {
+constexpr std::uint16_t kVersion11 = 257;
+} // namespace
+
+modSocketPlus::modSocketPlus(platform::Sockets& sockets, platform::HostNames& hostNames, forms::MessageWindows& windows)
+    : sockets_(sockets), hostNames_(hostNames), windows_(windows) {}
+
+modSocketPlus::~modSocketPlus() = default;
+
+void modSocketPlus::InitiateProcesses() {
+  ++socketClassCount_;
+  if (winsockStarted_) return;
+  winsockStarted_ = true;
+  const std::int32_t error = sockets_.WSAStartup(kVersion11);
+  if (error != 0) throw SystemError(error, u"modSocketPlus.InitiateProcesses");
+}
+
+void modSocketPlus::FinalizeProcesses() {
+  const bool last = socketClassCount_-- == 1;
+  if (!winsockStarted_ || !last) return;
+  if (sockets_.WSACleanup() == platform::kSocketError)
+    throw SystemError(sockets_.WSAGetLastError(), u"modSocketPlus.FinalizeProcesses");
+  DetachDispatcher();
+  resolves_.Clear();
+  socketOwners_.Clear();
+  winsockStarted_ = false;
+}
+
+bool modSocketPlus::RegisterSocket(platform::SocketHandle socket, CSocketPlus* owner, bool selectEvents) {
+  if (!registeredSockets_) {
+    registeredSockets_.emplace();
+    CreateWinsockMessageWindow();
+    AttachDispatcher();
+  }
+  socketOwners_.Add(socket, owner);
+  if (selectEvents &&
+      sockets_.WSAAsyncSelect(socket, socketWindow_, kSocketMessage, kEventMask) == platform::kSocketError)
+    throw SystemError(sockets_.WSAGetLastError(), u"modSocketPlus.RegisterSocket");
+  registeredSockets_->insert(socket);
+  return true;
+}
+
+void modSocketPlus::UnregisterSocket(platform::SocketHandle socket) {
+  socketOwners_.Remove(socket);
+  if (!registeredSockets_) return;
+  registeredSockets_->erase(socket);
+  if (!registeredSockets_->empty()) return;
+  registeredSockets_.reset();
+  DetachDispatcher();
+  DestroyWinsockMessageWindow();
+}
+
+bool modSocketPlus::IsSocketRegistered(platform::SocketHandle socket) const {
+  return registeredSockets_ && registeredSockets_->contains(socket);
+}
+
+std::uint32_t modSocketPlus::StartResolve(const Text& name, std::span<std::uint8_t> buffer, CSocketPlus* owner) {
+  const std::uint32_t handle =
+      sockets_.WSAAsyncGetHostByName(socketWindow_, kResolveMessage, ToCodePage(name), buffer);
+  if (handle != 0) RegisterResolve(handle, owner);
+  return handle;
+}
+
+void modSocketPlus::RegisterAccept(platform::SocketHandle socket) {
+  auto pending = std::make_unique<CSocketPlus>(*this);
+  pending->ArrayAdd(Text(u"Temporal_Socket"));
+  pending->Accept(Text(u"Temporal_Socket"), socket);
+  pendingAccepts_[socket] = std::move(pending);
+}
+
+bool modSocketPlus::IsAcceptRegistered(platform::SocketHandle socket) const { return pendingAccepts_.contains(socket); }
+
+void modSocketPlus::UnregisterAccept(platform::SocketHandle socket) {
+  // Out of the list before it ends: ending it comes back here by way of the class count.
+  const auto ended = pendingAccepts_.extract(socket);
+}
+
+CSocketPlus* modSocketPlus::GetAcceptClass(platform::SocketHandle socket) const {
+  const auto found = pendingAccepts_.find(socket);
+  return found == pendingAccepts_.end() ? nullptr : found->second.get();
+}
+
+void modSocketPlus::CreateWinsockMessageWindow() {
+  socketWindow_ = windows_.Create();
+  if (socketWindow_ != 0) return;
+  registeredSockets_.reset();
+  throw Fault(Fault::kOutOfMemory, u"Out of memory", u"modSocketPlus.RegisterSocket");
+}
+
+void modSocketPlus::DestroyWinsockMessageWindow() {
+  if (!windows_.Destroy(socketWindow_))
+    throw Fault(Fault::kOutOfMemory, u"Out of memory", u"modSocketPlus.DestroyWinsockMessageWindow");
+  socketWindow_ = 0;
+}
+
+void modSocketPlus::AttachDispatcher() {
+  if (subclassedWindow_ != 0) return;
+  const auto previous = windows_.Procedure(socketWindow_);
+  subclassedWindow_ = socketWindow_;
+  previousWindowProc_ = previous;
+  using Procedure = forms::WindowProcedure::element_type;
+  windows_.Replace(socketWindow_, std::make_shared<Procedure>([this, previous](forms::WindowHandle window,
+                                                                               std::uint32_t message,
+                                                                               std::uint32_t wParam,
+                                                                               std::uint32_t lParam) {
+    CSocketPlus* owner = nullptr;
+    if (message == kResolveMessage) owner = resolves_.OwnerOf(wParam);
+    if (message == kSocketMessage) owner = socketOwners_.OwnerOf(wParam);
+    return owner ? owner->WndProc(window, message, wParam, lParam) : (*previous)(window, message, wParam, lParam);
+  }));
+}
+
+void modSocketPlus::DetachDispatcher() {
+  if (subclassedWindow_ == 0) return;
+  windows_.Replace(subclassedWindow_, previousWindowProc_);
+  subclassedWindow_ = 0;
+  previousWindowProc_ = nullptr;
+}
+
+} // namespace quendra::foundation

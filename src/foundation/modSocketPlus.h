@@ -1,0 +1,75 @@
+#pragma once
+
+#include "forms/MessageWindows.h"
+#include "foundation/HandleOwners.h"
+#include "platform/HostNames.h"
+#include "platform/Sockets.h"
+#include "runtime/Text.h"
+
+#include <map>
+#include <memory>
+#include <optional>
+#include <set>
+
+namespace quendra::foundation {
+
+class CSocketPlus;
+
+/// What all socket objects of the program share: the library's start and end, the one hidden window, the tables that tell
+/// which object owns which socket or look-up, and the dispatcher from window messages to those objects.
+class modSocketPlus {
+ public:
+  static constexpr std::uint32_t kResolveMessage = 32768;
+  static constexpr std::uint32_t kSocketMessage = 32769;
+  static constexpr std::int32_t kEventMask = 59;
+
+  modSocketPlus(platform::Sockets& sockets, platform::HostNames& hostNames, forms::MessageWindows& windows);
+  ~modSocketPlus();
+
+  void InitiateProcesses();
+  void FinalizeProcesses();
+  bool RegisterSocket(platform::SocketHandle socket, CSocketPlus* owner, bool selectEvents);
+  void UnregisterSocket(platform::SocketHandle socket);
+  bool IsSocketRegistered(platform::SocketHandle socket) const;
+  void RegisterResolve(std::uint32_t handle, CSocketPlus* owner) { resolves_.Add(handle, owner); }
+  void UnregisterResolve(std::uint32_t handle) { resolves_.Remove(handle); }
+  /// The look-up's handle, 0 on failure.
+  std::uint32_t StartResolve(const Text& name, std::span<std::uint8_t> buffer, CSocketPlus* owner);
+  void ChangeSocketOwner(platform::SocketHandle socket, CSocketPlus* owner) { socketOwners_.ChangeOwner(socket, owner); }
+
+  /// The pending list: connections accepted by the system that nobody has taken yet.
+  void RegisterAccept(platform::SocketHandle socket);
+  bool IsAcceptRegistered(platform::SocketHandle socket) const;
+  void UnregisterAccept(platform::SocketHandle socket);
+  CSocketPlus* GetAcceptClass(platform::SocketHandle socket) const;
+
+  platform::Sockets& Library() { return sockets_; }
+  platform::HostNames& Names() { return hostNames_; }
+
+  std::int32_t SocketClassCount() const { return socketClassCount_; }
+  bool WinsockStarted() const { return winsockStarted_; }
+  forms::WindowHandle SocketWindow() const { return socketWindow_; }
+  int ResolveCount() const { return resolves_.Count(); }
+  int SocketCount() const { return socketOwners_.Count(); }
+
+ private:
+  void CreateWinsockMessageWindow();
+  void DestroyWinsockMessageWindow();
+  void AttachDispatcher();
+  void DetachDispatcher();
+
+  platform::Sockets& sockets_;
+  platform::HostNames& hostNames_;
+  forms::MessageWindows& windows_;
+  std::int32_t socketClassCount_ = 0;
+  bool winsockStarted_ = false;
+  forms::WindowHandle socketWindow_ = 0;
+  std::optional<std::set<platform::SocketHandle>> registeredSockets_;
+  std::map<platform::SocketHandle, std::unique_ptr<CSocketPlus>> pendingAccepts_;
+  HandleOwners resolves_;
+  HandleOwners socketOwners_;
+  forms::WindowHandle subclassedWindow_ = 0;
+  forms::WindowProcedure previousWindowProc_;
+};
+
+} // namespace quendra::foundation

@@ -1,0 +1,51 @@
+#include "platform/linux/LinuxMachine.h"
+
+#include "platform/linux/LinuxCapture.h"
+#include "platform/linux/LinuxHostNames.h"
+#include "platform/linux/LinuxIcons.h"
+#include "platform/linux/LinuxIpHelper.h"
+#include "platform/linux/LinuxProcesses.h"
+#include "platform/linux/LinuxShellStart.h"
+#include "platform/linux/LinuxSystem.h"
+#include "platform/linux/LinuxTokens.h"
+#include "platform/linux/LinuxVersionInfo.h"
+#include "platform/linux/NotAvailable.h"
+
+namespace quendra::platform::linux_ {
+
+struct LinuxMachine::Parts {
+  Parts(EventLoop& loop, const std::string& procRoot) : folder(procRoot), capture(loop) {}
+
+  ProcFolder folder;
+  HandleTable handleTable;
+  SystemPaths paths;
+  DesktopIndex desktopIndex{UserFolders::OfEnvironment()};
+  IconTheme iconTheme{UserFolders::OfEnvironment()};
+
+  LinuxCapture capture;
+  LinuxHandles handles;
+  LinuxHostNames hostNames{folder};
+  LinuxIcons icons{desktopIndex, iconTheme, paths};
+  LinuxIpHelper ipHelper{folder, {MayTraceEveryProcess(), ::geteuid()}};
+  LinuxProcesses processes{folder, handleTable, paths};
+  LinuxShellStart shellStart;
+  LinuxSockets sockets;
+  LinuxSystem system;
+  LinuxTokens tokens{handleTable};
+  LinuxVersionInfo versionInfo{desktopIndex, paths};
+};
+
+LinuxMachine::LinuxMachine(EventLoop& loop, const std::string& procRoot)
+    : parts_(std::make_unique<Parts>(loop, procRoot)) {}
+
+LinuxMachine::~LinuxMachine() = default;
+
+Machine LinuxMachine::Operations() {
+  return {parts_->capture, parts_->capture,  parts_->handles,   parts_->hostNames,
+          parts_->icons,   parts_->ipHelper, parts_->processes, parts_->shellStart,
+          parts_->sockets, parts_->system,   parts_->tokens,    parts_->versionInfo};
+}
+
+LinuxCapture& LinuxMachine::Capture() { return parts_->capture; }
+
+} // namespace quendra::platform::linux_

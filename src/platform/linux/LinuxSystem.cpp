@@ -1,0 +1,38 @@
+#include "platform/linux/LinuxSystem.h"
+
+#include "platform/linux/Clock.h"
+
+#include <chrono>
+#include <ctime>
+#include <thread>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+constexpr std::int32_t kDayNumberOf1970 = 25569;
+
+} // namespace
+
+std::uint32_t LinuxSystem::GetTickCount() { return static_cast<std::uint32_t>(CoarseMilliseconds()); }
+
+bool LinuxSystem::GetVersionExA(OsVersion& version) {
+  version = {2, 5, 1};
+  return true;
+}
+
+void LinuxSystem::Sleep(std::uint32_t milliseconds) {
+  std::this_thread::sleep_for(std::chrono::milliseconds(milliseconds));
+}
+
+std::int32_t LinuxSystem::DayNumber() {
+  const std::time_t now = std::time(nullptr);
+  std::tm local{};
+  if (::localtime_r(&now, &local) == nullptr) return 0;
+  const std::chrono::year_month_day date{std::chrono::year{local.tm_year + 1900},
+                                         std::chrono::month{static_cast<unsigned>(local.tm_mon + 1)},
+                                         std::chrono::day{static_cast<unsigned>(local.tm_mday)}};
+  return static_cast<std::int32_t>(std::chrono::sys_days{date}.time_since_epoch().count()) + kDayNumberOf1970;
+}
+
+} // namespace quendra::platform::linux_

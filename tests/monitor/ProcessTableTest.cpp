@@ -1,0 +1,461 @@
+#include "monitor/MonitorFixture.h"
+
+namespace quendra::monitor {
+
+namespace {
+
+using Ids = std::vector<std::int64_t>;
+
+struct ProcessTableTest : MonitorFixture {
+  Text Upload() { return controls.main_lblUpload.Caption(); }
+  Text Download() { return controls.main_lblDownload.Caption(); }
+
+  void AddProcesses(std::initializer_list<std::uint32_t> ids) {
+    for (const std::uint32_t id : ids) machine.AddProcess({id, 9999, "a.exe", ""});
+  }
+};
+
+} // namespace
+
+// The elapsed time.
+
+TEST_F(ProcessTableTest, A_rate_is_by_the_seconds_since_the_last_refresh) {
+  AddProcesses({10});
+  Pass();
+  Charge(10, 9, 6);
+  Pass(1500);
+  EXPECT_EQ(CellOf(10, kUploadCell), u"06.00");
+  EXPECT_EQ(CellOf(10, kDownloadCell), u"004.00");
+  EXPECT_EQ(CellOf(10, kTotalCell), u"10.00");
+}
+
+TEST_F(ProcessTableTest, A_burst_after_a_silence_is_spread_over_the_whole_silence) {
+  AddProcesses({10});
+  Pass();
+  Charge(10, 600, 0);
+  Pass(60000);
+  EXPECT_EQ(CellOf(10, kUploadCell), u"10.00");
+}
+
+TEST_F(ProcessTableTest, The_seconds_run_on_where_the_signed_tick_wraps) {
+  AddProcesses({10});
+  machine.SetTick(0x7FFFFF00);
+  Pass(0);
+  Charge(10, 2, 0);
+  Pass(1000);
+  EXPECT_EQ(CellOf(10, kUploadCell), u"02.00");
+}
+
+TEST_F(ProcessTableTest, The_seconds_run_on_where_the_tick_starts_over) {
+  AddProcesses({10});
+  machine.SetTick(0xFFFFFF00);
+  Pass(0);
+  Charge(10, 2, 0);
+  Pass(1000);
+  EXPECT_EQ(CellOf(10, kUploadCell), u"02.00");
+}
+
+TEST_F(ProcessTableTest, A_last_refresh_that_lies_ahead_turns_the_rates_negative) {
+  AddProcesses({10});
+  Pass();
+  Charge(10, 2, 0);
+  fields.LastRefreshTick = Tick() + 2000;
+  table.RefreshProcessTable(u"");
+  EXPECT_EQ(CellOf(10, kUploadCell), u"");
+  EXPECT_EQ(CellOf(10, kTotalCell), u"-1.00");
+}
+
+TEST_F(ProcessTableTest, A_pass_at_the_tick_of_the_last_refresh_divides_traffic_by_zero) {
+  AddProcesses({10});
+  Pass();
+  Charge(10, 2, 0);
+  EXPECT_EQ(FaultNumberOf([&] { Pass(0); }), Fault::kDivision);
+  EXPECT_EQ(machine.processes.OpenHandles(), 0);
+}
+
+TEST_F(ProcessTableTest, A_pass_at_the_tick_of_the_last_refresh_divides_silence_by_zero_as_an_overflow) {
+  AddProcesses({10});
+  Pass();
+  EXPECT_EQ(FaultNumberOf([&] { Pass(0); }), Fault::kOverflow);
+}
+
+TEST_F(ProcessTableTest, A_pass_of_new_rows_alone_divides_nothing) {
+  AddProcesses({10});
+  EXPECT_EQ(FaultNumberOf([&] { Pass(0); }), 0);
+}
+
+TEST_F(ProcessTableTest, The_pass_never_stores_the_tick_itself) {
+  fields.LastRefreshTick = 77;
+  table.RefreshProcessTable(u"");
+  EXPECT_EQ(fields.LastRefreshTick, 77);
+}
+
+TEST_F(ProcessTableTest, The_day_number_that_the_first_pass_measures_from_does_no_harm) {
+  AddProcesses({10});
+  fields.LastRefreshTick = machine.system.DayNumber();
+  table.RefreshProcessTable(u"");
+  EXPECT_EQ(CellOf(10, kUploadCell), u"0");
+  EXPECT_EQ(Upload(), u"0.0");
+  EXPECT_EQ(Download(), u"0.0");
+}
+
+TEST_F(ProcessTableTest, The_reason_of_a_pass_is_ignored) {
+  AddProcesses({10});
+  table.RefreshProcessTable(u"anything");
+  EXPECT_TRUE(HasRow(10));
+}
+
+// The snapshot.
+
+TEST_F(ProcessTableTest, Rows_come_in_snapshot_order) {
+  AddProcesses({30, 10, 20});
+  Pass();
+  EXPECT_EQ(Order(), (Ids{30, 10, 20}));
+}
+
+TEST_F(ProcessTableTest, The_snapshot_is_closed_before_the_ports_are_merged) {
+  AddProcesses({10});
+  machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 10});
+  int openWhileYielding = -1;
+  desktop.OnYield = [&] { openWhileYielding = machine.processes.OpenHandles(); };
+  Pass();
+  EXPECT_EQ(openWhileYielding, 0);
+}
+
+TEST_F(ProcessTableTest, A_failed_snapshot_clears_the_marks_and_touches_nothing_else) {
+  AddProcesses({10, 20});
+  Pass();
+  Charge(10, 2, 2);
+  list.Sort(0, forms::SortOrder::Ascending);
+  controls.main_lblUpload.Caption = Text(u"33.00");
+  machine.processes.FailSnapshots = true;
+  Pass();
+  EXPECT_TRUE(Row(10).CellTag(kApplicationCell).IsEmpty());
+  EXPECT_EQ(CellOf(10, kUploadCell), u"0");
+  EXPECT_EQ(list.Count(), 2);
+  EXPECT_EQ(Upload(), u"33.00");
+  EXPECT_EQ(list.SortKey(), 0);
+  EXPECT_EQ(machine.ipHelper.TablesFetched, 1);
+}
+
+TEST_F(ProcessTableTest, The_pass_after_a_failed_snapshot_repairs_the_marks) {
+  AddProcesses({10, 20});
+  Pass();
+  machine.processes.FailSnapshots = true;
+  Pass();
+  machine.processes.FailSnapshots = false;
+  Pass();
+  EXPECT_EQ(Row(10).CellTag(kApplicationCell), Variant(u"1"));
+  EXPECT_EQ(Row(20).CellTag(kApplicationCell), Variant(u"1"));
+}
+
+TEST_F(ProcessTableTest, A_process_that_the_snapshot_lists_twice_has_one_row) {
+  AddProcesses({10, 10});
+  Pass();
+  EXPECT_EQ(list.Count(), 1);
+}
+
+TEST_F(ProcessTableTest, A_process_id_of_32_bits_has_a_row) {
+  AddProcesses({4194304, 0xFFFFFFF0});
+  Pass();
+  EXPECT_TRUE(HasRow(4194304));
+  EXPECT_TRUE(HasRow(0xFFFFFFF0));
+}
+
+TEST_F(ProcessTableTest, A_process_id_that_comes_back_between_two_passes_keeps_the_old_row) {
+  machine.AddProcess({10, 9999, "old.exe", ""});
+  Pass();
+  Charge(10, 5, 0);
+  machine.EndProcess(10);
+  machine.AddProcess({10, 9999, "new.exe", ""});
+  Pass();
+  EXPECT_EQ(CellOf(10, kNameCell), u"old.exe");
+  EXPECT_EQ(Row(10).CellTag(kUploadCell), Variant(5.0));
+}
+
+TEST_F(ProcessTableTest, A_pass_shows_no_message_and_does_not_yield_without_connections) {
+  AddProcesses({10});
+  Pass();
+  Pass();
+  EXPECT_TRUE(desktop.Boxes.empty());
+  EXPECT_EQ(desktop.YieldCount, 0);
+}
+
+// Rows that were there before.
+
+TEST_F(ProcessTableTest, The_first_texts_of_a_silent_row_are_gone_after_the_second_pass) {
+  AddProcesses({10});
+  Pass();
+  ASSERT_EQ(CellOf(10, kUploadCell), u"0");
+  Pass();
+  EXPECT_EQ(CellOf(10, kUploadCell), u"");
+  EXPECT_EQ(CellOf(10, kDownloadCell), u"");
+  EXPECT_EQ(CellOf(10, kTotalCell), u"");
+}
+
+TEST_F(ProcessTableTest, A_row_takes_no_new_name_path_class_or_icon_after_its_creation) {
+  machine.AddProcess({10, 9999, "a.exe", "C:\\a.exe"});
+  Pass();
+  machine.AddVersionBlock("C:\\a.exe", {9, 4, 0xE4, 4}, {{"ProductName", "A"}});
+  machine.SetIcon("C:\\a.exe", {1, 2, 3});
+  machine.AddProcess({9999, 0, "services.exe", ""});
+  Pass();
+  EXPECT_EQ(CellOf(10, kApplicationCell), u"");
+  EXPECT_EQ(ClassOf(10), u"");
+  EXPECT_EQ(Row(10).SmallIcon(), 1);
+  EXPECT_EQ(controls.main_ImList.Count(), 1);
+}
+
+TEST_F(ProcessTableTest, Totals_charged_while_a_pass_yields_count_in_the_next_pass) {
+  AddProcesses({10});
+  machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 10});
+  Pass();
+  desktop.OnYield = [&] {
+    if (desktop.YieldCount % 4 == 1) Charge(10, 3, 0);
+  };
+  Pass();
+  ASSERT_EQ(CellOf(10, kUploadCell), u"");
+  desktop.OnYield = {};
+  Pass();
+  EXPECT_EQ(CellOf(10, kUploadCell), u"03.00");
+}
+
+// Dead rows.
+
+TEST_F(ProcessTableTest, A_dead_process_leaves_the_table) {
+  AddProcesses({10, 20, 30});
+  Pass();
+  machine.EndProcess(10);
+  Pass();
+  EXPECT_EQ(Order(), (Ids{20, 30}));
+}
+
+TEST_F(ProcessTableTest, The_last_row_is_never_examined_and_a_dead_one_stays_there) {
+  AddProcesses({10, 20});
+  Pass();
+  Pass();
+  machine.EndProcess(20);
+  Pass();
+  Pass();
+  EXPECT_EQ(Order(), (Ids{10, 20}));
+}
+
+TEST_F(ProcessTableTest, A_dead_last_row_leaves_once_another_row_sorts_below_it) {
+  AddProcesses({10, 20});
+  Pass();
+  machine.EndProcess(20);
+  // Nothing updates a dead row: its first "0" sorts above the live row's empty cell.
+  Pass();
+  ASSERT_EQ(Order(), (Ids{20, 10}));
+  Pass();
+  EXPECT_EQ(Order(), (Ids{10}));
+}
+
+TEST_F(ProcessTableTest, The_row_that_slides_into_the_place_of_a_removed_one_is_skipped) {
+  AddProcesses({10, 20, 30, 40});
+  Pass();
+  machine.EndProcess(10);
+  machine.EndProcess(20);
+  Pass();
+  EXPECT_FALSE(HasRow(10));
+  EXPECT_TRUE(HasRow(20));
+  Pass();
+  EXPECT_FALSE(HasRow(20));
+}
+
+TEST_F(ProcessTableTest, Of_a_table_of_dead_rows_every_second_leaves_in_a_pass) {
+  AddProcesses({10, 20, 30, 40, 50});
+  Pass();
+  for (const std::uint32_t id : {10, 20, 30, 40, 50}) machine.EndProcess(id);
+  Pass();
+  EXPECT_EQ(Order(), (Ids{20, 40, 50}));
+  Pass();
+  EXPECT_EQ(Order(), (Ids{40, 50}));
+}
+
+TEST_F(ProcessTableTest, A_single_dead_row_stays) {
+  AddProcesses({10});
+  Pass();
+  machine.EndProcess(10);
+  Pass();
+  EXPECT_TRUE(HasRow(10));
+}
+
+// Meters.
+
+TEST_F(ProcessTableTest, An_empty_table_gives_both_meters_a_plain_zero) {
+  Pass();
+  EXPECT_EQ(Upload(), u"0.0");
+  EXPECT_EQ(Download(), u"0.0");
+}
+
+TEST_F(ProcessTableTest, A_pass_with_new_rows_alone_gives_both_meters_a_plain_zero) {
+  AddProcesses({10, 20});
+  Pass();
+  EXPECT_EQ(Upload(), u"0.0");
+  EXPECT_EQ(Download(), u"0.0");
+}
+
+TEST_F(ProcessTableTest, The_meters_show_the_sums_of_the_rates_in_the_upload_format) {
+  AddProcesses({10, 20});
+  Pass();
+  Charge(10, 1.25, 3);
+  Charge(20, 2.25, 120.4);
+  Pass();
+  EXPECT_EQ(Upload(), u"03.50");
+  EXPECT_EQ(Download(), u"123.40");
+}
+
+TEST_F(ProcessTableTest, A_rate_of_exactly_1_kilobyte_a_second_reads_01_00_in_the_meter) {
+  AddProcesses({10});
+  Pass();
+  Charge(10, 1, 1);
+  Pass();
+  EXPECT_EQ(Upload(), u"01.00");
+  EXPECT_EQ(Download(), u"01.00");
+}
+
+TEST_F(ProcessTableTest, Each_pass_begins_its_sums_at_zero) {
+  AddProcesses({10});
+  Pass();
+  Charge(10, 5, 5);
+  Pass();
+  Pass();
+  EXPECT_EQ(Upload(), u"0.0");
+  EXPECT_EQ(Download(), u"0.0");
+}
+
+TEST_F(ProcessTableTest, A_dead_row_counts_in_no_sum) {
+  AddProcesses({10, 20});
+  Pass();
+  Charge(10, 5, 5);
+  machine.EndProcess(10);
+  Pass();
+  EXPECT_EQ(Upload(), u"0.0");
+}
+
+TEST_F(ProcessTableTest, The_meters_keep_their_figures_while_no_pass_runs) {
+  AddProcesses({10});
+  Pass();
+  Charge(10, 5, 5);
+  Pass();
+  machine.AdvanceTick(600000);
+  EXPECT_EQ(Upload(), u"05.00");
+}
+
+// The order.
+
+TEST_F(ProcessTableTest, Every_pass_sorts_by_the_download_rate_with_the_highest_first) {
+  AddProcesses({10, 20, 30});
+  Pass();
+  Charge(20, 0, 30);
+  Charge(30, 0, 4);
+  Pass();
+  EXPECT_EQ(Order(), (Ids{20, 30, 10}));
+  EXPECT_EQ(list.SortKey(), 5);
+  EXPECT_EQ(list.Order(), forms::SortOrder::Descending);
+  EXPECT_TRUE(list.Sorted());
+}
+
+TEST_F(ProcessTableTest, The_sort_is_by_text_and_puts_1000_below_999) {
+  AddProcesses({10, 20});
+  Pass();
+  Charge(10, 0, 1000);
+  Charge(20, 0, 999);
+  Pass();
+  EXPECT_EQ(Order(), (Ids{20, 10}));
+}
+
+TEST_F(ProcessTableTest, A_column_that_the_user_picked_holds_until_the_next_pass) {
+  AddProcesses({10, 20});
+  Pass();
+  table.main_ListView1_ColumnClick(2);
+  ASSERT_EQ(list.SortKey(), 1);
+  Pass();
+  EXPECT_EQ(list.SortKey(), 5);
+  EXPECT_EQ(list.Order(), forms::SortOrder::Descending);
+}
+
+TEST_F(ProcessTableTest, The_selection_follows_its_row_through_a_pass) {
+  AddProcesses({10, 20});
+  Pass();
+  list.Select(&Row(10));
+  Charge(20, 0, 5);
+  Pass();
+  ASSERT_EQ(Order(), (Ids{20, 10}));
+  EXPECT_EQ(list.SelectedItem(), &Row(10));
+}
+
+// Versions.
+
+TEST_F(ProcessTableTest, The_version_with_a_tcp_owner_table_fills_the_ports_of_a_new_row_in_the_same_pass) {
+  AddProcesses({10});
+  machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 10});
+  Pass();
+  EXPECT_EQ(PortsOf(10), u".80.");
+}
+
+TEST_F(ProcessTableTest, The_ports_only_ever_grow) {
+  AddProcesses({10});
+  machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 10});
+  Pass();
+  machine.ipHelper.Connections = {{2, "0.0.0.0", 443, "0.0.0.0", 0, 10}};
+  Pass();
+  EXPECT_EQ(PortsOf(10), u".80.443.");
+}
+
+TEST_F(ProcessTableTest, A_failed_fetch_leaves_the_previous_table_to_be_walked_again) {
+  AddProcesses({10});
+  machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 20});
+  Pass();
+  AddProcesses({20});
+  machine.ipHelper.TableError = 50;
+  Pass();
+  EXPECT_EQ(PortsOf(20), u".80.");
+}
+
+struct OtherVersions : ProcessTableTest, testing::WithParamInterface<std::int32_t> {};
+
+TEST_P(OtherVersions, Leave_the_ports_cells_empty) {
+  fields.OsVersionCode = GetParam();
+  AddProcesses({10});
+  machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 10});
+  machine.AddHandle({10, 4, u"\\Device\\Tcp", 80});
+  Pass();
+  Pass();
+  EXPECT_EQ(PortsOf(10), u"");
+  EXPECT_EQ(machine.ipHelper.TablesFetched, 0);
+  EXPECT_TRUE(machine.handles.TableQueries.empty());
+}
+
+INSTANTIATE_TEST_SUITE_P(Codes, OtherVersions, testing::Values(0, 32, 95, 98, 351, 40));
+
+// Events that arrive while the ports are merged.
+
+TEST_F(ProcessTableTest, A_pass_that_starts_while_another_yields_runs_to_its_end_and_so_does_the_other) {
+  AddProcesses({10, 20});
+  machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 10});
+  machine.AddConnection({2, "0.0.0.0", 443, "0.0.0.0", 0, 20});
+  desktop.OnYield = [&, once = false]() mutable {
+    if (std::exchange(once, true)) return;
+    AddProcesses({30});
+    machine.AddConnection({2, "0.0.0.0", 25, "0.0.0.0", 0, 30});
+    machine.AdvanceTick(1000);
+    table.RefreshProcessTable(u"");
+  };
+  Pass();
+  EXPECT_EQ(PortsOf(10), u".80.");
+  EXPECT_EQ(PortsOf(20), u".443.");
+  EXPECT_EQ(PortsOf(30), u".25.");
+  EXPECT_EQ(machine.processes.OpenHandles(), 0);
+}
+
+TEST_F(ProcessTableTest, The_end_of_the_program_while_a_pass_yields_unwinds_it) {
+  AddProcesses({10});
+  machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 10});
+  desktop.OnYield = [&] { desktop.End(0); };
+  EXPECT_THROW(Pass(), forms::ProgramEnded);
+  EXPECT_EQ(machine.processes.OpenHandles(), 0);
+}
+
+} // namespace quendra::monitor

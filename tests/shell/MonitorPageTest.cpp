@@ -1,0 +1,177 @@
+#include "shell/MonitorPageSwitch.h"
+
+#include "shell/ProgramFixture.h"
+
+namespace quendra::shell {
+namespace {
+
+/// Writes what the page's start asks of the machine and does to the table into one list.
+class Recorder : public forms::ListViewObserver, public platform::HostNames, public platform::System {
+ public:
+  explicit Recorder(platform::simulated::SimulatedMachine& machine) : machine_(machine) {}
+
+  std::vector<std::string>& Lines() { return machine_.Calls; }
+
+  void RowAdded(int) override { Note("row added"); }
+  void RowRemoved(int) override {}
+  void RowChanged(int, int) override {}
+  void RowsMoved() override {}
+  void RowsCleared() override { Note("rows cleared"); }
+  void ColumnsChanged() override { Note("columns"); }
+
+  std::optional<std::string> gethostname() override {
+    Note("addresses");
+    return machine_.hostNames.gethostname();
+  }
+  std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) override {
+    return machine_.hostNames.gethostbyname(name);
+  }
+
+  std::uint32_t GetTickCount() override { return machine_.system.GetTickCount(); }
+  bool GetVersionExA(platform::OsVersion& version) override { return machine_.system.GetVersionExA(version); }
+  void Sleep(std::uint32_t milliseconds) override { machine_.system.Sleep(milliseconds); }
+  std::int32_t DayNumber() override {
+    Note("day number");
+    return machine_.system.DayNumber();
+  }
+
+ private:
+  /// Columns come one by one; told once.
+  void Note(const std::string& line) {
+    if (Lines().empty() || Lines().back() != line) Lines().push_back(line);
+  }
+
+  platform::simulated::SimulatedMachine& machine_;
+};
+
+class MonitorPageSwitchTest : public ProgramTest {
+ protected:
+  frmMenu& menu = program.frmMenu;
+};
+
+TEST_F(MonitorPageSwitchTest,
+       The_start_sets_up_the_table_reads_the_addresses_seeds_the_tick_makes_a_pass_and_captures) {
+  machine.AddProcess({100, 1, "one.exe", ""});
+  Recorder recorder(machine);
+  const platform::Machine original = machine.Operations();
+  app::Program other({original.captureControls, original.captureLibrary, original.handles, recorder,
+                      original.icons, original.ipHelper, original.processes, original.shellStart,
+                      original.sockets, recorder, original.tokens, original.versionInfo},
+                     desktop);
+  other.Start();
+  desktop.Click(other.frmSplash.Label2);
+  desktop.Click(other.frmMenu.lblCaption[0]);
+  desktop.Click(other.frmMenu.lblCaption[1]);
+  other.frmMenu.main_ListView1.Observe(&recorder);
+  machine.Calls.clear();
+  desktop.Click(other.frmMenu.lblCaption[0]);
+  EXPECT_EQ(machine.Calls,
+            (std::vector<std::string>{"rows cleared", "columns", "addresses", "day number", "row added",
+                                      "vpGetAdapterInfo 0", "AdapterAddress eth0", "vpSetCurrentAdapter 0",
+                                      "vpBegin 1000", "vpGetAdapterInfo 0", "BindAdapter eth0",
+                                      "SetValueA 32", "SetValueB 1000", "OpenChannel", "SetChannelSize 15000",
+                                      "SetValueC 15000", "StartEvents"}));
+}
+
+TEST_F(MonitorPageSwitchTest, The_start_seeds_the_last_refresh_with_the_day_number_and_not_with_a_tick) {
+  machine.AddProcess({100, 1, "one.exe", ""});
+  ComeHome();
+  ClickEntry(0);
+  EXPECT_EQ(program.monitorFields.LastRefreshTick, machine.system.Day);
+  EXPECT_EQ(machine.processes.SnapshotsTaken, 1);
+}
+
+TEST_F(MonitorPageSwitchTest, The_start_clears_the_pinned_sort) {
+  ComeHome();
+  program.processTable.SortPinned = kTrue16;
+  ClickEntry(0);
+  EXPECT_EQ(program.processTable.SortPinned, 0);
+}
+
+TEST_F(MonitorPageSwitchTest, The_stop_ends_the_session_pauses_and_stops_the_control) {
+  ComeHome();
+  ClickEntry(0);
+  machine.Calls.clear();
+  program.monitorPageSwitch.main_StopPage();
+  EXPECT_EQ(machine.Calls,
+            (std::vector<std::string>{"vpEnd", "Sleep 300", "StopEvents", "ReleaseChannel", "CloseChannel"}));
+  EXPECT_FALSE(program.captureFields.CaptureRunning);
+}
+
+TEST_F(MonitorPageSwitchTest, Timer_1_stamps_the_time_and_makes_no_pass) {
+  ComeHome();
+  ClickEntry(0);
+  const int passes = machine.processes.SnapshotsTaken;
+  menu.main_Timer1.Enabled = true;
+  machine.SetTick(5'000'000);
+  desktop.Advance(1000);
+  EXPECT_EQ(program.monitorFields.LastRefreshTick, 5'000'000);
+  EXPECT_EQ(machine.processes.SnapshotsTaken, passes);
+}
+
+TEST_F(MonitorPageSwitchTest, Timer_1_makes_a_pass_behind_its_gate) {
+  ComeHome();
+  ClickEntry(0);
+  const int passes = machine.processes.SnapshotsTaken;
+  EXPECT_EQ(program.monitorPageSwitch.TimerRefreshGate, 0);
+  program.monitorPageSwitch.TimerRefreshGate = kTrue16;
+  menu.main_Timer1.Enabled = true;
+  desktop.Advance(1000);
+  EXPECT_EQ(machine.processes.SnapshotsTaken, passes + 1);
+}
+
+TEST_F(MonitorPageSwitchTest, Timer_1_makes_no_pass_while_the_sort_is_pinned) {
+  ComeHome();
+  ClickEntry(0);
+  const int passes = machine.processes.SnapshotsTaken;
+  program.monitorPageSwitch.TimerRefreshGate = kTrue16;
+  program.processTable.SortPinned = kTrue16;
+  menu.main_Timer1.Enabled = true;
+  desktop.Advance(1000);
+  EXPECT_EQ(machine.processes.SnapshotsTaken, passes);
+}
+
+TEST_F(MonitorPageSwitchTest, A_tick_beyond_31_bits_is_stored_as_it_wraps) {
+  ComeHome();
+  machine.SetTick(0xFFFFFFFE);
+  program.monitorPageSwitch.main_Timer1_Timer();
+  EXPECT_EQ(program.monitorFields.LastRefreshTick, -2);
+}
+
+TEST_F(MonitorPageSwitchTest, A_header_click_sorts_by_its_column) {
+  machine.AddProcess({100, 1, "zebra.exe", ""});
+  machine.AddProcess({101, 1, "ant.exe", ""});
+  ComeHome();
+  ClickEntry(0);
+  EXPECT_TRUE(desktop.ClickHeader(menu.main_ListView1, 2));
+  EXPECT_EQ(menu.main_ListView1.Row(1).CellText(1), u"ant.exe");
+  EXPECT_TRUE(desktop.ClickHeader(menu.main_ListView1, 2));
+  EXPECT_EQ(menu.main_ListView1.Row(1).CellText(1), u"zebra.exe");
+}
+
+TEST_F(MonitorPageSwitchTest, Choosing_another_adapter_follows_it) {
+  machine.AddCaptureAdapter({"wlan0", "Radio card", ""});
+  ComeHome();
+  ClickEntry(0);
+  EXPECT_TRUE(desktop.ChooseItem(menu.main_cmbAdapters, 1));
+  EXPECT_EQ(program.captureFields.CurrentAdapter, 1);
+  EXPECT_EQ(machine.capture.ControlsMade, 2);
+}
+
+TEST_F(MonitorPageSwitchTest, The_actions_that_come_later_can_be_pressed_and_do_nothing) {
+  machine.AddProcess({100, 1, "one.exe", "C:\\one.exe"});
+  ComeHome();
+  ClickEntry(0);
+  machine.Calls.clear();
+  for (forms::Label* label : {&menu.main_lblEndProcess, &menu.main_lblJumpToPath, &menu.main_cmdAddRemove,
+                              &menu.main_cmdChecks, &menu.main_cmdMemInfo, &menu.main_cmdRpt}) {
+    EXPECT_TRUE(static_cast<bool>(label->Click)) << ToUtf8(label->Name());
+    EXPECT_TRUE(desktop.Click(*label)) << ToUtf8(label->Name());
+  }
+  EXPECT_TRUE(machine.Calls.empty());
+  EXPECT_TRUE(desktop.Boxes.empty());
+  EXPECT_EQ(menu.main_ListView1.Count(), 1);
+}
+
+} // namespace
+} // namespace quendra::shell
