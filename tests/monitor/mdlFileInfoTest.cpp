@@ -197,16 +197,16 @@ TEST_F(WellKnown, Other_names_are_passed_over) {
 TEST_F(WellKnown, Ids_have_32_bits) {
   fileInfo.RecordWellKnown(u"services.exe", 0xFFFFFFF0);
   EXPECT_EQ(fileInfo.ServicesPid, 0xFFFFFFF0u);
-  EXPECT_STREQ(fileInfo.ClassOfParent(0xFFFFFFF0), u"Service");
+  EXPECT_EQ(Text(fileInfo.ClassOfParent(0xFFFFFFF0)), u"Service");
 }
 
 TEST_F(WellKnown, The_order_of_comparison_is_services_then_explorer_then_the_five) {
   fileInfo.ServicesPid = fileInfo.ExplorerPid = fileInfo.SystemPids[0] = 5;
-  EXPECT_STREQ(fileInfo.ClassOfParent(5), u"Service");
+  EXPECT_EQ(Text(fileInfo.ClassOfParent(5)), u"Service");
   fileInfo.ServicesPid = 1;
-  EXPECT_STREQ(fileInfo.ClassOfParent(5), u"User");
+  EXPECT_EQ(Text(fileInfo.ClassOfParent(5)), u"User");
   fileInfo.ExplorerPid = 1;
-  EXPECT_STREQ(fileInfo.ClassOfParent(5), u"System");
+  EXPECT_EQ(Text(fileInfo.ClassOfParent(5)), u"System");
   EXPECT_EQ(fileInfo.ClassOfParent(6), nullptr);
 }
 
