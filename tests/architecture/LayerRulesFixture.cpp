@@ -1,0 +1,218 @@
+#include "LayerRulesFixture.h"
+
+#include <algorithm>
+#include <cctype>
+#include <map>
+#include <regex>
+#include <set>
+#include <sstream>
+
+namespace quendra::architecture {
+
+namespace {
+
+using Names = std::set<std::string>;
+
+const Names kBelowSubsystems{"foundation", "forms", "platform", "runtime"};
+
+Names With(Names names, const Names& more) {
+  names.insert(more.begin(), more.end());
+  return names;
+}
+
+/// What each folder may include beside itself. Arrows go down; those that go sideways are all here.
+const std::map<std::string, Names>& Allowed() {
+  static const Names subsystems{"monitor", "capture", "report", "diagnostics", "provisioning", "mail"};
+  static const Names backends{"forms/qt",       "forms/win32",      "forms/headless",
+                              "platform/linux", "platform/windows", "platform/simulated"};
+  static const Names belowShell = With(subsystems, kBelowSubsystems);
+  static const std::map<std::string, Names> allowed{
+      {"runtime", {}},
+      {"forms", {"runtime"}},
+      {"platform", {"runtime"}},
+      {"foundation", {"forms", "platform", "runtime"}},
+      {"monitor", kBelowSubsystems},
+      {"capture", With(kBelowSubsystems, {"monitor"})},
+      {"report", With(kBelowSubsystems, {"monitor"})},
+      {"diagnostics", kBelowSubsystems},
+      {"provisioning", With(kBelowSubsystems, {"mail", "diagnostics"})},
+      {"mail", kBelowSubsystems},
+      {"shell", belowShell},
+      {"app", With(With(belowShell, {"shell"}), backends)},
+      {"forms/qt", {"forms", "runtime"}},
+      {"forms/win32", {"forms", "runtime"}},
+      {"forms/headless", {"forms", "runtime"}},
+      {"platform/linux", {"platform", "runtime"}},
+      {"platform/windows", {"platform", "runtime"}},
+      {"platform/simulated", {"platform", "runtime"}},
+  };
+  return allowed;
+}
+
+bool IsDesktop(const std::string& folder) { return folder.starts_with("forms/"); }
+bool IsBackend(const std::string& folder) { return folder.find('/') != std::string::npos; }
+
+/// "forms/qt" for "forms/qt/QtDesktop.h", "forms" for "forms/Form.h", empty for a path outside the layers.
+std::string FolderOf(const std::string& path) {
+  const auto first = path.find('/');
+  if (first == std::string::npos) return {};
+  const auto second = path.find('/', first + 1);
+  const std::string folder = path.substr(0, second == std::string::npos ? first : second);
+  return Allowed().contains(folder) ? folder : std::string{};
+}
+
+const Names kStandardHeaders{"algorithm",
+                             "any",
+                             "array",
+                             "atomic",
+                             "barrier",
+                             "bit",
+                             "bitset",
+                             "cassert",
+                             "cctype",
+                             "cerrno",
+                             "cfloat",
+                             "charconv",
+                             "chrono",
+                             "cinttypes",
+                             "climits",
+                             "cmath",
+                             "compare",
+                             "complex",
+                             "concepts",
+                             "condition_variable",
+                             "csignal",
+                             "cstdarg",
+                             "cstddef",
+                             "cstdint",
+                             "cstdio",
+                             "cstdlib",
+                             "cstring",
+                             "ctime",
+                             "cwchar",
+                             "deque",
+                             "exception",
+                             "filesystem",
+                             "forward_list",
+                             "fstream",
+                             "functional",
+                             "future",
+                             "initializer_list",
+                             "iomanip",
+                             "ios",
+                             "iosfwd",
+                             "iostream",
+                             "istream",
+                             "iterator",
+                             "latch",
+                             "limits",
+                             "list",
+                             "locale",
+                             "map",
+                             "memory",
+                             "memory_resource",
+                             "mutex",
+                             "new",
+                             "numbers",
+                             "numeric",
+                             "optional",
+                             "ostream",
+                             "queue",
+                             "random",
+                             "ranges",
+                             "ratio",
+                             "regex",
+                             "semaphore",
+                             "set",
+                             "shared_mutex",
+                             "source_location",
+                             "span",
+                             "sstream",
+                             "stack",
+                             "stdexcept",
+                             "stop_token",
+                             "streambuf",
+                             "string",
+                             "string_view",
+                             "system_error",
+                             "thread",
+                             "tuple",
+                             "type_traits",
+                             "typeindex",
+                             "typeinfo",
+                             "unordered_map",
+                             "unordered_set",
+                             "utility",
+                             "valarray",
+                             "variant",
+                             "vector",
+                             "version"};
+
+bool IsQtHeader(const std::string& header) {
+  return header.starts_with("Qt") ||
+         (header.size() > 1 && header[0] == 'Q' && std::isupper(static_cast<unsigned char>(header[1])));
+}
+
+/// Headers of a system or toolkit that a source may name.
+bool MayNameSystemHeader(const std::string& path, const std::string& folder, const std::string& header) {
+  if (path == "runtime/CodePage.cpp") return header == "iconv.h";
+  if (folder == "forms/qt") return IsQtHeader(header);
+  if (folder == "forms/headless") return header == "poll.h" || header == "unistd.h";
+  if (folder == "forms/win32" || folder == "platform/linux" || folder == "platform/windows")
+    return !IsQtHeader(header);
+  return false;
+}
+
+std::string WhyNotIncluded(const std::string& path, const std::string& header) {
+  const std::string folder = FolderOf(path);
+  const std::string target = FolderOf(header);
+  if (target.empty()) return "is not written from src/";
+  if (target == folder) return {};
+  if (IsDesktop(folder) && header == "platform/EventLoop.h") return {};
+  if (Allowed().at(folder).contains(target)) return {};
+  return IsBackend(target) ? "names a backend" : "goes against the layers";
+}
+
+std::string WhyNotSystem(const std::string& path, const std::string& header) {
+  if (kStandardHeaders.contains(header)) return {};
+  return MayNameSystemHeader(path, FolderOf(path), header) ? "" : "is a header of a system or toolkit";
+}
+
+std::string WhyWrongLine(const std::string& path, const std::string& line) {
+  static const std::regex include(R"(^\s*#\s*include\b\s*(.*)$)");
+  static const std::regex quoted(R"(^"([^"]+)\".*$)");
+  static const std::regex angled(R"(^<([^>]+)>.*$)");
+  static const std::regex condition(R"(^\s*#\s*(if|ifdef|ifndef|elif)\b(.*)$)");
+  static const std::regex system(
+      R"((\b(_?_?WIN(32|64)?(__)?|_WIN32|_WIN64|_MSC_VER|__MINGW\w*|__CYGWIN__|(__)?linux(__)?|__gnu_linux__|(__)?unix(__)?|__APPLE__|__ANDROID__)\b|\bQ_OS_\w+|__has_include))");
+  std::smatch match;
+  if (std::regex_match(line, match, include)) {
+    const std::string target = match[1];
+    if (std::regex_match(target, match, quoted)) return WhyNotIncluded(path, match[1]);
+    if (std::regex_match(target, match, angled)) return WhyNotSystem(path, match[1]);
+    return "is no plain include";
+  }
+  if (std::regex_match(line, match, condition) && !IsBackend(FolderOf(path))) {
+    const std::string asked = match[2];
+    if (std::regex_search(asked, system)) return "asks for an operating system";
+  }
+  return {};
+}
+
+} // namespace
+
+std::vector<std::string> ViolationsOf(const Source& source) {
+  if (FolderOf(source.path).empty()) return {source.path + ": stands in no layer"};
+  std::vector<std::string> violations;
+  std::istringstream lines(source.text);
+  std::string line;
+  for (int number = 1; std::getline(lines, line); ++number) {
+    if (!line.empty() && line.back() == '\r') line.pop_back();
+    const std::string why = WhyWrongLine(source.path, line);
+    if (!why.empty())
+      violations.push_back(source.path + ":" + std::to_string(number) + ": " + line + " " + why);
+  }
+  return violations;
+}
+
+} // namespace quendra::architecture

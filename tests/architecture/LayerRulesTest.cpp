@@ -1,0 +1,127 @@
+#include "LayerRulesFixture.h"
+
+#include <gtest/gtest.h>
+
+namespace quendra::architecture {
+namespace {
+
+bool IsAllowed(const std::string& path, const std::string& line) {
+  return ViolationsOf({path, line + "\n"}).empty();
+}
+
+struct Case {
+  const char* path;
+  const char* line;
+};
+
+TEST(LayerRules, An_include_that_goes_down_is_allowed) {
+  const Case cases[] = {
+      {"monitor/ProcessTable.h", "#include \"monitor/MonitorPage.h\""},
+      {"monitor/ProcessTable.h", "#include \"forms/ListView.h\""},
+      {"monitor/ProcessTable.h", "#include \"platform/Machine.h\""},
+      {"capture/PacketAttribution.h", "#include \"monitor/MonitorPage.h\""},
+      {"report/Report.cpp", "#include \"monitor/ProcessRow.h\""},
+      {"provisioning/mdlDun.cpp", "#include \"diagnostics/mdlPing.h\""},
+      {"provisioning/mdlDun.cpp", "#include \"mail/mdlEmail.h\""},
+      {"shell/frmMenu.h", "#include \"capture/CaptureSession.h\""},
+      {"app/main_linux.cpp", "#include \"platform/linux/LinuxMachine.h\""},
+      {"app/main_linux.cpp", "#include \"forms/qt/QtDesktop.h\""},
+      {"foundation/CSocketPlus.h", "#include \"platform/Sockets.h\""},
+      {"forms/qt/QtDesktop.h", "#include \"platform/EventLoop.h\""},
+      {"forms/headless/HeadlessLoop.h", "#include \"platform/EventLoop.h\""},
+      {"forms/qt/QtDesktop.cpp", "#include <QApplication>"},
+      {"forms/headless/HeadlessLoop.cpp", "#include <poll.h>"},
+      {"platform/linux/LinuxCapture.cpp", "#include <pcap/pcap.h>"},
+      {"platform/windows/WindowsMachine.cpp", "#include <windows.h>"},
+      {"runtime/CodePage.cpp", "#include <iconv.h>"},
+      {"runtime/Text.cpp", "  #  include <string>  // why"},
+  };
+  for (const Case& row : cases) EXPECT_TRUE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
+}
+
+TEST(LayerRules, An_include_that_goes_up_or_sideways_is_found) {
+  const Case cases[] = {
+      {"runtime/Text.h", "#include \"forms/Form.h\""},
+      {"forms/Form.h", "#include \"platform/EventLoop.h\""},
+      {"platform/Machine.h", "#include \"forms/Form.h\""},
+      {"foundation/CSocketPlus.h", "#include \"monitor/ProcessRow.h\""},
+      {"monitor/ProcessTable.h", "#include \"capture/CaptureFields.h\""},
+      {"monitor/ProcessTable.h", "#include \"shell/frmMenu.h\""},
+      {"mail/mdlEmail.h", "#include \"provisioning/mdlDun.h\""},
+      {"diagnostics/mdlPing.h", "#include \"monitor/ProcessRow.h\""},
+      {"report/Report.h", "#include \"capture/clsIP.h\""},
+      {"shell/frmMenu.h", "#include \"app/Program.h\""},
+      {"forms/qt/QtDesktop.h", "#include \"platform/Machine.h\""},
+      {"forms/headless/HeadlessLoop.h", "#include \"platform/Processes.h\""},
+      {"platform/linux/LinuxMachine.h", "#include \"forms/Form.h\""},
+      {"platform/simulated/SimulatedMachine.h", "#include \"monitor/ProcessRow.h\""},
+  };
+  for (const Case& row : cases) EXPECT_FALSE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
+}
+
+TEST(LayerRules, A_backend_that_is_named_outside_app_is_found) {
+  const Case cases[] = {
+      {"shell/frmMenu.h", "#include \"forms/qt/QtDesktop.h\""},
+      {"monitor/ProcessTable.h", "#include \"platform/simulated/SimulatedMachine.h\""},
+      {"forms/Desktop.cpp", "#include \"forms/headless/HeadlessDesktop.h\""},
+      {"platform/Machine.h", "#include \"platform/linux/LinuxMachine.h\""},
+      {"forms/headless/HeadlessDesktop.h", "#include \"forms/qt/QtDesktop.h\""},
+      {"platform/simulated/SimulatedMachine.h", "#include \"platform/linux/LinuxMachine.h\""},
+  };
+  for (const Case& row : cases) EXPECT_FALSE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
+}
+
+TEST(LayerRules, A_header_of_a_system_or_toolkit_outside_its_backend_is_found) {
+  const Case cases[] = {
+      {"monitor/ProcessTable.cpp", "#include <unistd.h>"},
+      {"capture/CaptureSession.cpp", "#include <pcap/pcap.h>"},
+      {"shell/frmMenu.cpp", "#include <windows.h>"},
+      {"forms/Form.h", "#include <QWidget>"},
+      {"forms/Form.h", "#include <QtGlobal>"},
+      {"platform/linux/LinuxMachine.cpp", "#include <QSocketNotifier>"},
+      {"forms/qt/QtDesktop.cpp", "#include <sys/socket.h>"},
+      {"forms/headless/HeadlessLoop.cpp", "#include <sys/socket.h>"},
+      {"platform/simulated/SimulatedMachine.cpp", "#include <netinet/in.h>"},
+      {"runtime/Text.cpp", "#include <iconv.h>"},
+      {"app/main_linux.cpp", "#include <QApplication>"},
+      {"runtime/Text.cpp", "#include <string.h>"},
+  };
+  for (const Case& row : cases) EXPECT_FALSE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
+}
+
+TEST(LayerRules, An_include_that_is_not_written_from_src_is_found) {
+  EXPECT_FALSE(IsAllowed("monitor/ProcessTable.cpp", "#include \"ProcessTable.h\""));
+  EXPECT_FALSE(IsAllowed("monitor/ProcessTable.cpp", "#include \"../forms/Form.h\""));
+  EXPECT_FALSE(IsAllowed("monitor/ProcessTable.cpp", "#include HEADER_OF_THE_SYSTEM"));
+  EXPECT_FALSE(IsAllowed("elsewhere/File.h", ""));
+}
+
+TEST(LayerRules, A_condition_on_an_operating_system_above_the_backends_is_found) {
+  const Case cases[] = {
+      {"shell/frmMenu.cpp", "#ifdef _WIN32"},
+      {"runtime/CodePage.cpp", "#if defined(__linux__)"},
+      {"forms/Form.h", "#elif defined(__APPLE__)"},
+      {"capture/clsIP.cpp", "# ifndef Q_OS_WIN"},
+      {"monitor/Rates.cpp", "#if __has_include(<unistd.h>)"},
+      {"app/main_linux.cpp", "#ifdef __unix__"},
+      {"platform/Machine.h", "#ifdef WIN32"},
+      {"platform/Machine.h", "#if defined(linux)"},
+  };
+  for (const Case& row : cases) EXPECT_FALSE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
+}
+
+TEST(LayerRules, Other_conditions_and_those_of_backends_are_allowed) {
+  EXPECT_TRUE(IsAllowed("runtime/Text.cpp", "#if defined(__cpp_lib_to_chars)"));
+  EXPECT_TRUE(IsAllowed("platform/linux/LinuxCapture.cpp", "#ifdef __linux__"));
+  EXPECT_TRUE(IsAllowed("monitor/Rates.cpp", "// the #ifdef _WIN32 of old is gone"));
+}
+
+TEST(LayerRules, A_violation_is_told_with_its_place) {
+  const auto violations = ViolationsOf({"runtime/Text.h", "#pragma once\n\n#include \"forms/Form.h\"\n"});
+
+  ASSERT_EQ(violations.size(), 1U);
+  EXPECT_EQ(violations[0], "runtime/Text.h:3: #include \"forms/Form.h\" goes against the layers");
+}
+
+} // namespace
+} // namespace quendra::architecture
