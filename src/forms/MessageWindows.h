@@ -11,8 +11,8 @@ namespace quendra::forms {
 using WindowHandle = std::uint32_t;
 
 /// What answers the messages that reach a window: window, message, wParam, lParam.
-using WindowProcedure =
-    std::shared_ptr<const std::function<std::int32_t(WindowHandle, std::uint32_t, std::uint32_t, std::uint32_t)>>;
+using WindowProcedure = std::shared_ptr<
+    const std::function<std::int32_t(WindowHandle, std::uint32_t, std::uint32_t, std::uint32_t)>>;
 
 /// Windows that nobody sees: they exist to receive messages, and their procedures can be replaced.
 class MessageWindows {
@@ -28,7 +28,8 @@ class MessageWindows {
   /// The procedure that stood there before.
   WindowProcedure Replace(WindowHandle window, WindowProcedure procedure);
   /// A message reaches the window; one for a window that has gone is lost.
-  std::int32_t Dispatch(WindowHandle window, std::uint32_t message, std::uint32_t wParam, std::uint32_t lParam) const;
+  std::int32_t Dispatch(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
+                        std::uint32_t lParam) const;
   int Count() const { return static_cast<int>(procedures_.size()); }
 
  private:

@@ -9,12 +9,11 @@
 
 namespace quendra::foundation {
 
-/// Leaves new elements without a value: what grows is about to be written, and clearing it first costs as much again.
+/// Leaves new elements without a value: what grows is about to be written, and clearing it first costs as
+/// much again.
 template <typename Element> class UnclearedAllocator : public std::allocator<Element> {
  public:
-  template <typename Other> struct rebind {
-    using other = UnclearedAllocator<Other>;
-  };
+  template <typename Other> struct rebind { using other = UnclearedAllocator<Other>; };
   template <typename Other> void construct(Other* place) noexcept { ::new (static_cast<void*>(place)) Other; }
   template <typename Other, typename... Args> void construct(Other* place, Args&&... args) {
     ::new (static_cast<void*>(place)) Other(std::forward<Args>(args)...);
@@ -30,7 +29,9 @@ class ByteQueue {
   bool IsEmpty() const { return Size() == 0; }
   std::span<const std::uint8_t> Front(std::size_t count) const { return {bytes_.data() + taken_, count}; }
 
-  void Append(std::span<const std::uint8_t> bytes) { bytes_.insert(bytes_.end(), bytes.begin(), bytes.end()); }
+  void Append(std::span<const std::uint8_t> bytes) {
+    bytes_.insert(bytes_.end(), bytes.begin(), bytes.end());
+  }
   /// Room for `count` bytes at the end, without a value yet; what isn't used goes back by `DropLast`.
   std::span<std::uint8_t> Extend(std::size_t count) {
     bytes_.resize(bytes_.size() + count);

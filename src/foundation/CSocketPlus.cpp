@@ -18,7 +18,9 @@ std::int32_t CheckedPort(const Value& port, const char16_t* source) {
 
 } // namespace
 
-CSocketPlus::CSocketPlus(modSocketPlus& module) : module_(module), records_(1) { module_.InitiateProcesses(); }
+CSocketPlus::CSocketPlus(modSocketPlus& module) : module_(module), records_(1) {
+  module_.InitiateProcesses();
+}
 
 CSocketPlus::~CSocketPlus() {
   try {
@@ -38,10 +40,12 @@ void CSocketPlus::Release() {
   module_.FinalizeProcesses();
 }
 
-std::int32_t CSocketPlus::WndProc(forms::WindowHandle, std::uint32_t message, std::uint32_t wParam, std::uint32_t lParam) {
+std::int32_t CSocketPlus::WndProc(forms::WindowHandle, std::uint32_t message, std::uint32_t wParam,
+                                  std::uint32_t lParam) {
   const auto high = static_cast<std::int32_t>(lParam >> 16);
   if (message == modSocketPlus::kResolveMessage) PostResolution(wParam, high);
-  if (message == modSocketPlus::kSocketMessage) PostSocket(wParam, static_cast<std::int32_t>(lParam & 0xFFFF), high);
+  if (message == modSocketPlus::kSocketMessage)
+    PostSocket(wParam, static_cast<std::int32_t>(lParam & 0xFFFF), high);
   return 0;
 }
 
@@ -50,7 +54,8 @@ std::int32_t CSocketPlus::RemotePort(const Value& index) { return At(GetSocketIn
 void CSocketPlus::SetRemotePort(const Value& index, const Value& port) {
   constexpr auto kSource = u"CSocketPlus.RemotePort";
   SocketRecord& record = At(GetSocketIndex(index));
-  if (record.Protocol == sckTCPProtocol && record.State != sckClosed) throw Misuse(kInvalidAtCurrentState, kSource);
+  if (record.Protocol == sckTCPProtocol && record.State != sckClosed)
+    throw Misuse(kInvalidAtCurrentState, kSource);
   record.RemotePort = CheckedPort(port, kSource);
 }
 

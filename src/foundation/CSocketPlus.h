@@ -8,8 +8,9 @@
 
 namespace quendra::foundation {
 
-/// An array of event-driven sockets, told apart by an index of the caller's choice: a 16-bit or 32-bit integer or a text.
-/// Never blocks on the network. Misuse raises numbered faults; failures of the network raise the Error event.
+/// An array of event-driven sockets, told apart by an index of the caller's choice: a 16-bit or 32-bit
+/// integer or a text. Never blocks on the network. Misuse raises numbered faults; failures of the network
+/// raise the Error event.
 class CSocketPlus {
  public:
   explicit CSocketPlus(modSocketPlus& module);
@@ -20,7 +21,8 @@ class CSocketPlus {
   /// Cancels all look-ups, closes all sockets and leaves the module. What fails is raised. Once only.
   void Release();
 
-  std::int32_t WndProc(forms::WindowHandle window, std::uint32_t message, std::uint32_t wParam, std::uint32_t lParam);
+  std::int32_t WndProc(forms::WindowHandle window, std::uint32_t message, std::uint32_t wParam,
+                       std::uint32_t lParam);
 
   std::int32_t RemotePort(const Value& index);
   void SetRemotePort(const Value& index, const Value& port);
@@ -54,14 +56,15 @@ class CSocketPlus {
   void PeekData(const Value& index, Value& data, DataKind kind = DataKind::None, const Value& maxLength = {});
   void SendData(const Value& index, const Value& data);
 
-  /// The events; each has the index first. In Error follow number, description, Scode, source, help file, help context
-  /// and CancelDisplay, which a handler sets to false to have the class show the error in a box.
+  /// The events; each has the index first. In Error follow number, description, Scode, source, help file,
+  /// help context and CancelDisplay, which a handler sets to false to have the class show the error in a box.
   struct EventTable {
     forms::Event<const Value&> CloseSck;
     forms::Event<const Value&> Connect;
     forms::Event<const Value&, platform::SocketHandle> ConnectionRequest;
     forms::Event<const Value&, std::int32_t> DataArrival;
-    forms::Event<const Value&, std::int16_t, const Text&, std::int32_t, const Text&, const Text&, std::int32_t, bool&>
+    forms::Event<const Value&, std::int16_t, const Text&, std::int32_t, const Text&, const Text&,
+                 std::int32_t, bool&>
         Error;
     forms::Event<const Value&> SendComplete;
     forms::Event<const Value&, std::int32_t, std::int32_t> SendProgress;
@@ -88,7 +91,7 @@ class CSocketPlus {
   void ProcessOptions(Slot slot);
   bool BindInternal(Slot slot, const Value& port = {}, const Value& address = {});
   std::uint32_t ResolveBlocking(const Text& host, std::int32_t& error);
-  void ResolveIfHostname(Slot slot);
+  std::uint32_t ResolveIfHostname(Slot slot, const Text& host);
   void PostResolution(std::uint32_t handle, std::int32_t error);
   void ConnectToIP(Slot slot, std::uint32_t address, std::int32_t error);
   void StoreLocalAddress(Slot slot);
@@ -108,7 +111,8 @@ class CSocketPlus {
   void SendBufferedData(Slot slot);
   void SendBufferedDataUDP(Slot slot);
   std::int32_t RecvDataToBuffer(Slot slot);
-  void TakeData(const Value& index, Value& data, DataKind kind, const Value& maxLength, bool peek, const char16_t* source);
+  void TakeData(const Value& index, Value& data, DataKind kind, const Value& maxLength, bool peek,
+                const char16_t* source);
   void RecvData(Slot slot, Value& data, DataKind kind, std::int32_t maxLength, bool bounded, bool peek);
   ByteArray TakeBytes(Slot slot, std::size_t count, bool peek);
   std::int32_t AmountWaiting(Slot slot);

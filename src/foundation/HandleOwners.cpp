@@ -5,7 +5,8 @@
 namespace quendra::foundation {
 
 std::vector<HandleOwners::Entry>::iterator HandleOwners::Find(std::uint32_t handle) {
-  return std::find_if(entries_.begin(), entries_.end(), [&](const Entry& entry) { return entry.handle == handle; });
+  return std::find_if(entries_.begin(), entries_.end(),
+                      [&](const Entry& entry) { return entry.handle == handle; });
 }
 
 void HandleOwners::Add(std::uint32_t handle, CSocketPlus* owner) {

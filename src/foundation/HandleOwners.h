@@ -7,8 +7,8 @@ namespace quendra::foundation {
 
 class CSocketPlus;
 
-/// A pair of parallel arrays from 1: handles and the objects that own them. Grows and never shrinks while the dispatcher
-/// lives; an entry that was freed holds -1 and nothing, and takes the next pair.
+/// A pair of parallel arrays from 1: handles and the objects that own them. Grows and never shrinks while the
+/// dispatcher lives; an entry that was freed holds -1 and nothing, and takes the next pair.
 class HandleOwners {
  public:
   static constexpr std::uint32_t kFree = 0xFFFFFFFF;

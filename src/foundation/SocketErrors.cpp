@@ -65,7 +65,8 @@ constexpr ErrorText kMisuses[] = {
     {kUnknownIndex, u"Unknown index."},
 };
 
-template <std::size_t count> const ErrorText* FindError(const ErrorText (&table)[count], std::int32_t number) {
+template <std::size_t count>
+const ErrorText* FindError(const ErrorText (&table)[count], std::int32_t number) {
   const auto found = std::find_if(std::begin(table), std::end(table),
                                   [&](const ErrorText& row) { return row.number == number; });
   return found == std::end(table) ? nullptr : found;
@@ -78,7 +79,9 @@ Text SystemErrorText(std::int32_t number) {
   return row ? row->text : u"Unknown error.";
 }
 
-Fault SystemError(std::int32_t number, Text source) { return Fault(number, SystemErrorText(number), std::move(source)); }
+Fault SystemError(std::int32_t number, Text source) {
+  return Fault(number, SystemErrorText(number), std::move(source));
+}
 
 Fault Misuse(SocketMisuse number, Text source) {
   return Fault(number, FindError(kMisuses, number)->text, std::move(source));

@@ -13,7 +13,7 @@ enum SocketState : std::int32_t {
   sckClosed = 0,
   sckOpen = 1,
   sckListening = 2,
-  sckConnectionPending = 3,  ///< never entered
+  sckConnectionPending = 3, ///< never entered
   sckResolvingHost = 4,
   sckHostResolved = 5,
   sckConnecting = 6,
@@ -44,7 +44,7 @@ struct SocketRecord {
   ByteQueue RecvBuffer;
   std::int32_t SendBufferSize = 0;
   std::int32_t RecvBufferSize = 0;
-  std::vector<std::uint32_t> ResolveRequests;  ///< look-up handles under way
+  std::vector<std::uint32_t> ResolveRequests; ///< look-up handles under way
   Value Index;
 
   /// What a slot is set to before it waits in the free list: its ports are -1 then, where a new slot's are 0.

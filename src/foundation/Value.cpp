@@ -36,9 +36,10 @@ struct NumberReader {
 } // namespace
 
 DataKind KindOf(const Value& value) {
-  static constexpr DataKind kKinds[] = {DataKind::None,     DataKind::Other, DataKind::Boolean, DataKind::Byte,
-                                        DataKind::Integer,  DataKind::Long,  DataKind::Single,  DataKind::Double,
-                                        DataKind::Currency, DataKind::Date,  DataKind::String,  DataKind::ByteArray};
+  static constexpr DataKind kKinds[] = {DataKind::None,   DataKind::Other,   DataKind::Boolean,
+                                        DataKind::Byte,   DataKind::Integer, DataKind::Long,
+                                        DataKind::Single, DataKind::Double,  DataKind::Currency,
+                                        DataKind::Date,   DataKind::String,  DataKind::ByteArray};
   static_assert(std::size(kKinds) == std::variant_size_v<Value>);
   return kKinds[value.index()];
 }

@@ -21,15 +21,28 @@ struct Date {
   friend bool operator==(const Date&, const Date&) = default;
 };
 
-/// A value of any kind that the language's variables hold; starts empty. What the socket class takes for an index, for
-/// arguments that callers may leave out or get wrong, and for data.
-using Value = std::variant<std::monostate, Null, bool, std::uint8_t, std::int16_t, std::int32_t, float, double, Currency,
-                           Date, Text, ByteArray>;
+/// A value of any kind that the language's variables hold; starts empty. What the socket class takes for an
+/// index, for arguments that callers may leave out or get wrong, and for data.
+using Value = std::variant<std::monostate, Null, bool, std::uint8_t, std::int16_t, std::int32_t, float,
+                           double, Currency, Date, Text, ByteArray>;
 
 inline bool IsEmpty(const Value& value) { return std::holds_alternative<std::monostate>(value); }
 
 /// The kinds of data that can be asked for.
-enum class DataKind { None, Boolean, Byte, Currency, Date, Double, Integer, Long, Single, String, ByteArray, Other };
+enum class DataKind {
+  None,
+  Boolean,
+  Byte,
+  Currency,
+  Date,
+  Double,
+  Integer,
+  Long,
+  Single,
+  String,
+  ByteArray,
+  Other
+};
 
 /// The kind of a value's own type; None for an empty value, Other for one that no data is read into.
 DataKind KindOf(const Value& value);

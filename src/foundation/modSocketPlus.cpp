@@ -9,7 +9,8 @@ namespace {
 constexpr std::uint16_t kVersion11 = 257;
 } // namespace
 
-modSocketPlus::modSocketPlus(platform::Sockets& sockets, platform::HostNames& hostNames, forms::MessageWindows& windows)
+modSocketPlus::modSocketPlus(platform::Sockets& sockets, platform::HostNames& hostNames,
+                             forms::MessageWindows& windows)
     : sockets_(sockets), hostNames_(hostNames), windows_(windows) {}
 
 modSocketPlus::~modSocketPlus() = default;
@@ -61,7 +62,8 @@ bool modSocketPlus::IsSocketRegistered(platform::SocketHandle socket) const {
   return registeredSockets_ && registeredSockets_->contains(socket);
 }
 
-std::uint32_t modSocketPlus::StartResolve(const Text& name, std::span<std::uint8_t> buffer, CSocketPlus* owner) {
+std::uint32_t modSocketPlus::StartResolve(const Text& name, std::span<std::uint8_t> buffer,
+                                          CSocketPlus* owner) {
   const std::uint32_t handle =
       sockets_.WSAAsyncGetHostByName(socketWindow_, kResolveMessage, ToCodePage(name), buffer);
   if (handle != 0) RegisterResolve(handle, owner);
@@ -75,7 +77,9 @@ void modSocketPlus::RegisterAccept(platform::SocketHandle socket) {
   pendingAccepts_[socket] = std::move(pending);
 }
 
-bool modSocketPlus::IsAcceptRegistered(platform::SocketHandle socket) const { return pendingAccepts_.contains(socket); }
+bool modSocketPlus::IsAcceptRegistered(platform::SocketHandle socket) const {
+  return pendingAccepts_.contains(socket);
+}
 
 void modSocketPlus::UnregisterAccept(platform::SocketHandle socket) {
   // Out of the list before it ends: ending it comes back here by way of the class count.
@@ -106,15 +110,15 @@ void modSocketPlus::AttachDispatcher() {
   subclassedWindow_ = socketWindow_;
   previousWindowProc_ = previous;
   using Procedure = forms::WindowProcedure::element_type;
-  windows_.Replace(socketWindow_, std::make_shared<Procedure>([this, previous](forms::WindowHandle window,
-                                                                               std::uint32_t message,
-                                                                               std::uint32_t wParam,
-                                                                               std::uint32_t lParam) {
-    CSocketPlus* owner = nullptr;
-    if (message == kResolveMessage) owner = resolves_.OwnerOf(wParam);
-    if (message == kSocketMessage) owner = socketOwners_.OwnerOf(wParam);
-    return owner ? owner->WndProc(window, message, wParam, lParam) : (*previous)(window, message, wParam, lParam);
-  }));
+  windows_.Replace(socketWindow_, std::make_shared<Procedure>(
+                                      [this, previous](forms::WindowHandle window, std::uint32_t message,
+                                                       std::uint32_t wParam, std::uint32_t lParam) {
+                                        CSocketPlus* owner = nullptr;
+                                        if (message == kResolveMessage) owner = resolves_.OwnerOf(wParam);
+                                        if (message == kSocketMessage) owner = socketOwners_.OwnerOf(wParam);
+                                        return owner ? owner->WndProc(window, message, wParam, lParam)
+                                                     : (*previous)(window, message, wParam, lParam);
+                                      }));
 }
 
 void modSocketPlus::DetachDispatcher() {

@@ -15,8 +15,9 @@ namespace quendra::foundation {
 
 class CSocketPlus;
 
-/// What all socket objects of the program share: the library's start and end, the one hidden window, the tables that tell
-/// which object owns which socket or look-up, and the dispatcher from window messages to those objects.
+/// What all socket objects of the program share: the library's start and end, the one hidden window, the
+/// tables that tell which object owns which socket or look-up, and the dispatcher from window messages to
+/// those objects.
 class modSocketPlus {
  public:
   static constexpr std::uint32_t kResolveMessage = 32768;
@@ -35,7 +36,9 @@ class modSocketPlus {
   void UnregisterResolve(std::uint32_t handle) { resolves_.Remove(handle); }
   /// The look-up's handle, 0 on failure.
   std::uint32_t StartResolve(const Text& name, std::span<std::uint8_t> buffer, CSocketPlus* owner);
-  void ChangeSocketOwner(platform::SocketHandle socket, CSocketPlus* owner) { socketOwners_.ChangeOwner(socket, owner); }
+  void ChangeSocketOwner(platform::SocketHandle socket, CSocketPlus* owner) {
+    socketOwners_.ChangeOwner(socket, owner);
+  }
 
   /// The pending list: connections accepted by the system that nobody has taken yet.
   void RegisterAccept(platform::SocketHandle socket);

@@ -8,7 +8,8 @@ namespace {
 
 constexpr std::uint32_t kNoAddress = 0xFFFFFFFF;
 
-/// One part in decimal, octal (leading 0) or hexadecimal (leading 0x), as the library reads them; -1 when it is none.
+/// One part in decimal, octal (leading 0) or hexadecimal (leading 0x), as the library reads them; -1 when it
+/// is none.
 std::int64_t TakePart(std::string_view& text) {
   unsigned base = 10;
   if (text.starts_with("0x") || text.starts_with("0X")) {
@@ -45,8 +46,9 @@ std::uint32_t Sockets::inet_addr(const std::string& dotted) {
     if (value > (last ? (std::int64_t{1} << bits) - 1 : 255)) return kNoAddress;
     address |= static_cast<std::uint32_t>(last ? value : value << (bits - 8));
     if (last) {
-      const std::uint8_t bytes[4] = {static_cast<std::uint8_t>(address >> 24), static_cast<std::uint8_t>(address >> 16),
-                                     static_cast<std::uint8_t>(address >> 8), static_cast<std::uint8_t>(address)};
+      const std::uint8_t bytes[4] = {
+          static_cast<std::uint8_t>(address >> 24), static_cast<std::uint8_t>(address >> 16),
+          static_cast<std::uint8_t>(address >> 8), static_cast<std::uint8_t>(address)};
       std::memcpy(&address, bytes, sizeof address);
       return address;
     }

@@ -32,14 +32,15 @@ struct SocketAddress {
   friend bool operator==(const SocketAddress&, const SocketAddress&) = default;
 };
 
-/// Winsock 1.1 with its notification by window messages. Numbers that fail give kSocketError (or kNoSocket) and leave
-/// the reason for WSAGetLastError. A machine without a network answers as these defaults do.
+/// Winsock 1.1 with its notification by window messages. Numbers that fail give kSocketError (or kNoSocket)
+/// and leave the reason for WSAGetLastError. A machine without a network answers as these defaults do.
 ///
-/// WSAAsyncSelect makes the socket non-blocking and announces each event of the mask as the message, with the socket as
-/// wParam, the event in the low and an error number in the high word of lParam. An event is announced once until the
-/// call that re-enables it: FD_READ until recv or recvfrom (and again at once while data remains), FD_WRITE after the
-/// connection and after a send that was refused with kWouldBlock, FD_ACCEPT until accept (again while connections
-/// wait), FD_CONNECT once, FD_CLOSE once, after the last data was read. An accepted socket has its listener's selection.
+/// WSAAsyncSelect makes the socket non-blocking and announces each event of the mask as the message, with the
+/// socket as wParam, the event in the low and an error number in the high word of lParam. An event is
+/// announced once until the call that re-enables it: FD_READ until recv or recvfrom (and again at once while
+/// data remains), FD_WRITE after the connection and after a send that was refused with kWouldBlock, FD_ACCEPT
+/// until accept (again while connections wait), FD_CONNECT once, FD_CLOSE once, after the last data was read.
+/// An accepted socket has its listener's selection.
 class Sockets {
  public:
   virtual ~Sockets() = default;
@@ -90,11 +91,12 @@ class Sockets {
 
   virtual std::int32_t WSAAsyncSelect(SocketHandle socket, std::uint32_t window, std::uint32_t message,
                                       std::int32_t events) = 0;
-  /// Starts a look-up and gives its handle, 0 on failure. When it ends the window gets the message with the handle as
-  /// wParam and an error number in the high word of lParam; without an error `buffer` starts with the count of the
-  /// name's addresses (32 bits, host order) and the addresses as they lie in memory.
+  /// Starts a look-up and gives its handle, 0 on failure. When it ends the window gets the message with the
+  /// handle as wParam and an error number in the high word of lParam; without an error `buffer` starts with
+  /// the count of the name's addresses (32 bits, host order) and the addresses as they lie in memory.
   virtual std::uint32_t WSAAsyncGetHostByName(std::uint32_t /*window*/, std::uint32_t /*message*/,
-                                              const std::string& /*name*/, std::span<std::uint8_t> /*buffer*/) {
+                                              const std::string& /*name*/,
+                                              std::span<std::uint8_t> /*buffer*/) {
     return 0;
   }
   /// 0 when the look-up was under way: its message will not come and its buffer is not touched any more.

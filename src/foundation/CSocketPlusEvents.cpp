@@ -1,0 +1,152 @@
+#include "foundation/CSocketPlus.h"
+#include "foundation/SocketErrors.h"
+#include "foundation/SocketTexts.h"
+
+#include "runtime/Integers.h"
+
+#include <array>
+
+namespace quendra::foundation {
+
+bool CSocketPlus::StillHolds(const Life& life, Slot slot, platform::SocketHandle socket) const {
+  return !life.expired() && slot < records_.size() && records_[slot].SocketHandle == socket;
+}
+
+void CSocketPlus::PostSocket(platform::SocketHandle socket, std::int32_t event, std::int32_t error) {
+  const auto found = slotsBySocket_.find(socket);
+  if (found == slotsBySocket_.end()) return;
+  const Slot slot = found->second;
+  if (error != 0) return Fail(slot, error, u"CSocketPlus.PostSocket");
+  switch (event) {
+  case platform::kFdRead: return OnRead(slot);
+  case platform::kFdWrite:
+    if (At(slot).State == sckConnected && !At(slot).SendBuffer.IsEmpty()) SendBufferedData(slot);
+    return;
+  case platform::kFdAccept: return OnAccept(slot);
+  case platform::kFdConnect: return OnConnect(slot);
+  case platform::kFdClose: return OnClose(slot);
+  default: return;
+  }
+}
+
+void CSocketPlus::OnRead(Slot slot) {
+  if (At(slot).Protocol == sckUDPProtocol) {
+    if (At(slot).State == sckOpen) OnReadUDP(slot);
+    return;
+  }
+  if (At(slot).State != sckConnected || RecvDataToBuffer(slot) <= 0) return;
+  const Value index = At(slot).Index;
+  Events.DataArrival(index, ::quendra::ToInt32(static_cast<std::int64_t>(At(slot).RecvBuffer.Size())));
+}
+
+void CSocketPlus::OnReadUDP(Slot slot) {
+  const Life life = life_;
+  const platform::SocketHandle socket = At(slot).SocketHandle;
+  const std::int32_t waiting = AmountWaiting(slot);
+  if (waiting > 0) {
+    const Value index = At(slot).Index;
+    Events.DataArrival(index, waiting);
+  }
+  if (!StillHolds(life, slot, socket)) return;
+  // A datagram that the handler left unread would announce nothing behind it: it goes.
+  std::array<std::uint8_t, 1> byte{};
+  module_.Library().recv(socket, byte, 0);
+}
+
+void CSocketPlus::OnConnect(Slot slot) {
+  if (At(slot).State != sckConnecting) return;
+  StoreLocalAddress(slot);
+  StorePeerAddress(slot);
+  At(slot).State = sckConnected;
+  const Value index = At(slot).Index;
+  Events.Connect(index);
+}
+
+void CSocketPlus::OnClose(Slot slot) {
+  if (At(slot).State != sckConnected) return;
+  At(slot).State = sckClosing;
+  const Value index = At(slot).Index;
+  Events.CloseSck(index);
+}
+
+void CSocketPlus::OnAccept(Slot slot) {
+  if (At(slot).State != sckListening) return;
+  const platform::SocketHandle accepted = module_.Library().accept(At(slot).SocketHandle);
+  if (accepted == platform::kNoSocket)
+    return Fail(slot, module_.Library().WSAGetLastError(), u"CSocketPlus.PostSocket");
+  module_.RegisterAccept(accepted);
+  const Life life = life_;
+  modSocketPlus& module = module_;
+  OfferConnection(slot, accepted);
+  if (!module.IsAcceptRegistered(accepted)) return;
+  module.Library().closesocket(accepted);
+  module.UnregisterSocket(accepted);
+  module.UnregisterAccept(accepted);
+}
+
+void CSocketPlus::OfferConnection(Slot slot, platform::SocketHandle accepted) {
+  const Life life = life_;
+  const platform::SocketHandle listener = At(slot).SocketHandle;
+  const std::int32_t port = At(slot).RemotePort;
+  const Text address = At(slot).RemoteHostIP;
+  const Text host = At(slot).RemoteHost;
+  platform::SocketAddress peer;
+  module_.Library().getpeername(accepted, peer);
+  At(slot).RemotePort = peer.port;
+  At(slot).RemoteHostIP = DottedAddress(peer.address);
+  At(slot).RemoteHost.clear();
+  const Value index = At(slot).Index;
+  Events.ConnectionRequest(index, accepted);
+  if (!StillHolds(life, slot, listener) || At(slot).State != sckListening) return;
+  At(slot).RemotePort = port;
+  At(slot).RemoteHostIP = address;
+  At(slot).RemoteHost = host;
+}
+
+void CSocketPlus::Accept(const Value& index, platform::SocketHandle requestID) {
+  const Slot slot = GetSocketIndex(index);
+  if (At(slot).State != sckClosed) throw Misuse(kInvalidAtCurrentState, u"CSocketPlus.Accept");
+  At(slot).SocketHandle = requestID;
+  At(slot).Protocol = sckTCPProtocol;
+  ProcessOptions(slot);
+  if (module_.IsAcceptRegistered(requestID)) return TakePending(slot, requestID);
+  if (module_.IsSocketRegistered(requestID)) {
+    At(slot).SocketHandle = platform::kNoSocket;
+    At(slot).RecvBufferSize = At(slot).SendBufferSize = 0;
+    throw Misuse(kWrongProtocolOrState, u"CSocketPlus.Accept");
+  }
+  // Nobody knows this socket: the object is the one that holds it until somebody takes it. It keeps the
+  // selection of the listener, so data that comes early is gathered here.
+  acceptClass_ = true;
+  At(slot).State = sckConnected;
+  StoreLocalAddress(slot);
+  slotsBySocket_[requestID] = slot;
+  module_.RegisterSocket(requestID, this, false);
+}
+
+void CSocketPlus::TakePending(Slot slot, platform::SocketHandle requestID) {
+  const Life life = life_;
+  const Value pendingIndex = Text(u"Temporal_Socket");
+  CSocketPlus& pending = *module_.GetAcceptClass(requestID);
+  StoreLocalAddress(slot);
+  StorePeerAddress(slot);
+  At(slot).State = sckConnected;
+  if (pending.BytesReceived(pendingIndex) > 0) {
+    Value data;
+    pending.GetData(pendingIndex, data, DataKind::ByteArray);
+    At(slot).RecvBuffer.Append(std::get<ByteArray>(data));
+  }
+  const bool peerClosed = pending.State(pendingIndex) == sckClosing;
+  slotsBySocket_[requestID] = slot;
+  module_.ChangeSocketOwner(requestID, this);
+  module_.UnregisterAccept(requestID);
+
+  const Value index = At(slot).Index;
+  if (!At(slot).RecvBuffer.IsEmpty())
+    Events.DataArrival(index, ::quendra::ToInt32(static_cast<std::int64_t>(At(slot).RecvBuffer.Size())));
+  if (!peerClosed || !StillHolds(life, slot, requestID)) return;
+  At(slot).State = sckClosing;
+  Events.CloseSck(index);
+}
+
+} // namespace quendra::foundation

@@ -1,0 +1,213 @@
+#include "foundation/CSocketPlus.h"
+#include "foundation/SocketErrors.h"
+#include "foundation/SocketTexts.h"
+
+#include <algorithm>
+#include <cstring>
+#include <new>
+
+namespace quendra::foundation {
+
+namespace {
+
+constexpr std::int32_t kInternetFamily = 2;
+constexpr std::int32_t kStream = 1;
+constexpr std::int32_t kDatagram = 2;
+constexpr std::int32_t kTcp = 6;
+constexpr std::int32_t kUdp = 17;
+
+constexpr std::int32_t kSocketLevel = 0xFFFF;
+constexpr std::int32_t kBroadcast = 0x20;
+constexpr std::int32_t kSendBufferOption = 0x1001;
+constexpr std::int32_t kReceiveBufferOption = 0x1002;
+constexpr std::int32_t kMaxMessageSize = 0x2003;
+
+constexpr std::uint32_t kNoAddress = 0xFFFFFFFF;
+/// In place of an address: the look-up is under way. An address of this very value is taken for it too.
+constexpr std::uint32_t kLookUpRunning = 1;
+constexpr std::size_t kResolveBufferSize = 1024;
+constexpr std::int32_t kListenBacklog = 5;
+
+std::uint32_t WordAt(const ResolveBuffer& buffer, std::size_t offset) {
+  std::uint32_t word = 0;
+  std::memcpy(&word, buffer.data() + offset, sizeof word);
+  return word;
+}
+
+std::int32_t PortArgument(const Value& port, std::int32_t lowest, const char16_t* source) {
+  if (!IsNumeric(port)) throw Misuse(kUnsupportedType, source);
+  const std::int32_t number = ToInt32(port);
+  if (number < lowest || number > 65535) throw Misuse(kInvalidArgumentFault, source);
+  return number;
+}
+
+} // namespace
+
+void CSocketPlus::Connect(const Value& index, const Value& remoteHost, const Value& remotePort) {
+  constexpr auto kSource = u"CSocketPlus.Connect";
+  const Slot slot = GetSocketIndex(index);
+  if (At(slot).State != sckClosed) throw Misuse(kInvalidAtCurrentState, kSource);
+  const bool isNull = std::holds_alternative<Null>(remoteHost);
+  if (!IsEmpty(remoteHost)) At(slot).RemoteHost = isNull ? Text{} : ToText(remoteHost);
+  if (!IsEmpty(remotePort)) At(slot).RemotePort = PortArgument(remotePort, 1, kSource);
+  if (!SocketExists(slot)) return;
+  if (!BindInternal(slot)) return;
+  if (At(slot).Protocol == sckUDPProtocol) {
+    At(slot).State = sckOpen;
+    return;
+  }
+  const std::uint32_t address = ResolveIfHostname(slot, At(slot).RemoteHost);
+  if (address != kLookUpRunning) ConnectToIP(slot, address, 0);
+}
+
+void CSocketPlus::Bind(const Value& index, const Value& localPort, const Value& localIP) {
+  const Slot slot = GetSocketIndex(index);
+  if (At(slot).State != sckClosed) throw Misuse(kInvalidAtCurrentState, u"CSocketPlus.Bind");
+  if (BindInternal(slot, localPort, localIP)) At(slot).State = sckOpen;
+}
+
+void CSocketPlus::Listen(const Value& index) {
+  constexpr auto kSource = u"CSocketPlus.Listen";
+  const Slot slot = GetSocketIndex(index);
+  if (At(slot).State != sckClosed && At(slot).State != sckOpen) throw Misuse(kInvalidAtCurrentState, kSource);
+  if (!SocketExists(slot)) return;
+  if (!BindInternal(slot)) return;
+  if (module_.Library().listen(At(slot).SocketHandle, kListenBacklog) == platform::kSocketError)
+    throw SystemError(module_.Library().WSAGetLastError(), kSource);
+  At(slot).State = sckListening;
+}
+
+bool CSocketPlus::SocketExists(Slot slot) {
+  if (At(slot).SocketHandle != platform::kNoSocket) return true;
+  const bool tcp = At(slot).Protocol == sckTCPProtocol;
+  const platform::SocketHandle socket =
+      module_.Library().socket(kInternetFamily, tcp ? kStream : kDatagram, tcp ? kTcp : kUdp);
+  if (socket == platform::kNoSocket) {
+    Fail(slot, module_.Library().WSAGetLastError(), u"CSocketPlus.SocketExists");
+    return false;
+  }
+  slotsBySocket_[socket] = slot;
+  At(slot).SocketHandle = socket;
+  ProcessOptions(slot);
+  return module_.RegisterSocket(socket, this, true);
+}
+
+void CSocketPlus::ProcessOptions(Slot slot) {
+  platform::Sockets& library = module_.Library();
+  SocketRecord& record = At(slot);
+  const auto read = [&](std::int32_t option, std::int32_t& value) {
+    if (library.getsockopt(record.SocketHandle, kSocketLevel, option, value) == platform::kSocketError)
+      throw SystemError(library.WSAGetLastError(), u"CSocketPlus.ProcessOptions");
+  };
+  if (record.Protocol == sckUDPProtocol) {
+    library.setsockopt(record.SocketHandle, kSocketLevel, kBroadcast, 1);
+    read(kMaxMessageSize, record.RecvBufferSize);
+    record.SendBufferSize = record.RecvBufferSize;
+  } else {
+    read(kReceiveBufferOption, record.RecvBufferSize);
+    read(kSendBufferOption, record.SendBufferSize);
+  }
+}
+
+bool CSocketPlus::BindInternal(Slot slot, const Value& port, const Value& address) {
+  constexpr auto kSource = u"CSocketPlus.BindInternal";
+  if (At(slot).State == sckOpen) return true;
+  const std::int32_t wanted = IsEmpty(port) ? At(slot).LocalPort : PortArgument(port, 0, kSource);
+  const Text host = IsEmpty(address) ? Text{} : ToText(address);
+  platform::SocketAddress local;
+  local.port = static_cast<std::uint16_t>(wanted);
+  if (!host.empty()) {
+    std::int32_t error = 0;
+    local.address = ResolveBlocking(host, error);
+    if (error != 0) throw Fault(kInvalidArgumentFault, u"Invalid argument", kSource);
+  }
+  if (!SocketExists(slot)) return false;
+  if (module_.Library().bind(At(slot).SocketHandle, local) == platform::kSocketError)
+    throw SystemError(module_.Library().WSAGetLastError(), kSource);
+  if (wanted != 0) {
+    At(slot).LocalPort = wanted;
+  } else {
+    platform::SocketAddress bound;
+    module_.Library().getsockname(At(slot).SocketHandle, bound);
+    At(slot).LocalPortBind = bound.port;
+  }
+  return true;
+}
+
+std::uint32_t CSocketPlus::ResolveBlocking(const Text& host, std::int32_t& error) {
+  error = 0;
+  const std::string name = ToCodePage(host);
+  const std::uint32_t address = platform::Sockets::inet_addr(name);
+  if (address != kNoAddress) return address;
+  const auto addresses = module_.Names().gethostbyname(name);
+  if (addresses && !addresses->empty()) return addresses->front();
+  error = module_.Library().WSAGetLastError();
+  if (error == 0) error = platform::kHostNotFound;
+  return kNoAddress;
+}
+
+std::uint32_t CSocketPlus::ResolveIfHostname(Slot slot, const Text& host) {
+  constexpr auto kSource = u"CSocketPlus.ResolveIfHostname";
+  const std::uint32_t address = platform::Sockets::inet_addr(ToCodePage(host));
+  if (address != kNoAddress) return address;
+  At(slot).State = sckResolvingHost;
+  try {
+    At(slot).LookUpBuffer = std::make_unique<ResolveBuffer>(kResolveBufferSize);
+  } catch (const std::bad_alloc&) {
+    At(slot).State = sckError;
+    throw Fault(Fault::kOutOfMemory, u"Out of memory", kSource);
+  }
+  const std::uint32_t handle = module_.StartResolve(host, *At(slot).LookUpBuffer, this);
+  if (handle != 0) {
+    At(slot).ResolveRequests.push_back(handle);
+    slotsByResolve_[handle] = slot;
+  } else {
+    At(slot).LookUpBuffer.reset();
+    Fail(slot, module_.Library().WSAGetLastError(), kSource);
+  }
+  return kLookUpRunning;
+}
+
+void CSocketPlus::PostResolution(std::uint32_t handle, std::int32_t error) {
+  const auto found = slotsByResolve_.find(handle);
+  if (found == slotsByResolve_.end()) return;
+  const Slot slot = found->second;
+  slotsByResolve_.erase(found);
+  std::erase(At(slot).ResolveRequests, handle);
+  module_.UnregisterResolve(handle);
+  if (At(slot).State != sckResolvingHost) return;
+  const auto buffer = std::exchange(At(slot).LookUpBuffer, nullptr);
+  if (error == 0 && (!buffer || WordAt(*buffer, 0) == 0)) error = platform::kHostNotFound;
+  if (error != 0) return ConnectToIP(slot, kLookUpRunning, error);
+  At(slot).State = sckHostResolved;
+  ConnectToIP(slot, WordAt(*buffer, sizeof(std::uint32_t)), 0);
+}
+
+void CSocketPlus::ConnectToIP(Slot slot, std::uint32_t address, std::int32_t error) {
+  constexpr auto kSource = u"CSocketPlus.ConnectToIP";
+  if (error != 0) return Fail(slot, error, kSource);
+  At(slot).State = sckConnecting;
+  const platform::SocketAddress peer{address, static_cast<std::uint16_t>(At(slot).RemotePort)};
+  if (module_.Library().connect(At(slot).SocketHandle, peer) != platform::kSocketError) return;
+  const std::int32_t reason = module_.Library().WSAGetLastError();
+  if (reason == platform::kWouldBlock) return;
+  if (reason == platform::kAddressNotAvailable) throw SystemError(reason, kSource);
+  Fail(slot, reason, kSource);
+}
+
+void CSocketPlus::StoreLocalAddress(Slot slot) {
+  platform::SocketAddress local;
+  module_.Library().getsockname(At(slot).SocketHandle, local);
+  At(slot).LocalPortBind = local.port;
+  At(slot).LocalIP = DottedAddress(local.address);
+}
+
+void CSocketPlus::StorePeerAddress(Slot slot) {
+  platform::SocketAddress peer;
+  module_.Library().getpeername(At(slot).SocketHandle, peer);
+  At(slot).RemotePort = peer.port;
+  At(slot).RemoteHostIP = DottedAddress(peer.address);
+  At(slot).RemoteHost.clear();
+}
+
+} // namespace quendra::foundation
