@@ -2,6 +2,7 @@
 
 #include "forms/Controls.h"
 #include "forms/Form.h"
+#include "forms/MessageWindows.h"
 
 #include <functional>
 
@@ -25,7 +26,6 @@ enum BoxFlags : int {
   kHebrewBox = kRightAligned | kRightToLeft,
 };
 
-using WindowHandle = std::uint32_t;
 using RegionHandle = std::uint32_t;
 using CursorHandle = std::uint32_t;
 
@@ -54,6 +54,9 @@ class Desktop {
   virtual int MessageBox(const Text& text, int flags, const Text& title) = 0;
   /// Handles what waits in the message queue, then returns. Cheap when nothing waits.
   virtual void DoEvents() = 0;
+
+  /// The windows that exist for their messages alone.
+  MessageWindows Windows;
 
   // Mouse, window shape and messages.
 

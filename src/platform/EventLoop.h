@@ -1,12 +1,13 @@
 #pragma once
 
+#include <cstdint>
 #include <functional>
 #include <memory>
 
 namespace quendra::platform {
 
-/// The one loop from which events come, implemented by the desktop. Handlers run on its thread, one at a time save that a
-/// handler that pumps lets others run inside it.
+/// The one loop from which events come, implemented by the desktop. Handlers run on its thread, one at a time
+/// save that a handler that pumps lets others run inside it.
 class EventLoop {
  public:
   virtual ~EventLoop() = default;
@@ -19,9 +20,15 @@ class EventLoop {
 
   /// Runs `work` from the loop, behind what is posted already. May be called from any thread.
   virtual void Post(std::function<void()> work) = 0;
+  /// Puts a window message behind what is posted already: window, message, wParam, lParam. May be called from
+  /// any thread. A loop without windows loses it, as one for a window that has gone is lost.
+  virtual void PostMessage(std::uint32_t /*window*/, std::uint32_t /*message*/, std::uint32_t /*wParam*/,
+                           std::uint32_t /*lParam*/) {}
   /// Calls `ready` whenever the descriptor can be read, again as long as it can.
-  [[nodiscard]] virtual std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) = 0;
-  [[nodiscard]] virtual std::unique_ptr<Subscription> StartTimer(int milliseconds, std::function<void()> tick) = 0;
+  [[nodiscard]] virtual std::unique_ptr<Subscription> WatchDescriptor(int descriptor,
+                                                                      std::function<void()> ready) = 0;
+  [[nodiscard]] virtual std::unique_ptr<Subscription> StartTimer(int milliseconds,
+                                                                 std::function<void()> tick) = 0;
   /// Handles what waits, without waiting for more.
   virtual void PumpOnce() = 0;
 };

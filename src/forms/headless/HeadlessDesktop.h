@@ -17,6 +17,11 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   HeadlessDesktop();
   ~HeadlessDesktop() override;
 
+  void PostMessage(std::uint32_t window, std::uint32_t message, std::uint32_t wParam,
+                   std::uint32_t lParam) override {
+    Post([=, this] { Windows.Dispatch(window, message, wParam, lParam); });
+  }
+
   /// Pixels: how wide each character and how high each line is in any font.
   static constexpr int CharacterWidth = 8;
   static constexpr int LineHeight = 16;
@@ -140,7 +145,8 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   RegionHandle lastRegion_ = 0;
   std::unordered_map<const PictureBox*, std::vector<std::string>> drawings_;
   mutable std::map<std::string, Picture> images_;
-  std::unordered_map<const Form*, std::unique_ptr<FormView>> views_;  // last: a view that goes drops its drawings
+  std::unordered_map<const Form*, std::unique_ptr<FormView>>
+      views_; // last: a view that goes drops its drawings
 };
 
 } // namespace quendra::forms

@@ -64,6 +64,10 @@ class QtDesktop : public Desktop, public platform::EventLoop {
   Picture ImageOf(const PictureBox& box) const override { return drawing_.ImageOf(box); }
 
   void Post(std::function<void()> work) override { loop_.Post(std::move(work)); }
+  void PostMessage(std::uint32_t window, std::uint32_t message, std::uint32_t wParam,
+                   std::uint32_t lParam) override {
+    Post([=, this] { Windows.Dispatch(window, message, wParam, lParam); });
+  }
   std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override {
     return loop_.WatchDescriptor(descriptor, std::move(ready));
   }
