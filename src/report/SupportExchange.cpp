@@ -1,0 +1,141 @@
+#include "report/SupportExchange.h"
+
+#include "report/SupportRequests.h"
+#include "runtime/Settings.h"
+
+namespace quendra::report {
+
+using foundation::Value;
+
+namespace {
+
+constexpr std::int16_t kProcsPage = 1;
+constexpr std::int16_t kNumber = 2;
+constexpr std::int16_t kReport = 3;
+constexpr std::int16_t kLoad = 4;
+constexpr std::int16_t kWebPort = 80;
+
+constexpr const char16_t* kHebrewTitle = u"זלמר בינלאומי@נט";
+constexpr const char16_t* kDefaultTitle = u"Quendra";
+
+std::int16_t NumberOfIndex(const Value& index) {
+  const auto* number = std::get_if<std::int16_t>(&index);
+  return number ? *number : std::int16_t{0};
+}
+
+} // namespace
+
+SupportExchange::SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop,
+                                 forms::ListView& main_ListView1, monitor::ProcessTable& table,
+                                 forms::Timer& main_Timer1)
+    : module_(module), desktop_(desktop), main_ListView1_(main_ListView1), table_(table),
+      main_Timer1_(main_Timer1) {}
+
+void SupportExchange::PrepareSockets() {
+  main_spSockets_ = std::make_unique<foundation::CSocketPlus>(module_);
+  for (std::int16_t index = kProcsPage; index <= kLoad; ++index) main_spSockets_->ArrayAdd(index);
+  auto& events = main_spSockets_->Events;
+  events.Connect = [this](Index index) { main_spSockets_Connect(index); };
+  events.DataArrival = [this](Index index, std::int32_t) { main_spSockets_DataArrival(index); };
+  events.CloseSck = [this](Index index) { main_spSockets_CloseSck(index); };
+  events.Error = [this](Index index, std::int16_t number, const Text& description, std::int32_t, const Text&,
+                        const Text&, std::int32_t,
+                        bool&) { main_spSockets_Error(index, number, description); };
+}
+
+void SupportExchange::ReleaseSockets() {
+  if (!main_spSockets_) return;
+  const std::int32_t count = main_spSockets_->ArrayCount();
+  for (std::int32_t index = 0; index <= count; ++index)
+    if (main_spSockets_->ArrayIndexInUse(index)) main_spSockets_->ArrayRemove(index);
+  main_spSockets_.reset();
+}
+
+void SupportExchange::main_cmdRpt_Click() {
+  OpenSockets().Connect(kNumber, Text(settings::SupportServerHost), kWebPort);
+}
+
+void SupportExchange::main_Label3_DblClick() {
+  OpenSockets().Connect(kLoad, Text(settings::SupportServerAddress), kWebPort);
+}
+
+void SupportExchange::main_Label2_DblClick() { OpenSockets().CloseSck(kLoad); }
+
+void SupportExchange::main_spSockets_Connect(Index index) {
+  switch (NumberOfIndex(index)) {
+  case kProcsPage:
+    return OpenSockets().SendData(index, GetRequest(settings::SupportServerHost, u"/procs.htm"));
+  case kNumber: return OpenSockets().SendData(index, GetRequest(settings::SupportServerHost, u"/getid.asp"));
+  case kReport:
+    ReportReply_.clear();
+    return OpenSockets().SendData(index, PostRequest(ReportBody(ReportNumber_, main_ListView1_)));
+  case kLoad:
+    return OpenSockets().SendData(index, GetRequest(settings::SupportServerAddress, u"/files/big.zip"));
+  default: return;
+  }
+}
+
+void SupportExchange::main_spSockets_DataArrival(Index index) {
+  switch (NumberOfIndex(index)) {
+  case kProcsPage: ProcsPageText_ += TakeText(index); return;
+  case kNumber: return NumberArrived();
+  case kReport: ReportReply_ += TakeText(index); return;
+  default: return; // the load stays where it is: only its traffic counts
+  }
+}
+
+void SupportExchange::main_spSockets_CloseSck(Index index) {
+  switch (NumberOfIndex(index)) {
+  case kProcsPage: return ProcsPageClosed();
+  case kNumber: return OpenSockets().CloseSck(kNumber);
+  case kReport: return ReportClosed();
+  case kLoad: return OpenSockets().CloseSck(kLoad);
+  default: return;
+  }
+}
+
+void SupportExchange::main_spSockets_Error(Index index, std::int16_t number, const Text& description) {
+  const std::int16_t socket = NumberOfIndex(index);
+  if (socket < kProcsPage || socket > kLoad) return;
+  desktop_.MessageBox(u"winsock error: " + DecimalText(number) + u" - " + description, 0,
+                      socket == kProcsPage ? kHebrewTitle : kDefaultTitle);
+}
+
+foundation::CSocketPlus& SupportExchange::OpenSockets() {
+  if (!main_spSockets_) throw Fault(Fault::kObjectNotSet);
+  return *main_spSockets_;
+}
+
+Text SupportExchange::TakeText(Index index) {
+  Value data = Text();
+  OpenSockets().GetData(index, data);
+  return std::get<Text>(std::move(data));
+}
+
+void SupportExchange::NumberArrived() {
+  const Text number = ReportNumberIn(TakeText(kNumber));
+  ShowHebrewBox(u"מספר הדו\"ח שלך הוא: " + number, forms::kInformation);
+  ReportNumber_ = number;
+  OpenSockets().Connect(kReport, Text(settings::SupportServerHost), kWebPort);
+}
+
+void SupportExchange::ReportClosed() {
+  const bool accepted = ReportReply_.find(u"~OK") != Text::npos;
+  if (accepted)
+    ShowHebrewBox(u"הדו\"ח נשלח בהצלחה.", forms::kInformation);
+  else
+    ShowHebrewBox(u"בעיה בשליחת הדו\"ח!", forms::kCritical);
+  OpenSockets().CloseSck(kReport);
+}
+
+void SupportExchange::ProcsPageClosed() {
+  OpenSockets().CloseSck(kProcsPage);
+  table_.RefreshProcessTable({});
+  main_Timer1_.Enabled = true;
+}
+
+void SupportExchange::ShowHebrewBox(const Text& text, int icon) {
+  desktop_.MessageBox(text, icon | forms::kHebrewBox, kHebrewTitle);
+}
+
+} // namespace quendra::report

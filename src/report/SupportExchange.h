@@ -1,0 +1,58 @@
+#pragma once
+
+#include "forms/Controls.h"
+#include "forms/Desktop.h"
+#include "foundation/CSocketPlus.h"
+#include "monitor/ProcessTable.h"
+
+#include <memory>
+
+namespace quendra::report {
+
+/// The exchange with the support server over the sockets of the monitor page: 1 fetches a page that nobody
+/// reads and is never connected, 2 fetches a report number, 3 posts the report, 4 downloads a load. Its state
+/// is the order of the events; leaving the page ends it without a word.
+class SupportExchange {
+ public:
+  SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop, forms::ListView& main_ListView1,
+                  monitor::ProcessTable& table, forms::Timer& main_Timer1);
+
+  /// The sockets' half of the page's start.
+  void PrepareSockets();
+  /// The sockets' half of the page's stop.
+  void ReleaseSockets();
+
+  void main_cmdRpt_Click();
+  void main_Label2_DblClick();
+  void main_Label3_DblClick();
+
+  /// nullptr while the page isn't open.
+  foundation::CSocketPlus* Sockets() { return main_spSockets_.get(); }
+
+ private:
+  using Index = const foundation::Value&;
+
+  void main_spSockets_Connect(Index index);
+  void main_spSockets_DataArrival(Index index);
+  void main_spSockets_CloseSck(Index index);
+  void main_spSockets_Error(Index index, std::int16_t number, const Text& description);
+
+  foundation::CSocketPlus& OpenSockets();
+  Text TakeText(Index index);
+  void NumberArrived();
+  void ReportClosed();
+  void ProcsPageClosed();
+  void ShowHebrewBox(const Text& text, int icon);
+
+  foundation::modSocketPlus& module_;
+  forms::Desktop& desktop_;
+  forms::ListView& main_ListView1_;
+  monitor::ProcessTable& table_;
+  forms::Timer& main_Timer1_;
+  std::unique_ptr<foundation::CSocketPlus> main_spSockets_;
+  Text ProcsPageText_;
+  Text ReportNumber_;
+  Text ReportReply_;
+};
+
+} // namespace quendra::report

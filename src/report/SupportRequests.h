@@ -1,0 +1,26 @@
+#pragma once
+
+#include "forms/ListView.h"
+#include "runtime/Text.h"
+
+namespace quendra::report {
+
+/// "GET http://" host path and its four headers. The blank behind the version belongs to the request.
+Text GetRequest(TextView host, TextView path);
+
+/// The process table as records: seven fields behind one another, "|" between them and "}" behind the last.
+/// In every field but the first a comma becomes "~".
+Text ProcessRecords(const forms::ListView& table);
+
+/// The report's body under its number.
+Text ReportBody(TextView reportNumber, const forms::ListView& table);
+
+/// The request that posts a body, with the body and two line ends behind it that its length doesn't count.
+/// The length counts characters: each becomes one byte.
+Text PostRequest(const Text& body);
+
+/// The report number in a reply: what stands behind "~~~~~~~~" and two characters of line end; without that
+/// mark, what stands from the tenth character on.
+Text ReportNumberIn(TextView reply);
+
+} // namespace quendra::report
