@@ -6,6 +6,8 @@
 #include <QCloseEvent>
 #include <QEventLoop>
 #include <QGuiApplication>
+#include <QPaintEvent>
+#include <QPainter>
 #include <QPointer>
 #include <QScreen>
 #include <QWindow>
@@ -29,7 +31,7 @@ Qt::WindowFlags WindowFlagsOf(const Form& form) {
 FormView::FormView(ViewContext& context, Form& form, WindowHandle handle)
     : QWidget(nullptr, WindowFlagsOf(form)), WidgetView(context, form, *this), handle_(handle) {
   setLayoutDirection(form.RightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
-  setAutoFillBackground(true);
+  setAttribute(Qt::WA_OpaquePaintEvent);
   AddViews(form, *this);
 }
 
@@ -60,11 +62,6 @@ void FormView::ControlGone() {
 
 void FormView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Caption)) setWindowTitle(VisibleText(TheForm()->Caption()));
-  if (Concerns(aspect, Aspect::Colours)) {
-    QPalette colours = palette();
-    colours.setColor(QPalette::Window, ToQColor(TheForm()->BackColour()));
-    setPalette(colours);
-  }
   if (aspect == Aspect::Geometry) PlaceChildren(*TheForm());
 }
 
@@ -109,6 +106,12 @@ void FormView::RunModal(QWidget* owner) {
   if (!self) return;
   modalLoop_ = nullptr;
   setWindowModality(Qt::NonModal);
+}
+
+// Painted, not set as the window's palette, which the lists and their scroll bars would take over.
+void FormView::paintEvent(QPaintEvent* event) {
+  QPainter painter(this);
+  if (TheForm()) painter.fillRect(event->rect(), ToQColor(TheForm()->BackColour()));
 }
 
 void FormView::changeEvent(QEvent* event) {

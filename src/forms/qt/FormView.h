@@ -31,6 +31,7 @@ class FormView : public QWidget, public WidgetView {
   void Place() override;
   void Show() override;
   QString AccessibleName() const override;
+  void paintEvent(QPaintEvent* event) override;
   void changeEvent(QEvent* event) override;
   void closeEvent(QCloseEvent* event) override;
 

@@ -45,7 +45,8 @@ void LabelView::paintEvent(QPaintEvent* /*event*/) {
   painter.setRenderHint(QPainter::Antialiasing);
   PaintFace(painter);
   PaintText(painter);
-  if (hasFocus()) PaintFocus(painter);
+  // A window gives the focus to its first control when it comes up; the ring is for those who use the keys.
+  if (hasFocus() && window()->testAttribute(Qt::WA_KeyboardFocusChange)) PaintFocus(painter);
 }
 
 bool LabelView::IsHeldDown() const { return underMouse() && QApplication::mouseButtons() & Qt::LeftButton; }

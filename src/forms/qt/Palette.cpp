@@ -32,8 +32,8 @@ void DressApplication(QApplication& application) {
   QApplication::setStyle(QStringLiteral("fusion"));
   QApplication::setPalette(HousePalette());
   QFont font;
-  font.setFamilies(
-      {QStringLiteral("DejaVu Sans"), QStringLiteral("Noto Sans Hebrew"), QStringLiteral("Sans Serif")});
+  font.setFamilies({QStringLiteral("Noto Sans"), QStringLiteral("Noto Sans Hebrew"),
+                    QStringLiteral("DejaVu Sans"), QStringLiteral("Sans Serif")});
   font.setPointSize(9);
   QApplication::setFont(font);
   QApplication::setLayoutDirection(Qt::RightToLeft);

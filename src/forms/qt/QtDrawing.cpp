@@ -11,6 +11,8 @@ namespace quendra::forms::qt {
 namespace {
 
 constexpr int kPixelMode = 3;
+/// Pixels that text keeps off the right edge, which it would touch else.
+constexpr int kEdge = 8;
 
 PictureBoxView* ViewOf(const PictureBox& box) { return static_cast<PictureBoxView*>(box.View()); }
 
@@ -78,9 +80,9 @@ void QtDrawing::Print(PictureBox& box, TextView text) {
   if (PictureBoxView* view = ViewOf(box)) {
     const QString line = VisibleText(text);
     const bool rightToLeft = ReadsFromRightToLeft(box);
-    const int x = PixelsX(box, box.CurrentX);
-    const QRect place(rightToLeft ? 0 : x, PixelsY(box, box.CurrentY), view->width() - x,
-                      PixelsY(box, lineHeight));
+    const int x = PixelsX(box, box.CurrentX) + (rightToLeft ? kEdge : 0);
+    const int left = rightToLeft ? 0 : x;
+    const QRect place(left, PixelsY(box, box.CurrentY), view->width() - x, PixelsY(box, lineHeight));
     QPainter painter(&view->Surface());
     painter.setFont(ToQFont(box.TextFont()));
     painter.setPen(ToQColor(box.ForeColour()));
