@@ -43,7 +43,7 @@ void CaptureSession::InitLibrary() { fields_.CaptureInitResult = machine_.captur
 void CaptureSession::CreateControl() {
   RetireControl();
   fields_.vpacket = machine_.captureControls.Create();
-  fields_.vpacket->PacketReceived = [this, sender = fields_.vpacket.get()] { OnPacketReceived(sender); };
+  fields_.vpacket->PacketReceived = [this, sender = ++controlsMade_] { OnPacketReceived(sender); };
 }
 
 void CaptureSession::ReadLocalAddresses() {
@@ -186,8 +186,8 @@ void CaptureSession::RetireControl() {
     retired_.push_back(std::move(fields_.vpacket));
 }
 
-void CaptureSession::OnPacketReceived(const platform::CaptureControl* sender) {
-  if (sender != fields_.vpacket.get()) return;
+void CaptureSession::OnPacketReceived(int sender) {
+  if (sender != controlsMade_) return;
   if (eventsUnderWay_ == 0) retired_.clear();
   const EventUnderWay event(eventsUnderWay_);
   attribution_.vpacket_PacketReceived();

@@ -49,7 +49,7 @@ class CaptureSession {
   void ShowCaptureState();
   platform::CaptureControl& Control();
   void RetireControl();
-  void OnPacketReceived(const platform::CaptureControl* sender);
+  void OnPacketReceived(int sender);
 
   platform::Machine machine_;
   forms::Desktop& desktop_;
@@ -60,6 +60,7 @@ class CaptureSession {
   /// way.
   std::vector<std::unique_ptr<platform::CaptureControl>> retired_;
   int eventsUnderWay_ = 0;
+  int controlsMade_ = 0; ///< the number of `vpacket`: a new control may lie where a dropped one lay
 };
 
 } // namespace quendra::capture
