@@ -11,8 +11,8 @@
 
 namespace quendra::platform {
 
-/// A frame as a capture loop sees it: bytes by index from 0, checked. The bytes belong to whoever delivered them and
-/// hold until the next call for a frame. Starts as an array of two zero bytes.
+/// A frame as a capture loop sees it: bytes by index from 0, checked. The bytes belong to whoever delivered
+/// them and hold until the next call for a frame. Starts as an array of two zero bytes.
 class FrameBytes {
  public:
   FrameBytes() = default;
@@ -36,8 +36,8 @@ class FrameBytes {
 
 /// An adapter in the capture library's exchange form.
 struct AdapterInfo {
-  std::array<char, 255> AdapterName{};         ///< zero bytes fill the end
-  std::array<char, 255> AdapterDescription{};  ///< likewise, in the system's code page
+  std::array<char, 255> AdapterName{};        ///< zero bytes fill the end
+  std::array<char, 255> AdapterDescription{}; ///< likewise, in the system's code page
   std::array<char, 2> alignment{};
   std::uint32_t unread = 0;
 };
@@ -59,7 +59,8 @@ class CaptureLibrary {
   virtual void vpSetCurrentAdapter(std::int16_t adapter) = 0;
   /// Opens a session on the current adapter.
   virtual void vpBegin(std::int32_t value) = 0;
-  /// Never waits. Above 0, `frame` is the next frame; 0, none waits and `frame` is 60 zero bytes; below 0, failure.
+  /// Never waits. Above 0, `frame` is the next frame; 0, none waits; below 0, failure, as without a session.
+  /// In both of these `frame` is 60 zero bytes.
   virtual std::int32_t vpCapture(FrameBytes& frame, CaptureHeader& header) = 0;
   virtual void vpEnd() = 0;
   virtual void vpSetParam(std::int32_t parameter, std::int32_t value) = 0;
@@ -79,17 +80,20 @@ class CaptureControl {
   virtual void ReleaseChannel(std::int32_t& result) = 0;
   virtual void CloseChannel(std::int32_t& result) = 0;
   /// The adapter's address as it lies in memory (network order), 0 for none.
-  virtual void AdapterAddress(const std::string& adapterName, std::uint32_t& address, std::uint32_t& second) = 0;
+  virtual void AdapterAddress(const std::string& adapterName, std::uint32_t& address,
+                              std::uint32_t& second) = 0;
   virtual void StartEvents(std::int32_t& result) = 0;
   virtual void StopEvents(std::int32_t& result) = 0;
-  /// Writes the newest capture record over the start of `bytes`: a header in host order (seconds, microseconds, captured
-  /// length, length on the wire, 32 bits each, and a 16-bit header length), padding up to that header length, the frame.
+  /// Writes the newest capture record over the start of `bytes`: a header in host order (seconds,
+  /// microseconds, captured length, length on the wire, 32 bits each, and a 16-bit header length), padding up
+  /// to that header length, the frame. Before the first record it is a header with zero lengths of the frame.
   virtual void ReadBuffer(std::span<std::uint8_t> bytes) = 0;
   virtual void SetValueA(std::int32_t value) = 0;
   virtual void SetValueB(std::int32_t value) = 0;
   virtual void SetValueC(std::int32_t value) = 0;
 
-  /// Raised when frames have arrived, and once more through the queue after an event that took frames and left some.
+  /// Raised when frames have arrived, and once more through the queue after an event that took frames and
+  /// left some.
   std::function<void()> PacketReceived;
 };
 

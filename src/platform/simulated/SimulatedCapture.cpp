@@ -72,7 +72,6 @@ void SimulatedCapture::Control::ReadBuffer(std::span<std::uint8_t> bytes) {
   ++capture_->ReadBufferCalls;
   if (capture_->RecordFrameCalls) Say("ReadBuffer");
   const Frame& newest = capture_->newest_;
-  if (newest.bytes.empty()) return;
   const std::size_t headerLength = std::max<std::size_t>(capture_->RecordHeaderLength, 18);
   std::vector<std::uint8_t> record(headerLength);
   Put32(record, 0, newest.tick / 1000);
@@ -146,10 +145,8 @@ std::int32_t SimulatedCapture::vpCapture(FrameBytes& frame, CaptureHeader& heade
   static constexpr std::array<std::uint8_t, 60> kBlankFrame{};
   ++CaptureCalls;
   if (RecordFrameCalls) Record("vpCapture");
-  if (waiting_.empty()) {
-    frame = FrameBytes(kBlankFrame.data(), static_cast<int>(kBlankFrame.size()));
-    return 0;
-  }
+  frame = FrameBytes(kBlankFrame.data(), static_cast<int>(kBlankFrame.size()));
+  if (waiting_.empty()) return 0;
   if (waiting_.front().failure != 0) {
     const std::int32_t failure = waiting_.front().failure;
     waiting_.pop_front();

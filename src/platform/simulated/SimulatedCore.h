@@ -48,6 +48,9 @@ inline std::uint32_t Get32(std::span<const std::uint8_t> bytes, std::size_t at) 
   return value;
 }
 
+/// A text as the system takes it: what stands behind a NUL isn't there.
+inline std::string CutText(const std::string& text) { return text.substr(0, text.find('\0')); }
+
 /// A dotted text as an address lies in memory: the first part in the low byte. 0 for a text that is none.
 std::uint32_t AddressInMemory(const std::string& dotted);
 

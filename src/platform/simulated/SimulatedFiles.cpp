@@ -33,19 +33,21 @@ void SimulatedVersionInfo::Add(const std::string& path, std::vector<std::uint8_t
 }
 
 std::uint32_t SimulatedVersionInfo::GetFileVersionInfoSizeA(const std::string& path) {
-  return indexOf_.contains(path) ? kBlockSize : 0;
+  return indexOf_.contains(CutText(path)) ? kBlockSize : 0;
 }
 
 bool SimulatedVersionInfo::GetFileVersionInfoA(const std::string& path, std::span<std::uint8_t> buffer) {
-  const auto found = indexOf_.find(path);
-  if (found == indexOf_.end() || unreadable_.contains(path) || buffer.size() < kBlockSize) return false;
+  const auto found = indexOf_.find(CutText(path));
+  if (found == indexOf_.end() || unreadable_.contains(found->first) || buffer.size() < kBlockSize)
+    return false;
   Put32(buffer, 0, kBlockMark);
   Put32(buffer, 4, found->second);
   return true;
 }
 
 std::optional<std::vector<std::uint8_t>>
-SimulatedVersionInfo::VerQueryValueA(std::span<const std::uint8_t> block, const std::string& subBlock) {
+SimulatedVersionInfo::VerQueryValueA(std::span<const std::uint8_t> block, const std::string& subBlockText) {
+  const std::string subBlock = CutText(subBlockText);
   Queries.push_back(subBlock);
   if (block.size() < kBlockSize || Get32(block, 0) != kBlockMark || Get32(block, 4) >= blocks_.size())
     return {};
@@ -62,7 +64,7 @@ SimulatedVersionInfo::VerQueryValueA(std::span<const std::uint8_t> block, const 
 }
 
 Handle SimulatedIcons::ExtractIconExA(const std::string& path, int index) {
-  const auto found = images_.find(path);
+  const auto found = images_.find(CutText(path));
   if (found == images_.end() || index != 0) return kNoHandle;
   const auto icon = static_cast<Handle>(++Extracted);
   live_[icon] = found->second;

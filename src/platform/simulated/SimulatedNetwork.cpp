@@ -56,7 +56,7 @@ std::optional<std::string> SimulatedHostNames::gethostname() {
 }
 
 std::optional<std::vector<std::uint32_t>> SimulatedHostNames::gethostbyname(const std::string& name) {
-  if (FailAddresses || name != Name) return {};
+  if (FailAddresses || CutText(name) != Name) return {};
   std::vector<std::uint32_t> addresses;
   for (const auto& address : Addresses) addresses.push_back(AddressInMemory(address));
   return addresses;

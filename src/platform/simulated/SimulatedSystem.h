@@ -41,7 +41,7 @@ class SimulatedShellStart : public ShellStart {
   bool Fail = false;
 
   bool Shell(const std::string& commandLine, int windowStyle) override {
-    core_.calls.push_back("Shell " + std::to_string(windowStyle) + " " + commandLine);
+    core_.calls.push_back("Shell " + std::to_string(windowStyle) + " " + CutText(commandLine));
     return !Fail;
   }
 

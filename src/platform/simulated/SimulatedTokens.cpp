@@ -27,7 +27,7 @@ bool SimulatedTokens::OpenProcessToken(Handle process, std::uint32_t, Handle& to
 bool SimulatedTokens::LookupPrivilegeValueA(const std::string&, const std::string& name,
                                             std::uint64_t& luid) {
   if (LookupPrivilegeValueError != 0) return Answer(LookupPrivilegeValueError);
-  privileges_.push_back(name);
+  privileges_.push_back(CutText(name));
   luid = privileges_.size();
   return Answer(0);
 }

@@ -1,0 +1,122 @@
+#include "platform/BackendFixture.h"
+
+#include "forms/headless/HeadlessDesktop.h"
+#include "platform/linux/LinuxMachine.h"
+#include "platform/simulated/SimulatedMachine.h"
+
+#include <arpa/inet.h>
+#include <sys/socket.h>
+#include <unistd.h>
+
+#include <filesystem>
+#include <fstream>
+#include <stdexcept>
+#include <vector>
+
+namespace quendra::platform {
+
+namespace {
+
+class SimulatedBackend : public Backend {
+ public:
+  SimulatedBackend() {
+    machine_.AddProcess({.id = 4, .parent = 0, .name = "System"});
+    machine_.AddProcess({.id = OwnId(), .parent = OwnParent(), .name = OwnName(), .path = OwnPath()});
+    machine_.hostNames.Addresses = {"127.0.0.1", "10.0.0.7"};
+    machine_.ipHelper.Adapters = {{"{1}", "Ethernet", {"10.0.0.7"}, {"10.0.0.138"}}};
+    machine_.AddCaptureAdapter({"\\Device\\NPF_{1}", "Ethernet", "10.0.0.7"});
+  }
+
+  Machine Operations() override { return machine_.Operations(); }
+  std::uint32_t OwnId() const override { return 1234; }
+  std::uint32_t OwnParent() const override { return 4; }
+  std::string OwnName() const override { return "quendra.exe"; }
+  std::string OwnPath() const override { return "C:\\Program Files\\quendra.exe"; }
+  std::uint32_t MissingId() const override { return 4321; }
+  std::uint16_t Listen() override {
+    machine_.AddConnection({.state = 2, .localAddress = "127.0.0.1", .localPort = 1025, .owner = OwnId()});
+    return 1025;
+  }
+  std::uint16_t Connect(std::uint16_t port) override {
+    for (const bool near : {true, false})
+      machine_.AddConnection({.state = 5,
+                              .localAddress = "127.0.0.1",
+                              .localPort = static_cast<std::uint16_t>(near ? 1026 : port),
+                              .remoteAddress = "127.0.0.1",
+                              .remotePort = static_cast<std::uint16_t>(near ? port : 1026),
+                              .owner = OwnId()});
+    return 1026;
+  }
+
+ private:
+  simulated::SimulatedMachine machine_;
+};
+
+class LinuxBackend : public Backend {
+ public:
+  LinuxBackend() : machine_(loop_) {}
+  ~LinuxBackend() override {
+    for (const int socket : sockets_) close(socket);
+  }
+
+  Machine Operations() override { return machine_.Operations(); }
+  std::uint32_t OwnId() const override { return static_cast<std::uint32_t>(getpid()); }
+  std::uint32_t OwnParent() const override { return static_cast<std::uint32_t>(getppid()); }
+  std::string OwnName() const override { return std::filesystem::path(OwnPath()).filename(); }
+  std::string OwnPath() const override { return std::filesystem::read_symlink("/proc/self/exe"); }
+  std::uint32_t MissingId() const override {
+    // Ids run from 1 to below this number.
+    std::uint32_t limit = 0;
+    std::ifstream("/proc/sys/kernel/pid_max") >> limit;
+    return limit + 1;
+  }
+  std::uint16_t Listen() override {
+    const int socket = NewSocket();
+    const sockaddr_in any = Loopback(0);
+    Check(bind(socket, reinterpret_cast<const sockaddr*>(&any), sizeof any));
+    Check(listen(socket, 1));
+    return PortOf(socket);
+  }
+  std::uint16_t Connect(std::uint16_t port) override {
+    const int socket = NewSocket();
+    const sockaddr_in target = Loopback(port);
+    Check(connect(socket, reinterpret_cast<const sockaddr*>(&target), sizeof target));
+    sockets_.push_back(accept(sockets_.front(), nullptr, nullptr));
+    Check(sockets_.back());
+    return PortOf(socket);
+  }
+
+ private:
+  static void Check(int result) {
+    if (result < 0) throw std::runtime_error("a socket call on loopback failed");
+  }
+  static sockaddr_in Loopback(std::uint16_t port) {
+    sockaddr_in address{};
+    address.sin_family = AF_INET;
+    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
+    address.sin_port = htons(port);
+    return address;
+  }
+  int NewSocket() {
+    sockets_.push_back(socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0));
+    Check(sockets_.back());
+    return sockets_.back();
+  }
+  static std::uint16_t PortOf(int socket) {
+    sockaddr_in address{};
+    socklen_t size = sizeof address;
+    Check(getsockname(socket, reinterpret_cast<sockaddr*>(&address), &size));
+    return ntohs(address.sin_port);
+  }
+
+  forms::HeadlessDesktop loop_;
+  linux_::LinuxMachine machine_;
+  std::vector<int> sockets_;
+};
+
+} // namespace
+
+std::unique_ptr<Backend> MakeSimulatedBackend() { return std::make_unique<SimulatedBackend>(); }
+std::unique_ptr<Backend> MakeLinuxBackend() { return std::make_unique<LinuxBackend>(); }
+
+} // namespace quendra::platform
