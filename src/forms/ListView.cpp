@@ -25,6 +25,12 @@ void ListRow::SetCellText(int cell, Text text) {
   list_.CellChanged(*this, cell);
 }
 
+void ListRow::AppendCellText(int cell, TextView tail) {
+  if (tail.empty()) return;
+  At(cell).text.append(tail);
+  list_.CellChanged(*this, cell);
+}
+
 void ListRow::SetCellColour(int cell, Colour colour) {
   if (std::exchange(At(cell).colour, colour) != colour) list_.CellChanged(*this, cell);
 }
@@ -109,7 +115,8 @@ void ListView::Sort(int sortKey, SortOrder order) {
                                         [&](char16_t a, char16_t b) { return lowered(a) < lowered(b); });
   };
   const auto before = [&](const auto& left, const auto& right) {
-    return order_ == SortOrder::Ascending ? below(textOf(left), textOf(right)) : below(textOf(right), textOf(left));
+    return order_ == SortOrder::Ascending ? below(textOf(left), textOf(right))
+                                          : below(textOf(right), textOf(left));
   };
   if (std::is_sorted(rows_.begin(), rows_.end(), before)) return;
   std::stable_sort(rows_.begin(), rows_.end(), before);

@@ -12,7 +12,8 @@ namespace quendra::forms {
 
 class ListView;
 
-/// One item of a ListView: a key, a text and a Tag, a small icon, and cells numbered from 1. Cell 0 is the item itself.
+/// One item of a ListView: a key, a text and a Tag, a small icon, and cells numbered from 1. Cell 0 is the
+/// item itself.
 class ListRow {
  public:
   ListRow(ListView& list, Text key, Text text, int smallIcon);
@@ -24,6 +25,8 @@ class ListRow {
   /// Fault 9 for a cell that the row lacks.
   const Text& CellText(int cell) const { return At(cell).text; }
   void SetCellText(int cell, Text text);
+  /// Puts `tail` behind the text; cheap however long the text is.
+  void AppendCellText(int cell, TextView tail);
   Variant& CellTag(int cell) { return At(cell).tag; }
   const Variant& CellTag(int cell) const { return At(cell).tag; }
   Colour CellColour(int cell) const { return At(cell).colour; }
@@ -59,9 +62,9 @@ enum class SortOrder { Ascending, Descending };
 /// A row of the columns' table: what stands in the header and how the cells below it are laid out.
 struct ColumnHeader {
   Text caption{};
-  int width = 0;  ///< twips
+  int width = 0; ///< twips
   Alignment alignment = Alignment::Leading;
-  int icon = 0;  ///< index in the list of header icons, 0 for none
+  int icon = 0; ///< index in the list of header icons, 0 for none
   /// For header icons: what assistive technology says in place of a caption.
   Text description{};
 };
@@ -92,7 +95,8 @@ class ListView : public Control {
   /// Fault 35601 for a row that the list lacks.
   ListRow& Row(int index);
   const ListRow& Row(int index) const;
-  /// The row with this key, nullptr when there is none. Finds what a walk from row 1 would find: keys are unique.
+  /// The row with this key, nullptr when there is none. Finds what a walk from row 1 would find: keys are
+  /// unique.
   ListRow* Find(TextView key);
   /// The place of a row of this list now.
   int IndexOf(const ListRow& row) const { return row.index_; }
@@ -103,8 +107,9 @@ class ListView : public Control {
   void Remove(int index);
   void Clear();
 
-  /// Orders the rows by the text of one cell (0 the item), once, and remembers key and order. Rows that are equal keep
-  /// their order; a row without that cell counts as empty. Latin letters compare without regard to case.
+  /// Orders the rows by the text of one cell (0 the item), once, and remembers key and order. Rows that are
+  /// equal keep their order; a row without that cell counts as empty. Latin letters compare without regard to
+  /// case.
   void Sort(int sortKey, SortOrder order);
   int SortKey() const { return sortKey_; }
   SortOrder Order() const { return order_; }
@@ -120,8 +125,8 @@ class ListView : public Control {
   ImageList* SmallIcons = nullptr;
   ImageList* HeaderIcons = nullptr;
 
-  /// Grows with every change of the rows, their order or their texts; Tags don't count. What was indexed beside the
-  /// table holds as long as this number stands still.
+  /// Grows with every change of the rows, their order or their texts; Tags don't count. What was indexed
+  /// beside the table holds as long as this number stands still.
   std::uint64_t Revision() const { return revision_; }
 
   void Observe(ListViewObserver* observer) { observer_ = observer; }

@@ -25,9 +25,7 @@ std::size_t NumberIn(TextView digits) {
 void PortsCells::Learn(Numbers& numbers, TextView text) {
   for (std::size_t start = 0; start < text.size(); ++start) {
     std::size_t number = 0;
-    // A port's decimal text has no leading zero, so a text that begins with one is the port 0 or none.
-    const std::size_t longest = text[start] == u'0' ? 1 : kLongestPort;
-    const std::size_t end = std::min(text.size(), start + longest);
+    const std::size_t end = std::min(text.size(), start + kLongestPort);
     for (std::size_t i = start; i < end && IsDigit(text[i]); ++i) {
       number = number * 10 + (text[i] - u'0');
       if (number < numbers.size()) numbers.set(number);
@@ -54,11 +52,9 @@ bool PortsCells::Contains(const forms::ListRow& row, TextView port) {
 void PortsCells::Append(forms::ListRow& row, TextView port) {
   const Text& text = row.CellText(kPortsCell);
   const std::size_t before = text.size();
-  Text grown;
-  grown.reserve(before + port.size() + 2);
-  grown.append(text.empty() ? TextView(u".") : TextView(text)).append(port).append(u".");
+  const Text tail = Text(text.empty() ? u"." : u"").append(port).append(u".");
   const auto known = revision_ == list_.Revision() ? cells_.find(&row) : cells_.end();
-  row.SetCellText(kPortsCell, std::move(grown));
+  row.AppendCellText(kPortsCell, tail);
   // One step is this very change; whoever changed more in answer to it makes the index worthless.
   if (known == cells_.end() || list_.Revision() != revision_ + 1) return;
   revision_ = list_.Revision();

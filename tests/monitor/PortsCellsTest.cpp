@@ -22,12 +22,13 @@ struct PortsCellsOfAList : testing::Test {
 /// So many ports that searching it often costs more than reading it once.
 Text LongPorts() {
   Text text = u".";
-  for (int port = 10000; port < 12000; ++port) text += DecimalText(port) + u".";
+  for (int port = 10000; port < 10400; ++port) text += DecimalText(port) + u".";
   return text;
 }
 
 void ExpectTheAnswersOfAPlainSearch(PortsCells& cells, const forms::ListRow& row) {
-  for (int port = 0; port <= 65535; ++port) {
+  // All of the small ones, which lie inside others, and one of eleven of the others.
+  for (int port = 0; port <= 65535; port += port < 2000 ? 1 : 11) {
     const Text text = DecimalText(port);
     ASSERT_EQ(cells.Contains(row, text), row.CellText(kPortsCell).find(text) != Text::npos) << port;
   }

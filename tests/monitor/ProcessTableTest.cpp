@@ -55,6 +55,15 @@ TEST_F(ProcessTableTest, The_seconds_run_on_where_the_tick_starts_over) {
   EXPECT_EQ(CellOf(10, kUploadCell), u"02.00");
 }
 
+TEST_F(ProcessTableTest, The_seconds_are_right_while_the_signed_tick_is_below_zero) {
+  AddProcesses({10});
+  machine.SetTick(0x90000000);
+  Pass(0);
+  Charge(10, 2, 0);
+  Pass(1000);
+  EXPECT_EQ(CellOf(10, kUploadCell), u"02.00");
+}
+
 TEST_F(ProcessTableTest, A_last_refresh_that_lies_ahead_turns_the_rates_negative) {
   AddProcesses({10});
   Pass();

@@ -288,6 +288,16 @@ TEST_F(OddSocketHandles, The_duplicate_is_made_for_the_own_process) {
   EXPECT_EQ(handles.duplicateAccess, 0x101F0000u);
 }
 
+TEST_F(OddSocketHandles, Only_the_invalid_handle_for_an_owner_ends_the_step_before_duplicating) {
+  machine.processes.FailOpen(10, platform::kInvalidHandle);
+  odd.ScanSocketHandles();
+  EXPECT_EQ(handles.duplicateAccess, 0u);
+  handles.TableStatuses = {platform::Handles::kStatusInfoLengthMismatch, 0};
+  machine.processes.FailOpen(10, platform::kNoHandle);
+  odd.ScanSocketHandles();
+  EXPECT_EQ(handles.duplicateAccess, 0x101F0000u);
+}
+
 // The driver's answer.
 
 TEST_F(OddSocketHandles, The_driver_is_asked_for_the_address_of_query_type_3) {

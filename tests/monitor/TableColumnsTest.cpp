@@ -110,6 +110,14 @@ TEST_F(TableColumns, A_third_click_on_another_header_begins_ascending) {
   EXPECT_EQ(list.Order(), forms::SortOrder::Ascending);
 }
 
+TEST_F(TableColumns, A_second_click_on_another_header_keeps_ascending) {
+  Pass();
+  table.main_ListView1_ColumnClick(2);
+  table.main_ListView1_ColumnClick(3);
+  EXPECT_EQ(list.SortKey(), 2);
+  EXPECT_EQ(list.Order(), forms::SortOrder::Ascending);
+}
+
 TEST_F(TableColumns, A_click_on_the_download_header_after_a_pass_turns_the_passes_order_over) {
   Pass();
   table.main_ListView1_ColumnClick(6);

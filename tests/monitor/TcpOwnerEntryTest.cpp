@@ -10,7 +10,7 @@ namespace {
 
 platform::IpHelper::TcpTable TableOf(std::uint32_t count, const std::vector<std::uint32_t>& fields,
                                      std::size_t extraBytes = 0) {
-  std::vector<std::uint8_t> bytes(4 + fields.size() * 4 + extraBytes);
+  std::vector<std::uint8_t> bytes(4 + fields.size() * 4 + extraBytes, 0xAA);
   std::memcpy(bytes.data(), &count, 4);
   if (!fields.empty()) std::memcpy(bytes.data() + 4, fields.data(), fields.size() * 4);
   return std::make_shared<const std::vector<std::uint8_t>>(std::move(bytes));
