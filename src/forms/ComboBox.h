@@ -17,8 +17,8 @@ class ComboBox : public Control {
 
   /// The selected item, -1 for none.
   int ListIndex() const { return selected_; }
-  /// Selects and raises Click, also when the item was the selected one already. An index that the list lacks selects
-  /// nothing and raises nothing.
+  /// Selects and raises Click, also when the item was the selected one already. An index that the list lacks
+  /// selects nothing and raises nothing.
   void SelectItem(int index);
   /// The selected item's text, empty for none.
   Text SelectedText() const;

@@ -12,8 +12,8 @@ namespace quendra::forms {
 class Container;
 class Form;
 
-/// Distances in twips, 1440 to the inch. Left runs from the leading edge of the container: from the right edge in a form
-/// that reads from right to left.
+/// Distances in twips, 1440 to the inch. Left runs from the leading edge of the container: from the right
+/// edge in a form that reads from right to left.
 struct Geometry {
   int left = 0;
   int top = 0;
@@ -23,7 +23,7 @@ struct Geometry {
 };
 
 struct Font {
-  int size = 9;  ///< points
+  int size = 9; ///< points
   bool bold = false;
   bool underline = false;
   friend bool operator==(const Font&, const Font&) = default;

@@ -43,7 +43,7 @@ class Line : public Control {
  public:
   using Control::Control;
   Property<LineEnds, Aspect::Geometry> Ends{*this};
-  Property<int, Aspect::Look> BorderWidth{*this, 1};  ///< pixels
+  Property<int, Aspect::Look> BorderWidth{*this, 1}; ///< pixels
 };
 
 /// A picture without a drawing surface, stretched to its size.
@@ -66,7 +66,8 @@ class PictureBox : public Container {
   int CurrentY = 0;
 };
 
-/// Calls Tick every Interval milliseconds while it is enabled and its form is loaded. An interval of 0 never ticks.
+/// Calls Tick every Interval milliseconds while it is enabled and its form is loaded. An interval of 0 never
+/// ticks.
 class Timer : public Control {
  public:
   Timer(Container& parent, Text name, int interval, bool enabled) : Control(parent, std::move(name)) {

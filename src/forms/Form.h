@@ -11,8 +11,9 @@ enum class BorderStyle { None, FixedSingle, FixedDialog, Sizable };
 /// State of the modifier keys in key and mouse events.
 enum ShiftState : int { kNoShift = 0, kShift = 1, kCtrl = 2, kAlt = 4 };
 
-/// A form: a plain object whose members are its controls. Its life is Load, then shown, then Unload, and again.
-/// `Position` holds the client area's size; its left and top are not used, forms are centred on the screen.
+/// A form: a plain object whose members are its controls. Its life is Load, then shown, then Unload, and
+/// again. `Position` holds the client area's size; its left and top are not used, forms are centred on the
+/// screen.
 class Form : public Container {
  public:
   explicit Form(Text name) : Container(std::move(name)) { Visible = false; }
@@ -31,8 +32,8 @@ class Form : public Container {
   virtual void Form_Unload() {}
   virtual void Form_Activate() {}
   virtual void Form_Deactivate() {}
-  /// `keyCode` is the code of the character that the key gives without modifiers in the active layout, as upper case
-  /// for Latin letters; `shift` is a sum of ShiftState.
+  /// `keyCode` is the code of the character that the key gives without modifiers in the active layout, as
+  /// upper case for Latin letters; `shift` is a sum of ShiftState.
   virtual void Form_KeyDown(int /*keyCode*/, int /*shift*/) {}
 
   bool IsLoaded() const { return loaded_; }

@@ -14,7 +14,7 @@ class Picture {
   struct Pixels {
     int width = 0;
     int height = 0;
-    std::vector<std::uint32_t> argb;  ///< row by row from the top, 0xAARRGGBB, not premultiplied
+    std::vector<std::uint32_t> argb; ///< row by row from the top, 0xAARRGGBB, not premultiplied
   };
 
   Picture() = default;

@@ -6,8 +6,9 @@
 
 namespace quendra {
 
-/// A run-time fault: number, description and source, as the classes of the program raise them. The one exception type
-/// of the program's logic; one that nobody traps reaches the desktop's dispatcher and ends the program.
+/// A run-time fault: number, description and source, as the classes of the program raise them. The one
+/// exception type of the program's logic; one that nobody traps reaches the desktop's dispatcher and ends the
+/// program.
 class Fault : public std::exception {
  public:
   enum Number : int {

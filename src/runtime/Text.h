@@ -14,7 +14,8 @@ using TextView = std::u16string_view;
 Text FromUtf8(std::string_view bytes);
 std::string ToUtf8(TextView text);
 
-/// Single bytes of the system's code page (1255), as at platform calls and in files. What the page lacks becomes "?".
+/// Single bytes of the system's code page (1255), as at platform calls and in files. What the page lacks
+/// becomes "?".
 std::string ToCodePage(TextView text);
 Text FromCodePage(std::string_view bytes);
 
