@@ -113,11 +113,11 @@ TEST_F(LinuxCaptureEventsTest, The_buffer_holds_the_newest_record_with_a_header_
   far.Send(UdpFrame(1026, 53, 200));
   WaitForEvents(1);
   const Record record(*control);
-  EXPECT_EQ(record.captured, 128u);
+  EXPECT_EQ(record.captured, 96u);
   EXPECT_EQ(record.wire, 214u);
   EXPECT_EQ(record.headerLength, 18);
   EXPECT_EQ(record.bytes[18 + 14 + 9], 17);
-  const Bytes frame(record.bytes.begin() + 18, record.bytes.begin() + 18 + 128);
+  const Bytes frame(record.bytes.begin() + 18, record.bytes.begin() + 18 + 96);
   EXPECT_EQ(SourcePort(frame), 1026u);
 }
 

@@ -178,8 +178,8 @@ TEST_F(LinuxCaptureTest, Frames_are_cut_to_what_the_decoders_need_but_tell_their
   WaitUntil([&] { return events > 0; }, "the frame");
   FrameBytes frame;
   CaptureHeader header{};
-  EXPECT_EQ(capture->vpCapture(frame, header), 128);
-  EXPECT_EQ(frame.UpperBound(), 127);
+  EXPECT_EQ(capture->vpCapture(frame, header), 96);
+  EXPECT_EQ(frame.UpperBound(), 95);
   EXPECT_EQ(header[3], 1514u);
 }
 

@@ -6,8 +6,9 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-// Enough for a TCP header inside a tunnel; the rest of a frame is of no use to the decoders.
-constexpr int kSnapLength = 128;
+// A TCP header inside a tunnel ends at index 93, and frames that reach index 94 are taken for tunnelled; what
+// lies behind is of no use to the decoders.
+constexpr int kSnapLength = 96;
 // The kernel hands over a block of frames when it is full or this old, so that a wake-up brings many frames.
 constexpr int kBlockMilliseconds = 16;
 // Half a second of 300,000 frames a second.
