@@ -6,6 +6,7 @@
 #include "platform/linux/LinuxIpHelper.h"
 #include "platform/linux/LinuxProcesses.h"
 #include "platform/linux/LinuxShellStart.h"
+#include "platform/linux/LinuxSockets.h"
 #include "platform/linux/LinuxSystem.h"
 #include "platform/linux/LinuxTokens.h"
 #include "platform/linux/LinuxVersionInfo.h"
@@ -14,7 +15,7 @@
 namespace quendra::platform::linux_ {
 
 struct LinuxMachine::Parts {
-  Parts(EventLoop& loop, const std::string& procRoot) : folder(procRoot), capture(loop) {}
+  Parts(EventLoop& loop, const std::string& procRoot) : folder(procRoot), capture(loop), sockets(loop, hostNames) {}
 
   ProcFolder folder;
   HandleTable handleTable;

@@ -1,7 +1,6 @@
 #pragma once
 
 #include "platform/Handles.h"
-#include "platform/Sockets.h"
 
 namespace quendra::platform::linux_ {
 
@@ -26,19 +25,6 @@ class LinuxHandles : public Handles {
                                       std::span<std::uint8_t>) override {
     return kStatusNotImplemented;
   }
-};
-
-/// Nothing asks for sockets on this system so far: every call fails.
-class LinuxSockets : public Sockets {
- public:
-  std::int32_t recv(SocketHandle, std::span<std::uint8_t>, std::int32_t) override { return -1; }
-  std::int32_t WSAAsyncSelect(SocketHandle, std::uint32_t, std::uint32_t, std::int32_t) override {
-    return -1;
-  }
-  std::int32_t closesocket(SocketHandle) override { return -1; }
-  bool WSAIsBlocking() override { return false; }
-  std::int32_t WSACancelBlockingCall() override { return -1; }
-  std::int32_t WSACleanup() override { return -1; }
 };
 
 } // namespace quendra::platform::linux_

@@ -1,0 +1,121 @@
+#include "platform/linux/NameLookUps.h"
+
+#include "platform/linux/SocketErrorNumbers.h"
+
+#include <netdb.h>
+#include <netinet/in.h>
+#include <strings.h>
+#include <sys/socket.h>
+
+#include <deque>
+#include <map>
+#include <mutex>
+#include <thread>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+struct Answer {
+  std::int32_t error = 0;
+  std::vector<std::uint32_t> addresses;
+};
+
+Answer LookUp(const std::string& name) {
+  addrinfo hints{};
+  hints.ai_family = AF_INET;
+  hints.ai_socktype = SOCK_STREAM;
+  addrinfo* first = nullptr;
+  Answer answer;
+  answer.error = LookUpErrorOf(::getaddrinfo(name.c_str(), nullptr, &hints, &first));
+  if (answer.error != 0) return answer;
+  const std::unique_ptr<addrinfo, void (*)(addrinfo*)> owner(first, ::freeaddrinfo);
+  for (const addrinfo* entry = first; entry != nullptr; entry = entry->ai_next)
+    answer.addresses.push_back(reinterpret_cast<const sockaddr_in*>(entry->ai_addr)->sin_addr.s_addr);
+  return answer;
+}
+
+} // namespace
+
+/// Outlives the object as long as a thread waits for a name server: such a wait can't be cut short.
+struct NameLookUps::Shared {
+  struct Job {
+    std::uint32_t handle;
+    std::string name;
+  };
+
+  std::mutex lock;
+  EventLoop* loop; ///< nullptr once the object has gone
+  std::deque<Job> jobs;
+  int threads = 0;
+  // Only the loop's thread touches these.
+  std::map<std::uint32_t, Done> underWay;
+  std::uint32_t lastHandle = 0;
+
+  void Finish(const std::shared_ptr<Shared>& self, std::uint32_t handle, Answer answer) {
+    const std::scoped_lock guard(lock);
+    if (!loop) return;
+    loop->Post([self, handle, answer = std::move(answer)] {
+      const auto found = self->underWay.find(handle);
+      if (found == self->underWay.end()) return;
+      const Done done = std::move(found->second);
+      self->underWay.erase(found);
+      done(answer.error, answer.addresses);
+    });
+  }
+};
+
+NameLookUps::NameLookUps(EventLoop& loop, HostNames& hostNames)
+    : hostNames_(hostNames), shared_(std::make_shared<Shared>()) {
+  shared_->loop = &loop;
+}
+
+NameLookUps::~NameLookUps() {
+  shared_->underWay.clear();
+  const std::scoped_lock guard(shared_->lock);
+  shared_->loop = nullptr;
+  shared_->jobs.clear();
+}
+
+std::uint32_t NameLookUps::Start(const std::string& name, Done done) {
+  const std::uint32_t handle = ++shared_->lastHandle;
+  shared_->underWay[handle] = std::move(done);
+  const auto own = hostNames_.gethostname();
+  if (own && ::strcasecmp(own->c_str(), name.c_str()) == 0) {
+    const auto addresses = hostNames_.gethostbyname(name);
+    shared_->Finish(shared_, handle,
+                    addresses ? Answer{0, *addresses} : Answer{LookUpErrorOf(EAI_NONAME), {}});
+    return handle;
+  }
+  const std::scoped_lock guard(shared_->lock);
+  shared_->jobs.push_back({handle, name});
+  if (shared_->threads == kMostThreads) return handle;
+  ++shared_->threads;
+  std::thread([shared = shared_] { Work(shared); }).detach();
+  return handle;
+}
+
+bool NameLookUps::Cancel(std::uint32_t lookUp) {
+  if (shared_->underWay.erase(lookUp) == 0) return false;
+  const std::scoped_lock guard(shared_->lock);
+  std::erase_if(shared_->jobs, [&](const Shared::Job& job) { return job.handle == lookUp; });
+  return true;
+}
+
+void NameLookUps::Work(const std::shared_ptr<Shared>& shared) {
+  for (;;) {
+    Shared::Job job;
+    {
+      const std::scoped_lock guard(shared->lock);
+      if (shared->jobs.empty()) {
+        --shared->threads;
+        return;
+      }
+      job = std::move(shared->jobs.front());
+      shared->jobs.pop_front();
+    }
+    shared->Finish(shared, job.handle, LookUp(job.name));
+  }
+}
+
+} // namespace quendra::platform::linux_

@@ -1,0 +1,26 @@
+#pragma once
+
+#include "platform/Sockets.h"
+#include "platform/linux/Descriptor.h"
+
+namespace quendra::platform::linux_ {
+
+/// One socket: where it stands, and which of its events may be announced now.
+struct SocketEntry {
+  enum class Stage { Fresh, Connecting, Connected, Listening, Datagram };
+
+  Descriptor descriptor;
+  Stage stage = Stage::Fresh;
+
+  // What WSAAsyncSelect asked for.
+  std::uint32_t window = 0;
+  std::uint32_t message = 0;
+  std::int32_t mask = 0;
+
+  /// Events that may be announced; one leaves when it is and comes back with the call that re-enables it.
+  std::int32_t enabled = kFdRead | kFdWrite | kFdAccept | kFdConnect | kFdClose;
+  /// What the kernel watches for now.
+  std::uint32_t watched = 0;
+};
+
+} // namespace quendra::platform::linux_

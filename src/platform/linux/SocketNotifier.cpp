@@ -1,0 +1,136 @@
+#include "platform/linux/SocketNotifier.h"
+
+#include "platform/linux/SocketErrorNumbers.h"
+
+#include <sys/epoll.h>
+#include <sys/ioctl.h>
+#include <sys/socket.h>
+
+#include <array>
+#include <cerrno>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+constexpr int kBatch = 64;
+constexpr std::uint32_t kReadable = EPOLLIN;
+constexpr std::uint32_t kWritable = EPOLLOUT;
+constexpr std::uint32_t kEnded = EPOLLRDHUP;
+
+int BytesWaiting(int descriptor) {
+  int amount = 0;
+  return ::ioctl(descriptor, FIONREAD, &amount) == 0 ? amount : 0;
+}
+
+/// The error that waits on the socket; asking takes it away.
+int TakeError(int descriptor) {
+  int error = 0;
+  socklen_t size = sizeof error;
+  return ::getsockopt(descriptor, SOL_SOCKET, SO_ERROR, &error, &size) == 0 ? error : errno;
+}
+
+std::uint32_t InterestOf(const SocketEntry& entry) {
+  const auto wants = [&](SocketEvent event) { return (entry.mask & entry.enabled & event) != 0; };
+  switch (entry.stage) {
+  case SocketEntry::Stage::Fresh: return 0;
+  case SocketEntry::Stage::Connecting: return wants(kFdConnect) ? kWritable : 0;
+  case SocketEntry::Stage::Listening: return wants(kFdAccept) ? kReadable : 0;
+  case SocketEntry::Stage::Connected:
+  case SocketEntry::Stage::Datagram: break;
+  }
+  // The end of a stream is told behind its last data, so it is looked for together with data.
+  const bool reads = wants(kFdRead) && (entry.enabled & kFdClose) != 0;
+  return (reads ? kReadable | kEnded : 0) | (wants(kFdWrite) ? kWritable : 0);
+}
+
+} // namespace
+
+SocketNotifier::SocketNotifier(EventLoop& loop) : loop_(loop), epoll_(::epoll_create1(EPOLL_CLOEXEC)) {
+  if (epoll_) watch_ = loop_.WatchDescriptor(epoll_.Number(), [this] { Serve(); });
+}
+
+SocketEntry* SocketNotifier::Find(SocketHandle socket) {
+  const auto found = sockets_.find(socket);
+  return found == sockets_.end() ? nullptr : &found->second;
+}
+
+SocketHandle SocketNotifier::Add(SocketEntry entry) {
+  // A number of its own, never that of a socket gone before: messages for that one may still be on their way.
+  last_ += 4;
+  sockets_.emplace(last_, std::move(entry));
+  return last_;
+}
+
+void SocketNotifier::Remove(SocketHandle socket) { sockets_.erase(socket); }
+
+void SocketNotifier::Clear() { sockets_.clear(); }
+
+void SocketNotifier::Rearm(SocketHandle socket, SocketEntry& entry) {
+  const std::uint32_t interest = InterestOf(entry);
+  if (interest == entry.watched) return;
+  epoll_event event{};
+  event.events = interest;
+  event.data.u32 = socket;
+  const int operation = interest == 0 ? EPOLL_CTL_DEL : entry.watched == 0 ? EPOLL_CTL_ADD : EPOLL_CTL_MOD;
+  ::epoll_ctl(epoll_.Number(), operation, entry.descriptor.Number(), &event);
+  entry.watched = interest;
+}
+
+void SocketNotifier::Enable(SocketHandle socket, SocketEntry& entry, std::int32_t events) {
+  entry.enabled |= events;
+  Rearm(socket, entry);
+}
+
+void SocketNotifier::Announce(SocketHandle socket, SocketEntry& entry, SocketEvent event,
+                              std::int32_t error) {
+  if ((entry.mask & entry.enabled & event) == 0) return;
+  entry.enabled &= ~event;
+  loop_.PostMessage(entry.window, entry.message, socket,
+                    static_cast<std::uint32_t>(event) | static_cast<std::uint32_t>(error) << 16);
+}
+
+void SocketNotifier::Serve() {
+  std::array<epoll_event, kBatch> ready;
+  const int count = ::epoll_wait(epoll_.Number(), ready.data(), kBatch, 0);
+  for (int i = 0; i < count; ++i) {
+    const SocketHandle socket = ready[static_cast<std::size_t>(i)].data.u32;
+    SocketEntry* entry = Find(socket);
+    if (!entry) continue;
+    OnReady(socket, *entry, ready[static_cast<std::size_t>(i)].events);
+    Rearm(socket, *entry);
+  }
+}
+
+void SocketNotifier::OnReady(SocketHandle socket, SocketEntry& entry, std::uint32_t ready) {
+  switch (entry.stage) {
+  case SocketEntry::Stage::Fresh: return;
+  case SocketEntry::Stage::Connecting: return OnConnectionReady(socket, entry);
+  case SocketEntry::Stage::Listening: return Announce(socket, entry, kFdAccept);
+  case SocketEntry::Stage::Datagram:
+    // An answer that nobody listens there leaves an error behind; a datagram socket goes on.
+    if ((ready & EPOLLERR) != 0) TakeError(entry.descriptor.Number());
+    if ((ready & EPOLLIN) != 0) Announce(socket, entry, kFdRead);
+    break;
+  case SocketEntry::Stage::Connected:
+    if ((ready & (EPOLLIN | EPOLLRDHUP | EPOLLHUP | EPOLLERR)) != 0) OnStreamReadable(socket, entry);
+    break;
+  }
+  if ((ready & EPOLLOUT) != 0) Announce(socket, entry, kFdWrite);
+}
+
+void SocketNotifier::OnConnectionReady(SocketHandle socket, SocketEntry& entry) {
+  const int error = TakeError(entry.descriptor.Number());
+  entry.stage = error == 0 ? SocketEntry::Stage::Connected : SocketEntry::Stage::Fresh;
+  Announce(socket, entry, kFdConnect, SocketErrorOf(error));
+  if (error == 0) Announce(socket, entry, kFdWrite);
+}
+
+void SocketNotifier::OnStreamReadable(SocketHandle socket, SocketEntry& entry) {
+  if ((entry.enabled & kFdRead) == 0) return;
+  if (BytesWaiting(entry.descriptor.Number()) > 0) return Announce(socket, entry, kFdRead);
+  Announce(socket, entry, kFdClose, SocketErrorOf(TakeError(entry.descriptor.Number())));
+  entry.enabled &= ~(kFdClose | kFdWrite);
+}
+
+} // namespace quendra::platform::linux_
