@@ -3,9 +3,8 @@
 #include "platform/linux/LinuxMachine.h"
 
 int main(int argc, char** argv) {
-  quendra::forms::qt::QtDesktop desktop(argc, argv);
+  quendra::forms::QtDesktop desktop(argc, argv);
   quendra::platform::linux_::LinuxMachine machine(desktop);
   quendra::app::Program program(machine.Operations(), desktop);
-  program.Start();
-  return desktop.Run();
+  return desktop.Run([&] { program.Start(); });
 }

@@ -6,6 +6,8 @@
 namespace quendra::shell::looks {
 
 inline constexpr forms::Colour kLime = forms::Rgb(162, 233, 93);
+/// The foot of the main window, as its background picture has it.
+inline constexpr forms::Colour kFoot = forms::Rgb(205, 243, 168);
 inline constexpr forms::Colour kForest = forms::Rgb(24, 61, 16);
 inline constexpr forms::Colour kLeaf = forms::Rgb(46, 125, 50);
 inline constexpr forms::Colour kPaper = forms::Rgb(250, 253, 247);

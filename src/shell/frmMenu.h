@@ -56,8 +56,8 @@ class frmMenu : public forms::Form {
   Label lblWelcome{picOut, u"lblWelcome"};
   Label lblWelcomeHint{picOut, u"lblWelcomeHint"};
   std::array<PictureBox, 6> PicMenu = ControlArray<PictureBox, 6>(*this, u"PicMenu");
-  MenuHighlight::Lines linMenu1 = ControlArrayOn<forms::Line>(PicMenu, u"linMenu1");
-  MenuHighlight::Lines linMenu2 = ControlArrayOn<forms::Line>(PicMenu, u"linMenu2");
+  MenuHighlight::Lines linMenu1 = LinesOnSecondRow(u"linMenu1");
+  MenuHighlight::Lines linMenu2 = LinesOnSecondRow(u"linMenu2");
   std::array<Label, 6> lblCaption = ControlArrayOn<Label>(PicMenu, u"lblCaption");
   Label Label1{*this, u"Label1"};
   std::array<PictureBox, 3> picMenu2 = ControlArray<PictureBox, 3>(*this, u"picMenu2");
@@ -106,8 +106,10 @@ class frmMenu : public forms::Form {
   Boolean16 InBackground() const { return inBackground_; }
 
  private:
+  MenuHighlight::Lines LinesOnSecondRow(TextView name);
   void DesignMenu();
   void DesignEntry(std::size_t entry);
+  void DesignLines();
   void DesignWelcome();
   void DesignPages();
   void DesignPageWithoutContent(Label& title, Label& back, const char16_t* caption);

@@ -1,4 +1,5 @@
 #include "shell/Looks.h"
+#include "shell/MenuLayout.h"
 #include "shell/Twips.h"
 #include "shell/Wording.h"
 #include "shell/frmMenu.h"
@@ -7,25 +8,14 @@ namespace quendra::shell {
 
 namespace {
 
-constexpr int kWindowWidth = 1150;
-constexpr int kWindowHeight = 760;
-constexpr int kMargin = 16;
-constexpr int kButtonWidth = 264;
-constexpr int kButtonHeight = 64;
-constexpr int kButtonGap = 12;
-constexpr int kLinkHeight = 26;
-constexpr int kMenuTop = 14;
-constexpr int kLinksTop = kMenuTop + kButtonHeight + 6;
-constexpr int kPageTop = kLinksTop + kLinkHeight + 10;
-constexpr int kPageWidth = kWindowWidth - 2 * kMargin;
-constexpr int kPageHeight = kWindowHeight - kPageTop - kMargin;
+using namespace layout;
 
 constexpr const char16_t* kPageNames[] = {u"ניטור תהליכים", u"בעיות גלישה", u"התחברות ראשונה"};
 constexpr const char* kButtonArtwork[] = {"menu_monitor", "menu_surf", "menu_connect"};
 
-void Place(forms::Line& line, int x1, int x2, int y, int width) {
-  line.Ends = forms::LineEnds{Px(x1), Px(y), Px(x2), Px(y)};
-  line.BorderWidth = width;
+void Place(forms::Line& line, int x1, int y1, int x2, int y2) {
+  line.Ends = forms::LineEnds{Px(x1), Px(y1), Px(x2), Px(y2)};
+  line.BorderWidth = 1;
   line.ForeColour = looks::kLeaf;
   line.Visible = false;
 }
@@ -47,6 +37,7 @@ void frmMenu::DesignMenu() {
   picOut.Contents = forms::Picture::Artwork("background");
   picOut.Move(0, 0, Px(kWindowWidth), Px(kWindowHeight));
   for (std::size_t entry = 0; entry < PicMenu.size(); ++entry) DesignEntry(entry);
+  DesignLines();
   for (std::size_t button = 0; button < picMenu3.size(); ++button) {
     const std::string artwork = kButtonArtwork[button];
     picMenu2[button].Contents = forms::Picture::Artwork(artwork + "_hot");
@@ -63,18 +54,32 @@ void frmMenu::DesignMenu() {
 void frmMenu::DesignEntry(std::size_t entry) {
   const bool isButton = entry < picMenu3.size();
   const int column = static_cast<int>(entry % picMenu3.size());
+  const int width = isButton ? kButtonWidth : kLinkWidth;
   const int height = isButton ? kButtonHeight : kLinkHeight;
-  PictureBox& picture = PicMenu[entry];
+  const int left = (isButton ? kMargin : kLinksLeft) + column * (width + kButtonGap);
+  PicMenu[entry].BackColour = isButton ? looks::kLime : looks::kFoot;
+  PicMenu[entry].Move(Px(left), Px(isButton ? kMenuTop : kLinksTop), Px(width), Px(height));
   Label& caption = lblCaption[entry];
-  picture.BackColour = looks::kLime;
-  picture.Move(Px(kMargin + column * (kButtonWidth + kButtonGap)), Px(isButton ? kMenuTop : kLinksTop),
-               Px(kButtonWidth), Px(height));
-  const char16_t* name = kPageNames[isButton ? entry : 5 - entry];
-  looks::Text(caption, name, isButton ? looks::kEntry : looks::kSmall, looks::kForest);
+  looks::Text(caption, kPageNames[isButton ? entry : 5 - entry], isButton ? looks::kEntry : looks::kSmall,
+              looks::kForest);
   caption.Align = forms::Alignment::Centre;
-  caption.Move(0, 0, Px(kButtonWidth), Px(height));
-  Place(linMenu1[entry], isButton ? 24 : 60, kButtonWidth - (isButton ? 24 : 60), height - 2, 2);
-  Place(linMenu2[entry], isButton ? 60 : 100, kButtonWidth - (isButton ? 60 : 100), height - 4, 1);
+  caption.Move(0, 0, Px(width), Px(height));
+}
+
+/// The lines of an entry of the second row and of the one three before show together: a frame round the
+/// entry.
+void frmMenu::DesignLines() {
+  const int left = 1;
+  const int right = kLinkWidth - 1;
+  const int top = 1;
+  const int bottom = kLinkHeight - 1;
+  for (std::size_t button = 0; button < picMenu3.size(); ++button) {
+    const std::size_t link = button + picMenu3.size();
+    Place(linMenu1[button], left, top, right, top);
+    Place(linMenu2[button], right, top, right, bottom);
+    Place(linMenu1[link], left, bottom, right, bottom);
+    Place(linMenu2[link], left, top, left, bottom);
+  }
 }
 
 void frmMenu::DesignWelcome() {

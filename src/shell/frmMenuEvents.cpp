@@ -3,6 +3,13 @@
 
 namespace quendra::shell {
 
+MenuHighlight::Lines frmMenu::LinesOnSecondRow(TextView name) {
+  const auto holder = [this](std::size_t entry) -> forms::Container& {
+    return PicMenu[entry < MenuHighlight::kButtons ? entry + MenuHighlight::kButtons : entry];
+  };
+  return MakeControls<forms::Line>(name, holder, std::make_index_sequence<MenuHighlight::kEntries>());
+}
+
 monitor::MonitorPage frmMenu::Page() {
   return {frameMain,      main_ListView1,   main_ImList,      main_headersIL,      main_Pic,
           main_lblUpload, main_lblDownload, main_cmbAdapters, main_lblCaptureState};

@@ -1,4 +1,5 @@
 #include "shell/Looks.h"
+#include "shell/MenuLayout.h"
 #include "shell/Twips.h"
 #include "shell/frmMenu.h"
 
@@ -6,10 +7,11 @@ namespace quendra::shell {
 
 namespace {
 
-constexpr int kPageWidth = 1118;
+using layout::kPageWidth;
+
 constexpr int kInset = 6;
 constexpr int kTableTop = 54;
-constexpr int kTableHeight = 446;
+constexpr int kTableHeight = 450;
 constexpr int kActionsTop = kTableTop + kTableHeight + 10;
 constexpr int kAdaptersTop = kActionsTop + 44;
 

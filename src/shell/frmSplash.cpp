@@ -10,6 +10,8 @@ namespace {
 
 /// Room that the agreement leaves free beside its lines, in pixels.
 constexpr int kSideRoom = 30;
+/// Letters may reach a pixel beyond their measured width.
+constexpr int kLinkRoom = 1;
 
 } // namespace
 
@@ -40,7 +42,7 @@ void frmSplash::PlaceLinkOnItsWord() {
   const double twips = desktop_.TwipsPerPixelX();
   forms::Geometry place = lblWarning.Position;
   place.left += RoundToInt32(desktop_.TextWidth(picBuffer, before) * twips);
-  place.width = RoundToInt32(desktop_.TextWidth(picBuffer, Label1.Caption()) * twips);
+  place.width = RoundToInt32((desktop_.TextWidth(picBuffer, Label1.Caption()) + kLinkRoom) * twips);
   Label1.Position = place;
 }
 

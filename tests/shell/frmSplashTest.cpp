@@ -81,9 +81,9 @@ TEST_F(Splash, Has_the_link_lie_on_the_last_word_of_the_warning) {
   program.Start();
   const forms::Geometry warning = splash.lblWarning.Position;
   const forms::Geometry link = splash.Label1.Position;
-  // 74 letters of 8 pixels stand before the word, which has 3.
+  // 74 letters of 8 pixels stand before the word, which has 3; one pixel is room.
   EXPECT_EQ(link.left, warning.left + 74 * 8 * 15);
-  EXPECT_EQ(link.width, 3 * 8 * 15);
+  EXPECT_EQ(link.width, (3 * 8 + 1) * 15);
   EXPECT_EQ(link.top, warning.top);
   EXPECT_EQ(link.height, warning.height);
 }

@@ -1,0 +1,72 @@
+#include "shell/ProgramFixture.h"
+
+#include <fstream>
+#include <sstream>
+
+namespace quendra::shell {
+namespace {
+
+/// What stands on the screen, as text, beside a file of the folder snapshots.
+class Snapshot : public ProgramTest {
+ protected:
+  void ExpectScreen(forms::Form& form, const std::string& name) {
+    const std::string path = QUENDRA_SOURCE_DIR "/tests/shell/snapshots/" + name + ".txt";
+    std::ifstream file(path);
+    ASSERT_TRUE(file) << path;
+    std::stringstream expected;
+    expected << file.rdbuf();
+    EXPECT_EQ(desktop.Render(form), expected.str());
+  }
+};
+
+TEST_F(Snapshot, Of_the_splash) {
+  program.Start();
+  ExpectScreen(program.frmSplash, "splash");
+}
+
+TEST_F(Snapshot, Of_the_splash_with_its_agreement) {
+  program.Start();
+  desktop.Click(program.frmSplash.Label1);
+  ExpectScreen(program.frmSplash, "agreement");
+}
+
+TEST_F(Snapshot, Of_the_home_state) {
+  ComeHome();
+  ExpectScreen(program.frmMenu, "home");
+}
+
+TEST_F(Snapshot, Of_a_hovered_entry_of_the_second_row) {
+  ComeHome();
+  desktop.MouseMove(program.frmMenu.lblCaption[4]);
+  ExpectScreen(program.frmMenu, "hover");
+}
+
+TEST_F(Snapshot, Of_the_monitor_page) {
+  machine.AddProcess({4, 0, "System", ""});
+  machine.AddProcess({100, 4, "browser.exe", "C:\\browser.exe"});
+  machine.AddConnection({5, "10.0.0.5", 1025, "192.0.2.80", 80, 100});
+  ComeHome();
+  ClickEntry(0);
+  ExpectScreen(program.frmMenu, "monitor");
+}
+
+TEST_F(Snapshot, Of_the_page_for_surf_problems) {
+  ComeHome();
+  ClickEntry(1);
+  ExpectScreen(program.frmMenu, "surf");
+}
+
+TEST_F(Snapshot, Of_the_page_for_the_first_connection) {
+  ComeHome();
+  ClickEntry(2);
+  ExpectScreen(program.frmMenu, "connect");
+}
+
+TEST_F(Snapshot, Of_the_about_box) {
+  ComeHome();
+  desktop.Click(program.frmMenu.Label1);
+  ExpectScreen(program.frmAbout, "about");
+}
+
+} // namespace
+} // namespace quendra::shell
