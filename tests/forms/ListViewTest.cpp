@@ -272,6 +272,18 @@ TEST_F(ListViewTest, A_cell_that_is_set_to_what_it_holds_tells_nobody) {
   EXPECT_EQ(list.Revision(), revision);
 }
 
+TEST_F(ListViewTest, A_text_put_behind_a_cells_text_is_told_as_a_change_and_an_empty_one_is_not) {
+  ListRow& row = Add(u"p4", u".80.");
+  Watch();
+
+  row.AppendCellText(1, u"443.");
+  row.AppendCellText(1, u"");
+
+  EXPECT_EQ(row.CellText(1), u".80.443.");
+  EXPECT_EQ(observer.told, (std::vector<std::string>{"changed 1.1"}));
+  EXPECT_EQ(FaultOf([&] { row.AppendCellText(2, u"x"); }), Fault::kSubscript);
+}
+
 TEST_F(ListViewTest, The_revision_grows_with_rows_order_and_texts_and_not_with_tags) {
   ListRow& row = Add(u"p4", u"a");
   Add(u"p8", u"b");

@@ -34,6 +34,23 @@ void ExpectTheAnswersOfAPlainSearch(PortsCells& cells, const forms::ListRow& row
   }
 }
 
+/// Answers the first change of a cell by writing that cell itself.
+struct MeddlingView : forms::ListViewObserver {
+  explicit MeddlingView(forms::ListView& watched) : list(watched) { list.Observe(this); }
+  ~MeddlingView() override { list.Observe(nullptr); }
+  void RowChanged(int index, int cell) override {
+    if (!std::exchange(answered, true)) list.Row(index).SetCellText(cell, u".7.");
+  }
+  void RowAdded(int) override {}
+  void RowRemoved(int) override {}
+  void RowsMoved() override {}
+  void RowsCleared() override {}
+  void ColumnsChanged() override {}
+
+  forms::ListView& list;
+  bool answered = false;
+};
+
 } // namespace
 
 TEST_F(PortsCellsOfAList, An_empty_cell_takes_a_first_dot_the_port_and_a_dot) {
@@ -77,6 +94,15 @@ TEST_F(PortsCellsOfAList, A_cell_that_somebody_else_writes_is_read_anew) {
   forms::ListRow& row = Row(LongPorts());
   ExpectTheAnswersOfAPlainSearch(cells, row);
   row.SetCellText(kPortsCell, u".7.");
+  ExpectTheAnswersOfAPlainSearch(cells, row);
+}
+
+TEST_F(PortsCellsOfAList, A_cell_that_is_written_in_answer_to_its_growth_is_read_anew) {
+  forms::ListRow& row = Row(LongPorts());
+  ExpectTheAnswersOfAPlainSearch(cells, row);
+  MeddlingView view(list);
+  cells.Append(row, u"54321");
+  ASSERT_EQ(row.CellText(kPortsCell), u".7.");
   ExpectTheAnswersOfAPlainSearch(cells, row);
 }
 
