@@ -25,6 +25,7 @@ ListViewView::ListViewView(ViewContext& context, ListView& list, QWidget* parent
   setTextElideMode(Qt::ElideRight);
   auto* header = new ListHeader(model_, ReadsFromRightToLeft(), this);
   setHeader(header);
+  header->setSectionsClickable(true); // setHeader takes it away
   connect(header, &QHeaderView::sectionClicked, this, [this](int section) { HeaderClicked(section); });
   setItemDelegate(new ListDelegate(model_, ReadsFromRightToLeft(), this));
   setModel(&model_);
