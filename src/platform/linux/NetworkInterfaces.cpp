@@ -78,7 +78,7 @@ std::vector<DefaultRoute> ParseDefaultRoutes(std::string_view text) {
 std::vector<NetworkInterface> ReadNetworkInterfaces(const ProcFolder& folder) {
   std::vector<NetworkInterface> interfaces;
   AddAddresses(interfaces);
-  for (const auto& route : ParseDefaultRoutes(folder.File("net/route").value_or(""))) {
+  for (const auto& route : ParseDefaultRoutes(folder.File("thread-self/net/route").value_or(""))) {
     const auto found = std::find_if(interfaces.begin(), interfaces.end(),
                                     [&](const auto& interface) { return interface.name == route.interface; });
     if (found == interfaces.end()) continue;

@@ -26,7 +26,7 @@ struct DefaultRoute {
   std::uint32_t metric = 0;
 };
 
-/// The default routes in the text of /proc/net/route, the preferred one first. Lines that are no such lines
+/// The default routes in a text such as that of /proc/net/route, the preferred one first. Lines that are no such lines
 /// are left out.
 std::vector<DefaultRoute> ParseDefaultRoutes(std::string_view text);
 

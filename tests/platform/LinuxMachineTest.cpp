@@ -1,0 +1,158 @@
+#include "platform/linux/LinuxMachine.h"
+#include "LinuxFixture.h"
+#include "forms/headless/HeadlessDesktop.h"
+#include "platform/Handles.h"
+#include "platform/HostNames.h"
+#include "platform/IpHelper.h"
+#include "platform/Sockets.h"
+#include "platform/linux/LinuxShellStart.h"
+#include "platform/linux/LinuxSystem.h"
+
+#include <gtest/gtest.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <ctime>
+#include <filesystem>
+#include <fstream>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+TEST(LinuxSystemTest, The_version_is_of_the_family_with_a_TCP_owner_table) {
+  LinuxSystem system;
+  OsVersion version;
+  ASSERT_TRUE(system.GetVersionExA(version));
+  EXPECT_EQ(version.platformId, 2u);
+  EXPECT_EQ(version.majorVersion, 5u);
+  EXPECT_EQ(version.minorVersion, 1u);
+}
+
+TEST(LinuxSystemTest, The_tick_is_in_milliseconds_and_does_not_go_back) {
+  LinuxSystem system;
+  const std::uint32_t before = system.GetTickCount();
+  timespec now{};
+  ::clock_gettime(CLOCK_MONOTONIC, &now);
+  const auto expected = static_cast<std::uint32_t>(now.tv_sec * 1000 + now.tv_nsec / 1'000'000);
+  EXPECT_LT(expected - before, 1000u);
+  EXPECT_LT(system.GetTickCount() - before, 0x80000000u);
+}
+
+TEST(LinuxSystemTest, The_day_is_counted_so_that_day_1_is_31_December_1899) {
+  const Child child([] {
+    ::setenv("TZ", "UTC", 1);
+    ::tzset();
+    LinuxSystem system;
+    const std::time_t before = std::time(nullptr) / 86400;
+    const std::int32_t day = system.DayNumber();
+    const std::time_t after = std::time(nullptr) / 86400;
+    // 1 January 1970 is day 25569.
+    return std::string(day - 25569 >= before && day - 25569 <= after ? "right" : "wrong");
+  });
+  EXPECT_EQ(child.Answer(), "right");
+}
+
+TEST(LinuxShellStartTest, A_command_line_is_parted_at_blanks_that_are_not_in_quotes) {
+  using Words = std::vector<std::string>;
+  EXPECT_EQ(CommandWords("regsvr32.exe -s \"packetvb.dll\""), (Words{"regsvr32.exe", "-s", "packetvb.dll"}));
+  EXPECT_EQ(CommandWords("  \"a b\"c  d\t\"\" "), (Words{"a bc", "d", ""}));
+  EXPECT_EQ(CommandWords(""), Words{});
+  EXPECT_EQ(CommandWords("\"open"), Words{"open"});
+}
+
+TEST(LinuxShellStartTest, A_program_that_does_not_exist_cannot_be_started) {
+  LinuxShellStart shell;
+  EXPECT_FALSE(shell.Shell("quendra-no-such-program.exe -s \"x.dll\"", ShellStart::kNormalWindow));
+  EXPECT_FALSE(shell.Shell("", ShellStart::kNormalWindow));
+  EXPECT_FALSE(shell.Shell("\"\"", ShellStart::kNormalWindow));
+}
+
+TEST(LinuxShellStartTest, A_file_that_is_no_program_cannot_be_started) {
+  const TemporaryFolder folder;
+  LinuxShellStart shell;
+  EXPECT_FALSE(shell.Shell(folder.Write("text", "touch x\n", true), ShellStart::kNormalWindow));
+  EXPECT_FALSE(shell.Shell(folder.Path(), ShellStart::kNormalWindow));
+}
+
+TEST(LinuxShellStartTest, A_program_is_started_without_waiting_and_leaves_no_child_behind) {
+  const TemporaryFolder folder;
+  const std::string done = folder / "with blank";
+  LinuxShellStart shell;
+  ASSERT_TRUE(shell.Shell("touch \"" + done + "\"", ShellStart::kNormalWindow));
+  for (int i = 0; i < 5000 && !std::filesystem::exists(done); ++i) ::usleep(1000);
+  EXPECT_TRUE(std::filesystem::exists(done));
+  EXPECT_EQ(::waitpid(-1, nullptr, WNOHANG), -1);
+  EXPECT_EQ(errno, ECHILD);
+}
+
+TEST(LinuxShellStartTest, Signs_that_a_shell_would_understand_are_plain_words) {
+  const TemporaryFolder folder;
+  LinuxShellStart shell;
+  ASSERT_TRUE(shell.Shell("touch " + (folder / "a;b") + " " + (folder / "$HOME"), ShellStart::kNormalWindow));
+  for (int i = 0; i < 5000 && !std::filesystem::exists(folder / "$HOME"); ++i) ::usleep(1000);
+  EXPECT_TRUE(std::filesystem::exists(folder / "a;b"));
+  EXPECT_TRUE(std::filesystem::exists(folder / "$HOME"));
+}
+
+struct LinuxMachineTest : testing::Test {
+  forms::HeadlessDesktop desktop;
+  LinuxMachine machine{desktop};
+  Machine operations = machine.Operations();
+};
+
+TEST_F(LinuxMachineTest, Operations_that_this_system_lacks_answer_that_they_are_not_available) {
+  std::uint8_t buffer[64] = {};
+  std::uint32_t returned = 1;
+  EXPECT_EQ(operations.handles.NtQuerySystemInformation(16, buffer, returned),
+            Handles::kStatusNotImplemented);
+  EXPECT_EQ(operations.handles.NtQueryObject(4, 1, buffer, returned), Handles::kStatusNotImplemented);
+  EXPECT_EQ(operations.handles.NtDeviceIoControlFile(4, 0, 0x210012, buffer, buffer),
+            Handles::kStatusNotImplemented);
+  Handle duplicate = 0;
+  EXPECT_FALSE(operations.handles.DuplicateHandle(4, 4, 4, duplicate, 0, false, 0));
+  EXPECT_EQ(operations.sockets.recv(4, buffer, 0), -1);
+  EXPECT_EQ(operations.sockets.WSAAsyncSelect(4, 1, 1, 1), -1);
+  EXPECT_EQ(operations.sockets.closesocket(4), -1);
+  EXPECT_FALSE(operations.sockets.WSAIsBlocking());
+}
+
+TEST_F(LinuxMachineTest, The_own_process_is_in_the_snapshot_under_its_file_name) {
+  const Handle snapshot = operations.processes.CreateToolhelp32Snapshot(Processes::kSnapProcess, 0);
+  ASSERT_NE(snapshot, kInvalidHandle);
+  Processes::Entry entry;
+  std::string name = "(none)";
+  for (bool more = operations.processes.Process32First(snapshot, entry); more;
+       more = operations.processes.Process32Next(snapshot, entry))
+    if (entry.processId == static_cast<std::uint32_t>(::getpid())) name = entry.exeFile.data();
+  EXPECT_EQ(name, "platform_test");
+  EXPECT_TRUE(operations.processes.CloseHandle(snapshot));
+}
+
+TEST_F(LinuxMachineTest, A_user_without_rights_gets_snapshot_table_and_host_addresses) {
+  if (::geteuid() != 0) GTEST_SKIP() << "needs the administrator to become another user";
+  const Child user([] {
+    if (::setgid(65534) != 0 || ::setuid(65534) != 0) return std::string("no other user");
+    forms::HeadlessDesktop loop;
+    LinuxMachine limited(loop);
+    const Machine machine = limited.Operations();
+    std::string text;
+    Processes::Entry entry;
+    const Handle snapshot = machine.processes.CreateToolhelp32Snapshot(Processes::kSnapProcess, 0);
+    if (machine.processes.Process32First(snapshot, entry))
+      text += std::string("first ") + entry.exeFile.data();
+    const Handle first = machine.processes.OpenProcess(1040, false, 1);
+    std::uint32_t modules[50] = {};
+    if (!machine.processes.EnumProcessModules(first, modules)) text += ", no path";
+    IpHelper::TcpTable table;
+    if (machine.ipHelper.AllocateAndGetTcpExTableFromStack(table) == 0) text += ", a table";
+    if (machine.hostNames.gethostname()) text += ", a name";
+    return text;
+  });
+  EXPECT_EQ(user.Answer(), "first services.exe, no path, a table, a name");
+}
+
+} // namespace
+
+} // namespace quendra::platform::linux_
