@@ -7,6 +7,8 @@
 import sys
 import unicodedata
 
+from accessible import Program
+
 
 def width(text):
     return sum(not unicodedata.combining(letter) for letter in text)
@@ -25,8 +27,6 @@ def as_text(captions, rows, limit=None):
 
 
 def main():
-    from accessible import Program
-
     table = Program(int(sys.argv[1])).table()
     print(as_text(table.captions(), table.rows()))
 
