@@ -15,7 +15,10 @@ Control::Control(Container& parent, Text name) : name_(std::move(name)), parent_
 }
 
 Control::~Control() {
-  if (view_) view_->ControlGone();
+  if (view_) {
+    view_->control_ = nullptr;
+    view_->ControlGone();
+  }
   if (parent_) std::erase(parent_->children_, this);
 }
 
@@ -38,8 +41,15 @@ void Control::BringToFront() {
   TellChanged(*this, Aspect::Order);
 }
 
+ControlView::~ControlView() {
+  if (control_) control_->view_ = nullptr;
+}
+
 void Control::Attach(ControlView* view) {
+  if (view_) view_->control_ = nullptr;
+  if (view && view->control_) view->control_->view_ = nullptr;
   view_ = view;
+  if (view_) view_->control_ = this;
   TellChanged(*this, Aspect::All);
 }
 

@@ -29,13 +29,24 @@ struct Font {
   friend bool operator==(const Font&, const Font&) = default;
 };
 
-/// What a view is told. One view at most is attached to a control.
+class Control;
+
+/// What a view is told. A control has one view at most, a view one control; whichever goes first, the other
+/// is left alone.
 class ControlView {
  public:
-  virtual ~ControlView() = default;
+  ControlView() = default;
+  virtual ~ControlView();
+  ControlView(const ControlView&) = delete;
+  ControlView& operator=(const ControlView&) = delete;
+
   virtual void Changed(Aspect aspect) = 0;
   /// The control goes while the view is attached; it must not be touched any more.
   virtual void ControlGone() {}
+
+ private:
+  friend class Control;
+  Control* control_ = nullptr;
 };
 
 enum MouseButton : int { kNoButton = 0, kLeftButton = 1, kRightButton = 2 };
@@ -81,6 +92,7 @@ class Control {
   explicit Control(Text name) : name_(std::move(name)) {}
 
  private:
+  friend class ControlView;
   friend void TellChanged(Control& owner, Aspect aspect);
 
   Text name_;

@@ -89,6 +89,43 @@ TEST_F(ControlTest, A_view_learns_that_its_control_has_gone) {
   EXPECT_TRUE(view.gone);
 }
 
+TEST_F(ControlTest, A_view_that_goes_leaves_its_control_without_one) {
+  {
+    RecordingView shortLived;
+    label.Attach(&shortLived);
+  }
+
+  label.Caption = u"nobody hears";
+
+  EXPECT_EQ(label.View(), nullptr);
+}
+
+TEST_F(ControlTest, A_view_that_moves_to_another_control_leaves_the_first) {
+  Label other{frame, u"other"};
+  label.Attach(&view);
+  other.Attach(&view);
+  view.told.clear();
+
+  label.Caption = u"x";
+  other.Caption = u"y";
+
+  EXPECT_EQ(view.told, std::vector{Aspect::Caption});
+  EXPECT_EQ(label.View(), nullptr);
+}
+
+TEST_F(ControlTest, A_view_in_the_place_of_another_is_told_alone) {
+  RecordingView second;
+  label.Attach(&view);
+  label.Attach(&second);
+  view.told.clear();
+  second.told.clear();
+
+  label.Caption = u"x";
+
+  EXPECT_TRUE(view.told.empty());
+  EXPECT_EQ(second.told, std::vector{Aspect::Caption});
+}
+
 TEST_F(ControlTest, A_control_is_shown_while_it_and_all_its_containers_are_visible) {
   form.Visible = true;
   EXPECT_TRUE(label.IsShown());
