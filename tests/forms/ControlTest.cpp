@@ -100,6 +100,16 @@ TEST_F(ControlTest, A_view_that_goes_leaves_its_control_without_one) {
   EXPECT_EQ(label.View(), nullptr);
 }
 
+TEST_F(ControlTest, A_view_that_was_replaced_takes_nothing_with_it) {
+  {
+    RecordingView replaced;
+    label.Attach(&replaced);
+    label.Attach(&view);
+  }
+
+  EXPECT_EQ(label.View(), &view);
+}
+
 TEST_F(ControlTest, A_view_that_moves_to_another_control_leaves_the_first) {
   Label other{frame, u"other"};
   label.Attach(&view);

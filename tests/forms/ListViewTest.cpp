@@ -2,6 +2,7 @@
 
 #include "RecordingViewFixture.h"
 #include "runtime/Fault.h"
+#include "runtime/Format.h"
 
 #include <gtest/gtest.h>
 
@@ -202,6 +203,16 @@ TEST_F(ListViewTest, Equal_rows_keep_their_order_in_both_directions) {
 
   list.Sort(1, SortOrder::Ascending);
   EXPECT_EQ(Keys(), (std::vector<Text>{u"p1", u"p3", u"p2", u"p4"}));
+}
+
+TEST_F(ListViewTest, Equal_rows_keep_their_order_in_long_lists_too) {
+  for (int i = 0; i < 300; ++i) Add(u"p" + DecimalText(i), i % 3 == 0 ? u"b" : u"a");
+
+  list.Sort(1, SortOrder::Descending);
+
+  for (int i = 1; i <= 100; ++i) EXPECT_EQ(list.Row(i).Key(), u"p" + DecimalText((i - 1) * 3));
+  for (int i = 101; i < 300; ++i)
+    EXPECT_LT(NumberOf(list.Row(i).Key().substr(1)), NumberOf(list.Row(i + 1).Key().substr(1)));
 }
 
 TEST_F(ListViewTest, Latin_letters_sort_without_regard_to_case) {
