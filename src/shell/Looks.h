@@ -43,4 +43,13 @@ inline void Button(forms::Label& label, const char16_t* caption) {
   label.Align = forms::Alignment::Centre;
 }
 
+/// The one button of a page that leads on.
+inline void LeadingButton(forms::Label& label, const char16_t* caption) {
+  Button(label, caption);
+  label.TextFont = kStrong;
+  label.ForeColour = forms::kWhite;
+  label.BackColour = kLeaf;
+  label.Transparent = false;
+}
+
 } // namespace quendra::shell::looks

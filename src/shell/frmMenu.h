@@ -75,9 +75,9 @@ class frmMenu : public forms::Form {
   forms::ListView main_ListView1{frameMain, u"main_ListView1"};
   Label main_lblEndProcess{frameMain, u"main_lblEndProcess"};
   Label main_lblJumpToPath{frameMain, u"main_lblJumpToPath"};
-  Label main_cmdAddRemove{frameMain, u"main_cmdAddRemove"};
   Label main_cmdChecks{frameMain, u"main_cmdChecks"};
   Label main_cmdMemInfo{frameMain, u"main_cmdMemInfo"};
+  Label main_cmdAddRemove{frameMain, u"main_cmdAddRemove"};
   Label main_cmdRpt{frameMain, u"main_cmdRpt"};
   Frame main_Frame1{frameMain, u"main_Frame1"};
   forms::ComboBox main_cmbAdapters{main_Frame1, u"main_cmbAdapters"};

@@ -27,9 +27,9 @@ void Place(const Meter& meter, const char16_t* caption, int left) {
   meter.caption.Move(Px(left), Px(18), Px(70), Px(22));
   looks::Text(meter.figure, u"0.0", looks::kFigure, looks::kForest);
   meter.figure.Align = forms::Alignment::Centre;
-  meter.figure.Move(Px(left + 72), Px(12), Px(90), Px(30));
+  meter.figure.Move(Px(left + 72), Px(12), Px(116), Px(30));
   looks::Text(meter.unit, u"ק\"ב לשנייה", looks::kSmall, looks::kQuiet);
-  meter.unit.Move(Px(left + 164), Px(19), Px(76), Px(20));
+  meter.unit.Move(Px(left + 190), Px(19), Px(76), Px(20));
 }
 
 } // namespace
@@ -44,8 +44,8 @@ void frmMenu::DesignMonitorPage() {
 }
 
 void frmMenu::DesignMeters() {
-  Place({main_Label2, main_lblUpload, main_lblUploadUnit}, u"העלאה:", kPageWidth - 500);
-  Place({main_Label3, main_lblDownload, main_lblDownloadUnit}, u"הורדה:", kPageWidth - 254);
+  Place({main_Label2, main_lblUpload, main_lblUploadUnit}, u"העלאה:", kPageWidth - 556);
+  Place({main_Label3, main_lblDownload, main_lblDownloadUnit}, u"הורדה:", kPageWidth - 280);
 }
 
 void frmMenu::DesignTable() {
@@ -85,7 +85,7 @@ void frmMenu::DesignActions() {
     looks::Button(action.label, action.caption);
     action.label.Move(Px(action.left), Px(kActionsTop), Px(action.width), Px(34));
   }
-  main_cmdRpt.TextFont = looks::kStrong;
+  looks::LeadingButton(main_cmdRpt, u"שלח דוח");
 }
 
 void frmMenu::DesignAdapters() {

@@ -34,9 +34,8 @@ void frmSplash::DesignTexts() {
   Label1.BackColour = looks::kPaper;
   Label1.Move(Px(24), Px(288), Px(30), Px(22));
 
-  looks::Button(Label2, u"המשך");
+  looks::LeadingButton(Label2, u"המשך");
   Label2.Move(Px(24), Px(330), Px(120), Px(36));
-  Label2.TextFont = looks::kStrong;
   looks::Button(Label3, u"סגור");
   Label3.Move(Px(156), Px(330), Px(120), Px(36));
 
