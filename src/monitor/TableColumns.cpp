@@ -34,8 +34,6 @@ constexpr std::array<Column, 9> kColumns{{
 void ProcessTable::PrepareTable() {
   forms::ListView& list = page_.main_ListView1;
   list.Clear();
-  list.SmallIcons = &page_.main_ImList;
-  list.HeaderIcons = &page_.main_headersIL;
   list.ClearColumns();
   for (const Column& column : kColumns)
     list.AddColumn({column.caption, column.width, column.alignment, column.icon, column.description});

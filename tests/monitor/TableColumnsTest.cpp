@@ -51,8 +51,6 @@ TEST_F(TableColumns, The_rates_have_header_icons_1_and_2_and_words_for_those_who
   EXPECT_EQ(Column(5).description, u"העלאה");
   EXPECT_EQ(Column(6).icon, 2);
   EXPECT_EQ(Column(6).description, u"הורדה");
-  EXPECT_EQ(list.HeaderIcons, &controls.main_headersIL);
-  EXPECT_EQ(list.SmallIcons, &controls.main_ImList);
 }
 
 TEST_F(TableColumns, Preparing_again_does_not_double_the_columns) {
