@@ -1,16 +1,19 @@
 // What a pass of the process table costs on this machine, beside what the system's own tools take to tell the
 // same.
 //
-//   table_pass_bench PROCESSES SOCKETS PASSES
+//   table_pass_bench PROCESSES SOCKETS PASSES [window]
 //
 // Starts PROCESSES idle processes that hold SOCKETS connected TCP sockets between them, in a network
-// namespace of its own, and runs PASSES warm passes, one a second as the program does. Prints CPU time, user
-// and system, in milliseconds:
+// namespace of its own, and runs PASSES warm passes, one a second as the program does: of the table alone, or
+// of the whole program with its window open on the monitor page. Prints CPU time, user and system, in
+// milliseconds:
 //   first F pass P ps A ss B ratio R rows N owned M
 
 #include "TablePassBenchCrowd.h"
 
+#include "app/Program.h"
 #include "forms/headless/HeadlessDesktop.h"
+#include "forms/qt/QtDesktop.h"
 #include "monitor/MonitorControls.h"
 #include "monitor/ProcessRow.h"
 #include "monitor/ProcessTable.h"
@@ -25,7 +28,10 @@
 #include <algorithm>
 #include <cstdio>
 #include <cstdlib>
+#include <functional>
+#include <numeric>
 #include <stdexcept>
+#include <string_view>
 
 namespace quendra::bench {
 
@@ -69,66 +75,104 @@ double Median(std::vector<double> values) {
   return values[values.size() / 2];
 }
 
-/// The monitor page's table over this machine.
-class Table {
- public:
-  /// A pass as the page's caller makes it; its CPU time.
-  double Pass() {
-    const double before = OwnMilliseconds();
-    table_.RefreshProcessTable(u"");
-    fields_.LastRefreshTick = static_cast<std::int32_t>(operations_.system.GetTickCount());
-    return OwnMilliseconds() - before;
-  }
-
-  /// Traffic of every tenth row, so that there are rates to write and to sort.
-  void Charge() {
-    forms::ListView& list = controls_.main_ListView1;
-    for (int i = 1; i <= list.Count(); i += 10)
-      for (const int cell : {monitor::kUploadCell, monitor::kDownloadCell})
-        list.Row(i).CellTag(cell) = list.Row(i).CellTag(cell).Number() + 1.5 * (i % 97);
-  }
-
-  int Rows() const { return controls_.main_ListView1.Count(); }
-  int RowsWithPorts() {
-    int count = 0;
-    for (int i = 1; i <= Rows(); ++i)
-      count += !controls_.main_ListView1.Row(i).CellText(monitor::kPortsCell).empty();
-    return count;
-  }
-
- private:
-  forms::HeadlessDesktop desktop_;
-  platform::linux_::LinuxMachine machine_{desktop_};
-  platform::Machine operations_ = machine_.Operations();
-  monitor::MonitorControls controls_;
-  monitor::MonitorFields fields_{2002, 0};
-  monitor::mdlFileInfo fileInfo_{operations_, desktop_};
-  monitor::modProcPort procPort_{operations_, desktop_, controls_.main_ListView1, fileInfo_};
-  monitor::ProcessTable table_{operations_, desktop_, controls_.Page(), fields_, fileInfo_, procPort_};
+/// What is measured: a list, how a pass over it is made, and what the program does until the next.
+struct Subject {
+  forms::ListView& list;
+  std::function<void()> pass;
+  std::function<void()> rest;
 };
 
-void Measure(int processes, int sockets, int passes) {
-  const TableCrowd crowd(processes, sockets);
-  Table table;
-  const double first = table.Pass();
+/// Traffic of every tenth row, so that there are rates to write and to sort.
+void Charge(forms::ListView& list) {
+  for (int i = 1; i <= list.Count(); i += 10)
+    for (const int cell : {monitor::kUploadCell, monitor::kDownloadCell})
+      list.Row(i).CellTag(cell) = list.Row(i).CellTag(cell).Number() + 1.5 * (i % 97);
+}
+
+int RowsWithPorts(forms::ListView& list) {
+  int count = 0;
+  for (int i = 1; i <= list.Count(); ++i) count += !list.Row(i).CellText(monitor::kPortsCell).empty();
+  return count;
+}
+
+/// CPU time of a pass and of all that it leads to.
+double TimePass(const Subject& subject) {
+  const double before = OwnMilliseconds();
+  subject.pass();
+  subject.rest();
+  return OwnMilliseconds() - before;
+}
+
+void Measure(const Subject& subject, double first, int passes) {
   std::vector<double> pass, ps, ss;
   for (int i = 0; i < kWarmUpPasses + passes; ++i) {
     ::sleep(1);
-    table.Charge();
-    const double taken = table.Pass();
+    Charge(subject.list);
+    const double taken = TimePass(subject);
     if (i >= kWarmUpPasses) pass.push_back(taken);
     // In between, so that all are measured on the same machine in the same state.
     if (i < kWarmUpPasses || static_cast<int>(ps.size()) >= kToolRuns) continue;
     ps.push_back(ToolMilliseconds({"ps", "-eo", "pid,ppid,comm"}));
     ss.push_back(ToolMilliseconds({"ss", "-tnp"}));
   }
-  double sum = 0;
-  for (const double taken : pass) sum += taken;
   // The mean, since a pass that looks at more than the others is part of the price.
-  const double mean = sum / static_cast<double>(pass.size());
+  const double mean = std::accumulate(pass.begin(), pass.end(), 0.0) / static_cast<double>(pass.size());
   const double tools = Median(ps) + Median(ss);
   std::printf("first %.1f pass %.2f ps %.1f ss %.1f ratio %.3f rows %d owned %d\n", first, mean, Median(ps),
-              Median(ss), mean / tools, table.Rows(), table.RowsWithPorts());
+              Median(ss), mean / tools, subject.list.Count(), RowsWithPorts(subject.list));
+}
+
+/// The table alone: no window shows it.
+void MeasureTable(int passes) {
+  forms::HeadlessDesktop desktop;
+  platform::linux_::LinuxMachine machine(desktop);
+  const platform::Machine operations = machine.Operations();
+  monitor::MonitorControls controls;
+  monitor::MonitorFields fields{2002, 0};
+  monitor::mdlFileInfo fileInfo(operations, desktop);
+  monitor::modProcPort procPort(operations, desktop, controls.main_ListView1, fileInfo);
+  monitor::ProcessTable table(operations, desktop, controls.Page(), fields, fileInfo, procPort);
+  const Subject subject{controls.main_ListView1,
+                        [&] {
+                          table.RefreshProcessTable(u"");
+                          fields.LastRefreshTick =
+                              static_cast<std::int32_t>(operations.system.GetTickCount());
+                        },
+                        [] {}};
+  const double first = TimePass(subject);
+  Measure(subject, first, passes);
+}
+
+/// The whole program with its window on the monitor page; painting counts.
+int MeasureProgram(int passes) {
+  int count = 1;
+  char name[] = "table_pass_bench";
+  char* words[] = {name, nullptr};
+  forms::QtDesktop desktop(count, words);
+  platform::linux_::LinuxMachine machine(desktop);
+  const platform::Machine operations = machine.Operations();
+  app::Program program(operations, desktop);
+  const Subject subject{program.frmMenu.main_ListView1,
+                        [&] {
+                          program.processTable.RefreshProcessTable(u"");
+                          program.monitorFields.LastRefreshTick =
+                              static_cast<std::int32_t>(operations.system.GetTickCount());
+                        },
+                        [&] {
+                          // Painting is put off by the toolkit, so it gets some time to come.
+                          for (int i = 0; i < 10; ++i) {
+                            desktop.PumpOnce();
+                            ::usleep(5000);
+                          }
+                        }};
+  return desktop.Run([&] {
+    desktop.Show(program.frmMenu);
+    const double before = OwnMilliseconds();
+    program.frmMenu.lblCaption[0].Click();
+    subject.rest();
+    Measure(subject, OwnMilliseconds() - before, passes);
+    desktop.End();
+  });
 }
 
 } // namespace
@@ -136,12 +180,17 @@ void Measure(int processes, int sockets, int passes) {
 } // namespace quendra::bench
 
 int main(int count, char** words) {
-  if (count != 4) {
-    std::fprintf(stderr, "usage: %s PROCESSES SOCKETS PASSES\n", words[0]);
+  using namespace quendra::bench;
+  const bool withWindow = count == 5 && std::string_view(words[4]) == "window";
+  if (count != 4 && !withWindow) {
+    std::fprintf(stderr, "usage: %s PROCESSES SOCKETS PASSES [window]\n", words[0]);
     return 2;
   }
   try {
-    quendra::bench::Measure(std::atoi(words[1]), std::atoi(words[2]), std::atoi(words[3]));
+    const TableCrowd crowd(std::atoi(words[1]), std::atoi(words[2]));
+    const int passes = std::max(std::atoi(words[3]), 1);
+    if (withWindow) return MeasureProgram(passes);
+    MeasureTable(passes);
   } catch (const std::exception& failure) {
     std::fprintf(stderr, "%s: %s\n", words[0], failure.what());
     return 1;
