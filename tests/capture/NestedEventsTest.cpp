@@ -11,7 +11,7 @@ struct NestedEvents : CaptureProgram {
     AddRow(1, u".1025.");
   }
   void AtYield(int yield, std::function<void()> work) {
-    desktop.OnYield = [this, yield, work = std::move(work), yields = 0]() mutable {
+    desktop.OnYield = [yield, work = std::move(work), yields = 0]() mutable {
       if (++yields == yield) work();
     };
   }
