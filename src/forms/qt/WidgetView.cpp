@@ -8,8 +8,6 @@ namespace quendra::forms::qt {
 
 WidgetView::WidgetView(ViewContext& context, Control& control, QWidget& widget)
     : context_(context), control_(&control), widget_(widget), rightToLeft_(control.OwnerForm().RightToLeft) {
-  widget_.setObjectName(ToQString(control.Name()));
-  widget_.setAccessibleDescription(ToQString(control.Name()));
   context_.mouse.Watch(widget_, *this);
 }
 
@@ -26,6 +24,7 @@ void WidgetView::ControlGone() {
 
 void WidgetView::Changed(Aspect aspect) {
   if (!control_) return;
+  if (aspect == Aspect::All) Identify();
   if (Concerns(aspect, Aspect::Geometry)) Place();
   if (Concerns(aspect, Aspect::Font)) widget_.setFont(ToQFont(control_->TextFont()));
   if (Concerns(aspect, Aspect::Enabled)) widget_.setEnabled(control_->Enabled());
@@ -34,6 +33,13 @@ void WidgetView::Changed(Aspect aspect) {
   if (Concerns(aspect, Aspect::Caption)) widget_.setAccessibleName(AccessibleName());
   if (Concerns(aspect, Aspect::Visible)) Show();
   if (aspect != Aspect::Tag && aspect != Aspect::Visible) widget_.update();
+}
+
+// Not when the widget is made: assistive technology would be told at once and take it for the bare base that
+// it still is.
+void WidgetView::Identify() {
+  widget_.setObjectName(ToQString(control_->Name()));
+  widget_.setAccessibleDescription(ToQString(control_->Name()));
 }
 
 void WidgetView::Place() { PlaceAt(control_->Position()); }

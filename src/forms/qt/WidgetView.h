@@ -62,6 +62,8 @@ class WidgetView : public View {
   static bool Concerns(Aspect told, Aspect wanted) { return told == wanted || told == Aspect::All; }
 
  private:
+  void Identify();
+
   ViewContext& context_;
   Control* control_;
   QWidget& widget_;

@@ -1,0 +1,174 @@
+#include "forms/qt/QtFixture.h"
+
+#include "forms/qt/KeyEvents.h"
+
+#include <QKeyEvent>
+
+namespace quendra::forms {
+
+class Keyboard : public QtFixture {
+ protected:
+  static constexpr int kHebrewFinalNun = 0x05DF;
+  static constexpr quint32 kFinalNunSymbol = 0xCEF;
+};
+
+TEST_F(Keyboard, Tab_reaches_every_clickable_label_and_no_other) {
+  Frame frame(form, u"frame");
+  Label first(frame, u"first");
+  Label text(frame, u"text");
+  Label second(frame, u"second");
+  PictureBox box(form, u"box");
+  Label third(box, u"third");
+  for (Label* label : {&first, &second, &third}) label->Click = [] {};
+  ShowActive();
+  WidgetOf(first).setFocus();
+
+  QList<QString> reached;
+  for (int i = 0; i < 3; ++i) {
+    PressKey(*QApplication::focusWidget(), Qt::Key_Tab, QStringLiteral("\t"));
+    reached.push_back(QApplication::focusWidget()->objectName());
+  }
+
+  EXPECT_EQ(reached,
+            QList<QString>({QStringLiteral("second"), QStringLiteral("third"), QStringLiteral("first")}));
+}
+
+TEST_F(Keyboard, Hidden_and_disabled_labels_are_passed_over) {
+  Label first(form, u"first");
+  Label hidden(form, u"hidden");
+  Label disabled(form, u"disabled");
+  Label last(form, u"last");
+  for (Label* label : {&first, &hidden, &disabled, &last}) label->Click = [] {};
+  form.design = [&] {
+    hidden.Visible = false;
+    disabled.Enabled = false;
+  };
+  ShowActive();
+  WidgetOf(first).setFocus();
+
+  PressKey(WidgetOf(first), Qt::Key_Tab, QStringLiteral("\t"));
+
+  EXPECT_EQ(QApplication::focusWidget()->objectName(), QStringLiteral("last"));
+}
+
+TEST_F(Keyboard, Enter_and_Space_press_a_label) {
+  Label label(form, u"label");
+  int clicks = 0;
+  label.Click = [&] { ++clicks; };
+  ShowActive();
+  WidgetOf(label).setFocus();
+
+  PressKey(WidgetOf(label), Qt::Key_Return, QStringLiteral("\r"));
+  EXPECT_EQ(clicks, 1);
+  PressKey(WidgetOf(label), Qt::Key_Enter, QStringLiteral("\r"));
+  EXPECT_EQ(clicks, 2);
+  PressKey(WidgetOf(label), Qt::Key_Space, QStringLiteral(" "));
+  EXPECT_EQ(clicks, 3);
+  PressKey(WidgetOf(label), Qt::Key_A, QStringLiteral("a"));
+  EXPECT_EQ(clicks, 3);
+}
+
+TEST_F(Keyboard, The_focus_ring_shows_for_those_who_use_the_keys) {
+  Label label(form, u"label");
+  label.Click = [] {};
+  form.design = [&] { label.Move(0, 0, 1500, 450); };
+  ShowActive();
+  WidgetOf(form).setAttribute(Qt::WA_KeyboardFocusChange, false);
+  WidgetOf(label).setFocus();
+  const QColor without = PixelOf(WidgetOf(label), 50, 1);
+
+  WidgetOf(form).setAttribute(Qt::WA_KeyboardFocusChange, true);
+
+  EXPECT_NE(PixelOf(WidgetOf(label), 50, 1), without);
+}
+
+TEST_F(Keyboard, Keys_reach_a_form_with_a_preview_once_and_before_its_control) {
+  Label label(form, u"label");
+  label.Click = [&] { form.keys.push_back({-1, -1}); };
+  form.KeyPreview = true;
+  ShowActive();
+  WidgetOf(label).setFocus();
+
+  PressKey(WidgetOf(label), Qt::Key_Space, QStringLiteral(" "));
+  PressKey(WidgetOf(label), Qt::Key_A, QStringLiteral("a"));
+
+  const std::vector<std::pair<int, int>> expected{{' ', 0}, {-1, -1}, {'A', 0}};
+  EXPECT_EQ(form.keys, expected);
+}
+
+TEST_F(Keyboard, Keys_of_a_control_pass_a_form_without_a_preview) {
+  Label label(form, u"label");
+  label.Click = [] {};
+  ShowActive();
+  WidgetOf(label).setFocus();
+
+  PressKey(WidgetOf(label), Qt::Key_A, QStringLiteral("a"));
+
+  EXPECT_TRUE(form.keys.empty());
+}
+
+TEST_F(Keyboard, Ctrl_and_I_in_the_Latin_layout_give_an_upper_case_I) {
+  form.KeyPreview = true;
+  ShowActive();
+
+  PressKey(WidgetOf(form), Qt::Key_I, QStringLiteral("\t"), Qt::ControlModifier, 'i');
+
+  ASSERT_EQ(form.keys.size(), 1U);
+  EXPECT_EQ(form.keys[0], std::make_pair(static_cast<int>('I'), static_cast<int>(kCtrl)));
+}
+
+TEST_F(Keyboard, Ctrl_and_the_same_key_in_the_Hebrew_layout_give_a_final_nun) {
+  form.KeyPreview = true;
+  ShowActive();
+
+  // The toolkit reports the Latin key for Ctrl in any layout; the symbol tells what the layout has there.
+  PressKey(WidgetOf(form), Qt::Key_I, QStringLiteral("\t"), Qt::ControlModifier, kFinalNunSymbol);
+
+  ASSERT_EQ(form.keys.size(), 1U);
+  EXPECT_EQ(form.keys[0], std::make_pair(kHebrewFinalNun, static_cast<int>(kCtrl)));
+}
+
+TEST_F(Keyboard, Codes_come_from_the_symbol_then_the_text_then_the_key) {
+  const auto codeOf = [](int key, quint32 symbol, const QString& text) {
+    return qt::KeyCodeOf(QKeyEvent(QEvent::KeyPress, key, Qt::NoModifier, 0, symbol, 0, text));
+  };
+
+  EXPECT_EQ(codeOf(Qt::Key_I, 'i', {}), 'I');
+  EXPECT_EQ(codeOf(Qt::Key_I, 0x01000000 + 0x05DF, {}), kHebrewFinalNun);
+  EXPECT_EQ(codeOf(Qt::Key_I, 0, QStringLiteral("ן")), kHebrewFinalNun);
+  EXPECT_EQ(codeOf(Qt::Key_I, 0, {}), 'I');
+  EXPECT_EQ(codeOf(Qt::Key_unknown, 0xCE0, {}), 0x05D0);
+  EXPECT_EQ(codeOf(Qt::Key_unknown, 0xCFA, {}), 0x05EA);
+  EXPECT_EQ(codeOf(Qt::Key_Escape, 0xFF1B, QStringLiteral("\x1b")), 27);
+  EXPECT_EQ(codeOf(Qt::Key_F1, 0xFFBE, {}), 112);
+  EXPECT_EQ(codeOf(Qt::Key_Shift, 0xFFE1, {}), 0);
+}
+
+TEST_F(Keyboard, The_shift_state_is_a_sum_of_the_held_keys) {
+  form.KeyPreview = true;
+  ShowActive();
+
+  PressKey(WidgetOf(form), Qt::Key_A, QStringLiteral("A"), Qt::ShiftModifier);
+  PressKey(WidgetOf(form), Qt::Key_A, {}, Qt::ShiftModifier | Qt::ControlModifier | Qt::AltModifier);
+
+  ASSERT_EQ(form.keys.size(), 2U);
+  EXPECT_EQ(form.keys[0].second, 1);
+  EXPECT_EQ(form.keys[1].second, 7);
+}
+
+TEST_F(Keyboard, Ctrl_and_a_letter_over_a_table_belong_to_the_form) {
+  ListView list(form, u"list");
+  list.AddColumn({u"שם", 3000});
+  list.Add(u"p1", u"alpha", 0);
+  list.Add(u"p2", u"ink", 0);
+  form.KeyPreview = true;
+  ShowActive();
+  WidgetOf(list).setFocus();
+
+  PressKey(WidgetOf(list), Qt::Key_I, QStringLiteral("i"), Qt::ControlModifier, 'i');
+
+  EXPECT_EQ(form.keys.size(), 1U);
+  EXPECT_EQ(list.SelectedItem()->Key(), u"p1");
+}
+
+} // namespace quendra::forms
