@@ -33,6 +33,10 @@ struct MonitorFixture : testing::Test {
     fields.LastRefreshTick = Tick();
   }
 
+  void AddProcesses(std::initializer_list<std::uint32_t> ids) {
+    for (const std::uint32_t id : ids) machine.AddProcess({id, 9999, "a.exe", ""});
+  }
+
   bool HasRow(std::uint32_t processId) { return list.Find(KeyOfProcess(processId)) != nullptr; }
   forms::ListRow& Row(std::uint32_t processId) {
     forms::ListRow* row = list.Find(KeyOfProcess(processId));

@@ -6,14 +6,7 @@ namespace {
 
 using Ids = std::vector<std::int64_t>;
 
-struct ProcessTableTest : MonitorFixture {
-  Text Upload() { return controls.main_lblUpload.Caption(); }
-  Text Download() { return controls.main_lblDownload.Caption(); }
-
-  void AddProcesses(std::initializer_list<std::uint32_t> ids) {
-    for (const std::uint32_t id : ids) machine.AddProcess({id, 9999, "a.exe", ""});
-  }
-};
+struct ProcessTableTest : MonitorFixture {};
 
 } // namespace
 
@@ -104,8 +97,8 @@ TEST_F(ProcessTableTest, The_day_number_that_the_first_pass_measures_from_does_n
   fields.LastRefreshTick = machine.system.DayNumber();
   table.RefreshProcessTable(u"");
   EXPECT_EQ(CellOf(10, kUploadCell), u"0");
-  EXPECT_EQ(Upload(), u"0.0");
-  EXPECT_EQ(Download(), u"0.0");
+  EXPECT_EQ(controls.main_lblUpload.Caption(), u"0.0");
+  EXPECT_EQ(controls.main_lblDownload.Caption(), u"0.0");
 }
 
 TEST_F(ProcessTableTest, The_reason_of_a_pass_is_ignored) {
@@ -142,7 +135,7 @@ TEST_F(ProcessTableTest, A_failed_snapshot_clears_the_marks_and_touches_nothing_
   EXPECT_TRUE(Row(10).CellTag(kApplicationCell).IsEmpty());
   EXPECT_EQ(CellOf(10, kUploadCell), u"0");
   EXPECT_EQ(list.Count(), 2);
-  EXPECT_EQ(Upload(), u"33.00");
+  EXPECT_EQ(controls.main_lblUpload.Caption(), u"33.00");
   EXPECT_EQ(list.SortKey(), 0);
   EXPECT_EQ(machine.ipHelper.TablesFetched, 1);
 }
@@ -288,68 +281,6 @@ TEST_F(ProcessTableTest, A_single_dead_row_stays) {
   machine.EndProcess(10);
   Pass();
   EXPECT_TRUE(HasRow(10));
-}
-
-// Meters.
-
-TEST_F(ProcessTableTest, An_empty_table_gives_both_meters_a_plain_zero) {
-  Pass();
-  EXPECT_EQ(Upload(), u"0.0");
-  EXPECT_EQ(Download(), u"0.0");
-}
-
-TEST_F(ProcessTableTest, A_pass_with_new_rows_alone_gives_both_meters_a_plain_zero) {
-  AddProcesses({10, 20});
-  Pass();
-  EXPECT_EQ(Upload(), u"0.0");
-  EXPECT_EQ(Download(), u"0.0");
-}
-
-TEST_F(ProcessTableTest, The_meters_show_the_sums_of_the_rates_in_the_upload_format) {
-  AddProcesses({10, 20});
-  Pass();
-  Charge(10, 1.25, 3);
-  Charge(20, 2.25, 120.4);
-  Pass();
-  EXPECT_EQ(Upload(), u"03.50");
-  EXPECT_EQ(Download(), u"123.40");
-}
-
-TEST_F(ProcessTableTest, A_rate_of_exactly_1_kilobyte_a_second_reads_01_00_in_the_meter) {
-  AddProcesses({10});
-  Pass();
-  Charge(10, 1, 1);
-  Pass();
-  EXPECT_EQ(Upload(), u"01.00");
-  EXPECT_EQ(Download(), u"01.00");
-}
-
-TEST_F(ProcessTableTest, Each_pass_begins_its_sums_at_zero) {
-  AddProcesses({10});
-  Pass();
-  Charge(10, 5, 5);
-  Pass();
-  Pass();
-  EXPECT_EQ(Upload(), u"0.0");
-  EXPECT_EQ(Download(), u"0.0");
-}
-
-TEST_F(ProcessTableTest, A_dead_row_counts_in_no_sum) {
-  AddProcesses({10, 20});
-  Pass();
-  Charge(10, 5, 5);
-  machine.EndProcess(10);
-  Pass();
-  EXPECT_EQ(Upload(), u"0.0");
-}
-
-TEST_F(ProcessTableTest, The_meters_keep_their_figures_while_no_pass_runs) {
-  AddProcesses({10});
-  Pass();
-  Charge(10, 5, 5);
-  Pass();
-  machine.AdvanceTick(600000);
-  EXPECT_EQ(Upload(), u"05.00");
 }
 
 // The order.
