@@ -168,6 +168,16 @@ TEST_F(CaptureSessionTest,
   EXPECT_EQ(capture.CurrentAdapter, 2);
 }
 
+TEST_F(CaptureSessionTest, An_adapter_without_an_address_is_not_the_default_for_an_unset_gateway) {
+  machine.ipHelper.Adapters.push_back({"name", "description", {}, {"0.0.0.0"}});
+  AddAdapter("eth0");
+  AddAdapter("eth1");
+  AddAdapter("eth2", kOwnAddress);
+  StartCapture();
+  EXPECT_EQ(capture.GatewayAddress, u"0.0.0.0");
+  EXPECT_EQ(capture.CurrentAdapter, 2);
+}
+
 TEST_F(CaptureSessionTest, The_schedulers_words_do_not_stand_in_the_list) {
   machine.AddCaptureAdapter({"a", "Card (Microsoft's Packet Scheduler)", ""});
   machine.AddCaptureAdapter({"b", "(Microsoft's Packet Scheduler)Other(Microsoft's Packet Scheduler) 2", ""});

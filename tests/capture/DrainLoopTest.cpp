@@ -153,6 +153,35 @@ TEST_F(DrainLoop, A_failed_capture_does_not_count_the_frame_before_it_again) {
   EXPECT_EQ(Charged(), 1);
 }
 
+/// Fails behind its one frame and leaves the array as it was, though the frame's bytes are gone by then.
+struct LeavingLibrary : platform::simulated::SimulatedCapture {
+  using SimulatedCapture::SimulatedCapture;
+  std::int32_t vpCapture(platform::FrameBytes& frame, platform::CaptureHeader&) override {
+    if (++Calls > 1) {
+      bytes.reset();
+      return -1;
+    }
+    frame = FrameOf(*bytes);
+    return frame.UpperBound() + 1;
+  }
+  int Calls = 0;
+  std::unique_ptr<Bytes> bytes = std::make_unique<Bytes>(Outgoing(1025));
+};
+
+TEST_F(DrainLoop, A_failed_capture_that_leaves_the_array_alone_shows_no_bytes_that_are_gone) {
+  platform::simulated::Core core;
+  LeavingLibrary library(core);
+  const platform::Machine all = machine.Operations();
+  PacketAttribution other({all.captureControls, library, all.handles, all.hostNames, all.icons, all.ipHelper,
+                           all.processes, all.shellStart, all.sockets, all.system, all.tokens,
+                           all.versionInfo},
+                          desktop, form.Page(), fields, capture, table);
+  machine.Deliver(Outgoing(1025));
+  other.vpacket_PacketReceived();
+  EXPECT_EQ(library.Calls, 2);
+  EXPECT_EQ(Charged(), 1);
+}
+
 TEST_F(DrainLoop, A_first_frame_too_short_for_the_link_decoder_ends_the_drain) {
   Receive({Bytes(22, 0xFF), Outgoing(1025)});
   EXPECT_EQ(machine.capture.WaitingFrames(), 1);
