@@ -1,7 +1,11 @@
 #include "forms/qt/Boxes.h"
 
+#include "forms/qt/BoxIcons.h"
 #include "forms/qt/Conversion.h"
+#include "forms/qt/Palette.h"
 
+#include <QGridLayout>
+#include <QLabel>
 #include <QMessageBox>
 #include <QPushButton>
 
@@ -11,13 +15,34 @@ namespace {
 
 constexpr int kOkPressed = 1;
 constexpr qsizetype kMostText = 4096;
+/// Pixels: room for the title of a short box.
+constexpr int kLeastWidth = 320;
+constexpr int kIconSide = 40;
 
-QMessageBox::Icon IconOf(int flags) {
+QMessageBox::Icon KindOf(int flags) {
   switch (flags & 0x70) {
   case kCritical: return QMessageBox::Critical;
   case kExclamation: return QMessageBox::Warning;
   case kInformation: return QMessageBox::Information;
   default: return QMessageBox::NoIcon;
+  }
+}
+
+/// Each line decides by itself how it reads; a mark in front has lines of numbers read with the others.
+QString MarkedRightToLeft(QString text) {
+  const QChar mark(0x200F);
+  return mark + text.replace(u'\n', QStringLiteral("\n") + mark);
+}
+
+void LayOut(QMessageBox& box) {
+  QPalette page = box.palette();
+  page.setColor(QPalette::Window, palette::kPage);
+  box.setPalette(page);
+  if (auto* grid = qobject_cast<QGridLayout*>(box.layout())) {
+    grid->setContentsMargins(20, 18, 20, 16);
+    grid->setHorizontalSpacing(16);
+    grid->setVerticalSpacing(14);
+    grid->addItem(new QSpacerItem(kLeastWidth, 0), grid->rowCount(), 0, 1, grid->columnCount());
   }
 }
 
@@ -27,14 +52,20 @@ int ShowBox(QWidget* owner, const Text& text, int flags, const Text& title) {
   const bool rightToLeft = (flags & kRightToLeft) != 0;
   QMessageBox box(owner);
   box.setLayoutDirection(rightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
-  box.setIcon(IconOf(flags));
+  // The kind is what assistive technology hears; the sign is what is seen.
+  box.setIcon(KindOf(flags));
+  auto* sign = box.findChild<QLabel*>(QStringLiteral("qt_msgboxex_icon_label"));
+  if (sign && box.icon() != QMessageBox::NoIcon)
+    sign->setPixmap(BoxIcon(flags, kIconSide, box.devicePixelRatioF()));
   box.setTextFormat(Qt::PlainText);
   box.setWindowTitle(VisibleText(title));
-  box.setText(VisibleText(text, LineBreaks::Keep, kMostText));
+  const QString shown = VisibleText(text, LineBreaks::Keep, kMostText);
+  box.setText(rightToLeft ? MarkedRightToLeft(shown) : shown);
   QPushButton* ok =
       box.addButton(rightToLeft ? QStringLiteral("אישור") : QStringLiteral("OK"), QMessageBox::AcceptRole);
   box.setDefaultButton(ok);
   box.setEscapeButton(ok);
+  LayOut(box);
   box.exec();
   return kOkPressed;
 }

@@ -93,6 +93,9 @@ void LabelView::PaintFocus(QPainter& painter) const {
   painter.setPen(QPen(palette::kFocus, 2));
   painter.setBrush(Qt::NoBrush);
   painter.drawRoundedRect(QRectF(rect()).adjusted(1, 1, -1, -1), 5, 5);
+  // The light line within sets the ring off from dark faces and pictures.
+  painter.setPen(QPen(palette::kPage, 1));
+  painter.drawRoundedRect(QRectF(rect()).adjusted(2.5, 2.5, -2.5, -2.5), 4, 4);
 }
 
 } // namespace quendra::forms::qt

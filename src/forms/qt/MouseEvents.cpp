@@ -85,6 +85,10 @@ void MouseEvents::Raise(WidgetView& view, const Event<int, int, int, int>& raise
 
 void MouseEvents::Pressed(WidgetView& view, const QMouseEvent& event) {
   if (event.button() == Qt::LeftButton) pressed_ = &view;
+  // Who takes the mouse in hand needs no focus ring any more.
+  QWidget* window = view.Widget().window();
+  window->setAttribute(Qt::WA_KeyboardFocusChange, false);
+  if (QWidget* focused = window->focusWidget()) focused->update();
   view.Widget().update();
   Raise(view, view.TheControl()->MouseDown, ButtonOf(event.button()), event);
 }

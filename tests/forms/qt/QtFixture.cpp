@@ -93,7 +93,9 @@ void QtFixture::AnswerBox(Box& answered) {
     auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
     if (!box) return AnswerBox(answered);
     QAbstractButton* button = box->buttons().constFirst();
-    answered = {box->windowTitle(),     box->text(), button->text(),
+    // Marks of direction are the box's own.
+    const QString text = box->text().remove(QChar(0x200F));
+    answered = {box->windowTitle(),     text,        button->text(),
                 box->layoutDirection(), box->icon(), answered.count + 1};
     button->click();
   });
