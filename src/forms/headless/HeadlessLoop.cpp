@@ -84,7 +84,7 @@ bool HeadlessLoop::WaitFor(const std::function<bool()>& condition, int realMilli
     Advance(static_cast<int>(std::max<std::int64_t>(0, clockAtStart + passed - now_)));
     if (condition()) return true;
     if (passed >= realMilliseconds) return false;
-    PumpDescriptors(2);
+    PumpDescriptors(HasPosted() ? 0 : 2);
   }
 }
 
@@ -100,6 +100,11 @@ void HeadlessLoop::SetAlarm(Alarm& alarm, int period) {
   alarm.period = period;
   alarm.due = period < 1 ? -1 : now_ + period;
   alarm.sequence = ++sequence_;
+}
+
+bool HeadlessLoop::HasPosted() {
+  const std::lock_guard guard(postedLock_);
+  return !posted_.empty();
 }
 
 bool HeadlessLoop::PumpPosted() {

@@ -49,6 +49,7 @@ class HeadlessLoop : public platform::EventLoop {
  private:
   class Watch;
 
+  bool HasPosted();
   bool PumpPosted();
   bool PumpDescriptors(int realMilliseconds);
   std::shared_ptr<Alarm> NextAlarm(std::int64_t until);

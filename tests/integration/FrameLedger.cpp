@@ -1,0 +1,88 @@
+#include "integration/FrameLedger.h"
+
+#include <arpa/inet.h>
+#include <cstring>
+#include <pcap/pcap.h>
+#include <stdexcept>
+
+namespace quendra::integration {
+
+namespace {
+
+unsigned WordAt(const unsigned char* bytes) { return bytes[0] * 256u + bytes[1]; }
+
+pcap_t* OpenCapture(const std::string& link) {
+  char error[PCAP_ERRBUF_SIZE];
+  pcap_t* capture = pcap_create(link.c_str(), error);
+  if (capture == nullptr) throw std::runtime_error(error);
+  pcap_set_snaplen(capture, 64);
+  pcap_set_timeout(capture, 20);
+  pcap_set_buffer_size(capture, 64 << 20);
+  bpf_program everything{};
+  if (pcap_activate(capture) < 0 || pcap_compile(capture, &everything, "", 1, PCAP_NETMASK_UNKNOWN) != 0 ||
+      pcap_setfilter(capture, &everything) != 0)
+    throw std::runtime_error("no second capture on " + link);
+  pcap_freecode(&everything);
+  return capture;
+}
+
+} // namespace
+
+FrameLedger::FrameLedger(const std::string& link, const std::string& localAddress)
+    : capture_(OpenCapture(link)) {
+  inet_pton(AF_INET, localAddress.c_str(), &local_);
+  thread_ = std::thread(
+      [this] { pcap_loop(capture_, -1, &FrameLedger::Take, reinterpret_cast<unsigned char*>(this)); });
+}
+
+FrameLedger::~FrameLedger() {
+  pcap_breakloop(capture_);
+  thread_.join();
+  pcap_close(capture_);
+}
+
+void FrameLedger::Take(unsigned char* ledger, const pcap_pkthdr* header, const unsigned char* frame) {
+  reinterpret_cast<FrameLedger*>(ledger)->Enter(*header, frame);
+}
+
+void FrameLedger::Enter(const pcap_pkthdr& header, const unsigned char* frame) {
+  const std::lock_guard guard(lock_);
+  ++frames_;
+  if (header.caplen < 38 || WordAt(frame + 12) != 0x0800) return;
+  udpFrames_ += frame[23] == 17;
+  icmpFrames_ += frame[23] == 1;
+  if (frame[23] != 6) return;
+  ++tcpFrames_;
+  std::uint32_t source = 0;
+  std::memcpy(&source, frame + 26, sizeof source);
+  if (source == local_)
+    (*byPort_)[WordAt(frame + 34)].upload += WordAt(frame + 16);
+  else
+    (*byPort_)[WordAt(frame + 36)].download += WordAt(frame + 16);
+}
+
+FrameLedger::Page FrameLedger::Read() const {
+  const std::lock_guard guard(lock_);
+  Page page{frames_, tcpFrames_, udpFrames_, icmpFrames_, {}};
+  for (unsigned port = 0; port < byPort_->size(); ++port)
+    if ((*byPort_)[port] != Totals{}) page.byPort[static_cast<std::uint16_t>(port)] = (*byPort_)[port];
+  return page;
+}
+
+std::uint64_t FrameLedger::Frames() const {
+  const std::lock_guard guard(lock_);
+  return frames_;
+}
+
+std::uint64_t FrameLedger::TcpFrames() const {
+  const std::lock_guard guard(lock_);
+  return tcpFrames_;
+}
+
+std::uint64_t FrameLedger::Drops() const {
+  pcap_stat counted{};
+  pcap_stats(capture_, &counted);
+  return counted.ps_drop;
+}
+
+} // namespace quendra::integration
