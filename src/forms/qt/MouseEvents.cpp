@@ -3,6 +3,7 @@
 #include <QApplication>
 #include <QCursor>
 #include <QMouseEvent>
+#include <QWindow>
 
 namespace quendra::forms::qt {
 
@@ -44,6 +45,20 @@ void MouseEvents::SetCursor(Qt::CursorShape shape) {
 void MouseEvents::DragWindow(QWidget& window) {
   dragged_ = &window;
   grip_ = QCursor::pos() - window.pos();
+  const bool managed = window.windowHandle() && window.windowHandle()->startSystemMove();
+  drag_ = managed ? Drag::ByWindowManager : Drag::ByDesktop;
+}
+
+bool MouseEvents::Dragged(const QMouseEvent& event) {
+  if (drag_ == Drag::None) return false;
+  // A window manager keeps the mouse to itself, but moves from before it took over are still in the queue.
+  // Were the move asked for again by one of them, the manager would go on moving behind the release.
+  if (event.type() == QEvent::MouseMove && event.buttons() & Qt::LeftButton) {
+    if (drag_ == Drag::ByDesktop && dragged_) dragged_->move(event.globalPosition().toPoint() - grip_);
+    return true;
+  }
+  drag_ = Drag::None;
+  return event.type() == QEvent::MouseButtonRelease;
 }
 
 bool MouseEvents::eventFilter(QObject* watched, QEvent* event) {
@@ -55,13 +70,7 @@ bool MouseEvents::eventFilter(QObject* watched, QEvent* event) {
 }
 
 bool MouseEvents::Handle(WidgetView& view, QMouseEvent& event) {
-  if (dragged_) {
-    if (event.type() == QEvent::MouseMove && event.buttons() & Qt::LeftButton) {
-      dragged_->move(event.globalPosition().toPoint() - grip_);
-      return true;
-    }
-    dragged_ = nullptr;
-  }
+  if (Dragged(event)) return true;
   if (!view.Widget().isEnabled()) return true;
   switch (event.type()) {
   case QEvent::MouseButtonPress: Pressed(view, event); break;

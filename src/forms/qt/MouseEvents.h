@@ -28,13 +28,16 @@ class MouseEvents : public QObject {
   void SetCursor(Qt::CursorShape shape);
   /// The pressed control gets no click any more.
   void ReleaseCapture() { pressed_ = nullptr; }
-  /// Moves the window with the mouse until its button is let go.
+  /// Moves the window with the mouse until its button is let go: by the window manager, or by the desktop
+  /// itself where none is or it doesn't. Controls hear nothing of the mouse meanwhile.
   void DragWindow(QWidget& window);
 
  protected:
   bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
+  /// True for an event that belongs to a window being dragged.
+  bool Dragged(const QMouseEvent& event);
   bool Handle(WidgetView& view, QMouseEvent& event);
   void Pressed(WidgetView& view, const QMouseEvent& event);
   void DoubleClicked(WidgetView& view, const QMouseEvent& event);
@@ -48,6 +51,8 @@ class MouseEvents : public QObject {
   WidgetView* pressed_ = nullptr;
   QPointer<QWidget> moving_;
   bool cursorWasSet_ = false;
+  enum class Drag { None, ByWindowManager, ByDesktop };
+  Drag drag_ = Drag::None;
   QPointer<QWidget> dragged_;
   QPoint grip_;
 };

@@ -6,7 +6,6 @@
 
 #include <QImageReader>
 #include <QScreen>
-#include <QWindow>
 
 namespace quendra::forms {
 
@@ -96,9 +95,7 @@ std::int32_t QtDesktop::SendMessage(WindowHandle window, std::uint32_t message, 
   constexpr std::uint32_t kCaption = 2;
   qt::FormView* view = ViewOf(window);
   if (!view || message != kNonClientLeftButtonDown || wParam != kCaption) return 0;
-  QWindow* native = view->windowHandle();
-  // Without a window manager that moves windows, the desktop moves it itself.
-  if (!native || !native->startSystemMove()) mouse_.DragWindow(*view);
+  mouse_.DragWindow(*view);
   return 0;
 }
 
