@@ -114,6 +114,10 @@ TEST_F(CaptureSessionTest,
   EXPECT_EQ(machine.Calls, (Calls{"VBPcapInit", "create control", "VBPcapTerminate", "VBPcapTerminate"}));
   EXPECT_EQ(form.main_cmbAdapters.ListCount(), 0);
   EXPECT_FALSE(capture.CaptureRunning);
+  LetSecondPass();
+  machine.Deliver(Outgoing(1025));
+  EXPECT_FALSE(machine.SignalPackets());
+  EXPECT_EQ(Passes(), 0);
 }
 
 TEST_F(CaptureSessionTest, With_an_init_result_of_0_exactly_one_adapter_is_visited) {

@@ -227,6 +227,18 @@ TEST_F(PacketAttributionTest, The_tunnel_flag_comes_from_the_newest_record_and_n
   EXPECT_EQ(Upload(outer), 1);
 }
 
+TEST_F(PacketAttributionTest,
+       Another_page_stops_all_counting_and_a_row_that_still_stands_counts_on_afterwards) {
+  const auto& row = AddRow(1, u".1025.");
+  Receive({Outgoing(1025)});
+  form.frameMain.Visible = false;
+  Receive({Outgoing(1025)});
+  EXPECT_EQ(Upload(row), 1);
+  form.frameMain.Visible = true;
+  machine.SignalPackets();
+  EXPECT_EQ(Upload(row), 2);
+}
+
 TEST_F(PacketAttributionTest, Totals_live_as_long_as_their_row_through_an_adapter_change) {
   machine.AddCaptureAdapter({"eth1", "Card B", "192.0.2.1"});
   session.StopCapture();
