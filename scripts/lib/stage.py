@@ -7,6 +7,7 @@ import os
 import signal
 import subprocess
 import tempfile
+import time
 
 HERE_ADDRESS = "10.71.0.1"
 THERE_ADDRESS = "10.71.0.2"
@@ -51,7 +52,17 @@ def display(directory, width=1280, height=860):
             raise RuntimeError("Xvfb found no display number: " + open(f"{directory}/display.log").read())
         name = ":" + number
         with started(["openbox"], env=dict(os.environ, DISPLAY=name), stdout=log, stderr=log):
+            await_window_manager(name)
             yield name
+
+
+def await_window_manager(name):
+    """A window that is there before its manager loses the first click."""
+    for _ in range(100):
+        if "window id" in run("xprop", "-display", name, "-root", "_NET_SUPPORTING_WM_CHECK"):
+            return
+        time.sleep(0.1)
+    raise RuntimeError("the window manager doesn't come up")
 
 
 @contextlib.contextmanager

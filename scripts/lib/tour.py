@@ -43,6 +43,15 @@ def watch_table(program, ports):
 
 def tour(program, child, ports):
     walk = Walk(program, SCREENS)
+    try:
+        return walk_through(walk, child, ports)
+    except RuntimeError:
+        walk.picture("where-it-failed")
+        raise
+
+
+def walk_through(walk, child, ports):
+    program = walk.program
     walk.splash()
     walk.home()
     walk.monitor()
