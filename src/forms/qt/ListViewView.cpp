@@ -6,6 +6,7 @@
 #include "forms/qt/Palette.h"
 
 #include <QKeyEvent>
+#include <QPainter>
 #include <QScrollBar>
 
 namespace quendra::forms::qt {
@@ -131,6 +132,14 @@ void ListViewView::HeaderClicked(int section) {
     if (TheControl()) List().ColumnClick(section + 1);
   });
   header()->viewport()->update();
+}
+
+void ListViewView::paintEvent(QPaintEvent* event) {
+  QTreeView::paintEvent(event);
+  if (!hasFocus() || !window()->testAttribute(Qt::WA_KeyboardFocusChange)) return;
+  QPainter painter(viewport());
+  painter.setPen(QPen(palette::kFocus, 2));
+  painter.drawRect(viewport()->rect().adjusted(1, 1, -1, -1));
 }
 
 void ListViewView::keyPressEvent(QKeyEvent* event) {

@@ -27,6 +27,7 @@ class ListViewView : public QTreeView, public WidgetView, public ListViewObserve
   void Apply(Aspect aspect) override;
   void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
   void keyPressEvent(QKeyEvent* event) override;
+  void paintEvent(QPaintEvent* event) override;
 
  private:
   ListView& List() const { return static_cast<ListView&>(*TheControl()); }

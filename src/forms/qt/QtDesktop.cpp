@@ -31,9 +31,8 @@ std::unique_ptr<QApplication> MakeApplication(int& argc, char** argv) {
 } // namespace
 
 QtDesktop::QtDesktop(int& argc, char** argv)
-    : application_(MakeApplication(argc, argv)), dispatcher_([](const Text& text) {
-        qt::ShowBox(QApplication::activeWindow(), text, kCritical, u"Quendra");
-      }),
+    : application_(MakeApplication(argc, argv)),
+      dispatcher_([](const Text& text) { qt::ShowBox(FrontWindow(), text, kCritical, u"Quendra"); }),
       mouse_(dispatcher_, scale_),
       keys_(dispatcher_), context_{*this, dispatcher_, scale_, pictures_, mouse_}, drawing_(scale_),
       loop_(dispatcher_) {
@@ -64,8 +63,16 @@ void QtDesktop::End(int status) {
   throw ProgramEnded{dispatcher_.Status()};
 }
 
+QWidget* QtDesktop::FrontWindow() {
+  if (QWidget* active = QApplication::activeWindow()) return active;
+  // Without a window manager no window is the active one.
+  for (QWidget* window : QApplication::topLevelWidgets())
+    if (window->isVisible() && dynamic_cast<qt::FormView*>(window)) return window;
+  return nullptr;
+}
+
 int QtDesktop::MessageBox(const Text& text, int flags, const Text& title) {
-  const int answer = qt::ShowBox(QApplication::activeWindow(), text, flags, title);
+  const int answer = qt::ShowBox(FrontWindow(), text, flags, title);
   dispatcher_.UnwindIfEnded();
   return answer;
 }

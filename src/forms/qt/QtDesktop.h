@@ -88,6 +88,8 @@ class QtDesktop : public Desktop, public platform::EventLoop {
 
  private:
   void Close(qt::FormView& view);
+  /// The window that a box stands over, nullptr for none.
+  static QWidget* FrontWindow();
   qt::FormView* ViewOf(WindowHandle window) const;
   static qt::FormView* ViewOf(const Form& form) { return static_cast<qt::FormView*>(form.View()); }
 

@@ -57,6 +57,16 @@ TEST_F(Accessibility, A_label_without_a_caption_is_named_by_its_description) {
   EXPECT_EQ(NameOf(label), QStringLiteral("מוניטור"));
 }
 
+TEST_F(Accessibility, A_combo_box_in_a_frame_is_named_by_the_frames_caption) {
+  Frame frame(form, u"main_frameAdapters");
+  ComboBox combo(frame, u"main_cmbAdapters");
+  form.design = [&] { frame.Caption = Text(u" עקוב אחרי התקן "); };
+
+  desktop.Load(form);
+
+  EXPECT_EQ(NameOf(combo), QStringLiteral("עקוב אחרי התקן"));
+}
+
 TEST_F(Accessibility, A_clickable_label_is_a_button_and_any_other_a_text) {
   Label button(form, u"Label2");
   Label text(form, u"lblVersion");

@@ -82,6 +82,17 @@ TEST_F(Keyboard, The_focus_ring_shows_for_those_who_use_the_keys) {
   EXPECT_NE(PixelOf(WidgetOf(label), 50, 1), without);
 }
 
+TEST_F(Keyboard, The_focus_ring_goes_when_the_mouse_is_used) {
+  Label label(form, u"label");
+  label.Click = [] {};
+  ShowActive();
+  WidgetOf(form).setAttribute(Qt::WA_KeyboardFocusChange, true);
+
+  PressMouse(WidgetOf(label), {1, 1});
+
+  EXPECT_FALSE(WidgetOf(form).testAttribute(Qt::WA_KeyboardFocusChange));
+}
+
 TEST_F(Keyboard, Keys_reach_a_form_with_a_preview_once_and_before_its_control) {
   Label label(form, u"label");
   label.Click = [&] { form.keys.push_back({-1, -1}); };
