@@ -21,5 +21,5 @@ configure_and_build() {
     cat "$log" >&2
     return 1
   fi
-  cmake --build --preset "$preset" -- --quiet "$@"
+  cmake --build --preset "$preset" -- --quiet -k 0 "$@"
 }
