@@ -5,13 +5,16 @@ namespace quendra::app {
 Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
     : desktop_(desktop), frmSplash(desktop, frmMenu), frmAbout(desktop),
       frmMenu(machine, desktop, frmSplash, frmAbout,
-              {monitorPageSwitch, processTable, modProcPort, captureSession, hostAddresses, monitorFields}),
+              {monitorPageSwitch, processTable, modProcPort, captureSession, supportExchange, hostAddresses,
+               monitorFields}),
       mdlFileInfo(machine, desktop), modProcPort(machine, desktop, frmMenu.main_ListView1, mdlFileInfo),
       processTable(machine, desktop, frmMenu.Page(), monitorFields, mdlFileInfo, modProcPort),
       hostAddresses(machine),
       packetAttribution(machine, desktop, frmMenu.Page(), monitorFields, captureFields, processTable),
       captureSession(machine, desktop, frmMenu.Page(), captureFields, packetAttribution),
-      monitorPageSwitch(machine, monitorFields, processTable, captureSession) {
+      modSocketPlus(machine.sockets, machine.hostNames, desktop.Windows),
+      supportExchange(modSocketPlus, desktop, frmMenu.main_ListView1, processTable, frmMenu.main_Timer1),
+      monitorPageSwitch(machine, monitorFields, processTable, supportExchange, captureSession) {
   captureSession.UnloadMainWindow = [this] { desktop_.Unload(frmMenu); };
 }
 

@@ -4,10 +4,12 @@
 #include "capture/HostAddresses.h"
 #include "capture/PacketAttribution.h"
 #include "forms/Desktop.h"
+#include "foundation/modSocketPlus.h"
 #include "monitor/ProcessTable.h"
 #include "monitor/mdlFileInfo.h"
 #include "monitor/modProcPort.h"
 #include "platform/Machine.h"
+#include "report/SupportExchange.h"
 #include "shell/MonitorPageSwitch.h"
 #include "shell/frmAbout.h"
 #include "shell/frmMenu.h"
@@ -44,6 +46,9 @@ class Program {
   capture::HostAddresses hostAddresses;
   capture::PacketAttribution packetAttribution;
   capture::CaptureSession captureSession;
+
+  foundation::modSocketPlus modSocketPlus;
+  report::SupportExchange supportExchange;
 
   shell::MonitorPageSwitch monitorPageSwitch;
 };

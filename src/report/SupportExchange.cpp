@@ -3,6 +3,8 @@
 #include "report/SupportRequests.h"
 #include "runtime/Settings.h"
 
+#include <array>
+
 namespace quendra::report {
 
 using foundation::Value;
@@ -18,9 +20,11 @@ constexpr std::int16_t kWebPort = 80;
 constexpr const char16_t* kHebrewTitle = u"זלמר בינלאומי@נט";
 constexpr const char16_t* kDefaultTitle = u"Quendra";
 
-std::int16_t NumberOfIndex(const Value& index) {
-  const auto* number = std::get_if<std::int16_t>(&index);
-  return number ? *number : std::int16_t{0};
+/// 0, which no socket has, for an index that is no number.
+std::int32_t NumberOfIndex(const Value& index) {
+  if (const auto* number = std::get_if<std::int16_t>(&index)) return *number;
+  const auto* number = std::get_if<std::int32_t>(&index);
+  return number ? *number : 0;
 }
 
 } // namespace
@@ -48,6 +52,7 @@ void SupportExchange::ReleaseSockets() {
   const std::int32_t count = main_spSockets_->ArrayCount();
   for (std::int32_t index = 0; index <= count; ++index)
     if (main_spSockets_->ArrayIndexInUse(index)) main_spSockets_->ArrayRemove(index);
+  main_spSockets_->Release();
   main_spSockets_.reset();
 }
 
@@ -67,8 +72,8 @@ void SupportExchange::main_spSockets_Connect(Index index) {
     return OpenSockets().SendData(index, GetRequest(settings::SupportServerHost, u"/procs.htm"));
   case kNumber: return OpenSockets().SendData(index, GetRequest(settings::SupportServerHost, u"/getid.asp"));
   case kReport:
-    ReportReply_.clear();
-    return OpenSockets().SendData(index, PostRequest(ReportBody(ReportNumber_, main_ListView1_)));
+    ReportReply.clear();
+    return OpenSockets().SendData(index, PostRequest(ReportBody(ReportNumber, main_ListView1_)));
   case kLoad:
     return OpenSockets().SendData(index, GetRequest(settings::SupportServerAddress, u"/files/big.zip"));
   default: return;
@@ -77,9 +82,9 @@ void SupportExchange::main_spSockets_Connect(Index index) {
 
 void SupportExchange::main_spSockets_DataArrival(Index index) {
   switch (NumberOfIndex(index)) {
-  case kProcsPage: ProcsPageText_ += TakeText(index); return;
+  case kProcsPage: ProcsPageText += TakeText(index); return;
   case kNumber: return NumberArrived();
-  case kReport: ReportReply_ += TakeText(index); return;
+  case kReport: ReportReply += TakeText(index); return;
   default: return; // the load stays where it is: only its traffic counts
   }
 }
@@ -95,7 +100,7 @@ void SupportExchange::main_spSockets_CloseSck(Index index) {
 }
 
 void SupportExchange::main_spSockets_Error(Index index, std::int16_t number, const Text& description) {
-  const std::int16_t socket = NumberOfIndex(index);
+  const std::int32_t socket = NumberOfIndex(index);
   if (socket < kProcsPage || socket > kLoad) return;
   desktop_.MessageBox(u"winsock error: " + DecimalText(number) + u" - " + description, 0,
                       socket == kProcsPage ? kHebrewTitle : kDefaultTitle);
@@ -115,12 +120,12 @@ Text SupportExchange::TakeText(Index index) {
 void SupportExchange::NumberArrived() {
   const Text number = ReportNumberIn(TakeText(kNumber));
   ShowHebrewBox(u"מספר הדו\"ח שלך הוא: " + number, forms::kInformation);
-  ReportNumber_ = number;
+  ReportNumber = number;
   OpenSockets().Connect(kReport, Text(settings::SupportServerHost), kWebPort);
 }
 
 void SupportExchange::ReportClosed() {
-  const bool accepted = ReportReply_.find(u"~OK") != Text::npos;
+  const bool accepted = ReportReply.find(u"~OK") != Text::npos;
   if (accepted)
     ShowHebrewBox(u"הדו\"ח נשלח בהצלחה.", forms::kInformation);
   else
@@ -129,10 +134,14 @@ void SupportExchange::ReportClosed() {
 }
 
 void SupportExchange::ProcsPageClosed() {
+  ReadProcsPage();
   OpenSockets().CloseSck(kProcsPage);
   table_.RefreshProcessTable({});
   main_Timer1_.Enabled = true;
 }
+
+/// The page was to fill a table once. The table is still made, and dropped as it is.
+void SupportExchange::ReadProcsPage() { const std::array<std::array<Text, 3>, 3> table{}; }
 
 void SupportExchange::ShowHebrewBox(const Text& text, int icon) {
   desktop_.MessageBox(text, icon | forms::kHebrewBox, kHebrewTitle);

@@ -29,6 +29,10 @@ class SupportExchange {
   /// nullptr while the page isn't open.
   foundation::CSocketPlus* Sockets() { return main_spSockets_.get(); }
 
+  Text ProcsPageText; ///< gathered and never read
+  Text ReportNumber;
+  Text ReportReply; ///< what has come of the reply to the report
+
  private:
   using Index = const foundation::Value&;
 
@@ -42,6 +46,7 @@ class SupportExchange {
   void NumberArrived();
   void ReportClosed();
   void ProcsPageClosed();
+  void ReadProcsPage();
   void ShowHebrewBox(const Text& text, int icon);
 
   foundation::modSocketPlus& module_;
@@ -50,9 +55,6 @@ class SupportExchange {
   monitor::ProcessTable& table_;
   forms::Timer& main_Timer1_;
   std::unique_ptr<foundation::CSocketPlus> main_spSockets_;
-  Text ProcsPageText_;
-  Text ReportNumber_;
-  Text ReportReply_;
 };
 
 } // namespace quendra::report

@@ -6,6 +6,7 @@ namespace quendra::shell {
 
 void MonitorPageSwitch::main_StartPage() {
   table_.PrepareTable();
+  support_.PrepareSockets();
   capture_.ReadLocalAddresses();
   // A day number lies far below any tick, so that the first packet finds a second over and refreshes at once.
   fields_.LastRefreshTick = system_.DayNumber();
@@ -13,7 +14,10 @@ void MonitorPageSwitch::main_StartPage() {
   capture_.StartCapture();
 }
 
-void MonitorPageSwitch::main_StopPage() { capture_.StopCapture(); }
+void MonitorPageSwitch::main_StopPage() {
+  support_.ReleaseSockets();
+  capture_.StopCapture();
+}
 
 void MonitorPageSwitch::main_Timer1_Timer() {
   if (TimerRefreshGate && !table_.SortPinned) table_.RefreshProcessTable({});

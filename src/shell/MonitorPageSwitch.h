@@ -3,16 +3,18 @@
 #include "capture/CaptureSession.h"
 #include "monitor/ProcessTable.h"
 #include "platform/Machine.h"
+#include "report/SupportExchange.h"
 
 namespace quendra::shell {
 
-/// What opens, keeps and leaves the monitor page: the order in which its table and its capture are set to
-/// work.
+/// What opens, keeps and leaves the monitor page: the order in which its table, its sockets and its capture
+/// are set to work.
 class MonitorPageSwitch {
  public:
   MonitorPageSwitch(const platform::Machine& machine, monitor::MonitorFields& fields,
-                    monitor::ProcessTable& table, capture::CaptureSession& capture)
-      : system_(machine.system), fields_(fields), table_(table), capture_(capture) {}
+                    monitor::ProcessTable& table, report::SupportExchange& support,
+                    capture::CaptureSession& capture)
+      : system_(machine.system), fields_(fields), table_(table), support_(support), capture_(capture) {}
 
   void main_StartPage();
   void main_StopPage();
@@ -25,6 +27,7 @@ class MonitorPageSwitch {
   platform::System& system_;
   monitor::MonitorFields& fields_;
   monitor::ProcessTable& table_;
+  report::SupportExchange& support_;
   capture::CaptureSession& capture_;
 };
 

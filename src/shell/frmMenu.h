@@ -28,6 +28,7 @@ struct MenuModules {
   monitor::ProcessTable& processTable;
   monitor::modProcPort& modProcPort;
   capture::CaptureSession& captureSession;
+  report::SupportExchange& supportExchange;
   const capture::HostAddresses& hostAddresses;
   monitor::MonitorFields& fields;
 };

@@ -109,13 +109,13 @@ TEST_F(Pages, Choosing_the_page_that_shows_stops_and_restarts_it) {
   EXPECT_LT(stopped, started);
 }
 
-TEST_F(Pages, Leaving_the_monitor_for_another_page_stops_its_capture) {
+TEST_F(Pages, Leaving_the_monitor_for_another_page_releases_its_sockets_and_stops_its_capture) {
   ComeHome();
   ClickEntry(0);
   machine.Calls.clear();
   ClickEntry(2);
-  EXPECT_EQ(machine.Calls,
-            (std::vector<std::string>{"vpEnd", "Sleep 300", "StopEvents", "ReleaseChannel", "CloseChannel"}));
+  EXPECT_EQ(machine.Calls, (std::vector<std::string>{"WSACleanup", "vpEnd", "Sleep 300", "StopEvents",
+                                                     "ReleaseChannel", "CloseChannel"}));
 }
 
 TEST_F(Pages, Resetting_shows_the_labels_then_the_normal_pictures_then_stops_and_hides_the_pages) {

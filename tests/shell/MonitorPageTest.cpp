@@ -11,6 +11,10 @@ class Recorder : public forms::ListViewObserver, public platform::HostNames, pub
   explicit Recorder(platform::simulated::SimulatedMachine& machine) : machine_(machine) {}
 
   std::vector<std::string>& Lines() { return machine_.Calls; }
+  void StartOver() {
+    Lines().clear();
+    socketsStarted_ = machine_.sockets.Count("WSAStartup");
+  }
 
   void RowAdded(int) override { Note("row added"); }
   void RowRemoved(int) override {}
@@ -38,10 +42,13 @@ class Recorder : public forms::ListViewObserver, public platform::HostNames, pub
  private:
   /// Columns come one by one; told once.
   void Note(const std::string& line) {
+    const int started = machine_.sockets.Count("WSAStartup");
+    if (std::exchange(socketsStarted_, started) < started) Lines().push_back("sockets");
     if (Lines().empty() || Lines().back() != line) Lines().push_back(line);
   }
 
   platform::simulated::SimulatedMachine& machine_;
+  int socketsStarted_ = 0;
 };
 
 class MonitorPageSwitchTest : public ProgramTest {
@@ -50,7 +57,7 @@ class MonitorPageSwitchTest : public ProgramTest {
 };
 
 TEST_F(MonitorPageSwitchTest,
-       The_start_sets_up_the_table_reads_the_addresses_seeds_the_tick_makes_a_pass_and_captures) {
+       The_start_sets_up_table_and_sockets_reads_the_addresses_seeds_the_tick_makes_a_pass_and_captures) {
   machine.AddProcess({100, 1, "one.exe", ""});
   Recorder recorder(machine);
   const platform::Machine original = machine.Operations();
@@ -63,14 +70,14 @@ TEST_F(MonitorPageSwitchTest,
   desktop.Click(other.frmMenu.lblCaption[0]);
   desktop.Click(other.frmMenu.lblCaption[1]);
   other.frmMenu.main_ListView1.Observe(&recorder);
-  machine.Calls.clear();
+  recorder.StartOver();
   desktop.Click(other.frmMenu.lblCaption[0]);
   EXPECT_EQ(machine.Calls,
-            (std::vector<std::string>{"rows cleared", "columns", "addresses", "day number", "row added",
-                                      "vpGetAdapterInfo 0", "AdapterAddress eth0", "vpSetCurrentAdapter 0",
-                                      "vpBegin 1000", "vpGetAdapterInfo 0", "BindAdapter eth0",
-                                      "SetValueA 32", "SetValueB 1000", "OpenChannel", "SetChannelSize 15000",
-                                      "SetValueC 15000", "StartEvents"}));
+            (std::vector<std::string>{"rows cleared", "columns", "sockets", "addresses", "day number",
+                                      "row added", "vpGetAdapterInfo 0", "AdapterAddress eth0",
+                                      "vpSetCurrentAdapter 0", "vpBegin 1000", "vpGetAdapterInfo 0",
+                                      "BindAdapter eth0", "SetValueA 32", "SetValueB 1000", "OpenChannel",
+                                      "SetChannelSize 15000", "SetValueC 15000", "StartEvents"}));
 }
 
 TEST_F(MonitorPageSwitchTest, The_start_seeds_the_last_refresh_with_the_day_number_and_not_with_a_tick) {
@@ -88,13 +95,13 @@ TEST_F(MonitorPageSwitchTest, The_start_clears_the_pinned_sort) {
   EXPECT_EQ(program.processTable.SortPinned, 0);
 }
 
-TEST_F(MonitorPageSwitchTest, The_stop_ends_the_session_pauses_and_stops_the_control) {
+TEST_F(MonitorPageSwitchTest, The_stop_releases_the_sockets_ends_the_session_pauses_and_stops_the_control) {
   ComeHome();
   ClickEntry(0);
   machine.Calls.clear();
   program.monitorPageSwitch.main_StopPage();
-  EXPECT_EQ(machine.Calls,
-            (std::vector<std::string>{"vpEnd", "Sleep 300", "StopEvents", "ReleaseChannel", "CloseChannel"}));
+  EXPECT_EQ(machine.Calls, (std::vector<std::string>{"WSACleanup", "vpEnd", "Sleep 300", "StopEvents",
+                                                     "ReleaseChannel", "CloseChannel"}));
   EXPECT_FALSE(program.captureFields.CaptureRunning);
 }
 
@@ -164,7 +171,7 @@ TEST_F(MonitorPageSwitchTest, The_actions_that_come_later_can_be_pressed_and_do_
   ClickEntry(0);
   machine.Calls.clear();
   for (forms::Label* label : {&menu.main_lblEndProcess, &menu.main_lblJumpToPath, &menu.main_cmdAddRemove,
-                              &menu.main_cmdChecks, &menu.main_cmdMemInfo, &menu.main_cmdRpt}) {
+                              &menu.main_cmdChecks, &menu.main_cmdMemInfo}) {
     EXPECT_TRUE(static_cast<bool>(label->Click)) << ToUtf8(label->Name());
     EXPECT_TRUE(desktop.Click(*label)) << ToUtf8(label->Name());
   }

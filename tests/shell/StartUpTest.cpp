@@ -195,8 +195,8 @@ TEST_F(StartUp, The_close_box_stops_the_monitor_page_before_the_program_ends) {
   machine.Calls.clear();
   desktop.CloseBox(program.frmMenu);
   EXPECT_TRUE(desktop.Ended);
-  EXPECT_EQ(machine.Calls,
-            (std::vector<std::string>{"vpEnd", "Sleep 300", "StopEvents", "ReleaseChannel", "CloseChannel"}));
+  EXPECT_EQ(machine.Calls, (std::vector<std::string>{"WSACleanup", "vpEnd", "Sleep 300", "StopEvents",
+                                                     "ReleaseChannel", "CloseChannel"}));
 }
 
 TEST_F(StartUp, A_main_window_tagged_not_close_stops_its_monitor_page_all_the_same) {
