@@ -5,10 +5,13 @@
 #include "platform/HostNames.h"
 #include "platform/IpHelper.h"
 #include "platform/Sockets.h"
+#include "platform/linux/Descriptor.h"
 #include "platform/linux/LinuxShellStart.h"
 #include "platform/linux/LinuxSystem.h"
 
+#include <fcntl.h>
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -76,7 +79,17 @@ TEST(LinuxShellStartTest, A_file_that_is_no_program_cannot_be_started) {
   EXPECT_FALSE(shell.Shell(folder.Path(), ShellStart::kNormalWindow));
 }
 
-TEST(LinuxShellStartTest, A_program_is_started_without_waiting_and_leaves_no_child_behind) {
+TEST(LinuxShellStartTest, A_program_that_has_not_ended_is_not_waited_for) {
+  const TemporaryFolder folder;
+  ASSERT_EQ(::mkfifo((folder / "pipe").c_str(), 0600), 0);
+  LinuxShellStart shell;
+  // It waits until somebody opens the pipe's other end, which the test does only after the call.
+  ASSERT_TRUE(shell.Shell("cat " + (folder / "pipe"), ShellStart::kNormalWindow));
+  const Descriptor end(::open((folder / "pipe").c_str(), O_WRONLY | O_CLOEXEC));
+  EXPECT_TRUE(end);
+}
+
+TEST(LinuxShellStartTest, A_program_that_was_started_leaves_no_child_behind) {
   const TemporaryFolder folder;
   const std::string done = folder / "with blank";
   LinuxShellStart shell;

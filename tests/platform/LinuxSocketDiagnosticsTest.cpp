@@ -61,8 +61,10 @@ Bytes V6OnlyAttribute(std::uint8_t value) {
 }
 
 std::vector<TcpSocket> SocketsOf(const Bytes& datagram) {
+  // A copy takes exactly the memory that it needs, so that a checker sees a read behind it.
+  const Bytes exact(datagram);
   std::vector<TcpSocket> sockets;
-  EXPECT_EQ(SocketDiagnostics::TakeUp(datagram, 7, sockets), Progress::More);
+  EXPECT_EQ(SocketDiagnostics::TakeUp(exact, 7, sockets), Progress::More);
   return sockets;
 }
 
@@ -177,6 +179,15 @@ TEST(LinuxSocketDiagnostics, Lengths_that_lie_end_the_answer_and_attributes_that
     if (length != 4) {
       EXPECT_TRUE(SocketsOf(Datagram(Message(AF_INET6, 10), attributes)).empty()) << length;
     }
+  }
+}
+
+TEST(LinuxSocketDiagnostics, Attributes_cut_at_any_length_are_read_no_further_than_they_go) {
+  const Bytes whole = V6OnlyAttribute(0);
+  const std::size_t valueAt = 12;
+  for (std::size_t length = 0; length <= valueAt; ++length) {
+    const Bytes cut(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(length));
+    EXPECT_TRUE(SocketsOf(Datagram(Message(AF_INET6, 10), cut)).empty()) << length;
   }
 }
 
