@@ -17,38 +17,51 @@ using namespace quendra;
 
 volatile std::sig_atomic_t ended = 0;
 
-/// The least of a loop: one descriptor and what was posted.
+/// The least of a loop: one descriptor, one timer and what was posted.
 class PollLoop : public platform::EventLoop {
  public:
   void Post(std::function<void()> work) override { posted_.push_back(std::move(work)); }
   std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override {
-    watch_ = std::make_shared<Watch>(Watch{descriptor, std::move(ready)});
-    return std::make_unique<Ending>(*this);
+    return Keep(watch_, {descriptor, std::move(ready)});
   }
-  std::unique_ptr<Subscription> StartTimer(int, std::function<void()>) override { return nullptr; }
+  std::unique_ptr<Subscription> StartTimer(int milliseconds, std::function<void()> tick) override {
+    return Keep(timer_, {milliseconds, std::move(tick)});
+  }
   void PumpOnce() override { Pump(0); }
 
   void Pump(int milliseconds) {
     for (; !posted_.empty(); posted_.pop_front()) std::function<void()>(posted_.front())();
     const auto watch = watch_;
-    pollfd polled{watch ? watch->descriptor : -1, POLLIN, 0};
-    if (poll(&polled, 1, milliseconds) > 0) watch->ready();
+    const auto timer = timer_;
+    pollfd polled{watch ? watch->number : -1, POLLIN, 0};
+    const int ready = poll(&polled, 1, timer ? timer->number : milliseconds);
+    if (ready > 0)
+      watch->call();
+    else if (ready == 0 && timer)
+      timer->call();
   }
 
  private:
-  struct Watch {
-    int descriptor;
-    std::function<void()> ready;
+  struct Source {
+    int number;
+    std::function<void()> call;
   };
   class Ending : public Subscription {
    public:
-    explicit Ending(PollLoop& loop) : loop_(loop) {}
-    ~Ending() override { loop_.watch_.reset(); }
+    explicit Ending(std::shared_ptr<Source>& source) : source_(source) {}
+    ~Ending() override { source_.reset(); }
 
    private:
-    PollLoop& loop_;
+    std::shared_ptr<Source>& source_;
   };
-  std::shared_ptr<Watch> watch_;
+
+  static std::unique_ptr<Subscription> Keep(std::shared_ptr<Source>& place, Source source) {
+    place = std::make_shared<Source>(std::move(source));
+    return std::make_unique<Ending>(place);
+  }
+
+  std::shared_ptr<Source> watch_;
+  std::shared_ptr<Source> timer_;
   std::deque<std::function<void()>> posted_;
 };
 

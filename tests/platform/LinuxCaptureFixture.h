@@ -35,7 +35,7 @@ class LinuxCaptureFixture : public testing::Test {
   void WaitUntil(const std::function<bool()>& condition, const char* what);
   /// Pumps the loop long enough for any block of frames to come up from the kernel.
   void Settle() {
-    desktop.WaitFor([] { return false; }, 60);
+    desktop.WaitFor([] { return false; }, 150);
   }
 
   std::unique_ptr<integration::NetworkNamespace> network;

@@ -5,6 +5,7 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr std::uint8_t kBlankFrame[60] = {};
+constexpr int kPaceMilliseconds = 50;
 
 } // namespace
 
@@ -41,11 +42,12 @@ void LinuxCaptureCore::End() {
 void LinuxCaptureCore::Open() {
   Close();
   if (!CurrentName().empty()) session_ = PcapSession::Open(CurrentName(), queue_);
-  UpdateWatch();
+  UpdateBell();
 }
 
 void LinuxCaptureCore::Close() {
   watch_.reset();
+  pace_.reset();
   if (session_ != nullptr) {
     const auto statistics = session_->GetStatistics();
     earlier_.received += statistics.received;
@@ -73,44 +75,59 @@ std::int32_t LinuxCaptureCore::Capture(FrameBytes& frame, CaptureHeader& header)
 void LinuxCaptureCore::Listen(CaptureControl& control, const std::string& adapterName) {
   control_ = &control;
   controlAdapter_ = adapterName;
-  UpdateWatch();
+  UpdateBell();
 }
 
 void LinuxCaptureCore::StopListening(const CaptureControl& control) {
   if (control_ != &control) return;
   control_ = nullptr;
-  UpdateWatch();
+  UpdateBell();
 }
 
 bool LinuxCaptureCore::MayRing() const {
   return control_ != nullptr && HasSession() && controlAdapter_ == CurrentName();
 }
 
-void LinuxCaptureCore::UpdateWatch() {
-  if (!MayRing() || inEvent_ || secondRingPosted_) {
+void LinuxCaptureCore::UpdateBell() {
+  if (!MayRing()) {
     watch_.reset();
+    pace_.reset();
     return;
   }
-  if (watch_ != nullptr) return;
+  if (watch_ != nullptr || pace_ != nullptr) return;
   watch_ = loop_.WatchDescriptor(session_->Descriptor(), [weak = weak_from_this()] {
     if (const auto core = weak.lock()) core->DescriptorReady();
   });
 }
 
 void LinuxCaptureCore::DescriptorReady() {
-  if (!MayRing() || inEvent_ || secondRingPosted_) return;
+  watch_.reset();
+  if (!MayRing()) return;
+  pace_ = loop_.StartTimer(kPaceMilliseconds, [weak = weak_from_this()] {
+    if (const auto core = weak.lock()) core->LookAgain();
+  });
+  if (!inEvent_ && !secondRingPosted_) Serve();
+}
+
+void LinuxCaptureCore::LookAgain() {
+  if (inEvent_ || secondRingPosted_ || Serve()) return;
+  pace_.reset();
+  UpdateBell();
+}
+
+/// False when no packet has come.
+bool LinuxCaptureCore::Serve() {
+  if (!MayRing()) return false;
+  if (queue_.Empty()) queue_.Rewind();
   // Events that take nothing let the queue grow; then the newest frames, by which the next event is judged,
   // go first.
-  if (queue_.Empty()) queue_.Rewind();
   if (queue_.Room() < PcapSession::kRoomOfBatch) {
     queue_.DiscardOldest(PcapSession::kRoomOfBatch);
     earlier_.droppedByQueue += PcapSession::kRoomOfBatch;
   }
-  const int moved = session_->Fill();
-  if (moved > 0)
-    Ring();
-  else if (moved < 0)
-    UpdateWatch();
+  if (session_->Fill() <= 0) return false;
+  Ring();
+  return true;
 }
 
 /// Marks an event as under way, also when its handler ends by an exception.
@@ -119,7 +136,6 @@ class LinuxCaptureCore::Event {
   explicit Event(LinuxCaptureCore& core) : core_(core) {
     core_.inEvent_ = true;
     core_.taken_ = 0;
-    core_.UpdateWatch();
   }
   ~Event() { core_.inEvent_ = false; }
   Event(const Event&) = delete;
@@ -147,7 +163,7 @@ void LinuxCaptureCore::Ring() {
       if (const auto core = weak.lock()) core->RingAgain();
     });
   }
-  UpdateWatch();
+  UpdateBell();
 }
 
 void LinuxCaptureCore::RingAgain() {
@@ -155,7 +171,7 @@ void LinuxCaptureCore::RingAgain() {
   if (MayRing() && !inEvent_ && !queue_.Empty())
     Ring();
   else
-    UpdateWatch();
+    UpdateBell();
 }
 
 CaptureCounters LinuxCaptureCore::Counters() const {

@@ -9,10 +9,12 @@
 namespace quendra::platform::linux_ {
 
 /// The session that the capture library and its controls share, and the rules of when the event is raised:
-/// - when packets have moved from the kernel to the queue, which happens when the descriptor is ready;
+/// - when packets have moved from the kernel to the queue;
 /// - once more through the loop's queue after an event that took frames and left some.
-/// During an event and while a second one is on its way the descriptor isn't watched, so that a handler which
-/// yields is never entered again from here and the kernel's ring does the waiting.
+/// On a silent line the descriptor is watched. Once it has rung, a timer looks for packets as long as there
+/// are some: a busy line rings twenty times a second and not with every block of the kernel, as each ring
+/// costs the loop more than a hundred frames do. During an event nothing is served, so that a handler which
+/// yields is never entered again from here; the kernel's ring does the waiting.
 class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
  public:
   explicit LinuxCaptureCore(EventLoop& loop) : loop_(loop) {}
@@ -42,8 +44,10 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   void Close();
   bool HasSession() const { return session_ != nullptr && !session_->Failed(); }
   bool MayRing() const;
-  void UpdateWatch();
+  void UpdateBell();
   void DescriptorReady();
+  void LookAgain();
+  bool Serve();
   void Ring();
   void RingAgain();
 
@@ -59,7 +63,8 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
 
   CaptureControl* control_ = nullptr;
   std::string controlAdapter_;
-  std::unique_ptr<EventLoop::Subscription> watch_;
+  std::unique_ptr<EventLoop::Subscription> watch_; // on a silent line
+  std::unique_ptr<EventLoop::Subscription> pace_;  // on a busy line; never both
   bool inEvent_ = false;
   bool secondRingPosted_ = false;
   std::uint32_t taken_ = 0; // frames that the event under way took
