@@ -3,17 +3,21 @@
 #include "foundation/SocketErrors.h"
 #include "foundation/SocketTexts.h"
 
-#include <algorithm>
+#include <exception>
 
 namespace quendra::foundation {
 
 namespace {
 
-std::int32_t CheckedPort(const Value& port, const char16_t* source) {
-  if (!IsNumeric(port)) throw Misuse(kUnsupportedType, source);
-  const std::int32_t number = ToInt32(port);
-  if (number < 0 || number > 65535) throw Misuse(kInvalidArgumentFault, source);
-  return number;
+std::int32_t CheckedPort(std::int32_t port, const char16_t* source) {
+  if (port < 0 || port > 65535) throw Misuse(kInvalidArgumentFault, source);
+  return port;
+}
+
+/// What a failed question for a host's name leaves behind; such questions need not leave a number.
+std::int32_t NameError(platform::Sockets& library) {
+  const std::int32_t error = library.WSAGetLastError();
+  return error != 0 ? error : platform::kHostNotFound;
 }
 
 } // namespace
@@ -33,11 +37,22 @@ CSocketPlus::~CSocketPlus() {
 void CSocketPlus::Release() {
   if (std::exchange(released_, true)) return;
   life_.reset();
+  std::exception_ptr first;
+  const auto attempt = [&](const auto& step) {
+    try {
+      step();
+    } catch (const Fault&) {
+      if (!first) first = std::current_exception();
+    }
+  };
   for (Slot slot = 1; slot < records_.size(); ++slot) {
     CancelResolves(slot);
-    if (!acceptClass_) DestroySocket(slot);
+    if (!acceptClass_) attempt([&] { DestroySocket(slot); });
   }
-  module_.FinalizeProcesses();
+  // A socket that could not be closed must not lead messages to an object that is gone.
+  attempt([&] { module_.ForgetOwner(this); });
+  attempt([&] { module_.FinalizeProcesses(); });
+  if (first) std::rethrow_exception(first);
 }
 
 std::int32_t CSocketPlus::WndProc(forms::WindowHandle, std::uint32_t message, std::uint32_t wParam,
@@ -51,7 +66,7 @@ std::int32_t CSocketPlus::WndProc(forms::WindowHandle, std::uint32_t message, st
 
 std::int32_t CSocketPlus::RemotePort(const Value& index) { return At(GetSocketIndex(index)).RemotePort; }
 
-void CSocketPlus::SetRemotePort(const Value& index, const Value& port) {
+void CSocketPlus::SetRemotePort(const Value& index, std::int32_t port) {
   constexpr auto kSource = u"CSocketPlus.RemotePort";
   SocketRecord& record = At(GetSocketIndex(index));
   if (record.Protocol == sckTCPProtocol && record.State != sckClosed)
@@ -75,7 +90,7 @@ std::int32_t CSocketPlus::LocalPort(const Value& index) {
   return record.LocalPortBind != 0 ? record.LocalPortBind : record.LocalPort;
 }
 
-void CSocketPlus::SetLocalPort(const Value& index, const Value& port) {
+void CSocketPlus::SetLocalPort(const Value& index, std::int32_t port) {
   constexpr auto kSource = u"CSocketPlus.LocalPort";
   SocketRecord& record = At(GetSocketIndex(index));
   if (record.State != sckClosed) throw Misuse(kInvalidAtCurrentState, kSource);
@@ -86,7 +101,7 @@ SocketState CSocketPlus::State(const Value& index) { return At(GetSocketIndex(in
 
 Text CSocketPlus::LocalHostName() {
   const auto name = module_.Names().gethostname();
-  if (!name) throw SystemError(module_.Library().WSAGetLastError(), u"CSocketPlus.GetLocalHostName");
+  if (!name) throw SystemError(NameError(module_.Library()), u"CSocketPlus.GetLocalHostName");
   return FromCodePage(CutAtNul(std::string_view(*name).substr(0, 256)));
 }
 
@@ -95,7 +110,7 @@ Text CSocketPlus::LocalIP(const Value& index) {
   if (record.State == sckConnected) return record.LocalIP;
   const auto addresses = module_.Names().gethostbyname(ToCodePage(LocalHostName()));
   if (!addresses || addresses->empty())
-    throw SystemError(module_.Library().WSAGetLastError(), u"CSocketPlus.GetLocalIP");
+    throw SystemError(NameError(module_.Library()), u"CSocketPlus.GetLocalIP");
   return DottedAddress(addresses->front());
 }
 
@@ -148,9 +163,9 @@ void CSocketPlus::DestroySocket(Slot slot) {
     record.State = sckError;
     throw SystemError(module_.Library().WSAGetLastError(), u"CSocketPlus.DestroySocket");
   }
-  const platform::SocketHandle socket = std::exchange(record.SocketHandle, platform::kNoSocket);
-  slotsBySocket_.erase(socket);
-  module_.UnregisterSocket(socket);
+  module_.UnregisterSocket(record.SocketHandle);
+  slotsBySocket_.erase(record.SocketHandle);
+  record.SocketHandle = platform::kNoSocket;
 }
 
 void CSocketPlus::Fail(Slot slot, std::int32_t number, const char16_t* source) {

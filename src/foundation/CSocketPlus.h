@@ -18,20 +18,22 @@ class CSocketPlus {
   ~CSocketPlus();
   CSocketPlus(const CSocketPlus&) = delete;
 
-  /// Cancels all look-ups, closes all sockets and leaves the module. What fails is raised. Once only.
+  /// Cancels all look-ups, closes all sockets and leaves the module; the first fault of these is raised when
+  /// all of them were tried. Once only.
   void Release();
 
   std::int32_t WndProc(forms::WindowHandle window, std::uint32_t message, std::uint32_t wParam,
                        std::uint32_t lParam);
 
   std::int32_t RemotePort(const Value& index);
-  void SetRemotePort(const Value& index, const Value& port);
+  /// Refused with fault 40020 by a TCP socket that is not closed.
+  void SetRemotePort(const Value& index, std::int32_t port);
   Text RemoteHost(const Value& index);
   void SetRemoteHost(const Value& index, const Text& host);
   Text RemoteHostIP(const Value& index);
   /// The port that is bound, else the port asked for.
   std::int32_t LocalPort(const Value& index);
-  void SetLocalPort(const Value& index, const Value& port);
+  void SetLocalPort(const Value& index, std::int32_t port);
   SocketState State(const Value& index);
   Text LocalHostName();
   Text LocalIP(const Value& index);

@@ -110,8 +110,9 @@ void CSocketPlus::TakeData(const Value& index, Value& data, DataKind kind, const
   }
   std::int32_t most = 0;
   if (!IsEmpty(maxLength)) {
-    most = IsNumeric(maxLength) ? ToInt32(maxLength) : AmountWaiting(slot);
-    if (most < 0) throw Misuse(kInvalidArgumentFault, source);
+    const auto number = NumberIn(maxLength);
+    if (number && *number < 0) throw Misuse(kInvalidArgumentFault, source);
+    most = number ? ToInt32(maxLength) : AmountWaiting(slot);
   }
   RecvData(slot, data, kind, most, !IsEmpty(maxLength), peek);
 }

@@ -75,7 +75,6 @@ void CSocketPlus::OnAccept(Slot slot) {
   if (accepted == platform::kNoSocket)
     return Fail(slot, module_.Library().WSAGetLastError(), u"CSocketPlus.PostSocket");
   module_.RegisterAccept(accepted);
-  const Life life = life_;
   modSocketPlus& module = module_;
   OfferConnection(slot, accepted);
   if (!module.IsAcceptRegistered(accepted)) return;
@@ -127,7 +126,8 @@ void CSocketPlus::Accept(const Value& index, platform::SocketHandle requestID) {
 void CSocketPlus::TakePending(Slot slot, platform::SocketHandle requestID) {
   const Life life = life_;
   const Value pendingIndex = Text(u"Temporal_Socket");
-  CSocketPlus& pending = *module_.GetAcceptClass(requestID);
+  const auto held = module_.GetAcceptClass(requestID);
+  CSocketPlus& pending = *held;
   StoreLocalAddress(slot);
   StorePeerAddress(slot);
   At(slot).State = sckConnected;

@@ -35,10 +35,10 @@ std::uint32_t WordAt(const ResolveBuffer& buffer, std::size_t offset) {
 }
 
 std::int32_t PortArgument(const Value& port, std::int32_t lowest, const char16_t* source) {
-  if (!IsNumeric(port)) throw Misuse(kUnsupportedType, source);
-  const std::int32_t number = ToInt32(port);
-  if (number < lowest || number > 65535) throw Misuse(kInvalidArgumentFault, source);
-  return number;
+  const auto number = NumberIn(port);
+  if (!number) throw Misuse(kUnsupportedType, source);
+  if (!(*number >= lowest && *number <= 65535)) throw Misuse(kInvalidArgumentFault, source);
+  return ToInt32(port);
 }
 
 } // namespace
@@ -136,7 +136,7 @@ bool CSocketPlus::BindInternal(Slot slot, const Value& port, const Value& addres
 
 std::uint32_t CSocketPlus::ResolveBlocking(const Text& host, std::int32_t& error) {
   error = 0;
-  const std::string name = ToCodePage(host);
+  const std::string name = LibraryName(host);
   const std::uint32_t address = platform::Sockets::inet_addr(name);
   if (address != kNoAddress) return address;
   const auto addresses = module_.Names().gethostbyname(name);
@@ -148,7 +148,7 @@ std::uint32_t CSocketPlus::ResolveBlocking(const Text& host, std::int32_t& error
 
 std::uint32_t CSocketPlus::ResolveIfHostname(Slot slot, const Text& host) {
   constexpr auto kSource = u"CSocketPlus.ResolveIfHostname";
-  const std::uint32_t address = platform::Sockets::inet_addr(ToCodePage(host));
+  const std::uint32_t address = platform::Sockets::inet_addr(LibraryName(host));
   if (address != kNoAddress) return address;
   At(slot).State = sckResolvingHost;
   try {

@@ -32,4 +32,11 @@ CSocketPlus* HandleOwners::OwnerOf(std::uint32_t handle) const {
   return handle == kFree || found == entries_.end() ? nullptr : found->owner;
 }
 
+std::vector<std::uint32_t> HandleOwners::HandlesOf(const CSocketPlus* owner) const {
+  std::vector<std::uint32_t> handles;
+  for (const Entry& entry : entries_)
+    if (entry.handle != kFree && entry.owner == owner) handles.push_back(entry.handle);
+  return handles;
+}
+
 } // namespace quendra::foundation

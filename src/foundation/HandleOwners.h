@@ -19,6 +19,7 @@ class HandleOwners {
   void ChangeOwner(std::uint32_t handle, CSocketPlus* owner);
   /// nullptr for a handle that is not there.
   CSocketPlus* OwnerOf(std::uint32_t handle) const;
+  std::vector<std::uint32_t> HandlesOf(const CSocketPlus* owner) const;
   int Count() const { return static_cast<int>(entries_.size()); }
   void Clear() { entries_.clear(); }
 

@@ -11,4 +11,6 @@ Text DottedAddress(std::uint32_t address) {
          DecimalText(bytes[3]);
 }
 
+std::string LibraryName(const Text& name) { return std::string(CutAtNul(ToCodePage(name))); }
+
 } // namespace quendra::foundation

@@ -4,13 +4,11 @@
 #include "runtime/Format.h"
 #include "runtime/Integers.h"
 
-#include <optional>
-
 namespace quendra::foundation {
 
 namespace {
 
-std::optional<double> NumberIn(const Text& text) {
+std::optional<double> NumberInText(const Text& text) {
   try {
     return NumberOf(text);
   } catch (const Fault&) {
@@ -29,7 +27,7 @@ struct NumberReader {
   std::optional<double> operator()(double value) const { return value; }
   std::optional<double> operator()(Currency value) const { return static_cast<double>(value.scaled) / 10000; }
   std::optional<double> operator()(Date) const { return std::nullopt; }
-  std::optional<double> operator()(const Text& text) const { return NumberIn(text); }
+  std::optional<double> operator()(const Text& text) const { return NumberInText(text); }
   std::optional<double> operator()(const ByteArray&) const { return std::nullopt; }
 };
 
@@ -44,10 +42,10 @@ DataKind KindOf(const Value& value) {
   return kKinds[value.index()];
 }
 
-bool IsNumeric(const Value& value) { return std::visit(NumberReader{}, value).has_value(); }
+std::optional<double> NumberIn(const Value& value) { return std::visit(NumberReader{}, value); }
 
 std::int32_t ToInt32(const Value& value) {
-  const auto number = std::visit(NumberReader{}, value);
+  const auto number = NumberIn(value);
   if (!number) throw Fault(Fault::kTypeMismatch);
   return RoundToInt32(*number);
 }
@@ -56,7 +54,7 @@ Text ToText(const Value& value) {
   if (const Text* text = std::get_if<Text>(&value)) return *text;
   if (IsEmpty(value)) return {};
   if (const bool* flag = std::get_if<bool>(&value)) return *flag ? u"True" : u"False";
-  const auto number = std::visit(NumberReader{}, value);
+  const auto number = NumberIn(value);
   if (!number) throw Fault(Fault::kTypeMismatch);
   return NumberText(*number);
 }

@@ -3,6 +3,7 @@
 #include "foundation/ByteArray.h"
 #include "runtime/Text.h"
 
+#include <optional>
 #include <variant>
 
 namespace quendra::foundation {
@@ -47,8 +48,9 @@ enum class DataKind {
 /// The kind of a value's own type; None for an empty value, Other for one that no data is read into.
 DataKind KindOf(const Value& value);
 
-/// Numbers, booleans, the empty value and texts that hold a number.
-bool IsNumeric(const Value& value);
+/// The number that a value stands for: numbers, booleans (-1 and 0), the empty value (0) and texts that hold
+/// a number; nothing for a value that is not numeric.
+std::optional<double> NumberIn(const Value& value);
 /// A numeric value rounded to 32 bits; fault 13 for one that is not numeric, 6 for one that doesn't fit.
 std::int32_t ToInt32(const Value& value);
 /// The value as text; fault 13 for bytes and for Null.

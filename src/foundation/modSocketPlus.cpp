@@ -2,6 +2,7 @@
 
 #include "foundation/CSocketPlus.h"
 #include "foundation/SocketErrors.h"
+#include "foundation/SocketTexts.h"
 
 namespace quendra::foundation {
 
@@ -13,7 +14,11 @@ modSocketPlus::modSocketPlus(platform::Sockets& sockets, platform::HostNames& ho
                              forms::MessageWindows& windows)
     : sockets_(sockets), hostNames_(hostNames), windows_(windows) {}
 
-modSocketPlus::~modSocketPlus() = default;
+modSocketPlus::~modSocketPlus() {
+  // Each leaves the module as it ends, so the tables must still be there.
+  while (!pendingAccepts_.empty()) UnregisterAccept(pendingAccepts_.begin()->first);
+  DetachDispatcher();
+}
 
 void modSocketPlus::InitiateProcesses() {
   ++socketClassCount_;
@@ -58,6 +63,11 @@ void modSocketPlus::UnregisterSocket(platform::SocketHandle socket) {
   DestroyWinsockMessageWindow();
 }
 
+void modSocketPlus::ForgetOwner(const CSocketPlus* owner) {
+  for (const std::uint32_t handle : resolves_.HandlesOf(owner)) UnregisterResolve(handle);
+  for (const std::uint32_t handle : socketOwners_.HandlesOf(owner)) UnregisterSocket(handle);
+}
+
 bool modSocketPlus::IsSocketRegistered(platform::SocketHandle socket) const {
   return registeredSockets_ && registeredSockets_->contains(socket);
 }
@@ -65,13 +75,13 @@ bool modSocketPlus::IsSocketRegistered(platform::SocketHandle socket) const {
 std::uint32_t modSocketPlus::StartResolve(const Text& name, std::span<std::uint8_t> buffer,
                                           CSocketPlus* owner) {
   const std::uint32_t handle =
-      sockets_.WSAAsyncGetHostByName(socketWindow_, kResolveMessage, ToCodePage(name), buffer);
+      sockets_.WSAAsyncGetHostByName(socketWindow_, kResolveMessage, LibraryName(name), buffer);
   if (handle != 0) RegisterResolve(handle, owner);
   return handle;
 }
 
 void modSocketPlus::RegisterAccept(platform::SocketHandle socket) {
-  auto pending = std::make_unique<CSocketPlus>(*this);
+  auto pending = std::make_shared<CSocketPlus>(*this);
   pending->ArrayAdd(Text(u"Temporal_Socket"));
   pending->Accept(Text(u"Temporal_Socket"), socket);
   pendingAccepts_[socket] = std::move(pending);
@@ -86,9 +96,9 @@ void modSocketPlus::UnregisterAccept(platform::SocketHandle socket) {
   const auto ended = pendingAccepts_.extract(socket);
 }
 
-CSocketPlus* modSocketPlus::GetAcceptClass(platform::SocketHandle socket) const {
+std::shared_ptr<CSocketPlus> modSocketPlus::GetAcceptClass(platform::SocketHandle socket) const {
   const auto found = pendingAccepts_.find(socket);
-  return found == pendingAccepts_.end() ? nullptr : found->second.get();
+  return found == pendingAccepts_.end() ? nullptr : found->second;
 }
 
 void modSocketPlus::CreateWinsockMessageWindow() {

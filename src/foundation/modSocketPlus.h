@@ -31,6 +31,8 @@ class modSocketPlus {
   void FinalizeProcesses();
   bool RegisterSocket(platform::SocketHandle socket, CSocketPlus* owner, bool selectEvents);
   void UnregisterSocket(platform::SocketHandle socket);
+  /// What is still registered for an object that ends.
+  void ForgetOwner(const CSocketPlus* owner);
   bool IsSocketRegistered(platform::SocketHandle socket) const;
   void RegisterResolve(std::uint32_t handle, CSocketPlus* owner) { resolves_.Add(handle, owner); }
   void UnregisterResolve(std::uint32_t handle) { resolves_.Remove(handle); }
@@ -44,7 +46,8 @@ class modSocketPlus {
   void RegisterAccept(platform::SocketHandle socket);
   bool IsAcceptRegistered(platform::SocketHandle socket) const;
   void UnregisterAccept(platform::SocketHandle socket);
-  CSocketPlus* GetAcceptClass(platform::SocketHandle socket) const;
+  /// nullptr for a socket that isn't in the list.
+  std::shared_ptr<CSocketPlus> GetAcceptClass(platform::SocketHandle socket) const;
 
   platform::Sockets& Library() { return sockets_; }
   platform::HostNames& Names() { return hostNames_; }
@@ -68,7 +71,7 @@ class modSocketPlus {
   bool winsockStarted_ = false;
   forms::WindowHandle socketWindow_ = 0;
   std::optional<std::set<platform::SocketHandle>> registeredSockets_;
-  std::map<platform::SocketHandle, std::unique_ptr<CSocketPlus>> pendingAccepts_;
+  std::map<platform::SocketHandle, std::shared_ptr<CSocketPlus>> pendingAccepts_;
   HandleOwners resolves_;
   HandleOwners socketOwners_;
   forms::WindowHandle subclassedWindow_ = 0;

@@ -4,6 +4,7 @@
 #include "platform/simulated/SimulatedCapture.h"
 #include "platform/simulated/SimulatedNetwork.h"
 #include "platform/simulated/SimulatedProcesses.h"
+#include "platform/simulated/SimulatedSockets.h"
 #include "platform/simulated/SimulatedSystem.h"
 
 namespace quendra::platform::simulated {
@@ -13,8 +14,10 @@ namespace quendra::platform::simulated {
 class SimulatedMachine {
  public:
   SimulatedMachine()
-      : processes(core_), tokens(core_), handles(core_), sockets(core_), capture(core_), system(core_),
-        shellStart(core_) {}
+      : processes(core_), tokens(core_), handles(core_), sockets(core_, hostNames), capture(core_),
+        system(core_), shellStart(core_) {}
+  /// With sockets whose messages go through a loop.
+  explicit SimulatedMachine(EventLoop& loop) : SimulatedMachine() { sockets.UseLoop(loop); }
   SimulatedMachine(const SimulatedMachine&) = delete;
 
   Machine Operations() {

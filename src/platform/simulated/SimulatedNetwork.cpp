@@ -56,53 +56,13 @@ std::optional<std::string> SimulatedHostNames::gethostname() {
 }
 
 std::optional<std::vector<std::uint32_t>> SimulatedHostNames::gethostbyname(const std::string& name) {
-  if (FailAddresses || CutText(name) != Name) return {};
+  if (FailAddresses) return {};
+  const auto other = others_.find(CutText(name));
+  if (other == others_.end() && CutText(name) != Name) return {};
   std::vector<std::uint32_t> addresses;
-  for (const auto& address : Addresses) addresses.push_back(AddressInMemory(address));
+  for (const auto& address : other == others_.end() ? Addresses : other->second)
+    addresses.push_back(AddressInMemory(address));
   return addresses;
-}
-
-std::int32_t SimulatedSockets::recv(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t) {
-  core_.calls.push_back("recv " + std::to_string(socket) + " " + std::to_string(buffer.size()));
-  auto& waiting = waiting_[socket];
-  if (waiting.empty()) return 0;
-  if (!waiting.front()) {
-    waiting.pop_front();
-    return -1;
-  }
-  auto& bytes = *waiting.front();
-  const std::size_t length = std::min(bytes.size(), buffer.size());
-  std::copy_n(bytes.begin(), length, buffer.begin());
-  bytes.erase(bytes.begin(), bytes.begin() + static_cast<std::ptrdiff_t>(length));
-  if (bytes.empty()) waiting.pop_front();
-  return static_cast<std::int32_t>(length);
-}
-
-std::int32_t SimulatedSockets::WSAAsyncSelect(SocketHandle socket, std::uint32_t window,
-                                              std::uint32_t message, std::int32_t events) {
-  core_.calls.push_back("WSAAsyncSelect " + std::to_string(socket) + " " + std::to_string(window) + " " +
-                        std::to_string(message) + " " + std::to_string(events));
-  return 0;
-}
-
-std::int32_t SimulatedSockets::closesocket(SocketHandle socket) {
-  core_.calls.push_back("closesocket " + std::to_string(socket));
-  return 0;
-}
-
-bool SimulatedSockets::WSAIsBlocking() {
-  core_.calls.push_back("WSAIsBlocking");
-  return Blocking;
-}
-
-std::int32_t SimulatedSockets::WSACancelBlockingCall() {
-  core_.calls.push_back("WSACancelBlockingCall");
-  return 0;
-}
-
-std::int32_t SimulatedSockets::WSACleanup() {
-  core_.calls.push_back("WSACleanup");
-  return 0;
 }
 
 } // namespace quendra::platform::simulated

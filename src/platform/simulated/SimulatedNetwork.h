@@ -3,9 +3,9 @@
 #include "platform/Handles.h"
 #include "platform/HostNames.h"
 #include "platform/IpHelper.h"
-#include "platform/Sockets.h"
 #include "platform/simulated/SimulatedCore.h"
 
+#include <array>
 #include <deque>
 #include <optional>
 
@@ -80,43 +80,23 @@ class SimulatedIpHelper : public IpHelper {
   std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
 };
 
-/// Only the host's own name is known.
+/// The host's own name is known, and those that were added.
 class SimulatedHostNames : public HostNames {
  public:
   std::string Name = "subscriber";
   std::vector<std::string> Addresses;
+  /// Another name and its addresses.
+  void Add(const std::string& name, std::vector<std::string> addresses) {
+    others_[name] = std::move(addresses);
+  }
   bool FailName = false;
   bool FailAddresses = false;
 
   std::optional<std::string> gethostname() override;
   std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) override;
-};
-
-/// Sockets that give what the test put in; every call but recv's data stands in the machine's Calls.
-class SimulatedSockets : public Sockets {
- public:
-  explicit SimulatedSockets(Core& core) : core_(core) {}
-
-  /// What the next reads of a socket give; a read takes at most one of them. A socket with nothing left is at
-  /// its end.
-  void Receive(SocketHandle socket, std::vector<std::uint8_t> bytes) {
-    waiting_[socket].push_back(std::move(bytes));
-  }
-  /// A read that fails, behind what waits already.
-  void FailReceive(SocketHandle socket) { waiting_[socket].push_back(std::nullopt); }
-  bool Blocking = false;
-
-  std::int32_t recv(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags) override;
-  std::int32_t WSAAsyncSelect(SocketHandle socket, std::uint32_t window, std::uint32_t message,
-                              std::int32_t events) override;
-  std::int32_t closesocket(SocketHandle socket) override;
-  bool WSAIsBlocking() override;
-  std::int32_t WSACancelBlockingCall() override;
-  std::int32_t WSACleanup() override;
 
  private:
-  Core& core_;
-  std::map<SocketHandle, std::deque<std::optional<std::vector<std::uint8_t>>>> waiting_;
+  std::map<std::string, std::vector<std::string>> others_;
 };
 
 } // namespace quendra::platform::simulated
