@@ -15,6 +15,7 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr std::int32_t kNotStarted = 10093;
+constexpr std::int32_t kNoBufferSpace = 10055;
 constexpr std::int32_t kSocketLevel = 0xFFFF;
 constexpr std::int32_t kMaxMessageSizeOption = 0x2003;
 constexpr std::int32_t kLargestDatagram = 65507;
@@ -135,6 +136,8 @@ SocketHandle LinuxSockets::accept(SocketHandle socket) {
 std::int32_t LinuxSockets::connect(SocketHandle socket, const SocketAddress& peer) {
   SocketEntry* entry = Entry(socket);
   if (!entry) return kSocketError;
+  // This system takes address 0 for its own host; to the library neither is a place to connect to.
+  if (peer.address == 0 || peer.port == 0) return Fail(kAddressNotAvailable);
   const sockaddr_in address = SystemAddress(peer);
   const int descriptor = entry->descriptor.Number();
   const int result = ::connect(descriptor, reinterpret_cast<const sockaddr*>(&address), sizeof address);
@@ -271,6 +274,7 @@ std::uint32_t LinuxSockets::WSAAsyncGetHostByName(std::uint32_t window, std::uin
         }
         loop_.PostMessage(window, message, *handle, static_cast<std::uint32_t>(error) << 16);
       });
+  if (*handle == 0) Fail(kNoBufferSpace);
   return *handle;
 }
 

@@ -10,6 +10,7 @@
 #include <deque>
 #include <map>
 #include <mutex>
+#include <system_error>
 #include <thread>
 
 namespace quendra::platform::linux_ {
@@ -90,8 +91,16 @@ std::uint32_t NameLookUps::Start(const std::string& name, Done done) {
   const std::scoped_lock guard(shared_->lock);
   shared_->jobs.push_back({handle, name});
   if (shared_->threads == kMostThreads) return handle;
-  ++shared_->threads;
-  std::thread([shared = shared_] { Work(shared); }).detach();
+  try {
+    std::thread([shared = shared_] { Work(shared); }).detach();
+    ++shared_->threads;
+  } catch (const std::system_error&) {
+    // Those that run already will come to it; without any there is no look-up.
+    if (shared_->threads > 0) return handle;
+    shared_->jobs.clear();
+    shared_->underWay.erase(handle);
+    return 0;
+  }
   return handle;
 }
 

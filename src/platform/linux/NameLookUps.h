@@ -23,7 +23,8 @@ class NameLookUps {
   /// Look-ups under way end without a word.
   ~NameLookUps();
 
-  /// The look-up's handle. `done` runs from the loop, never before this returns.
+  /// The look-up's handle, 0 when the system has no thread for it. `done` runs from the loop, never before
+  /// this returns.
   std::uint32_t Start(const std::string& name, Done done);
   /// False when it isn't under way any more.
   bool Cancel(std::uint32_t lookUp);

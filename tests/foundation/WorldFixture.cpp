@@ -1,0 +1,46 @@
+#include "foundation/WorldFixture.h"
+
+#include <algorithm>
+
+namespace quendra::foundation {
+
+std::string NameOf(const Value& index) {
+  if (const Text* text = std::get_if<Text>(&index)) return ToUtf8(*text);
+  return ToUtf8(ToText(index));
+}
+
+ByteArray BytesFrom(const std::string& text) { return ByteArray(text.begin(), text.end()); }
+
+void Program::Record(CSocketPlus& sockets) {
+  auto& events = sockets.Events;
+  const auto add = [this](std::string event) { Events.push_back(std::move(event)); };
+  events.Connect = [add](const Value& index) { add("Connect " + NameOf(index)); };
+  events.CloseSck = [add](const Value& index) { add("CloseSck " + NameOf(index)); };
+  events.SendComplete = [add](const Value& index) { add("SendComplete " + NameOf(index)); };
+  events.DataArrival = [add](const Value& index, std::int32_t total) {
+    add("DataArrival " + NameOf(index) + " " + std::to_string(total));
+  };
+  events.ConnectionRequest = [add](const Value& index, platform::SocketHandle) {
+    add("ConnectionRequest " + NameOf(index));
+  };
+  events.SendProgress = [add](const Value& index, std::int32_t sent, std::int32_t left) {
+    add("SendProgress " + NameOf(index) + " " + std::to_string(sent) + " " + std::to_string(left));
+  };
+  events.Error = [add](const Value& index, std::int16_t number, const Text&, std::int32_t, const Text& source,
+                       const Text&, std::int32_t, bool&) {
+    add("Error " + NameOf(index) + " " + std::to_string(number) + " " + ToUtf8(source));
+  };
+}
+
+bool Program::Saw(const std::string& event) const {
+  return std::find(Events.begin(), Events.end(), event) != Events.end();
+}
+
+std::string Program::Take(const Value& index) {
+  Value data;
+  sockets_->GetData(index, data);
+  const auto* bytes = std::get_if<ByteArray>(&data);
+  return bytes ? std::string(bytes->begin(), bytes->end()) : std::string();
+}
+
+} // namespace quendra::foundation
