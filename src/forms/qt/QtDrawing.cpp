@@ -100,12 +100,10 @@ void QtDrawing::BitBlt(PictureBox& target, int x, int y, int width, int height, 
   PictureBoxView* to = ViewOf(target);
   const PictureBoxView* from = ViewOf(source);
   if (!to || !from || to == from) return;
-  // What lies outside the source has nothing to give.
-  const QRect wanted = QRect(sourceX, sourceY, width, height).intersected(from->rect());
-  if (wanted.isEmpty()) return;
   QPainter painter(&to->Surface());
   painter.translate(x - sourceX, y - sourceY);
-  painter.setClipRect(wanted);
+  // What lies outside the source has nothing to give: its layers end with it.
+  painter.setClipRect(sourceX, sourceY, width, height);
   from->PaintLayers(painter, PictureBoxView::Ground::Drawn);
 }
 

@@ -218,6 +218,12 @@ TEST_F(Drawing, Images_of_absurd_sizes_and_other_formats_are_refused) {
   EXPECT_TRUE(qt::DecodeIcon(PngOf(16, 16, Qt::red), {0, 32}).isNull());
 }
 
+TEST_F(Drawing, An_image_of_2048_pixels_is_taken_and_one_of_2049_refused) {
+  EXPECT_FALSE(qt::DecodeIcon(PngOf(2048, 1, Qt::red), {32, 32}).isNull());
+  EXPECT_TRUE(qt::DecodeIcon(PngOf(2049, 1, Qt::red), {32, 32}).isNull());
+  EXPECT_TRUE(qt::DecodeIcon(PngOf(1, 2049, Qt::red), {32, 32}).isNull());
+}
+
 TEST_F(Drawing, A_drawing_that_names_a_giant_size_is_drawn_small) {
   const auto svg = BytesOf("<svg xmlns='http://www.w3.org/2000/svg' width='60000' height='60000'>"
                            "<rect width='60000' height='60000' fill='#ff0000'/></svg>");

@@ -172,6 +172,19 @@ TEST_F(Mouse, A_caption_press_drags_the_window_where_no_window_manager_does) {
   EXPECT_EQ(clicks, 0);
 }
 
+TEST_F(Mouse, The_release_that_ends_a_drag_is_no_click) {
+  int clicks = 0;
+  label.Click = [&] { ++clicks; };
+  label.MouseMove = [&](int, int, int, int) { desktop.SendMessage(desktop.HandleOf(form), 0xA1, 2, 0); };
+  desktop.Show(form);
+
+  PressMouse(WidgetOf(label), {10, 10});
+  MoveMouse(WidgetOf(label), {10, 10}, Qt::LeftButton);
+  ReleaseMouse(WidgetOf(label), {10, 10});
+
+  EXPECT_EQ(clicks, 0);
+}
+
 TEST_F(Mouse, A_click_that_unloads_its_own_form_does_no_harm) {
   label.Click = [&] { desktop.Unload(form); };
   desktop.Show(form);

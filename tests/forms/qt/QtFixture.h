@@ -12,7 +12,7 @@
 
 namespace quendra::forms {
 
-/// A form with one control of each kind that most tests need, 100 by 60 pixels units of 15 twips at 96 DPI.
+/// A form of 400 by 300 pixels, at 96 DPI 15 twips each, whose handlers are told by the test.
 struct TestForm : Form {
   TestForm() : Form(u"frmTest") {}
   void Design() override {
