@@ -32,7 +32,7 @@ std::string Value(const KeyFile& file, std::string_view key) { return Unescaped(
 /// The program is shown in Hebrew, whatever the session's language.
 Text Localised(const KeyFile& file, const std::string& key) {
   for (const char* locale : {"[he]", "[he_IL]", "[iw]", ""}) {
-    const Text text = ReadableText(Value(file, key + locale));
+    Text text = ReadableText(Value(file, key + locale));
     if (!text.empty()) return text;
   }
   return {};
