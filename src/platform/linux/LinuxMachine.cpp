@@ -15,7 +15,8 @@
 namespace quendra::platform::linux_ {
 
 struct LinuxMachine::Parts {
-  Parts(EventLoop& loop, const std::string& procRoot) : folder(procRoot), capture(loop), sockets(loop, hostNames) {}
+  Parts(EventLoop& loop, const std::string& procRoot)
+      : folder(procRoot), capture(loop), sockets(loop, hostNames) {}
 
   ProcFolder folder;
   HandleTable handleTable;

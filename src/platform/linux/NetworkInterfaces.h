@@ -26,8 +26,8 @@ struct DefaultRoute {
   std::uint32_t metric = 0;
 };
 
-/// The default routes in a text such as that of /proc/net/route, the preferred one first. Lines that are no such lines
-/// are left out.
+/// The default routes in a text such as that of /proc/net/route, the preferred one first. Lines that are no
+/// such lines are left out.
 std::vector<DefaultRoute> ParseDefaultRoutes(std::string_view text);
 
 /// Of this network namespace, in the kernel's order.
