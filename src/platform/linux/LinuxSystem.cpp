@@ -1,7 +1,5 @@
 #include "platform/linux/LinuxSystem.h"
 
-#include "platform/linux/Clock.h"
-
 #include <chrono>
 #include <ctime>
 #include <thread>
@@ -11,10 +9,14 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr std::int32_t kDayNumberOf1970 = 25569;
+/// Far above any day number and far below the sign bit.
+constexpr std::uint64_t kTickAtStart = 10'000'000;
 
 } // namespace
 
-std::uint32_t LinuxSystem::GetTickCount() { return static_cast<std::uint32_t>(CoarseMilliseconds()); }
+std::uint32_t LinuxSystem::GetTickCount() {
+  return static_cast<std::uint32_t>(kTickAtStart + clock_() - start_);
+}
 
 bool LinuxSystem::GetVersionExA(OsVersion& version) {
   version = {2, 5, 1};
