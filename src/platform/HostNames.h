@@ -14,7 +14,8 @@ class HostNames {
 
   /// Nothing on failure.
   virtual std::optional<std::string> gethostname() = 0;
-  /// The name's IPv4 addresses in the system's order, each as it lies in memory (network order); nothing on failure.
+  /// The name's IPv4 addresses in the system's order, each as it lies in memory (network order); nothing on
+  /// failure.
   virtual std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) = 0;
 };
 

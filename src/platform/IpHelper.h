@@ -26,14 +26,14 @@ class IpHelper {
   static constexpr std::uint32_t kErrorBufferOverflow = 111;
   static constexpr std::uint32_t kErrorNotSupported = 50;
 
-  /// The IPv4 TCP connections with their owners: a 32-bit count in host order, then 24 bytes an entry: state, local
-  /// address, local port, remote address, remote port, owner. Addresses and ports (low 16 bits) are in network order as
-  /// they lie in memory. 0 on success; on failure `table` stays as it was.
+  /// The IPv4 TCP connections with their owners: a 32-bit count in host order, then 24 bytes an entry: state,
+  /// local address, local port, remote address, remote port, owner. Addresses and ports (low 16 bits) are in
+  /// network order as they lie in memory. 0 on success; on failure `table` stays as it was.
   virtual std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) = 0;
   /// 20 bytes: state 12, local address, local port, remote address, remote port. 0 on success.
   virtual std::uint32_t SetTcpEntry(std::span<const std::uint8_t, 20> record) = 0;
-  /// `size` counts bytes of room, 640 an adapter. With less room than needed it gives kErrorBufferOverflow and puts the
-  /// needed size in `size`; otherwise it gives 0 and fills `adapters`.
+  /// `size` counts bytes of room, 640 an adapter. With less room than needed it gives kErrorBufferOverflow
+  /// and puts the needed size in `size`; otherwise it gives 0 and fills `adapters`.
   virtual std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) = 0;
 };
 

@@ -17,7 +17,8 @@ class Processes {
  public:
   virtual ~Processes() = default;
 
-  /// One process of a snapshot. `exeFile` is the executable's file name in the system's code page, ended by a NUL.
+  /// One process of a snapshot. `exeFile` is the executable's file name in the system's code page, ended by a
+  /// NUL.
   struct Entry {
     std::uint32_t processId = 0;
     std::uint32_t parentProcessId = 0;
@@ -39,8 +40,8 @@ class Processes {
 
   /// Fills `modules` with the handles of the process's modules, the executable first; false on failure.
   virtual bool EnumProcessModules(Handle process, std::span<std::uint32_t> modules) = 0;
-  /// Writes the module's path in the system's code page over the start of `path`, at most `size` characters and never
-  /// beyond the text's end; gives the number written, 0 on failure.
+  /// Writes the module's path in the system's code page over the start of `path`, at most `size` characters
+  /// and never beyond the text's end; gives the number written, 0 on failure.
   virtual std::uint32_t GetModuleFileNameExA(Handle process, std::uint32_t module, std::string& path,
                                              std::uint32_t size) = 0;
 
