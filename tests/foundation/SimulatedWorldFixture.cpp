@@ -1,5 +1,4 @@
-#include "foundation/WorldFixture.h"
-#include "platform/simulated/SimulatedMachine.h"
+#include "foundation/SimulatedWorld.h"
 
 namespace quendra::foundation {
 
@@ -62,42 +61,34 @@ class SimulatedFarDatagrams : public FarDatagrams {
   std::vector<std::string> received_;
 };
 
-class SimulatedWorld : public World {
- public:
-  SimulatedWorld() : machine_(Desktop) {
-    machine_.hostNames.Addresses = {"127.0.0.1"};
-    machine_.hostNames.Add("localhost", {"127.0.0.1"});
-  }
-
-  platform::Sockets& Sockets() override { return machine_.sockets; }
-  platform::HostNames& Names() override { return machine_.hostNames; }
-  std::unique_ptr<FarServer> Listen() override {
-    const std::uint16_t port = ++lastPort_;
-    return std::make_unique<SimulatedFarServer>(machine_.sockets.Listen("127.0.0.1", port), port);
-  }
-  std::unique_ptr<FarEnd> Dial(std::int32_t port) override {
-    return std::make_unique<SimulatedFarEnd>(
-        machine_.sockets.Dial(static_cast<std::uint16_t>(port), "127.0.0.1", ++lastPort_));
-  }
-  std::unique_ptr<FarDatagrams> OpenDatagrams() override {
-    return std::make_unique<SimulatedFarDatagrams>(machine_, ++lastPort_);
-  }
-  std::int32_t ClosedPort() override { return 9; }
-  bool Until(const std::function<bool()>& condition) override {
-    for (int round = 0; round < 10'000; ++round) {
-      if (condition()) return true;
-      Desktop.PumpOnce();
-    }
-    return false;
-  }
-  void Settle() override { Desktop.RunUntilIdle(); }
-
- private:
-  SimulatedMachine machine_;
-  std::uint16_t lastPort_ = 7000;
-};
-
 } // namespace
+
+SimulatedWorld::SimulatedWorld() {
+  Machine.hostNames.Addresses = {"127.0.0.1"};
+  Machine.hostNames.Add("localhost", {"127.0.0.1"});
+}
+
+std::unique_ptr<FarServer> SimulatedWorld::Listen() {
+  const std::uint16_t port = ++lastPort_;
+  return std::make_unique<SimulatedFarServer>(Machine.sockets.Listen("127.0.0.1", port), port);
+}
+
+std::unique_ptr<FarEnd> SimulatedWorld::Dial(std::int32_t port) {
+  return std::make_unique<SimulatedFarEnd>(
+      Machine.sockets.Dial(static_cast<std::uint16_t>(port), "127.0.0.1", ++lastPort_));
+}
+
+std::unique_ptr<FarDatagrams> SimulatedWorld::OpenDatagrams() {
+  return std::make_unique<SimulatedFarDatagrams>(Machine, ++lastPort_);
+}
+
+bool SimulatedWorld::Until(const std::function<bool()>& condition) {
+  for (int round = 0; round < 10'000; ++round) {
+    if (condition()) return true;
+    Desktop.PumpOnce();
+  }
+  return false;
+}
 
 std::unique_ptr<World> MakeSimulatedWorld() { return std::make_unique<SimulatedWorld>(); }
 
