@@ -72,6 +72,10 @@ class Control {
   Property<Colour, Aspect::Colours> BackColour{*this, kWhite};
   Property<Font, Aspect::Font> TextFont{*this};
 
+  /// Where the Tab key finds the control: lower numbers first, equal ones as they stand in their form. Read
+  /// when the form is shown.
+  int TabIndex = 0;
+
   Event<> Click;
   Event<> DoubleClick;
   /// Button held (MouseButton), the state of Shift (1), Ctrl (2) and Alt (4), and the place in twips.

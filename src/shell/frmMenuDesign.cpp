@@ -63,6 +63,8 @@ void frmMenu::DesignEntry(std::size_t entry) {
   looks::Text(caption, kPageNames[isButton ? entry : 5 - entry], isButton ? looks::kEntry : looks::kSmall,
               looks::kForest);
   caption.Align = forms::Alignment::Centre;
+  // The second row stands at the foot of the window, behind the pages.
+  caption.TabIndex = isButton ? 0 : 1;
   caption.Move(0, 0, Px(width), Px(height));
 }
 

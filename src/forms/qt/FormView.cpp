@@ -12,6 +12,8 @@
 #include <QScreen>
 #include <QWindow>
 
+#include <algorithm>
+
 namespace quendra::forms::qt {
 
 namespace {
@@ -33,6 +35,7 @@ FormView::FormView(ViewContext& context, Form& form, WindowHandle handle)
   setLayoutDirection(form.RightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
   setAttribute(Qt::WA_OpaquePaintEvent);
   AddViews(form, *this);
+  OrderTabs();
 }
 
 FormView::~FormView() = default;
@@ -46,6 +49,17 @@ void FormView::AddViews(const Container& container, QWidget& parent) {
     child->Attach(made.view);
     if (const auto* inner = dynamic_cast<const Container*>(child)) AddViews(*inner, *made.widget);
   }
+}
+
+void FormView::OrderTabs() const {
+  std::vector<WidgetView*> views;
+  for (View* view : views_)
+    if (auto* widgetView = dynamic_cast<WidgetView*>(view)) views.push_back(widgetView);
+  const auto before = [](const WidgetView* left, const WidgetView* right) {
+    return left->TheControl()->TabIndex < right->TheControl()->TabIndex;
+  };
+  std::stable_sort(views.begin(), views.end(), before);
+  for (std::size_t i = 1; i < views.size(); ++i) setTabOrder(&views[i - 1]->Widget(), &views[i]->Widget());
 }
 
 void FormView::Release() {

@@ -37,6 +37,7 @@ class FormView : public QWidget, public WidgetView {
 
  private:
   void AddViews(const Container& container, QWidget& parent);
+  void OrderTabs() const;
 
   WindowHandle handle_;
   std::vector<View*> views_;

@@ -33,6 +33,26 @@ TEST_F(Keyboard, Tab_reaches_every_clickable_label_and_no_other) {
             QList<QString>({QStringLiteral("second"), QStringLiteral("third"), QStringLiteral("first")}));
 }
 
+TEST_F(Keyboard, Tab_follows_the_tab_index_and_then_the_order_in_the_form) {
+  Label foot(form, u"foot");
+  Frame frame(form, u"frame");
+  Label first(frame, u"first");
+  Label second(form, u"second");
+  foot.TabIndex = 1;
+  for (Label* label : {&foot, &first, &second}) label->Click = [] {};
+  ShowActive();
+  WidgetOf(first).setFocus();
+
+  QList<QString> reached;
+  for (int i = 0; i < 3; ++i) {
+    PressKey(*QApplication::focusWidget(), Qt::Key_Tab, QStringLiteral("\t"));
+    reached.push_back(QApplication::focusWidget()->objectName());
+  }
+
+  EXPECT_EQ(reached,
+            QList<QString>({QStringLiteral("second"), QStringLiteral("foot"), QStringLiteral("first")}));
+}
+
 TEST_F(Keyboard, Hidden_and_disabled_labels_are_passed_over) {
   Label first(form, u"first");
   Label hidden(form, u"hidden");
