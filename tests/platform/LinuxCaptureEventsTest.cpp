@@ -156,6 +156,7 @@ TEST_F(LinuxCaptureEventsTest, A_handler_that_yields_is_not_entered_again) {
     for (int i = 0; i < 20 && events < 3; ++i) {
       SendTcp(200);
       desktop.DoEvents();
+      desktop.Advance(60);
       NextFrame();
     }
     if (events == 3) Drain();

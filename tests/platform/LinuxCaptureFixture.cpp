@@ -48,9 +48,11 @@ void LinuxCaptureFixture::Start(const std::string& adapter) {
 
 void LinuxCaptureFixture::StartControl(const std::string& adapter) {
   control = capture->Create();
-  control->PacketReceived = [this] {
+  // What the handler holds must live as long as it runs, even when the control goes meanwhile.
+  control->PacketReceived = [this, held = std::make_shared<int>(1)] {
     ++events;
     if (onEvent) onEvent();
+    EXPECT_EQ(*held, 1);
   };
   std::int32_t result = 0;
   control->BindAdapter(adapter, result);

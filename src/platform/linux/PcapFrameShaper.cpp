@@ -51,7 +51,7 @@ Payload PayloadOf(LinkForm form, std::span<const std::uint8_t> packet) {
 void FillEthernet(PcapRecord& record, std::span<const std::uint8_t> packet, std::uint32_t wire) {
   record.captured = static_cast<std::uint32_t>(std::min<std::size_t>(packet.size(), PcapRecord::kRoom));
   record.wire = wire;
-  std::memcpy(record.bytes.data(), packet.data(), record.captured);
+  std::copy_n(packet.begin(), record.captured, record.bytes.begin());
 }
 
 /// The link's own header gives way to an Ethernet header without addresses.
@@ -63,7 +63,8 @@ void FillOther(PcapRecord& record, LinkForm form, std::span<const std::uint8_t> 
   std::memset(record.bytes.data(), 0, 12);
   record.bytes[12] = static_cast<std::uint8_t>(payload.type >> 8);
   record.bytes[13] = static_cast<std::uint8_t>(payload.type);
-  std::memcpy(record.bytes.data() + kEthernetHeader, packet.data() + skipped, length);
+  const auto payloadBytes = packet.subspan(skipped, length);
+  std::copy(payloadBytes.begin(), payloadBytes.end(), record.bytes.begin() + kEthernetHeader);
   record.captured = static_cast<std::uint32_t>(kEthernetHeader + length);
   record.wire = std::max<std::uint32_t>(wire, static_cast<std::uint32_t>(skipped)) -
                 static_cast<std::uint32_t>(skipped) + kEthernetHeader;
