@@ -66,7 +66,7 @@ Value CSocketPlus::ArrayAdd(const Value& index) {
 }
 
 Value CSocketPlus::ArrayRemove(const Value& index) {
-  const Value removed = index; // the caller's may lie in the record
+  Value removed = index; // the caller's may lie in the record
   const Slot slot = GetSocketIndex(removed);
   CloseSlot(slot);
   if (const Text* text = std::get_if<Text>(&removed)) {

@@ -56,7 +56,7 @@ Boolean16 mdlFileInfo::EnablePrivilege(TextView name, std::uint32_t attributes) 
 
 Text mdlFileInfo::ModulePathOf(std::uint32_t processId) {
   const platform::Handle process = machine_.processes.OpenProcess(kQueryAndRead, false, processId);
-  const Text path = FirstModulePath(machine_.processes, process);
+  Text path = FirstModulePath(machine_.processes, process);
   machine_.processes.CloseHandle(process);
   return path;
 }

@@ -38,7 +38,7 @@ std::string RoundedDigits(const Decimal& decimal, int places) {
   std::string digits(static_cast<std::size_t>(std::max(0, -decimal.pointAt)) + 1, '0');
   digits += decimal.digits;
   const int before = std::max(decimal.pointAt, 0) + 1;
-  const auto keep = static_cast<std::size_t>(before + places);
+  const auto keep = static_cast<std::size_t>(before) + static_cast<std::size_t>(places);
   if (digits.size() < keep + 1) digits.append(keep + 1 - digits.size(), '0');
   const bool up = digits[keep] >= '5';
   digits.resize(keep);

@@ -29,7 +29,8 @@ std::vector<std::uint8_t> WithNul(const std::string& text) {
 void SimulatedVersionInfo::Add(const std::string& path, std::vector<std::uint8_t> translation,
                                std::map<std::string, std::string> texts) {
   indexOf_[path] = static_cast<std::uint32_t>(blocks_.size());
-  blocks_.push_back({translation, TableOf(translation), std::move(texts)});
+  auto table = TableOf(translation);
+  blocks_.push_back({std::move(translation), std::move(table), std::move(texts)});
 }
 
 std::uint32_t SimulatedVersionInfo::GetFileVersionInfoSizeA(const std::string& path) {
