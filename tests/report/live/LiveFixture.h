@@ -1,0 +1,103 @@
+#pragma once
+
+#include "app/Program.h"
+#include "forms/headless/HeadlessDesktop.h"
+#include "integration/NetworkNamespace.h"
+#include "platform/linux/LinuxMachine.h"
+#include "report/SupportRequests.h"
+#include "report/live/Peer.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+
+namespace quendra::report {
+
+/// The whole program on this machine, in a network of its own with nothing but loopback.
+class LiveReportTest : public testing::Test {
+ protected:
+  void SetUp() override {
+    if (!integration::NetworkNamespace::Possible())
+      GTEST_SKIP() << integration::NetworkNamespace::kSkipReason;
+    space_ = std::make_unique<integration::NetworkNamespace>();
+    integration::RunCommand("ip link set lo up");
+    integration::NetworkNamespace::Set("net/ipv4/ip_local_port_range", "1025 5000");
+    std::string pattern = testing::TempDir() + "quendra-report-XXXXXX";
+    if (!mkdtemp(pattern.data())) throw std::runtime_error("no temporary folder");
+    folder = pattern;
+    // Servers that drop their rights write here.
+    std::filesystem::permissions(folder, std::filesystem::perms::all);
+    machine = std::make_unique<platform::linux_::LinuxMachine>(desktop);
+    program = std::make_unique<app::Program>(machine->Operations(), desktop);
+  }
+  void TearDown() override {
+    if (program && program->frmMenu.frameMain.Visible()) desktop.CloseBox(program->frmMenu);
+    program.reset();
+    machine.reset();
+    if (!folder.empty()) std::filesystem::remove_all(folder);
+  }
+
+  void OpenPage() {
+    program->Start();
+    ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));
+    ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[0]));
+    // The body as it was built: nothing runs between its building and this.
+    auto& connected = program->supportExchange.Sockets()->Events.Connect;
+    connected = [this, handler = connected](const foundation::Value& index) {
+      handler(index);
+      if (index == foundation::Value(std::int16_t{3}))
+        bodySent =
+            ToCodePage(ReportBody(program->supportExchange.ReportNumber, program->frmMenu.main_ListView1));
+    };
+  }
+  /// A click and what comes of it; true once that many boxes have stood.
+  bool ClickAndAwaitBoxes(std::size_t boxes) {
+    desktop.Click(program->frmMenu.main_cmdRpt);
+    return AwaitBoxes(boxes);
+  }
+  bool AwaitBoxes(std::size_t boxes) {
+    return Await([&] { return desktop.Boxes.size() >= boxes; });
+  }
+  bool Await(const std::function<bool()>& condition) { return desktop.WaitFor(condition, 10'000); }
+  foundation::SocketState StateOf(std::int16_t index) {
+    return program->supportExchange.Sockets()->State(index);
+  }
+
+  std::string Write(const std::string& name, const std::string& content, bool isProgram = false) const {
+    const std::string path = folder + "/" + name;
+    std::filesystem::create_directories(std::filesystem::path(path).parent_path());
+    std::filesystem::permissions(std::filesystem::path(path).parent_path(), std::filesystem::perms::all);
+    std::ofstream(path, std::ios::binary) << content;
+    if (isProgram) std::filesystem::permissions(path, std::filesystem::perms(0755));
+    return path;
+  }
+  static std::string ContentOf(const std::string& path) {
+    std::ifstream file(path, std::ios::binary);
+    return {std::istreambuf_iterator<char>(file), {}};
+  }
+  /// The content of the only file in a folder.
+  static std::string ContentOfOnlyFileIn(const std::string& path) {
+    std::vector<std::filesystem::path> files;
+    for (const auto& entry : std::filesystem::directory_iterator(path)) files.push_back(entry.path());
+    EXPECT_EQ(files.size(), 1u);
+    return files.empty() ? std::string() : ContentOf(files.front());
+  }
+
+  const Text kNumberIs = u"מספר הדו\"ח שלך הוא: ";
+  const Text kSuccess = u"הדו\"ח נשלח בהצלחה.";
+  const Text kFailure = u"בעיה בשליחת הדו\"ח!";
+
+ private:
+  std::unique_ptr<integration::NetworkNamespace> space_;
+
+ protected:
+  std::string folder;
+  std::string bodySent;
+  forms::HeadlessDesktop desktop;
+  std::unique_ptr<platform::linux_::LinuxMachine> machine;
+  std::unique_ptr<app::Program> program;
+};
+
+} // namespace quendra::report
