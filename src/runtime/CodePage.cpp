@@ -71,11 +71,8 @@ const CodePage& Page() {
 std::string ToCodePage(TextView text) {
   std::string bytes;
   bytes.reserve(text.size());
-  for (std::size_t i = 0; i < text.size(); ++i) {
-    const bool pair = (text[i] & 0xFC00) == 0xD800 && i + 1 < text.size() && (text[i + 1] & 0xFC00) == 0xDC00;
-    bytes.push_back(pair ? '?' : Page().ByteOf(text[i]));
-    if (pair) ++i;
-  }
+  // A byte for each code unit, also for the halves of a pair: lengths in characters hold for the bytes too.
+  for (const char16_t unit : text) bytes.push_back(Page().ByteOf(unit));
   return bytes;
 }
 
