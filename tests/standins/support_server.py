@@ -1,11 +1,11 @@
 #!/usr/bin/env python3
 """A stand-in for the support server: hands out report numbers and keeps the reports that are posted under them.
 
-    support_server.py [PORT] --reports FOLDER [--seconds N] [--first NUMBER] [--megabytes N] [--address ADDRESS]
+    support_server.py [PORT] --reports FOLDER [--seconds N] [--first NUMBER] [--megabytes N] [--keep N]
 
 Listens on loopback only. Prints its port once it can be reached and ends after N seconds or on SIGTERM. Each report
 becomes two files in FOLDER, counted up from 00001: .head with the request's head and .body with its body, both byte
-for byte as they came."""
+for byte as they came. Of all reports the newest N stay."""
 
 import argparse
 import os
@@ -16,6 +16,7 @@ import sys
 import threading
 from urllib.parse import urlsplit
 
+ADDRESS = "127.0.0.1"
 LONGEST_HEAD = 64 * 1024
 LONGEST_BODY = 64 * 1024 * 1024
 PATIENCE = 20
@@ -80,8 +81,9 @@ def reply(status, content, kind="text/plain"):
 class Desk:
     """What the server knows: the numbers it has given and the reports it has taken. Used by many threads."""
 
-    def __init__(self, folder, first_number, megabytes):
+    def __init__(self, folder, first_number, megabytes, kept):
         self.folder = folder
+        self.kept = kept
         self.number = first_number - 1
         self.reports = 0
         self.load = bytes(megabytes << 20)
@@ -96,11 +98,14 @@ class Desk:
         with self.lock:
             self.reports += 1
             name = f"{self.folder}/{self.reports:05}"
+            outdated = f"{self.folder}/{self.reports - self.kept:05}"
         for ending, content in (("head", head), ("body", body)):
             # Whoever watches the folder sees whole files only.
             with open(f"{name}.{ending}.part", "wb") as file:
                 file.write(content)
             os.rename(f"{name}.{ending}.part", f"{name}.{ending}")
+            if os.path.exists(f"{outdated}.{ending}"):
+                os.remove(f"{outdated}.{ending}")
 
     def answer(self, method, path, head, body):
         if (method, path) == ("GET", "/getid.asp"):
@@ -159,19 +164,17 @@ def main():
     parser.add_argument("--seconds", type=float, default=3600)
     parser.add_argument("--first", type=int, default=1001, help="the first report number")
     parser.add_argument("--megabytes", type=int, default=4, help="size of the load download")
-    parser.add_argument("--address", default="127.0.0.1", help="an address of loopback")
+    parser.add_argument("--keep", type=int, default=1000, help="how many reports stay")
     arguments = parser.parse_args()
-    if not arguments.address.startswith("127."):
-        parser.error("loopback only")
     for end in (signal.SIGTERM, signal.SIGINT, signal.SIGALRM):
         signal.signal(end, lambda *_: sys.exit(0))
     signal.setitimer(signal.ITIMER_REAL, arguments.seconds)
     os.makedirs(arguments.reports, exist_ok=True)
     try:
-        server = Server((arguments.address, arguments.port), Exchange)
+        server = Server((ADDRESS, arguments.port), Exchange)
     except OSError as fault:
-        sys.exit(f"support server: can't listen on {arguments.address}:{arguments.port}: {fault.strerror}")
-    server.desk = Desk(arguments.reports, arguments.first, arguments.megabytes)
+        sys.exit(f"support server: can't listen on {ADDRESS}:{arguments.port}: {fault.strerror}")
+    server.desk = Desk(arguments.reports, arguments.first, arguments.megabytes, arguments.keep)
     print(server.server_address[1], flush=True)
     server.serve_forever()
 
