@@ -1,0 +1,299 @@
+#include "foundation/WorldFixture.h"
+
+#include "runtime/Fault.h"
+
+#include <arpa/inet.h>
+#include <dirent.h>
+#include <gtest/gtest.h>
+#include <sys/socket.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <atomic>
+#include <thread>
+
+namespace quendra::foundation {
+namespace {
+
+/// Peers on loopback that mean no good. Each plays on a thread of its own, over plain sockets.
+class HostilePeers : public testing::Test {
+ protected:
+  static constexpr int kMostMilliseconds = 40'000;
+
+  ~HostilePeers() override {
+    stop_ = true;
+    if (peer_.joinable()) peer_.join();
+    if (listener_ >= 0) close(listener_);
+  }
+
+  /// Listens, and plays `play` with the first connection.
+  std::int32_t Serve(std::function<void(int)> play) {
+    listener_ = socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
+    sockaddr_in address = Loopback(0);
+    socklen_t size = sizeof address;
+    EXPECT_EQ(bind(listener_, reinterpret_cast<const sockaddr*>(&address), sizeof address), 0);
+    EXPECT_EQ(listen(listener_, 4096), 0);
+    getsockname(listener_, reinterpret_cast<sockaddr*>(&address), &size);
+    peer_ = std::thread([this, play = std::move(play)] {
+      const int connection = accept(listener_, nullptr, nullptr);
+      if (connection < 0) return;
+      play(connection);
+      close(connection);
+    });
+    return ntohs(address.sin_port);
+  }
+  void ConnectTo(std::int32_t port) {
+    program->ArrayAdd(1);
+    program->Connect(1, Text(u"127.0.0.1"), port);
+  }
+  bool Until(const std::function<bool()>& condition) {
+    return world->Desktop.WaitFor(condition, kMostMilliseconds);
+  }
+  void Play(std::function<void()> play) { peer_ = std::thread(std::move(play)); }
+  static sockaddr_in Loopback(std::int32_t port) {
+    sockaddr_in address{};
+    address.sin_family = AF_INET;
+    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
+    address.sin_port = htons(static_cast<std::uint16_t>(port));
+    return address;
+  }
+  static bool SendAll(int connection, const std::string& bytes) {
+    for (std::size_t sent = 0; sent < bytes.size();) {
+      const auto count = send(connection, bytes.data() + sent, bytes.size() - sent, MSG_NOSIGNAL);
+      if (count <= 0) return false;
+      sent += static_cast<std::size_t>(count);
+    }
+    return true;
+  }
+  static int OpenDescriptors() {
+    DIR* folder = opendir("/proc/self/fd");
+    int count = 0;
+    while (readdir(folder) != nullptr) ++count;
+    closedir(folder);
+    return count;
+  }
+
+  std::unique_ptr<World> world = MakeRealWorld();
+  Program program{*world};
+
+ private:
+  int listener_ = -1;
+  std::thread peer_;
+
+ protected:
+  std::atomic<bool> stop_ = false;
+};
+
+constexpr std::size_t kHundredMegabytes = 100'000'000;
+
+void SendHundredMegabytes(int connection) {
+  const std::string block(1'000'000, 'x');
+  for (std::size_t sent = 0; sent < kHundredMegabytes; sent += block.size())
+    if (send(connection, block.data(), block.size(), MSG_NOSIGNAL | MSG_WAITALL) < 0) return;
+}
+
+TEST_F(HostilePeers, A_reply_of_100_MB_is_taken_by_a_handler_to_the_last_byte) {
+  const std::int32_t port = Serve(SendHundredMegabytes);
+  std::size_t taken = 0;
+  program->Events.DataArrival = [&](const Value& index, std::int32_t total) {
+    Value data;
+    program->GetData(index, data);
+    EXPECT_EQ(std::get<ByteArray>(data).size(), static_cast<std::size_t>(total));
+    taken += std::get<ByteArray>(data).size();
+  };
+  ConnectTo(port);
+  ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
+  EXPECT_EQ(taken, kHundredMegabytes);
+}
+
+TEST_F(HostilePeers, A_reply_of_100_MB_that_nobody_takes_waits_whole) {
+  const std::int32_t port = Serve(SendHundredMegabytes);
+  program->Events.DataArrival = [](const Value&, std::int32_t) {};
+  ConnectTo(port);
+  ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
+  EXPECT_EQ(program->BytesReceived(1), static_cast<std::int32_t>(kHundredMegabytes));
+  program->CloseSck(1);
+  EXPECT_EQ(program->BytesReceived(1), 0);
+}
+
+TEST_F(HostilePeers, Ten_thousand_tiny_pieces_all_arrive_in_order) {
+  const std::int32_t port = Serve([](int connection) {
+    for (int i = 0; i < 10'000; ++i) SendAll(connection, std::to_string(i % 10));
+  });
+  std::string taken;
+  program->Events.DataArrival = [&](const Value& index, std::int32_t) { taken += program.Take(index); };
+  ConnectTo(port);
+  ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
+  ASSERT_EQ(taken.size(), 10'000u);
+  for (std::size_t i = 0; i < taken.size(); ++i) ASSERT_EQ(taken[i], static_cast<char>('0' + i % 10));
+}
+
+TEST_F(HostilePeers, A_reset_in_the_middle_of_a_reply_is_an_Error_and_not_the_programs_end) {
+  const std::int32_t port = Serve([](int connection) {
+    SendAll(connection, std::string(300'000, 'x'));
+    const linger forced{1, 0};
+    setsockopt(connection, SOL_SOCKET, SO_LINGER, &forced, sizeof forced);
+  });
+  ConnectTo(port);
+  ASSERT_TRUE(Until([&] { return program.Saw("Error 1 10054 CSocketPlus.PostSocket"); }));
+  EXPECT_EQ(program->State(1), sckError);
+  EXPECT_FALSE(world->Desktop.Ended);
+}
+
+TEST_F(HostilePeers, A_reset_while_the_program_sends_is_an_Error) {
+  const std::int32_t port = Serve([](int connection) {
+    std::string buffer(1000, ' ');
+    EXPECT_GT(recv(connection, buffer.data(), buffer.size(), 0), 0);
+    const linger forced{1, 0};
+    setsockopt(connection, SOL_SOCKET, SO_LINGER, &forced, sizeof forced);
+  });
+  program->Events.Connect = [&](const Value& index) { program->SendData(index, ByteArray(50'000'000)); };
+  ConnectTo(port);
+  ASSERT_TRUE(Until([&] { return program->State(1) == sckError; }));
+  EXPECT_TRUE(program.Events.back().starts_with("Error 1 10054 ")) << program.Events.back();
+  EXPECT_FALSE(world->Desktop.Ended);
+}
+
+TEST_F(HostilePeers, Nul_bytes_in_any_number_are_data_like_any_other) {
+  const std::int32_t port = Serve([](int connection) { SendAll(connection, std::string(100'000, '\0')); });
+  ConnectTo(port);
+  Text taken;
+  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+    Value data = Text();
+    program->GetData(index, data);
+    taken += std::get<Text>(data);
+  };
+  ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
+  EXPECT_EQ(taken, Text(100'000, u'\0'));
+}
+
+TEST_F(HostilePeers, A_flood_of_500_connections_that_nobody_takes_is_all_turned_away) {
+  program->ArrayAdd(1);
+  program->Listen(1);
+  const std::int32_t port = program->LocalPort(1);
+  std::atomic<int> ended = 0;
+  Play([&, port] {
+    std::vector<std::thread> diallers;
+    for (int i = 0; i < 5; ++i)
+      diallers.emplace_back([&, port] {
+        for (int j = 0; j < 100 && !stop_; ++j) {
+          const int dialler = socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
+          const timeval wait{20, 0};
+          setsockopt(dialler, SOL_SOCKET, SO_RCVTIMEO, &wait, sizeof wait);
+          const sockaddr_in target = Loopback(port);
+          char byte = 0;
+          if (connect(dialler, reinterpret_cast<const sockaddr*>(&target), sizeof target) == 0 &&
+              recv(dialler, &byte, 1, 0) <= 0)
+            ++ended;
+          close(dialler);
+        }
+      });
+    for (auto& dialler : diallers) dialler.join();
+  });
+  const int before = OpenDescriptors();
+  ASSERT_TRUE(Until([&] { return ended == 500; })) << ended;
+  EXPECT_EQ(std::count(program.Events.begin(), program.Events.end(), "ConnectionRequest 1"), 500);
+  EXPECT_EQ(program.module.SocketClassCount(), 1);
+  EXPECT_LE(OpenDescriptors(), before);
+  EXPECT_EQ(program->State(1), sckListening);
+}
+
+TEST_F(HostilePeers, A_flood_of_500_connections_that_are_all_taken_are_500_sockets) {
+  program->ArrayAdd(Text(u"listener"));
+  program->Listen(Text(u"listener"));
+  const std::int32_t port = program->LocalPort(Text(u"listener"));
+  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+    const Value index = program->ArrayAdd();
+    program->Accept(index, request);
+    program->SendData(index, Text(u"!"));
+  };
+  Play([&, port] {
+    // The system turns away who comes when five wait, and the kernel has him try again a second later: each
+    // waits for its greeting before the next one dials.
+    std::vector<int> diallers;
+    for (int i = 0; i < 500 && !stop_; ++i) {
+      diallers.push_back(socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0));
+      const timeval wait{20, 0};
+      setsockopt(diallers.back(), SOL_SOCKET, SO_RCVTIMEO, &wait, sizeof wait);
+      const sockaddr_in target = Loopback(port);
+      char byte = 0;
+      if (connect(diallers.back(), reinterpret_cast<const sockaddr*>(&target), sizeof target) == 0 &&
+          recv(diallers.back(), &byte, 1, 0) == 1)
+        SendAll(diallers.back(), "x");
+    }
+    for (const int dialler : diallers) close(dialler);
+  });
+  int closed = 0;
+  int arrived = 0;
+  program->Events.CloseSck = [&](const Value&) { ++closed; };
+  program->Events.DataArrival = [&](const Value&, std::int32_t) { ++arrived; };
+  ASSERT_TRUE(Until([&] { return closed == 500; })) << closed;
+  EXPECT_EQ(arrived, 500);
+  EXPECT_EQ(program->ArrayCount(), 501);
+}
+
+TEST_F(HostilePeers, A_thousand_sockets_of_one_object_connect_and_each_gets_its_own_answer) {
+  constexpr std::int32_t kSockets = 1000;
+  program->ArrayAdd(0);
+  program->Listen(0);
+  const std::int32_t port = program->LocalPort(0);
+  const auto server = std::make_unique<CSocketPlus>(program.module);
+  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+    server->Accept(server->ArrayAdd(), request);
+  };
+  server->Events.DataArrival = [&](const Value& index, std::int32_t) {
+    Value data;
+    server->GetData(index, data);
+    server->SendData(index, data);
+  };
+  std::int32_t next = 0;
+  std::int32_t answered = 0;
+  const auto start = [&] {
+    if (next == kSockets) return;
+    program->ArrayAdd(++next);
+    program->Connect(next, Text(u"127.0.0.1"), port);
+  };
+  program->Events.Connect = [&](const Value& index) {
+    program->SendData(index, ToText(index));
+    start();
+  };
+  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+    if (program.Take(index) == NameOf(index)) ++answered;
+  };
+  for (int i = 0; i < 4; ++i) start();
+  ASSERT_TRUE(Until([&] { return answered == kSockets; })) << answered;
+  EXPECT_EQ(program->ArrayCount(), kSockets + 1);
+  for (std::int32_t i = 0; i <= kSockets; ++i) program->ArrayRemove(i);
+  EXPECT_EQ(program->ArrayCount(), 0);
+}
+
+TEST_F(HostilePeers, A_thousand_exchanges_leave_no_descriptor_and_no_entry_behind) {
+  program->ArrayAdd(0);
+  program->Listen(0);
+  const std::int32_t port = program->LocalPort(0);
+  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+    program->Accept(program->ArrayAdd(2), request);
+    program->SendData(2, Text(u"answer"));
+    program->ArrayRemove(2);
+  };
+  int descriptors = 0;
+  int entries = 0;
+  for (int round = 0; round < 1000; ++round) {
+    program->ArrayAdd(1);
+    program.Events.clear();
+    program->Connect(1, Text(u"localhost"), port);
+    ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); })) << round;
+    ASSERT_TRUE(program.Saw("DataArrival 1 6"));
+    program->ArrayRemove(1);
+    if (round == 10) {
+      descriptors = OpenDescriptors();
+      entries = program.module.SocketCount();
+    }
+  }
+  EXPECT_EQ(OpenDescriptors(), descriptors);
+  EXPECT_EQ(program.module.SocketCount(), entries);
+  EXPECT_EQ(program.module.ResolveCount(), 1);
+}
+
+} // namespace
+} // namespace quendra::foundation
