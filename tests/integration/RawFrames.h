@@ -83,7 +83,19 @@ class RawLink {
     if (send(descriptor_, frame.data(), frame.size(), 0) != static_cast<ssize_t>(frame.size()))
       throw std::runtime_error("a frame couldn't be sent");
   }
-  int Descriptor() const { return descriptor_; }
+  /// In one call, so that nothing comes between them.
+  void SendTogether(std::vector<Bytes> frames) {
+    std::vector<iovec> parts(frames.size());
+    std::vector<mmsghdr> messages(frames.size());
+    for (std::size_t i = 0; i < frames.size(); ++i) {
+      parts[i] = {frames[i].data(), frames[i].size()};
+      messages[i].msg_hdr.msg_iov = &parts[i];
+      messages[i].msg_hdr.msg_iovlen = 1;
+    }
+    if (sendmmsg(descriptor_, messages.data(), static_cast<unsigned>(messages.size()), 0) !=
+        static_cast<int>(frames.size()))
+      throw std::runtime_error("frames couldn't be sent");
+  }
 
  private:
   int descriptor_;

@@ -19,9 +19,10 @@ class LinuxCaptureEventsTest : public LinuxCaptureFixture {
     if (!IsSkipped()) Start("qv0");
   }
   /// A burst that arrives as one block.
-  void SendTcp(int count) {
-    RawLink far("qv1");
-    for (int i = 0; i < count; ++i) far.Send(TcpFrame(static_cast<unsigned>(1025 + i), 80));
+  void SendTcp(unsigned count) {
+    std::vector<Bytes> frames;
+    for (unsigned i = 0; i < count; ++i) frames.push_back(TcpFrame(1025 + i, 80));
+    RawLink("qv1").SendTogether(std::move(frames));
   }
   void WaitForEvents(int count) {
     WaitUntil([&] { return events >= count; }, "events");
@@ -108,9 +109,7 @@ TEST_F(LinuxCaptureEventsTest, Frames_that_were_left_are_read_with_those_that_co
 }
 
 TEST_F(LinuxCaptureEventsTest, The_buffer_holds_the_newest_record_with_a_header_of_18_bytes) {
-  RawLink far("qv1");
-  far.Send(TcpFrame(1025, 80, 1500));
-  far.Send(UdpFrame(1026, 53, 200));
+  RawLink("qv1").SendTogether({TcpFrame(1025, 80, 1500), UdpFrame(1026, 53, 200)});
   WaitForEvents(1);
   const Record record(*control);
   EXPECT_EQ(record.captured, 96u);
