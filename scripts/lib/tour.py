@@ -1,7 +1,8 @@
 #!/usr/bin/python3
 """Walks through the program on a virtual display as a user would, with real clicks and keys, while real clients and
-servers exchange data over a link of its own. Leaves screenshots in build/screens, prints the process table as a screen
-reader sees it, and ends non-zero when the program, the table or a rate isn't as it should be.
+servers exchange data over a link of its own, and sends a report to a stand-in support server. Leaves screenshots in
+build/screens, prints the process table as a screen reader sees it and the report as the server got it, and ends non-zero
+when the program, the table, a rate or the report isn't as it should be.
 
 The link and the traffic need root. Without it the program runs on this machine as it is and the table has no rates."""
 
@@ -15,6 +16,7 @@ import time
 from gi.repository import GLib
 
 import cast
+import report
 import stage
 from accessible import Program
 from checks import missing_processes, missing_rates
@@ -38,19 +40,31 @@ def watch_table(program, ports):
         wrong = missing_rates(rows, ports) if ports else []
         if not wrong:
             break
-    return rows, wrong + missing_processes(rows, ("Xvfb", "openbox", os.path.basename(PROGRAM)))
+    return rows, wrong + missing_processes(rows, ("Xvfb", "explorer.exe", os.path.basename(PROGRAM)))
 
 
-def tour(program, child, ports):
+def send_report(walk, support):
+    """Gives what is wrong with the report. Without a support server the button isn't pressed."""
+    if not support.folder:
+        say(f"no report is sent: {support.reason}")
+        return []
+    with report.silence(support.spaces, walk.program.process):
+        number, body, wrong = report.ReportStep(walk, support.folder).take()
+    say(f"report {number}, as the support server received it, {len(body)} bytes:")
+    print(report.as_lines(body))
+    return wrong
+
+
+def tour(program, child, ports, support):
     walk = Walk(program, SCREENS)
     try:
-        return walk_through(walk, child, ports)
+        return walk_through(walk, child, ports, support)
     except RuntimeError:
         walk.picture("where-it-failed")
         raise
 
 
-def walk_through(walk, child, ports):
+def walk_through(walk, child, ports, support):
     program = walk.program
     walk.splash()
     walk.home()
@@ -63,6 +77,7 @@ def walk_through(walk, child, ports):
     walk.column()
     walk.about()
     print("\n".join(walk.addresses()))
+    wrong += send_report(walk, support)
     walk.other_pages()
     walk.monitor()
     time.sleep(3)
@@ -93,16 +108,17 @@ def perform():
         os.remove(f"{SCREENS}/{old}")
     with contextlib.ExitStack() as stack:
         set_scene(stack)
-        command, ports = [PROGRAM], {}
+        command, ports, spaces = [PROGRAM], {}, []
         if os.geteuid() == 0:
-            here, there = stack.enter_context(stage.linked_namespaces())
+            spaces = here, there = stack.enter_context(stage.linked_namespaces())
             ports = cast.start_traffic(stack, {"here": here, "there": there})
             command = stage.in_namespace(here, PROGRAM)
             say("traffic runs, local ports " + ", ".join(f"{name} {port}" for name, port in ports.items()))
         else:
             say("not root: no capture, no traffic of its own, so no rates are looked for")
+        support = report.start_server(stack, spaces, cast.SECONDS)
         child = stack.enter_context(stage.started(command))
-        return tour(Program(child.pid), child, ports)
+        return tour(Program(child.pid), child, ports, support)
 
 
 def too_late(*_):
