@@ -3,7 +3,6 @@
 #include "report/SupportRequests.h"
 #include "runtime/Settings.h"
 
-#include <array>
 
 namespace quendra::report {
 
@@ -16,6 +15,8 @@ constexpr std::int16_t kNumber = 2;
 constexpr std::int16_t kReport = 3;
 constexpr std::int16_t kLoad = 4;
 constexpr std::int16_t kWebPort = 80;
+/// Boxes that stand on one another: each holds about 1.5 KB of the stack for as long as it stands.
+constexpr int kMostNumberBoxes = 250;
 
 constexpr const char16_t* kHebrewTitle = u"זלמר בינלאומי@נט";
 constexpr const char16_t* kDefaultTitle = u"Quendra";
@@ -119,9 +120,21 @@ Text SupportExchange::TakeText(Index index) {
 
 void SupportExchange::NumberArrived() {
   const Text number = ReportNumberIn(TakeText(kNumber));
-  ShowHebrewBox(u"מספר הדו\"ח שלך הוא: " + number, forms::kInformation);
+  ShowNumber(number);
   ReportNumber = number;
   OpenSockets().Connect(kReport, Text(settings::SupportServerHost), kWebPort);
+}
+
+/// The next piece of a reply may arrive behind the box and stack its own on it. A server that sends piece
+/// after piece must not bring the stack down.
+void SupportExchange::ShowNumber(const Text& number) {
+  if (standingNumberBoxes_ == kMostNumberBoxes) throw Fault(Fault::kOutOfStackSpace);
+  struct Standing {
+    int& count;
+    explicit Standing(int& boxes) : count(boxes) { ++count; }
+    ~Standing() { --count; }
+  } const standing(standingNumberBoxes_);
+  ShowHebrewBox(u"מספר הדו\"ח שלך הוא: " + number, forms::kInformation);
 }
 
 void SupportExchange::ReportClosed() {
@@ -141,7 +154,7 @@ void SupportExchange::ProcsPageClosed() {
 }
 
 /// The page was to fill a table once. The table is still made, and dropped as it is.
-void SupportExchange::ReadProcsPage() { const std::array<std::array<Text, 3>, 3> table{}; }
+void SupportExchange::ReadProcsPage() { const Text table[3][3]; }
 
 void SupportExchange::ShowHebrewBox(const Text& text, int icon) {
   desktop_.MessageBox(text, icon | forms::kHebrewBox, kHebrewTitle);

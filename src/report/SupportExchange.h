@@ -45,6 +45,7 @@ class SupportExchange {
   Text TakeText(Index index);
   void NumberArrived();
   void ReportClosed();
+  void ShowNumber(const Text& number);
   void ProcsPageClosed();
   void ReadProcsPage();
   void ShowHebrewBox(const Text& text, int icon);
@@ -55,6 +56,7 @@ class SupportExchange {
   monitor::ProcessTable& table_;
   forms::Timer& main_Timer1_;
   std::unique_ptr<foundation::CSocketPlus> main_spSockets_;
+  int standingNumberBoxes_ = 0;
 };
 
 } // namespace quendra::report

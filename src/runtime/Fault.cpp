@@ -12,13 +12,14 @@ struct Description {
   const char16_t* text;
 };
 
-constexpr std::array<Description, 11> kDescriptions{{
+constexpr std::array<Description, 12> kDescriptions{{
     {Fault::kInvalidCall, u"Invalid procedure call or argument"},
     {Fault::kOverflow, u"Overflow"},
     {Fault::kOutOfMemory, u"Out of memory"},
     {Fault::kSubscript, u"Subscript out of range"},
     {Fault::kDivision, u"Division by zero"},
     {Fault::kTypeMismatch, u"Type mismatch"},
+    {Fault::kOutOfStackSpace, u"Out of stack space"},
     {Fault::kObjectNotSet, u"Object variable or With block variable not set"},
     {Fault::kInvalidPropertyValue, u"Invalid property value"},
     {Fault::kCannotCreateObject, u"ActiveX component can't create object"},

@@ -18,6 +18,7 @@ class Fault : public std::exception {
     kSubscript = 9,
     kDivision = 11,
     kTypeMismatch = 13,
+    kOutOfStackSpace = 28,
     kObjectNotSet = 91,
     kInvalidPropertyValue = 380,
     kCannotCreateObject = 429,

@@ -238,6 +238,59 @@ TEST_F(SupportFailures, A_failed_read_ends_the_program_with_the_run_times_messag
   EXPECT_EQ(desktop.Boxes.back().text, u"Run-time error '10050':\n\nNetwork is down.");
 }
 
+TEST_F(SupportFailures,
+       A_number_in_a_hundred_pieces_behind_one_another_gives_a_hundred_boxes_that_stand_at_once) {
+  Server();
+  OpenPage();
+  for (int piece = 1; piece < 100; ++piece)
+    desktop.WhileBoxStands.push_back([&] {
+      Connection(0).Send("x");
+      Run();
+    });
+  desktop.WhileBoxStands.push_back([&] { Server().StaySilent(); });
+
+  AskForNumberAndAnswer("x");
+
+  EXPECT_EQ(
+      std::count(desktop.Boxes.begin(), desktop.Boxes.end(), Box{kNumberIs, kHebrewInformation, kTitle}),
+      100);
+  EXPECT_EQ(desktop.Boxes.back().text, u"Run-time error '40020':\n\nInvalid operation at current state");
+}
+
+TEST_F(SupportFailures, A_number_in_ten_thousand_pieces_runs_out_of_room_for_boxes_before_the_stack_ends) {
+  Server();
+  OpenPage();
+  for (int piece = 1; piece < 10'000; ++piece)
+    desktop.WhileBoxStands.push_back([&] {
+      Connection(0).Send("x");
+      Run();
+    });
+
+  AskForNumberAndAnswer("x");
+
+  EXPECT_TRUE(desktop.Ended);
+  EXPECT_EQ(desktop.EndStatus, 1);
+  EXPECT_EQ(desktop.Boxes.size(), 251u);
+  EXPECT_EQ(desktop.Boxes.back().text, u"Run-time error '28':\n\nOut of stack space");
+}
+
+TEST_F(SupportFailures, Boxes_that_were_closed_make_room_for_others) {
+  Server();
+  OpenPage();
+  for (int round = 0; round < 600; ++round) {
+    ClickReport();
+    Run();
+    Server().Connections.back()->Send("~~~~~~~~\r\n1");
+    Run();
+    Server().Connections.back()->Close();
+    Server().Connections.at(Server().Connections.size() - 2)->Close();
+    Run();
+  }
+
+  EXPECT_FALSE(desktop.Ended);
+  EXPECT_EQ(desktop.Boxes.size(), 1200u);
+}
+
 TEST_F(SupportFailures, NUL_bytes_in_the_number_are_shown_kept_and_posted) {
   Server();
   OpenPage();

@@ -12,6 +12,7 @@ TEST(Fault, Carries_the_run_times_description_of_its_number) {
       {9, u"Subscript out of range"},
       {11, u"Division by zero"},
       {13, u"Type mismatch"},
+      {28, u"Out of stack space"},
       {91, u"Object variable or With block variable not set"},
       {429, u"ActiveX component can't create object"},
       {457, u"This key is already associated with an element of this collection"},
