@@ -138,6 +138,58 @@ TEST_F(SocketFailures, A_connection_from_the_end_of_a_look_up_that_fails_at_once
   EXPECT_EQ(Object.Events, Events{"Error 1 10065 CSocketPlus.ConnectToIP"});
 }
 
+TEST_F(SocketFailures, Sixty_four_look_ups_one_after_another_keep_one_entry) {
+  World.Machine.hostNames.Add("name", {"10.1.1.1"});
+  for (int i = 0; i < 64; ++i) {
+    Add(1);
+    Object->Connect(1, Text(u"name"), 80);
+    EXPECT_EQ(Object.module.ResolveCount(), 1);
+    Settle();
+    ASSERT_EQ(Object->State(1), sckConnected);
+    Object->ArrayRemove(1);
+  }
+  EXPECT_EQ(Object.module.ResolveCount(), 1);
+  EXPECT_EQ(Object.module.SocketCount(), 1);
+}
+
+TEST_F(SocketFailures, A_look_up_that_ended_just_before_it_is_cancelled_tells_nobody) {
+  World.Machine.hostNames.Add("name", {"10.1.1.1"});
+  Add(1);
+  Object->Connect(1, Text(u"name"), 80);
+  World.Desktop.PumpOnce();
+  ASSERT_EQ(Net().LookUpsUnderWay(), 0); // the answer is on its way as a message now
+  ASSERT_EQ(Object->State(1), sckResolvingHost);
+  Object->CloseSck(1);
+  Settle();
+  EXPECT_EQ(Object->State(1), sckClosed);
+  EXPECT_EQ(Net().Count("connect"), 0);
+}
+
+TEST_F(SocketFailures, The_answer_to_a_cancelled_look_up_is_not_taken_for_the_next_one) {
+  World.Machine.hostNames.Add("first", {"10.1.1.1"});
+  Net().NeverAnswer("second");
+  Add(1);
+  Object->Connect(1, Text(u"first"), 80);
+  World.Desktop.PumpOnce();
+  Object->CloseSck(1);
+  Object->Connect(1, Text(u"second"), 80);
+  Settle();
+  EXPECT_EQ(Object->State(1), sckResolvingHost);
+  EXPECT_EQ(Net().Count("connect"), 0);
+}
+
+TEST_F(SocketFailures, An_incoming_connection_whose_buffer_sizes_can_not_be_read_is_raised_and_closed) {
+  Add(1);
+  Object->Bind(1, 2000);
+  Object->Listen(1);
+  Net().Fail("getsockopt", 10055);
+  const auto peer = Net().Dial(2000);
+  Settle();
+  EXPECT_TRUE(World.Desktop.Ended);
+  EXPECT_TRUE(peer->Ended);
+  EXPECT_EQ(Object.module.SocketClassCount(), 1);
+}
+
 TEST_F(SocketFailures, An_accept_that_fails_raises_Error_at_the_listener) {
   Add(1);
   Object->Bind(1, 2000);

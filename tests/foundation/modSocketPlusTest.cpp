@@ -152,16 +152,6 @@ TEST_F(SocketModule, The_window_asks_for_its_five_events_with_message_32769) {
 
 // The dispatcher.
 
-TEST_F(SocketModule, A_message_for_a_socket_that_nobody_owns_goes_to_the_window_s_own_procedure) {
-  const auto object = NewObject();
-  Open(*object, 1);
-  // Attached behind the dispatcher's back: what the dispatcher lets through ends in the first procedure.
-  EXPECT_EQ(Windows.Dispatch(Module.SocketWindow(), 32769, 12345, 1), 0);
-  EXPECT_EQ(Windows.Dispatch(Module.SocketWindow(), 32768, 12345, 0), 0);
-  EXPECT_EQ(Windows.Dispatch(Module.SocketWindow(), 16, 0, 0), 0);
-  EXPECT_EQ(object->State(1), sckOpen);
-}
-
 /// Windows whose own procedure answers 77, so that what reaches it is seen.
 class AnsweringWindows : public forms::MessageWindows {
  public:
@@ -219,20 +209,6 @@ TEST_F(SocketModule, Messages_reach_the_object_that_owns_the_socket_and_no_other
 
 // The arrays.
 
-TEST_F(SocketModule, Sixty_four_look_ups_one_after_another_keep_one_entry) {
-  const auto object = NewObject();
-  Machine.hostNames.Add("name", {"127.0.0.1"});
-  // The window is the module's own here, so its messages are handed over by the test.
-  for (int i = 0; i < 64; ++i) {
-    object->ArrayAdd(1);
-    object->Connect(1, Text(u"name"), 80);
-    EXPECT_EQ(Module.ResolveCount(), 1);
-    object->ArrayRemove(1);
-  }
-  EXPECT_EQ(Module.ResolveCount(), 1);
-  EXPECT_EQ(Module.SocketCount(), 1);
-}
-
 TEST_F(SocketModule, The_arrays_keep_the_peak_number_of_parallel_entries) {
   const auto object = NewObject();
   for (std::int32_t i = 1; i <= 5; ++i) {
@@ -287,18 +263,6 @@ TEST_F(SocketModule, An_object_that_ends_cancels_its_look_ups) {
   EXPECT_EQ(Net().LookUpsUnderWay(), 1);
   object.reset();
   EXPECT_EQ(Net().LookUpsUnderWay(), 0);
-}
-
-TEST_F(SocketModule, A_look_up_that_ended_just_before_it_is_cancelled_tells_nobody) {
-  Machine.hostNames.Add("name", {"127.0.0.1"});
-  const auto object = NewObject();
-  object->ArrayAdd(1);
-  object->Connect(1, Text(u"name"), 80);
-  Desktop.PumpOnce(); // the answer is on its way as a message now
-  EXPECT_EQ(Net().LookUpsUnderWay(), 0);
-  object->CloseSck(1);
-  Desktop.RunUntilIdle();
-  EXPECT_EQ(object->State(1), sckClosed);
 }
 
 TEST_F(SocketModule, An_answer_to_a_socket_that_no_longer_waits_for_one_changes_nothing) {
