@@ -19,8 +19,9 @@ struct SocketEntry {
 
   /// Events that may be announced; one leaves when it is and comes back with the call that re-enables it.
   std::int32_t enabled = kFdRead | kFdWrite | kFdAccept | kFdConnect | kFdClose;
-  /// What the kernel watches for now.
+  /// What the kernel watches for now; it stops with what it tells.
   std::uint32_t watched = 0;
+  bool knownToKernel = false;
 };
 
 } // namespace quendra::platform::linux_

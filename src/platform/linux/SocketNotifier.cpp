@@ -17,6 +17,7 @@ constexpr int kBatch = 64;
 constexpr std::uint32_t kReadable = EPOLLIN;
 constexpr std::uint32_t kWritable = EPOLLOUT;
 constexpr std::uint32_t kEnded = EPOLLRDHUP;
+constexpr std::uint32_t kAtEnd = EPOLLRDHUP | EPOLLHUP | EPOLLERR;
 
 int BytesWaiting(int descriptor) {
   int amount = 0;
@@ -70,11 +71,12 @@ void SocketNotifier::Rearm(SocketHandle socket, SocketEntry& entry) {
   const std::uint32_t interest = InterestOf(entry);
   if (interest == entry.watched) return;
   epoll_event event{};
-  event.events = interest;
+  event.events = interest | EPOLLONESHOT;
   event.data.u32 = socket;
-  const int operation = interest == 0 ? EPOLL_CTL_DEL : entry.watched == 0 ? EPOLL_CTL_ADD : EPOLL_CTL_MOD;
+  const int operation = interest == 0 ? EPOLL_CTL_DEL : entry.knownToKernel ? EPOLL_CTL_MOD : EPOLL_CTL_ADD;
   ::epoll_ctl(epoll_.Number(), operation, entry.descriptor.Number(), &event);
   entry.watched = interest;
+  entry.knownToKernel = interest != 0;
 }
 
 void SocketNotifier::Enable(SocketHandle socket, SocketEntry& entry, std::int32_t events) {
@@ -97,6 +99,7 @@ void SocketNotifier::Serve() {
     const SocketHandle socket = ready[static_cast<std::size_t>(i)].data.u32;
     SocketEntry* entry = Find(socket);
     if (!entry) continue;
+    entry->watched = 0;
     OnReady(socket, *entry, ready[static_cast<std::size_t>(i)].events);
     Rearm(socket, *entry);
   }
@@ -113,7 +116,7 @@ void SocketNotifier::OnReady(SocketHandle socket, SocketEntry& entry, std::uint3
     if ((ready & EPOLLIN) != 0) Announce(socket, entry, kFdRead);
     break;
   case SocketEntry::Stage::Connected:
-    if ((ready & (EPOLLIN | EPOLLRDHUP | EPOLLHUP | EPOLLERR)) != 0) OnStreamReadable(socket, entry);
+    if ((ready & (kReadable | kAtEnd)) != 0) OnStreamReadable(socket, entry, ready);
     break;
   }
   if ((ready & EPOLLOUT) != 0) Announce(socket, entry, kFdWrite);
@@ -126,9 +129,11 @@ void SocketNotifier::OnConnectionReady(SocketHandle socket, SocketEntry& entry) 
   if (error == 0) Announce(socket, entry, kFdWrite);
 }
 
-void SocketNotifier::OnStreamReadable(SocketHandle socket, SocketEntry& entry) {
+void SocketNotifier::OnStreamReadable(SocketHandle socket, SocketEntry& entry, std::uint32_t ready) {
   if ((entry.enabled & kFdRead) == 0) return;
-  if (BytesWaiting(entry.descriptor.Number()) > 0) return Announce(socket, entry, kFdRead);
+  // Readable and not at its end, a stream has data; at its end it may have some left.
+  const bool hasData = (ready & kAtEnd) == 0 || BytesWaiting(entry.descriptor.Number()) > 0;
+  if (hasData) return Announce(socket, entry, kFdRead);
   Announce(socket, entry, kFdClose, SocketErrorOf(TakeError(entry.descriptor.Number())));
   entry.enabled &= ~(kFdClose | kFdWrite);
 }

@@ -31,7 +31,7 @@ class SocketNotifier {
   void Serve();
   void OnReady(SocketHandle socket, SocketEntry& entry, std::uint32_t ready);
   void OnConnectionReady(SocketHandle socket, SocketEntry& entry);
-  void OnStreamReadable(SocketHandle socket, SocketEntry& entry);
+  void OnStreamReadable(SocketHandle socket, SocketEntry& entry, std::uint32_t ready);
 
   EventLoop& loop_;
   Descriptor epoll_;
