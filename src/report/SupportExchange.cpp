@@ -3,7 +3,6 @@
 #include "report/SupportRequests.h"
 #include "runtime/Settings.h"
 
-
 namespace quendra::report {
 
 using foundation::Value;
