@@ -296,7 +296,8 @@ TEST_F(LinuxSocketsTest, A_reset_is_told_as_FD_CLOSE_with_10054_behind_the_last_
 TEST_F(LinuxSocketsTest, FD_WRITE_comes_after_a_refused_send_when_there_is_room_again) {
   Pair();
   const std::string block(1'000'000, 'x');
-  while (Send(near, block) > 0) {}
+  while (Send(near, block) > 0) {
+  }
   EXPECT_EQ(LastError(), kWouldBlock);
   Settle();
   EXPECT_EQ(Count(near, kFdWrite), 0);
