@@ -120,6 +120,17 @@ TEST_F(LinuxCaptureEventsTest, The_buffer_holds_the_newest_record_with_a_header_
   EXPECT_EQ(SourcePort(frame), 1026u);
 }
 
+TEST_F(LinuxCaptureEventsTest, Behind_frames_that_were_left_the_buffer_holds_the_newest_of_all_that_came) {
+  SendTcp(3);
+  WaitForEvents(1);
+  SendTcp(900);
+  RawLink("qv1").Send(TcpFrame(4711, 80));
+  WaitUntil([&] { return capture->Counters().received == 904; }, "all frames");
+  EXPECT_EQ(events, 2);
+  const Record record(*control);
+  EXPECT_EQ(record.bytes[18 + 34] * 256 + record.bytes[18 + 35], 4711);
+}
+
 TEST_F(LinuxCaptureEventsTest, The_newest_record_stays_when_its_frame_has_been_taken) {
   SendTcp(2);
   WaitForEvents(1);

@@ -278,9 +278,14 @@ TEST_F(LinuxCaptureTest, An_interface_that_goes_down_and_comes_up_is_heard_again
   EXPECT_NO_THROW(desktop.RunUntilIdle());
   RunCommand("ip link set qv0 up");
   RawLink far("qv1");
-  far.Send(TcpFrame(1, 80));
-  WaitUntil([&] { return events > 0; }, "the frame behind the break");
-  EXPECT_EQ(Drain(), 1);
+  // The far end learns a little later that the link is there, and sends nothing until then.
+  WaitUntil(
+      [&] {
+        far.Send(TcpFrame(1, 80));
+        return events > 0;
+      },
+      "a frame behind the break");
+  EXPECT_GE(Drain(), 1);
 }
 
 TEST_F(LinuxCaptureTest, Two_million_frames_pass_without_a_drop) {

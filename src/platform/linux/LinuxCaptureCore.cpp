@@ -6,6 +6,8 @@ namespace {
 
 constexpr std::uint8_t kBlankFrame[60] = {};
 constexpr int kPaceMilliseconds = 50;
+// So that a line faster than this loop doesn't keep it for ever.
+constexpr int kMostBatches = 256;
 
 } // namespace
 
@@ -118,16 +120,26 @@ void LinuxCaptureCore::LookAgain() {
 /// False when no packet has come.
 bool LinuxCaptureCore::Serve() {
   if (!MayRing()) return false;
-  if (queue_.Empty()) queue_.Rewind();
-  // Events that take nothing let the queue grow; then the newest frames, by which the next event is judged,
-  // go first.
-  if (queue_.Room() < PcapSession::kRoomOfBatch) {
-    queue_.DiscardOldest(PcapSession::kRoomOfBatch);
-    earlier_.droppedByQueue += PcapSession::kRoomOfBatch;
+  // One batch starts a drain, which takes the others from the kernel as it goes. Behind an event that took
+  // none all of them move, so that the record by which the next event is judged is the newest there is.
+  const int batches = queue_.Empty() ? 1 : kMostBatches;
+  queue_.Rewind();
+  bool moved = false;
+  for (int batch = 0; batch < batches; ++batch) {
+    MakeRoom();
+    const int count = session_->Fill();
+    moved = moved || count > 0;
+    if (count < PcapSession::kBatch) break;
   }
-  if (session_->Fill() <= 0) return false;
-  Ring();
-  return true;
+  if (moved) Ring();
+  return moved;
+}
+
+/// Frames that many events have left wait in vain; the oldest go first.
+void LinuxCaptureCore::MakeRoom() {
+  if (queue_.Room() >= PcapSession::kRoomOfBatch) return;
+  queue_.DiscardOldest(PcapSession::kRoomOfBatch);
+  earlier_.droppedByQueue += PcapSession::kRoomOfBatch;
 }
 
 /// Marks an event as under way, also when its handler ends by an exception.

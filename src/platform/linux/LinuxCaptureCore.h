@@ -48,6 +48,7 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   void DescriptorReady();
   void LookAgain();
   bool Serve();
+  void MakeRoom();
   void Ring();
   void RingAgain();
 

@@ -13,8 +13,9 @@ namespace quendra::platform::linux_ {
 /// A live capture on one interface, non-blocking.
 class PcapSession {
  public:
-  /// The most packets that one call to Fill takes from the kernel.
-  static constexpr int kBatch = 1024;
+  /// The most packets that one call to Fill takes from the kernel: few enough to stay in the nearest caches
+  /// until they are read.
+  static constexpr int kBatch = 256;
   /// The room that a call to Fill may need.
   static constexpr std::uint32_t kRoomOfBatch = kBatch * PcapFrameShaper::kMostPieces;
 
