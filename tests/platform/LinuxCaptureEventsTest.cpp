@@ -1,4 +1,5 @@
 #include "platform/LinuxCaptureFixture.h"
+#include "platform/linux/PcapFrameQueue.h"
 
 #include <cstring>
 
@@ -305,7 +306,7 @@ TEST_F(LinuxCaptureEventsTest, Any_other_fault_of_a_handler_goes_to_the_dispatch
 
 TEST_F(LinuxCaptureEventsTest, When_events_take_nothing_the_oldest_frames_go_first_and_are_counted) {
   RawLink far("qv1");
-  constexpr std::uint64_t kFrames = 150000;
+  constexpr std::uint64_t kFrames = PcapFrameQueue::kCapacity + 50000;
   for (std::uint64_t sent = 0; sent < kFrames; ++sent) {
     far.Send(UdpFrame(1025, 53));
     if (sent % 2000 == 0) desktop.Advance(100);

@@ -22,7 +22,9 @@ static_assert(sizeof(PcapRecord) == 160);
 /// it fills. The frame popped last stays as it is until the next one is popped.
 class PcapFrameQueue {
  public:
-  static constexpr std::uint32_t kCapacity = 65536;
+  /// Events that take nothing, because a datagram came last each time, must not cost frames: room for seconds
+  /// of a busy line.
+  static constexpr std::uint32_t kCapacity = 1 << 19;
 
   PcapFrameQueue() : records_(new PcapRecord[kCapacity]) {}
 
