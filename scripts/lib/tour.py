@@ -100,6 +100,8 @@ def set_scene(stack):
     os.environ["DBUS_SESSION_BUS_ADDRESS"] = stack.enter_context(stage.message_bus(directory))
     os.environ["QT_LINUX_ACCESSIBILITY_ALWAYS_ON"] = "1"
     os.environ["QT_QPA_PLATFORM"] = "xcb"
+    # The session on this display is this user's own, whoever called sudo.
+    os.environ.pop("SUDO_UID", None)
 
 
 def perform():
