@@ -79,6 +79,19 @@ TEST_P(ConnectionSuite, The_local_host_has_a_name_and_an_address) {
   EXPECT_FALSE(program->LocalIP(1).empty());
 }
 
+TEST_P(ConnectionSuite, A_connection_reset_before_its_event_raises_Connect_and_then_Error_10054) {
+  program->ArrayAdd(1);
+  program->Connect(1, Text(u"127.0.0.1"), server->Port());
+  std::unique_ptr<FarEnd> far = server->TakeConnection();
+  ASSERT_TRUE(far || world->Until([&] { return (far = server->TakeConnection()) != nullptr; }));
+  far->Reset();
+  ASSERT_TRUE(program.Until("Error 1 10054 CSocketPlus.PostSocket"));
+  EXPECT_EQ(program.Events, (std::vector<std::string>{"Connect 1", "Error 1 10054 CSocketPlus.PostSocket"}));
+  EXPECT_EQ(program->RemoteHostIP(1), u"127.0.0.1");
+  EXPECT_EQ(program->RemotePort(1), server->Port());
+  EXPECT_EQ(program->State(1), sckError);
+}
+
 // Receiving.
 
 TEST_P(ConnectionSuite, Data_left_in_the_buffer_arrives_with_a_growing_total) {

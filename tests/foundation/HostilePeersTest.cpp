@@ -1,10 +1,9 @@
 #include "foundation/WorldFixture.h"
 
-#include "runtime/Fault.h"
-
 #include <arpa/inet.h>
 #include <dirent.h>
 #include <gtest/gtest.h>
+#include <sys/resource.h>
 #include <sys/socket.h>
 #include <unistd.h>
 
@@ -165,6 +164,44 @@ TEST_F(HostilePeers, Nul_bytes_in_any_number_are_data_like_any_other) {
   };
   ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
   EXPECT_EQ(taken, Text(100'000, u'\0'));
+}
+
+TEST_F(HostilePeers, Urgent_bytes_cost_no_data_and_do_not_hide_the_end) {
+  const std::int32_t port = Serve([](int connection) {
+    for (int i = 0; i < 100; ++i) {
+      SendAll(connection, "piece.");
+      EXPECT_EQ(send(connection, "!", 1, MSG_OOB | MSG_NOSIGNAL), 1);
+    }
+    SendAll(connection, "last.");
+  });
+  std::string taken;
+  program->Events.DataArrival = [&](const Value& index, std::int32_t) { taken += program.Take(index); };
+  ConnectTo(port);
+  ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
+  std::erase(taken, '!'); // the kernel keeps the latest aside and takes those before it for data
+  std::string sent;
+  for (int i = 0; i < 100; ++i) sent += "piece.";
+  EXPECT_EQ(taken, sent + "last.");
+  EXPECT_FALSE(world->Desktop.Ended);
+}
+
+TEST_F(HostilePeers, Without_a_descriptor_to_watch_a_socket_Connect_raises_10024_and_works_after_CloseSck) {
+  const std::int32_t port = Serve([](int connection) { SendAll(connection, "hello"); });
+  program->ArrayAdd(1);
+  rlimit before{};
+  getrlimit(RLIMIT_NOFILE, &before);
+  const int next = dup(STDERR_FILENO);
+  close(next);
+  const rlimit lowered{static_cast<rlim_t>(next) + 1, before.rlim_max};
+  setrlimit(RLIMIT_NOFILE, &lowered);
+  const std::string fault = FaultText([&] { program->Connect(1, Text(u"127.0.0.1"), port); });
+  setrlimit(RLIMIT_NOFILE, &before);
+  EXPECT_EQ(fault, "10024 Too many open files. [modSocketPlus.RegisterSocket]");
+  EXPECT_EQ(program->State(1), sckClosed);
+
+  program->CloseSck(1);
+  program->Connect(1, Text(u"127.0.0.1"), port);
+  EXPECT_TRUE(Until([&] { return program.Saw("DataArrival 1 5"); }));
 }
 
 TEST_F(HostilePeers, A_flood_of_500_connections_that_nobody_takes_is_all_turned_away) {

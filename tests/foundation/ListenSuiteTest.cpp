@@ -106,6 +106,44 @@ TEST_P(ListenSuite, A_peer_that_closes_before_it_is_looked_at_is_told_all_the_sa
   ASSERT_TRUE(program.Until("CloseSck 2"));
 }
 
+TEST_P(ListenSuite, A_peer_that_resets_before_it_is_looked_at_is_offered_with_its_address_and_then_an_Error) {
+  const std::int32_t port = Listening(1);
+  program->ArrayAdd(2);
+  Text address;
+  program->Events.ConnectionRequest = [&](const Value& index, platform::SocketHandle request) {
+    address = program->RemoteHostIP(index);
+    program->Accept(2, request);
+  };
+  const auto far = world->Dial(port);
+  far->Send("bye");
+  far->Reset();
+  ASSERT_TRUE(program.Until("Error 2 10054 CSocketPlus.PostSocket"));
+  EXPECT_EQ(program.Events,
+            (std::vector<std::string>{"DataArrival 2 3", "Error 2 10054 CSocketPlus.PostSocket"}));
+  EXPECT_EQ(address, u"127.0.0.1");
+  EXPECT_EQ(program->RemoteHostIP(2), u"127.0.0.1");
+  EXPECT_EQ(program->State(1), sckListening);
+}
+
+TEST_P(ListenSuite, A_reset_that_only_the_pending_list_saw_is_told_by_the_next_send) {
+  const std::int32_t port = Listening(1);
+  program->ArrayAdd(2);
+  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+    ASSERT_TRUE(world->Until(
+        [&] { return program.module.GetAcceptClass(request)->State(Text(u"Temporal_Socket")) == sckError; }));
+    program->Accept(2, request);
+  };
+  const auto far = world->Dial(port);
+  far->Send("bye");
+  far->Reset();
+  ASSERT_TRUE(program.Until("DataArrival 2 3"));
+  world->Settle();
+  EXPECT_EQ(program->State(2), sckConnected);
+  EXPECT_EQ(program.Take(2), "bye");
+  program->SendData(2, Text(u"x"));
+  EXPECT_EQ(program.Events.back(), "Error 2 10054 CSocketPlus.SendBufferedData");
+}
+
 TEST_P(ListenSuite, A_socket_of_the_program_connects_to_another_of_it) {
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);

@@ -28,9 +28,6 @@ class SimulatedWorld : public World {
   std::uint16_t lastPort_ = 7000;
 };
 
-/// What a fault says: "40020 description [source]"; empty without one.
-std::string FaultText(const std::function<void()>& work);
-
 /// One object on a simulated machine with a server at 10.1.1.1, port 80, that accepts and stays silent.
 class SocketTest : public testing::Test {
  protected:

@@ -96,6 +96,8 @@ class Program {
   std::unique_ptr<CSocketPlus> sockets_;
 };
 
+/// What a fault says: "40020 description [source]"; empty without one.
+std::string FaultText(const std::function<void()>& work);
 std::string NameOf(const Value& index);
 ByteArray BytesFrom(const std::string& text);
 

@@ -1,21 +1,35 @@
 #include "platform/BackendFixture.h"
 
-#include "forms/headless/HeadlessDesktop.h"
 #include "platform/linux/LinuxMachine.h"
 #include "platform/simulated/SimulatedMachine.h"
 
 #include <arpa/inet.h>
+#include <fcntl.h>
 #include <sys/socket.h>
 #include <unistd.h>
 
+#include <array>
 #include <filesystem>
 #include <fstream>
 #include <stdexcept>
+#include <utility>
 #include <vector>
 
 namespace quendra::platform {
 
 namespace {
+
+class SimulatedFarEnd : public FarEnd {
+ public:
+  explicit SimulatedFarEnd(std::shared_ptr<simulated::SimulatedPeer> peer) : peer_(std::move(peer)) {}
+  void Send(const std::string& bytes) override { peer_->Send(bytes); }
+  void CloseSending() override { peer_->Close(); }
+  void Reset() override { peer_->Reset(); }
+  void Drain() override { peer_->Received.clear(); }
+
+ private:
+  std::shared_ptr<simulated::SimulatedPeer> peer_;
+};
 
 class SimulatedBackend : public Backend {
  public:
@@ -47,9 +61,51 @@ class SimulatedBackend : public Backend {
                               .owner = OwnId()});
     return 1026;
   }
+  forms::HeadlessDesktop& Desktop() override { return desktop_; }
+  SocketAddress Outside() override {
+    // As on loopback: a sender that is faster than its reader has to wait now and then.
+    server_.TakeAtMost(100'000);
+    return {simulated::AddressInMemory("10.1.1.1"), 80};
+  }
+  std::unique_ptr<FarEnd> TakeConnection() override {
+    if (taken_ == server_.Connections.size()) return nullptr;
+    return std::make_unique<SimulatedFarEnd>(server_.Connections[taken_++]);
+  }
+  void Settle() override { desktop_.RunUntilIdle(); }
 
  private:
-  simulated::SimulatedMachine machine_;
+  forms::HeadlessDesktop desktop_;
+  simulated::SimulatedMachine machine_{desktop_};
+  simulated::SimulatedServer& server_ = machine_.sockets.Listen("10.1.1.1", 80);
+  std::size_t taken_ = 0;
+};
+
+void Check(int result) {
+  if (result < 0) throw std::runtime_error("a socket call on loopback failed");
+}
+
+class RealFarEnd : public FarEnd {
+ public:
+  explicit RealFarEnd(int socket) : socket_(socket) {}
+  ~RealFarEnd() override { close(socket_); }
+  void Send(const std::string& bytes) override {
+    if (send(socket_, bytes.data(), bytes.size(), MSG_NOSIGNAL) != static_cast<ssize_t>(bytes.size()))
+      throw std::runtime_error("the far end can't send so much at once");
+  }
+  void CloseSending() override { Check(shutdown(socket_, SHUT_WR)); }
+  void Reset() override {
+    const linger forced{1, 0};
+    Check(setsockopt(socket_, SOL_SOCKET, SO_LINGER, &forced, sizeof forced));
+    close(std::exchange(socket_, -1));
+  }
+  void Drain() override {
+    std::array<char, 65536> buffer;
+    while (recv(socket_, buffer.data(), buffer.size(), MSG_DONTWAIT) > 0) {
+    }
+  }
+
+ private:
+  int socket_;
 };
 
 class LinuxBackend : public Backend {
@@ -85,11 +141,21 @@ class LinuxBackend : public Backend {
     Check(sockets_.back());
     return PortOf(socket);
   }
+  forms::HeadlessDesktop& Desktop() override { return loop_; }
+  SocketAddress Outside() override {
+    const std::uint16_t port = Listen();
+    Check(fcntl(sockets_.back(), F_SETFL, O_NONBLOCK));
+    return {htonl(INADDR_LOOPBACK), port};
+  }
+  std::unique_ptr<FarEnd> TakeConnection() override {
+    const int taken = accept4(sockets_.back(), nullptr, nullptr, SOCK_CLOEXEC);
+    return taken < 0 ? nullptr : std::make_unique<RealFarEnd>(taken);
+  }
+  void Settle() override {
+    loop_.WaitFor([] { return false; }, 30);
+  }
 
  private:
-  static void Check(int result) {
-    if (result < 0) throw std::runtime_error("a socket call on loopback failed");
-  }
   static sockaddr_in Loopback(std::uint16_t port) {
     sockaddr_in address{};
     address.sin_family = AF_INET;

@@ -1,13 +1,26 @@
 #pragma once
 
-#include "platform/EventLoop.h"
+#include "forms/headless/HeadlessDesktop.h"
 #include "platform/Machine.h"
+#include "platform/Sockets.h"
 
 #include <cstdint>
 #include <memory>
 #include <string>
 
 namespace quendra::platform {
+
+/// The far end of a connection, outside the machine.
+class FarEnd {
+ public:
+  virtual ~FarEnd() = default;
+  virtual void Send(const std::string& bytes) = 0;
+  /// Nothing more comes from there; what comes there is still taken.
+  virtual void CloseSending() = 0;
+  virtual void Reset() = 0;
+  /// Takes what has come so far and drops it.
+  virtual void Drain() = 0;
+};
 
 /// A machine that a test can run on, and what the test must know of it.
 class Backend {
@@ -28,6 +41,16 @@ class Backend {
   virtual std::uint16_t Listen() = 0;
   /// The asking process connects to a port that it listens on; gives the port of the near end.
   virtual std::uint16_t Connect(std::uint16_t port) = 0;
+
+  // The network, for the machine's sockets. Their messages go to the desktop's windows.
+
+  virtual forms::HeadlessDesktop& Desktop() = 0;
+  /// Where somebody outside listens.
+  virtual SocketAddress Outside() = 0;
+  /// The next connection that came there; nullptr while there is none.
+  virtual std::unique_ptr<FarEnd> TakeConnection() = 0;
+  /// Lets all happen that is under way.
+  virtual void Settle() = 0;
 };
 
 std::unique_ptr<Backend> MakeSimulatedBackend();

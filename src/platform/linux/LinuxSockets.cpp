@@ -118,19 +118,24 @@ std::int32_t LinuxSockets::listen(SocketHandle socket, std::int32_t backlog) {
 SocketHandle LinuxSockets::accept(SocketHandle socket) {
   SocketEntry* listener = Entry(socket);
   if (!listener) return kNoSocket;
+  sockaddr_in peer{};
+  socklen_t size = sizeof peer;
   SocketEntry entry;
-  entry.descriptor =
-      Descriptor(::accept4(listener->descriptor.Number(), nullptr, nullptr, SOCK_CLOEXEC | SOCK_NONBLOCK));
+  entry.descriptor = Descriptor(::accept4(listener->descriptor.Number(), reinterpret_cast<sockaddr*>(&peer),
+                                          &size, SOCK_CLOEXEC | SOCK_NONBLOCK));
   const int error = errno;
   notifier_.Enable(socket, *listener, kFdAccept);
   if (!entry.descriptor) return static_cast<SocketHandle>(Fail(SocketErrorOf(error)));
   entry.stage = SocketEntry::Stage::Connected;
+  entry.peer = LibraryAddress(peer);
   entry.window = listener->window;
   entry.message = listener->message;
   entry.mask = listener->mask;
   const SocketHandle accepted = notifier_.Add(std::move(entry));
-  notifier_.Rearm(accepted, *notifier_.Find(accepted));
-  return accepted;
+  if (notifier_.Watch(accepted, *notifier_.Find(accepted))) return accepted;
+  FailWithErrno();
+  notifier_.Remove(accepted);
+  return kNoSocket;
 }
 
 std::int32_t LinuxSockets::connect(SocketHandle socket, const SocketAddress& peer) {
@@ -142,6 +147,7 @@ std::int32_t LinuxSockets::connect(SocketHandle socket, const SocketAddress& pee
   const int descriptor = entry->descriptor.Number();
   const int result = ::connect(descriptor, reinterpret_cast<const sockaddr*>(&address), sizeof address);
   const int error = result == 0 ? 0 : errno;
+  if (entry->stage == SocketEntry::Stage::Fresh) entry->peer = peer;
   if (entry->mask == 0 || entry->stage != SocketEntry::Stage::Fresh) {
     if (error == 0 && entry->stage == SocketEntry::Stage::Fresh) entry->stage = SocketEntry::Stage::Connected;
     return error == 0 ? 0 : Fail(SocketErrorOf(error));
@@ -165,7 +171,12 @@ std::int32_t LinuxSockets::getsockname(SocketHandle socket, SocketAddress& local
 
 std::int32_t LinuxSockets::getpeername(SocketHandle socket, SocketAddress& peer) {
   SocketEntry* entry = Entry(socket);
-  return entry ? Answer(AskAddress(::getpeername, entry->descriptor.Number(), peer)) : kSocketError;
+  if (!entry) return kSocketError;
+  // The kernel forgets the peer of a connection that was reset.
+  if (entry->stage != SocketEntry::Stage::Connected)
+    return Answer(AskAddress(::getpeername, entry->descriptor.Number(), peer));
+  peer = entry->peer;
+  return 0;
 }
 
 std::int32_t LinuxSockets::getsockopt(SocketHandle socket, std::int32_t level, std::int32_t option,
@@ -238,6 +249,7 @@ std::int32_t LinuxSockets::recvfrom(SocketHandle socket, std::span<std::uint8_t>
   const int error = errno;
   notifier_.Enable(socket, *entry, kFdRead);
   if (read < 0) return Fail(SocketErrorOf(error));
+  if (read == 0 && !buffer.empty() && entry->endError != 0) return Fail(entry->endError);
   if (datagram) from = LibraryAddress(address);
   if (datagram && static_cast<std::size_t>(read) > buffer.size()) return Fail(kMessageTooLong);
   return static_cast<std::int32_t>(read);
@@ -252,8 +264,9 @@ std::int32_t LinuxSockets::WSAAsyncSelect(SocketHandle socket, std::uint32_t win
   entry->window = window;
   entry->message = message;
   entry->mask = events;
-  notifier_.Rearm(socket, *entry);
-  return 0;
+  if (notifier_.Watch(socket, *entry)) return 0;
+  entry->mask = 0;
+  return FailWithErrno();
 }
 
 std::uint32_t LinuxSockets::WSAAsyncGetHostByName(std::uint32_t window, std::uint32_t message,

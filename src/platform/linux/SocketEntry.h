@@ -11,6 +11,8 @@ struct SocketEntry {
 
   Descriptor descriptor;
   Stage stage = Stage::Fresh;
+  SocketAddress peer{};      ///< of a stream, kept when the connection has gone
+  std::int32_t endError = 0; ///< what ended a stream, as the library numbers it; 0 for an orderly end
 
   // What WSAAsyncSelect asked for.
   std::uint32_t window = 0;

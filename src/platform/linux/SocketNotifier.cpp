@@ -3,7 +3,6 @@
 #include "platform/linux/SocketErrorNumbers.h"
 
 #include <sys/epoll.h>
-#include <sys/ioctl.h>
 #include <sys/socket.h>
 
 #include <array>
@@ -19,16 +18,22 @@ constexpr std::uint32_t kWritable = EPOLLOUT;
 constexpr std::uint32_t kEnded = EPOLLRDHUP;
 constexpr std::uint32_t kAtEnd = EPOLLRDHUP | EPOLLHUP | EPOLLERR;
 
-int BytesWaiting(int descriptor) {
-  int amount = 0;
-  return ::ioctl(descriptor, FIONREAD, &amount) == 0 ? amount : 0;
-}
-
 /// The error that waits on the socket; asking takes it away.
 int TakeError(int descriptor) {
   int error = 0;
   socklen_t size = sizeof error;
   return ::getsockopt(descriptor, SOL_SOCKET, SO_ERROR, &error, &size) == 0 ? error : errno;
+}
+
+/// Whether a stream at its end has data left; notes what ended it when it has none. The kernel's count of
+/// bytes stops at an urgent one, so only a look at the data itself tells.
+bool HasData(SocketEntry& entry) {
+  std::uint8_t byte = 0;
+  const auto seen = ::recv(entry.descriptor.Number(), &byte, 1, MSG_PEEK | MSG_DONTWAIT);
+  if (seen > 0) return true;
+  const int error = seen < 0 && errno != EAGAIN ? errno : TakeError(entry.descriptor.Number());
+  if (error != 0) entry.endError = SocketErrorOf(error);
+  return false;
 }
 
 std::uint32_t InterestOf(const SocketEntry& entry) {
@@ -45,11 +50,14 @@ std::uint32_t InterestOf(const SocketEntry& entry) {
   return (reads ? kReadable | kEnded : 0) | (wants(kFdWrite) ? kWritable : 0);
 }
 
-} // namespace
-
-SocketNotifier::SocketNotifier(EventLoop& loop) : loop_(loop), epoll_(::epoll_create1(EPOLL_CLOEXEC)) {
-  if (epoll_) watch_ = loop_.WatchDescriptor(epoll_.Number(), [this] { Serve(); });
+epoll_event EventFor(SocketHandle socket, std::uint32_t interest) {
+  epoll_event event{};
+  event.events = interest | EPOLLONESHOT;
+  event.data.u32 = socket;
+  return event;
 }
+
+} // namespace
 
 SocketEntry* SocketNotifier::Find(SocketHandle socket) {
   const auto found = sockets_.find(socket);
@@ -67,16 +75,34 @@ void SocketNotifier::Remove(SocketHandle socket) { sockets_.erase(socket); }
 
 void SocketNotifier::Clear() { sockets_.clear(); }
 
+bool SocketNotifier::Open() {
+  if (epoll_) return true;
+  epoll_ = Descriptor(::epoll_create1(EPOLL_CLOEXEC));
+  if (epoll_) watch_ = loop_.WatchDescriptor(epoll_.Number(), [this] { Serve(); });
+  return static_cast<bool>(epoll_);
+}
+
+bool SocketNotifier::Watch(SocketHandle socket, SocketEntry& entry) {
+  const bool wanted = entry.mask != 0;
+  if (wanted && !Open()) return false;
+  if (wanted != entry.knownToKernel) {
+    epoll_event event = EventFor(socket, 0);
+    if (::epoll_ctl(epoll_.Number(), wanted ? EPOLL_CTL_ADD : EPOLL_CTL_DEL, entry.descriptor.Number(),
+                    &event) != 0)
+      return false;
+    entry.knownToKernel = wanted;
+    entry.watched = 0;
+  }
+  Rearm(socket, entry);
+  return true;
+}
+
 void SocketNotifier::Rearm(SocketHandle socket, SocketEntry& entry) {
   const std::uint32_t interest = InterestOf(entry);
-  if (interest == entry.watched) return;
-  epoll_event event{};
-  event.events = interest | EPOLLONESHOT;
-  event.data.u32 = socket;
-  const int operation = interest == 0 ? EPOLL_CTL_DEL : entry.knownToKernel ? EPOLL_CTL_MOD : EPOLL_CTL_ADD;
-  ::epoll_ctl(epoll_.Number(), operation, entry.descriptor.Number(), &event);
+  if (!entry.knownToKernel || interest == entry.watched) return;
+  epoll_event event = EventFor(socket, interest);
+  ::epoll_ctl(epoll_.Number(), EPOLL_CTL_MOD, entry.descriptor.Number(), &event);
   entry.watched = interest;
-  entry.knownToKernel = interest != 0;
 }
 
 void SocketNotifier::Enable(SocketHandle socket, SocketEntry& entry, std::int32_t events) {
@@ -124,18 +150,22 @@ void SocketNotifier::OnReady(SocketHandle socket, SocketEntry& entry, std::uint3
 
 void SocketNotifier::OnConnectionReady(SocketHandle socket, SocketEntry& entry) {
   const int error = TakeError(entry.descriptor.Number());
-  entry.stage = error == 0 ? SocketEntry::Stage::Connected : SocketEntry::Stage::Fresh;
-  Announce(socket, entry, kFdConnect, SocketErrorOf(error));
+  // A peer may have ended a connection that stood: that is told like any other, and its end behind it.
+  const bool stood = error == 0 || error == ECONNRESET || error == EPIPE;
+  entry.stage = stood ? SocketEntry::Stage::Connected : SocketEntry::Stage::Fresh;
+  if (stood) entry.endError = SocketErrorOf(error);
+  Announce(socket, entry, kFdConnect, stood ? 0 : SocketErrorOf(error));
   if (error == 0) Announce(socket, entry, kFdWrite);
 }
 
 void SocketNotifier::OnStreamReadable(SocketHandle socket, SocketEntry& entry, std::uint32_t ready) {
   if ((entry.enabled & kFdRead) == 0) return;
   // Readable and not at its end, a stream has data; at its end it may have some left.
-  const bool hasData = (ready & kAtEnd) == 0 || BytesWaiting(entry.descriptor.Number()) > 0;
-  if (hasData) return Announce(socket, entry, kFdRead);
-  Announce(socket, entry, kFdClose, SocketErrorOf(TakeError(entry.descriptor.Number())));
-  entry.enabled &= ~(kFdClose | kFdWrite);
+  if ((ready & kAtEnd) == 0 || HasData(entry)) return Announce(socket, entry, kFdRead);
+  Announce(socket, entry, kFdClose, entry.endError);
+  entry.enabled &= ~kFdClose;
+  // A peer that sends no more may still read.
+  if (entry.endError != 0) entry.enabled &= ~kFdWrite;
 }
 
 } // namespace quendra::platform::linux_

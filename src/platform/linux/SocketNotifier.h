@@ -13,7 +13,7 @@ namespace quendra::platform::linux_ {
 /// between two messages.
 class SocketNotifier {
  public:
-  explicit SocketNotifier(EventLoop& loop);
+  explicit SocketNotifier(EventLoop& loop) : loop_(loop) {}
 
   SocketEntry* Find(SocketHandle socket);
   SocketHandle Add(SocketEntry entry);
@@ -21,6 +21,10 @@ class SocketNotifier {
   void Clear();
   std::size_t Count() const { return sockets_.size(); }
 
+  /// After a change of the selection: has the kernel watch the socket, or watch it no more. All that the
+  /// kernel may lack for it is asked for here, so that no later step can leave a socket deaf. False, with the
+  /// reason in errno, when it won't.
+  bool Watch(SocketHandle socket, SocketEntry& entry);
   /// After a change of what may be announced: tells the kernel what to watch for.
   void Rearm(SocketHandle socket, SocketEntry& entry);
   void Enable(SocketHandle socket, SocketEntry& entry, std::int32_t events);
@@ -28,6 +32,7 @@ class SocketNotifier {
   void Announce(SocketHandle socket, SocketEntry& entry, SocketEvent event, std::int32_t error = 0);
 
  private:
+  bool Open();
   void Serve();
   void OnReady(SocketHandle socket, SocketEntry& entry, std::uint32_t ready);
   void OnConnectionReady(SocketHandle socket, SocketEntry& entry);
