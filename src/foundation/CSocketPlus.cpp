@@ -14,12 +14,6 @@ std::int32_t CheckedPort(std::int32_t port, const char16_t* source) {
   return port;
 }
 
-/// What a failed question for a host's name leaves behind; such questions need not leave a number.
-std::int32_t NameError(platform::Sockets& library) {
-  const std::int32_t error = library.WSAGetLastError();
-  return error != 0 ? error : platform::kHostNotFound;
-}
-
 } // namespace
 
 CSocketPlus::CSocketPlus(modSocketPlus& module) : module_(module), records_(1) {
@@ -101,7 +95,7 @@ SocketState CSocketPlus::State(const Value& index) { return At(GetSocketIndex(in
 
 Text CSocketPlus::LocalHostName() {
   const auto name = module_.Names().gethostname();
-  if (!name) throw SystemError(NameError(module_.Library()), u"CSocketPlus.GetLocalHostName");
+  if (!name) throw SystemError(module_.Names().LastError(), u"CSocketPlus.GetLocalHostName");
   return FromCodePage(CutAtNul(std::string_view(*name).substr(0, 256)));
 }
 
@@ -109,8 +103,7 @@ Text CSocketPlus::LocalIP(const Value& index) {
   const SocketRecord& record = At(GetSocketIndex(index));
   if (record.State == sckConnected) return record.LocalIP;
   const auto addresses = module_.Names().gethostbyname(ToCodePage(LocalHostName()));
-  if (!addresses || addresses->empty())
-    throw SystemError(NameError(module_.Library()), u"CSocketPlus.GetLocalIP");
+  if (!addresses) throw SystemError(module_.Names().LastError(), u"CSocketPlus.GetLocalIP");
   return DottedAddress(addresses->front());
 }
 

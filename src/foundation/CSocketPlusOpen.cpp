@@ -140,9 +140,8 @@ std::uint32_t CSocketPlus::ResolveBlocking(const Text& host, std::int32_t& error
   const std::uint32_t address = platform::Sockets::inet_addr(name);
   if (address != kNoAddress) return address;
   const auto addresses = module_.Names().gethostbyname(name);
-  if (addresses && !addresses->empty()) return addresses->front();
-  error = module_.Library().WSAGetLastError();
-  if (error == 0) error = platform::kHostNotFound;
+  if (addresses) return addresses->front();
+  error = module_.Names().LastError();
   return kNoAddress;
 }
 

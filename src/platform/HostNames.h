@@ -7,16 +7,19 @@
 
 namespace quendra::platform {
 
-/// The host's name and the addresses behind a name.
+/// The host's name and the addresses behind a name. These questions have an error of their own: what sockets
+/// do in between neither sets nor hides it.
 class HostNames {
  public:
   virtual ~HostNames() = default;
 
   /// Nothing on failure.
   virtual std::optional<std::string> gethostname() = 0;
-  /// The name's IPv4 addresses in the system's order, each as it lies in memory (network order); nothing on
-  /// failure.
+  /// The name's IPv4 addresses, at least one, in the system's order, each as it lies in memory (network
+  /// order); nothing on failure.
   virtual std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) = 0;
+  /// Why the last of these questions failed, as the socket library numbers it; 0 when it was answered.
+  virtual std::int32_t LastError() = 0;
 };
 
 } // namespace quendra::platform

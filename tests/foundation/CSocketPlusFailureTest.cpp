@@ -286,6 +286,17 @@ TEST_F(SocketFailures, A_local_address_that_fails_is_raised) {
   EXPECT_EQ(FaultText([&] { Object->LocalIP(1); }), "11001 Host not found. [CSocketPlus.GetLocalIP]");
 }
 
+TEST_F(SocketFailures, A_local_name_or_address_that_fails_has_its_own_number_whatever_failed_before) {
+  Connect(1);
+  Net().Fail("send", 10053);
+  Object->SendData(1, Text(u"data"));
+  World.Machine.hostNames.FailAddresses = true;
+  EXPECT_EQ(FaultText([&] { Object->LocalIP(1); }), "11001 Host not found. [CSocketPlus.GetLocalIP]");
+  World.Machine.hostNames.FailName = true;
+  EXPECT_EQ(FaultText([&] { Object->LocalHostName(); }),
+            "11001 Host not found. [CSocketPlus.GetLocalHostName]");
+}
+
 TEST_F(SocketFailures, LocalIP_is_the_connections_own_while_it_is_connected_and_the_hosts_first_otherwise) {
   World.Machine.hostNames.Addresses = {"10.0.0.1", "10.0.0.2"};
   Connect(1);

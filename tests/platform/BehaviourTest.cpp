@@ -270,6 +270,17 @@ TEST_P(BehaviourTest, The_own_name_has_addresses_and_the_first_is_the_loopback) 
   EXPECT_EQ(addresses->front(), kLoopbackInMemory);
 }
 
+TEST_P(BehaviourTest, A_question_for_a_name_that_fails_has_its_own_number_which_socket_calls_leave_alone) {
+  EXPECT_FALSE(machine.hostNames.gethostbyname(std::string(300, 'x')));
+  machine.sockets.WSAStartup(257);
+  EXPECT_EQ(machine.sockets.listen(4711, 1), kSocketError);
+  machine.sockets.WSACleanup();
+  EXPECT_EQ(machine.hostNames.LastError(), kHostNotFound);
+
+  EXPECT_TRUE(machine.hostNames.gethostname());
+  EXPECT_EQ(machine.hostNames.LastError(), 0);
+}
+
 TEST_P(BehaviourTest, Adapters_are_asked_for_in_two_phases) {
   std::vector<AdapterRecord> adapters;
   std::uint32_t size = 0;

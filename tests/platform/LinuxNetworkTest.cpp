@@ -1,5 +1,6 @@
 #include "LinuxFixture.h"
 #include "integration/NetworkNamespace.h"
+#include "platform/Sockets.h"
 #include "platform/linux/LinuxHostNames.h"
 #include "platform/linux/LinuxIpHelper.h"
 #include "platform/linux/NetworkInterfaces.h"
@@ -323,6 +324,7 @@ TEST_F(LinuxNetwork,
 
 TEST_F(LinuxNetwork, The_own_name_without_any_interface_that_is_up_gives_nothing) {
   EXPECT_FALSE(names.gethostbyname(*names.gethostname()));
+  EXPECT_EQ(names.LastError(), kHostNotFound);
 }
 
 TEST_F(LinuxNetwork, The_own_name_is_compared_without_regard_to_case_and_an_empty_name_is_the_own) {

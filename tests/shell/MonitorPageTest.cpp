@@ -30,6 +30,7 @@ class Recorder : public forms::ListViewObserver, public platform::HostNames, pub
   std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) override {
     return machine_.hostNames.gethostbyname(name);
   }
+  std::int32_t LastError() override { return machine_.hostNames.LastError(); }
 
   std::uint32_t GetTickCount() override { return machine_.system.GetTickCount(); }
   bool GetVersionExA(platform::OsVersion& version) override { return machine_.system.GetVersionExA(version); }

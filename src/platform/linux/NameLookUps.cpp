@@ -1,11 +1,8 @@
 #include "platform/linux/NameLookUps.h"
 
-#include "platform/linux/SocketErrorNumbers.h"
+#include "platform/linux/LinuxHostNames.h"
 
-#include <netdb.h>
-#include <netinet/in.h>
 #include <strings.h>
-#include <sys/socket.h>
 
 #include <deque>
 #include <map>
@@ -14,29 +11,6 @@
 #include <thread>
 
 namespace quendra::platform::linux_ {
-
-namespace {
-
-struct Answer {
-  std::int32_t error = 0;
-  std::vector<std::uint32_t> addresses;
-};
-
-Answer LookUp(const std::string& name) {
-  addrinfo hints{};
-  hints.ai_family = AF_INET;
-  hints.ai_socktype = SOCK_STREAM;
-  addrinfo* first = nullptr;
-  Answer answer;
-  answer.error = LookUpErrorOf(::getaddrinfo(name.c_str(), nullptr, &hints, &first));
-  if (answer.error != 0) return answer;
-  const std::unique_ptr<addrinfo, void (*)(addrinfo*)> owner(first, ::freeaddrinfo);
-  for (const addrinfo* entry = first; entry != nullptr; entry = entry->ai_next)
-    answer.addresses.push_back(reinterpret_cast<const sockaddr_in*>(entry->ai_addr)->sin_addr.s_addr);
-  return answer;
-}
-
-} // namespace
 
 /// Outlives the object as long as a thread waits for a name server: such a wait can't be cut short.
 struct NameLookUps::Shared {
@@ -53,7 +27,7 @@ struct NameLookUps::Shared {
   std::map<std::uint32_t, Done> underWay;
   std::uint32_t lastHandle = 0;
 
-  void Finish(const std::shared_ptr<Shared>& self, std::uint32_t handle, Answer answer) {
+  void Finish(const std::shared_ptr<Shared>& self, std::uint32_t handle, NameAnswer answer) {
     const std::scoped_lock guard(lock);
     if (!loop) return;
     loop->Post([self, handle, answer = std::move(answer)] {
@@ -85,7 +59,7 @@ std::uint32_t NameLookUps::Start(const std::string& name, Done done) {
   if (own && ::strcasecmp(own->c_str(), name.c_str()) == 0) {
     const auto addresses = hostNames_.gethostbyname(name);
     shared_->Finish(shared_, handle,
-                    addresses ? Answer{0, *addresses} : Answer{LookUpErrorOf(EAI_NONAME), {}});
+                    addresses ? NameAnswer{0, *addresses} : NameAnswer{hostNames_.LastError(), {}});
     return handle;
   }
   const std::scoped_lock guard(shared_->lock);
@@ -123,7 +97,7 @@ void NameLookUps::Work(const std::shared_ptr<Shared>& shared) {
       job = std::move(shared->jobs.front());
       shared->jobs.pop_front();
     }
-    shared->Finish(shared, job.handle, LookUp(job.name));
+    shared->Finish(shared, job.handle, LookUpName(job.name));
   }
 }
 

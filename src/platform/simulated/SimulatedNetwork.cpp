@@ -51,17 +51,20 @@ std::uint32_t SimulatedIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& ada
 }
 
 std::optional<std::string> SimulatedHostNames::gethostname() {
+  lastError_ = FailName ? Error : 0;
   if (FailName) return {};
   return Name;
 }
 
 std::optional<std::vector<std::uint32_t>> SimulatedHostNames::gethostbyname(const std::string& name) {
-  if (FailAddresses) return {};
   const auto other = others_.find(CutText(name));
-  if (other == others_.end() && CutText(name) != Name) return {};
+  const bool isKnown = !FailAddresses && (other != others_.end() || CutText(name) == Name);
   std::vector<std::uint32_t> addresses;
-  for (const auto& address : other == others_.end() ? Addresses : other->second)
-    addresses.push_back(AddressInMemory(address));
+  if (isKnown)
+    for (const auto& address : other == others_.end() ? Addresses : other->second)
+      addresses.push_back(AddressInMemory(address));
+  lastError_ = addresses.empty() ? Error : 0;
+  if (addresses.empty()) return {};
   return addresses;
 }
 

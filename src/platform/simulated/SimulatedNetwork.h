@@ -91,11 +91,15 @@ class SimulatedHostNames : public HostNames {
   }
   bool FailName = false;
   bool FailAddresses = false;
+  /// What a question fails with.
+  std::int32_t Error = 11001;
 
   std::optional<std::string> gethostname() override;
   std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) override;
+  std::int32_t LastError() override { return lastError_; }
 
  private:
+  std::int32_t lastError_ = 0;
   std::map<std::string, std::vector<std::string>> others_;
 };
 

@@ -501,8 +501,8 @@ void SimulatedSockets::Resolved(std::uint32_t lookUp) {
   const auto addresses = hostNames_.gethostbyname(asked.name);
   if (const auto failing = failingNames_.find(asked.name); failing != failingNames_.end())
     error = failing->second;
-  else if (!addresses || addresses->empty())
-    error = kHostNotFound;
+  else if (!addresses)
+    error = hostNames_.LastError();
   if (error == 0) {
     const std::size_t count = std::min(addresses->size(), asked.buffer.size() / 4 - 1);
     Put32(asked.buffer, 0, static_cast<std::uint32_t>(count));
