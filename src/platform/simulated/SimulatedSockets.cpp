@@ -10,6 +10,7 @@ namespace quendra::platform::simulated {
 namespace {
 
 constexpr std::int32_t kNotStarted = 10093;
+constexpr std::int32_t kNotSupported = 10045;
 constexpr std::int32_t kAddressInUse = 10048;
 constexpr std::int32_t kNotConnected = 10057;
 constexpr std::int32_t kReset = 10054;
@@ -190,6 +191,7 @@ std::int32_t SimulatedSockets::listen(SocketHandle socket, std::int32_t backlog)
   if (Scripted("listen")) return kSocketError;
   const End end = Find(socket);
   if (!end) return kSocketError;
+  if (end->stage == SocketEnd::Stage::Datagram) return Refused(kNotSupported);
   end->stage = SocketEnd::Stage::Listening;
   end->backlogSize = static_cast<std::size_t>(std::max(backlog, 1));
   Update(*end);
