@@ -26,7 +26,7 @@ struct Download {
   platform::linux_::ProcFolder folder{"/proc"};
   platform::linux_::LinuxHostNames hostNames{folder};
   platform::linux_::LinuxSockets library{desktop, hostNames};
-  foundation::modSocketPlus module{library, hostNames, desktop.Windows};
+  foundation::modSocketPlus module{library, hostNames, desktop};
   foundation::CSocketPlus sockets{module};
   bool take = true;
   int open = 0;

@@ -165,10 +165,10 @@ void CSocketPlus::Fail(Slot slot, std::int32_t number, const char16_t* source) {
   At(slot).State = sckError;
   const Value index = At(slot).Index;
   const Text description = SystemErrorText(number);
-  const auto showError = ShowError;
+  modSocketPlus& module = module_; // the handler may end this object
   bool cancelDisplay = true;
   Events.Error(index, static_cast<std::int16_t>(number), description, 0, source, {}, 0, cancelDisplay);
-  if (!cancelDisplay && showError) showError(description, source);
+  if (!cancelDisplay) module.ShowError(description, source);
 }
 
 } // namespace quendra::foundation

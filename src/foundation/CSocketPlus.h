@@ -72,9 +72,6 @@ class CSocketPlus {
     forms::Event<const Value&, std::int32_t, std::int32_t> SendProgress;
   } Events;
 
-  /// Shows the box of an Error event whose handler asked for it: text, title.
-  std::function<void(const Text&, const Text&)> ShowError;
-
  private:
   using Slot = std::size_t;
   /// Lives as long as the object: a handler may end the object that raised its event.

@@ -11,8 +11,8 @@ constexpr std::uint16_t kVersion11 = 257;
 } // namespace
 
 modSocketPlus::modSocketPlus(platform::Sockets& sockets, platform::HostNames& hostNames,
-                             forms::MessageWindows& windows)
-    : sockets_(sockets), hostNames_(hostNames), windows_(windows) {}
+                             forms::Desktop& desktop, forms::MessageWindows& windows)
+    : sockets_(sockets), hostNames_(hostNames), desktop_(desktop), windows_(windows) {}
 
 modSocketPlus::~modSocketPlus() {
   // Each leaves the module as it ends, so the tables must still be there.

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/MessageWindows.h"
+#include "forms/Desktop.h"
 #include "foundation/HandleOwners.h"
 #include "platform/HostNames.h"
 #include "platform/Sockets.h"
@@ -24,7 +24,11 @@ class modSocketPlus {
   static constexpr std::uint32_t kSocketMessage = 32769;
   static constexpr std::int32_t kEventMask = 59;
 
-  modSocketPlus(platform::Sockets& sockets, platform::HostNames& hostNames, forms::MessageWindows& windows);
+  /// The windows may be others than the desktop's own.
+  modSocketPlus(platform::Sockets& sockets, platform::HostNames& hostNames, forms::Desktop& desktop,
+                forms::MessageWindows& windows);
+  modSocketPlus(platform::Sockets& sockets, platform::HostNames& hostNames, forms::Desktop& desktop)
+      : modSocketPlus(sockets, hostNames, desktop, desktop.Windows) {}
   ~modSocketPlus();
 
   void InitiateProcesses();
@@ -49,6 +53,9 @@ class modSocketPlus {
   /// nullptr for a socket that isn't in the list.
   std::shared_ptr<CSocketPlus> GetAcceptClass(platform::SocketHandle socket) const;
 
+  /// The plain box of an error whose handler leaves its display to the class.
+  void ShowError(const Text& description, const Text& source) { desktop_.MessageBox(description, 0, source); }
+
   platform::Sockets& Library() { return sockets_; }
   platform::HostNames& Names() { return hostNames_; }
 
@@ -66,6 +73,7 @@ class modSocketPlus {
 
   platform::Sockets& sockets_;
   platform::HostNames& hostNames_;
+  forms::Desktop& desktop_;
   forms::MessageWindows& windows_;
   std::int32_t socketClassCount_ = 0;
   bool winsockStarted_ = false;

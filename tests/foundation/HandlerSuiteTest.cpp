@@ -92,8 +92,6 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_SendProgress) {
 
 TEST_P(HandlerSuite, A_handler_may_end_the_object_in_Error_even_if_it_asks_for_the_box) {
   bool ended = false;
-  std::vector<Text> shown;
-  program->ShowError = [&](const Text& text, const Text& title) { shown = {text, title}; };
   program->Events.Error = [&](const Value&, std::int16_t, const Text&, std::int32_t, const Text&, const Text&,
                               std::int32_t, bool& cancelDisplay) {
     cancelDisplay = false;
@@ -103,7 +101,8 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_Error_even_if_it_asks_for_t
   program->ArrayAdd(1);
   program->Connect(1, Text(u"127.0.0.1"), world->ClosedPort());
   ASSERT_TRUE(world->Until([&] { return ended; }));
-  EXPECT_EQ(shown, (std::vector<Text>{u"Connection refused.", u"CSocketPlus.PostSocket"}));
+  const forms::HeadlessDesktop::Box box{u"Connection refused.", 0, u"CSocketPlus.PostSocket"};
+  EXPECT_EQ(world->Desktop.Boxes, std::vector{box});
 }
 
 TEST_P(HandlerSuite, A_handler_may_end_the_object_in_ConnectionRequest) {

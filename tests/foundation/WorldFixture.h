@@ -69,7 +69,7 @@ std::unique_ptr<World> MakeRealWorld();
 class Program {
  public:
   explicit Program(World& world)
-      : world_(world), module(world.Sockets(), world.Names(), world.Desktop.Windows),
+      : world_(world), module(world.Sockets(), world.Names(), world.Desktop),
         sockets_(std::make_unique<CSocketPlus>(module)) {
     Record(*sockets_);
   }

@@ -28,7 +28,7 @@ class SocketModule : public testing::Test {
   forms::HeadlessDesktop Desktop;
   platform::simulated::SimulatedMachine Machine{Desktop};
   StubbornWindows Windows;
-  modSocketPlus Module{Machine.sockets, Machine.hostNames, Windows};
+  modSocketPlus Module{Machine.sockets, Machine.hostNames, Desktop, Windows};
 };
 
 // The library.
@@ -165,7 +165,7 @@ class AnsweringWindows : public forms::MessageWindows {
 
 TEST_F(SocketModule, The_former_procedure_sees_all_but_the_messages_that_have_an_owner) {
   AnsweringWindows windows;
-  modSocketPlus module(Machine.sockets, Machine.hostNames, windows);
+  modSocketPlus module(Machine.sockets, Machine.hostNames, Desktop, windows);
   CSocketPlus object(module);
   Open(object, 1);
   const auto window = module.SocketWindow();
@@ -184,7 +184,7 @@ TEST_F(SocketModule, A_module_that_ends_leaves_no_dispatcher_behind) {
   AnsweringWindows windows;
   forms::WindowHandle window = 0;
   {
-    modSocketPlus module(Machine.sockets, Machine.hostNames, windows);
+    modSocketPlus module(Machine.sockets, Machine.hostNames, Desktop, windows);
     CSocketPlus object(module);
     Open(object, 1);
     window = module.SocketWindow();

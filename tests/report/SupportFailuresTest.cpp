@@ -18,6 +18,35 @@ TEST_F(SupportFailures, A_refused_connection_shows_the_error_without_the_provide
   EXPECT_EQ(desktop.Boxes, (Boxes{{u"winsock error: 10061 - Connection refused.", kOkOnly, kApplication}}));
 }
 
+TEST_F(SupportFailures, A_handler_that_leaves_the_display_to_the_socket_class_gets_its_plain_box) {
+  Server().Refuse();
+  OpenPage();
+  program.supportExchange.Sockets()->Events.Error = [](const foundation::Value&, std::int16_t, const Text&,
+                                                       std::int32_t, const Text&, const Text&, std::int32_t,
+                                                       bool& cancelDisplay) { cancelDisplay = false; };
+
+  ClickReport();
+  Run();
+
+  EXPECT_EQ(desktop.Boxes, (Boxes{{u"Connection refused.", kOkOnly, u"CSocketPlus.PostSocket"}}));
+}
+
+TEST_F(SupportFailures, The_page_may_be_left_while_the_socket_class_shows_its_box) {
+  Server().Refuse();
+  OpenPage();
+  program.supportExchange.Sockets()->Events.Error = [](const foundation::Value&, std::int16_t, const Text&,
+                                                       std::int32_t, const Text&, const Text&, std::int32_t,
+                                                       bool& cancelDisplay) { cancelDisplay = false; };
+  desktop.WhileBoxStands.push_back([&] { LeavePage(); });
+
+  ClickReport();
+  Run();
+
+  EXPECT_EQ(desktop.Boxes.size(), 1u);
+  EXPECT_FALSE(desktop.Ended);
+  EXPECT_EQ(program.supportExchange.Sockets(), nullptr);
+}
+
 TEST_F(SupportFailures, The_handler_leaves_the_failed_socket_as_it_is) {
   Server().Refuse();
   OpenPage();
