@@ -153,6 +153,33 @@ TEST_F(HostilePeers, A_reset_while_the_program_sends_is_an_Error) {
   EXPECT_FALSE(world->Desktop.Ended);
 }
 
+TEST_F(HostilePeers, A_peer_that_stops_sending_gets_only_what_was_under_way) {
+  constexpr std::int32_t kSent = 50'000'000;
+  std::atomic<bool> closing = false;
+  std::atomic<std::int64_t> received = -1;
+  const std::int32_t port = Serve([&](int connection) {
+    char byte = 0;
+    EXPECT_EQ(recv(connection, &byte, 1, MSG_PEEK), 1);
+    shutdown(connection, SHUT_WR);
+    while (!closing && !stop_) std::this_thread::yield();
+    const timeval wait{0, 200'000};
+    setsockopt(connection, SOL_SOCKET, SO_RCVTIMEO, &wait, sizeof wait);
+    std::string buffer(1'000'000, ' ');
+    std::int64_t total = 0;
+    for (ssize_t count; (count = recv(connection, buffer.data(), buffer.size(), 0)) > 0;) total += count;
+    received = total;
+  });
+  program->Events.Connect = [&](const Value& index) { program->SendData(index, ByteArray(kSent)); };
+  ConnectTo(port);
+  ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
+  closing = true;
+  ASSERT_TRUE(Until([&] { return received >= 0; }));
+  EXPECT_GT(received, 0);
+  EXPECT_LT(received, kSent);
+  EXPECT_FALSE(program.Saw("SendComplete 1"));
+  EXPECT_EQ(program->State(1), sckClosing);
+}
+
 TEST_F(HostilePeers, Nul_bytes_in_any_number_are_data_like_any_other) {
   const std::int32_t port = Serve([](int connection) { SendAll(connection, std::string(100'000, '\0')); });
   ConnectTo(port);
