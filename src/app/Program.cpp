@@ -13,7 +13,8 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
       packetAttribution(machine, desktop, frmMenu.Page(), monitorFields, captureFields, processTable),
       captureSession(machine, desktop, frmMenu.Page(), captureFields, packetAttribution),
       modSocketPlus(machine.sockets, machine.hostNames, desktop),
-      supportExchange(modSocketPlus, desktop, frmMenu.main_ListView1, processTable, frmMenu.main_Timer1),
+      supportExchange(modSocketPlus, desktop, frmMenu.main_ListView1, frmMenu.main_cmdRpt, processTable,
+                      frmMenu.main_Timer1),
       monitorPageSwitch(machine, monitorFields, processTable, supportExchange, captureSession) {
   captureSession.UnloadMainWindow = [this] { desktop_.Unload(frmMenu); };
 }

@@ -30,10 +30,10 @@ std::int32_t NumberOfIndex(const Value& index) {
 } // namespace
 
 SupportExchange::SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop,
-                                 forms::ListView& main_ListView1, monitor::ProcessTable& table,
-                                 forms::Timer& main_Timer1)
-    : module_(module), desktop_(desktop), main_ListView1_(main_ListView1), table_(table),
-      main_Timer1_(main_Timer1) {}
+                                 forms::ListView& main_ListView1, forms::Label& main_cmdRpt,
+                                 monitor::ProcessTable& table, forms::Timer& main_Timer1)
+    : module_(module), desktop_(desktop), main_ListView1_(main_ListView1), main_cmdRpt_(main_cmdRpt),
+      table_(table), main_Timer1_(main_Timer1) {}
 
 void SupportExchange::PrepareSockets() {
   main_spSockets_ = std::make_unique<foundation::CSocketPlus>(module_);
@@ -45,6 +45,7 @@ void SupportExchange::PrepareSockets() {
   events.Error = [this](Index index, std::int16_t number, const Text& description, std::int32_t, const Text&,
                         const Text&, std::int32_t,
                         bool&) { main_spSockets_Error(index, number, description); };
+  OfferReport();
 }
 
 void SupportExchange::ReleaseSockets() {
@@ -56,15 +57,11 @@ void SupportExchange::ReleaseSockets() {
   main_spSockets_.reset();
 }
 
-void SupportExchange::main_cmdRpt_Click() {
-  OpenSockets().Connect(kNumber, Text(settings::SupportServerHost), kWebPort);
-}
+void SupportExchange::main_cmdRpt_Click() { Connect(kNumber, settings::SupportServerHost); }
 
-void SupportExchange::main_Label3_DblClick() {
-  OpenSockets().Connect(kLoad, Text(settings::SupportServerAddress), kWebPort);
-}
+void SupportExchange::main_Label3_DblClick() { Connect(kLoad, settings::SupportServerAddress); }
 
-void SupportExchange::main_Label2_DblClick() { OpenSockets().CloseSck(kLoad); }
+void SupportExchange::main_Label2_DblClick() { Close(kLoad); }
 
 void SupportExchange::main_spSockets_Connect(Index index) {
   switch (NumberOfIndex(index)) {
@@ -92,9 +89,9 @@ void SupportExchange::main_spSockets_DataArrival(Index index) {
 void SupportExchange::main_spSockets_CloseSck(Index index) {
   switch (NumberOfIndex(index)) {
   case kProcsPage: return ProcsPageClosed();
-  case kNumber: return OpenSockets().CloseSck(kNumber);
+  case kNumber: return Close(kNumber);
   case kReport: return ReportClosed();
-  case kLoad: return OpenSockets().CloseSck(kLoad);
+  case kLoad: return Close(kLoad);
   default: return;
   }
 }
@@ -102,6 +99,7 @@ void SupportExchange::main_spSockets_CloseSck(Index index) {
 void SupportExchange::main_spSockets_Error(Index index, std::int16_t number, const Text& description) {
   const std::int32_t socket = NumberOfIndex(index);
   if (socket < kProcsPage || socket > kLoad) return;
+  OfferReport(); // a connection that fails at once shows its box before Connect returns
   desktop_.MessageBox(u"winsock error: " + DecimalText(number) + u" - " + description, 0,
                       socket == kProcsPage ? kHebrewTitle : kDefaultTitle);
 }
@@ -109,6 +107,24 @@ void SupportExchange::main_spSockets_Error(Index index, std::int16_t number, con
 foundation::CSocketPlus& SupportExchange::OpenSockets() {
   if (!main_spSockets_) throw Fault(Fault::kObjectNotSet);
   return *main_spSockets_;
+}
+
+void SupportExchange::Connect(std::int16_t index, TextView host) {
+  OpenSockets().Connect(index, Text(host), kWebPort);
+  OfferReport();
+}
+
+void SupportExchange::Close(std::int16_t index) {
+  OpenSockets().CloseSck(index);
+  OfferReport();
+}
+
+void SupportExchange::OfferReport() {
+  if (!main_spSockets_) return; // the page was left behind the box of an error
+  const auto isClosed = [this](std::int16_t index) {
+    return main_spSockets_->State(index) == foundation::sckClosed;
+  };
+  main_cmdRpt_.Enabled = standingNumberBoxes_ == 0 && isClosed(kNumber) && isClosed(kReport);
 }
 
 Text SupportExchange::TakeText(Index index) {
@@ -121,7 +137,7 @@ void SupportExchange::NumberArrived() {
   const Text number = ReportNumberIn(TakeText(kNumber));
   ShowNumber(number);
   ReportNumber = number;
-  OpenSockets().Connect(kReport, Text(settings::SupportServerHost), kWebPort);
+  Connect(kReport, settings::SupportServerHost);
 }
 
 /// The next piece of a reply may arrive behind the box and stack its own on it. A server that sends piece
@@ -142,12 +158,12 @@ void SupportExchange::ReportClosed() {
     ShowHebrewBox(u"הדו\"ח נשלח בהצלחה.", forms::kInformation);
   else
     ShowHebrewBox(u"בעיה בשליחת הדו\"ח!", forms::kCritical);
-  OpenSockets().CloseSck(kReport);
+  Close(kReport);
 }
 
 void SupportExchange::ProcsPageClosed() {
   ReadProcsPage();
-  OpenSockets().CloseSck(kProcsPage);
+  Close(kProcsPage);
   table_.RefreshProcessTable({});
   main_Timer1_.Enabled = true;
 }

@@ -15,7 +15,7 @@ namespace quendra::report {
 class SupportExchange {
  public:
   SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop, forms::ListView& main_ListView1,
-                  monitor::ProcessTable& table, forms::Timer& main_Timer1);
+                  forms::Label& main_cmdRpt, monitor::ProcessTable& table, forms::Timer& main_Timer1);
 
   /// The sockets' half of the page's start.
   void PrepareSockets();
@@ -42,6 +42,12 @@ class SupportExchange {
   void main_spSockets_Error(Index index, std::int16_t number, const Text& description);
 
   foundation::CSocketPlus& OpenSockets();
+  // A socket leaves its closed state and comes back to it by these two alone.
+  void Connect(std::int16_t index, TextView host);
+  void Close(std::int16_t index);
+  /// The button is enabled while a press can be taken: one while socket 2 or 3 is in use, failed ones
+  /// included, or before a number that was shown is posted would end the program.
+  void OfferReport();
   Text TakeText(Index index);
   void NumberArrived();
   void ReportClosed();
@@ -53,6 +59,7 @@ class SupportExchange {
   foundation::modSocketPlus& module_;
   forms::Desktop& desktop_;
   forms::ListView& main_ListView1_;
+  forms::Label& main_cmdRpt_;
   monitor::ProcessTable& table_;
   forms::Timer& main_Timer1_;
   std::unique_ptr<foundation::CSocketPlus> main_spSockets_;

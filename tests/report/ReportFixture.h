@@ -55,6 +55,11 @@ class ReportTest : public testing::Test {
   }
 
   void ClickReport() { ASSERT_TRUE(desktop.Click(menu.main_cmdRpt)); }
+  /// A click that the disabled button would not let through.
+  void ClickReportAllTheSame() {
+    EXPECT_FALSE(desktop.Click(menu.main_cmdRpt));
+    desktop.Dispatch([this] { menu.main_cmdRpt.Click(); });
+  }
   /// Lets all happen that is under way.
   void Run() { desktop.RunUntilIdle(); }
 

@@ -363,13 +363,15 @@ TEST_F(SupportExchange,
   EXPECT_NE(desktop.Boxes.back().text.find(u"40020"), Text::npos);
 }
 
-TEST_F(SupportExchange, A_second_click_during_an_exchange_ends_the_program_with_the_run_times_message) {
+TEST_F(
+    SupportExchange,
+    A_second_click_that_reaches_its_handler_during_an_exchange_ends_the_program_with_the_run_times_message) {
   Server();
   OpenPage();
   ClickReport();
   Run();
 
-  ClickReport();
+  ClickReportAllTheSame();
 
   EXPECT_TRUE(desktop.Ended);
   EXPECT_EQ(desktop.EndStatus, 1);
