@@ -1,13 +1,18 @@
 #include "forms/qt/Boxes.h"
 
 #include "forms/qt/BoxIcons.h"
+#include "forms/qt/BoxText.h"
 #include "forms/qt/Conversion.h"
 #include "forms/qt/Palette.h"
 
 #include <QGridLayout>
+#include <QGuiApplication>
 #include <QLabel>
 #include <QMessageBox>
 #include <QPushButton>
+#include <QScreen>
+
+#include <algorithm>
 
 namespace quendra::forms::qt {
 
@@ -18,6 +23,12 @@ constexpr qsizetype kMostText = 4096;
 /// Pixels: room for the title of a short box.
 constexpr int kLeastWidth = 320;
 constexpr int kIconSide = 40;
+/// What a box needs beside and above its text: margins, sign and button, and the frame that the window
+/// manager puts round it.
+constexpr QSize kAroundText(140, 180);
+/// The toolkit breaks the lines of a box that would be wider than this, or than half the screen.
+constexpr int kToolkitsWidth = 500;
+constexpr int kMostTextWidth = 640;
 
 QMessageBox::Icon KindOf(int flags) {
   switch (flags & 0x70) {
@@ -46,6 +57,26 @@ void LayOut(QMessageBox& box) {
   }
 }
 
+/// Whether the toolkit's own label shows the text whole.
+bool FitsIntoLabel(const QString& text, QSize screen, const QFontMetrics& metrics) {
+  const QSize room(std::min(kToolkitsWidth, screen.width() / 2) - kAroundText.width(),
+                   screen.height() - kAroundText.height());
+  const QRect taken = metrics.boundingRect(QRect(QPoint(), room), Qt::TextWordWrap, text);
+  return taken.width() <= room.width() && taken.height() <= room.height();
+}
+
+/// A text that is too large gets a field to scroll it in: the button must stay on the screen.
+void PutText(QMessageBox& box, const QString& text, QSize screen) {
+  box.setText(text);
+  auto* label = box.findChild<QLabel*>(QStringLiteral("qt_msgbox_label"));
+  if (!label || FitsIntoLabel(text, screen, label->fontMetrics())) return;
+  const QSize room = (screen - kAroundText).boundedTo({kMostTextWidth, screen.height()}).expandedTo({1, 1});
+  auto* field = new BoxText(text, room, box.layoutDirection(), &box);
+  field->setAccessibleName(box.windowTitle());
+  delete box.layout()->replaceWidget(label, field);
+  label->hide();
+}
+
 } // namespace
 
 int ShowBox(QWidget* owner, const Text& text, int flags, const Text& title) {
@@ -60,12 +91,14 @@ int ShowBox(QWidget* owner, const Text& text, int flags, const Text& title) {
   box.setTextFormat(Qt::PlainText);
   box.setWindowTitle(VisibleText(title));
   const QString shown = VisibleText(text, LineBreaks::Keep, kMostText);
-  box.setText(rightToLeft ? MarkedRightToLeft(shown) : shown);
+  const QScreen* screen = owner ? owner->screen() : QGuiApplication::primaryScreen();
+  PutText(box, rightToLeft ? MarkedRightToLeft(shown) : shown, screen->availableSize());
   QPushButton* ok =
       box.addButton(rightToLeft ? QStringLiteral("אישור") : QStringLiteral("OK"), QMessageBox::AcceptRole);
   box.setDefaultButton(ok);
   box.setEscapeButton(ok);
   LayOut(box);
+  ok->setFocus();
   box.exec();
   return kOkPressed;
 }
