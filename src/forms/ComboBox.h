@@ -8,6 +8,7 @@ namespace quendra::forms {
 class ComboBox : public Control {
  public:
   using Control::Control;
+  bool TakesFocus() const override { return true; }
 
   void Clear();
   void AddItem(Text item);

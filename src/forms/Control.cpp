@@ -34,6 +34,12 @@ bool Control::IsShown() const {
   return true;
 }
 
+bool Control::IsUsable() const {
+  for (const Control* control = this; control; control = control->parent_)
+    if (!control->Visible() || !control->Enabled()) return false;
+  return true;
+}
+
 void Control::BringToFront() {
   if (!parent_ || parent_->children_.back() == this) return;
   std::erase(parent_->children_, this);

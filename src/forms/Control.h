@@ -84,6 +84,10 @@ class Control {
 
   /// Visible itself and with all its containers.
   bool IsShown() const;
+  /// There for the user: shown and enabled, itself and with all its containers.
+  bool IsUsable() const;
+  /// Of a kind that the keyboard works on.
+  virtual bool TakesFocus() const { return false; }
   void Move(int left, int top, int width, int height) { Position = Geometry{left, top, width, height}; }
   /// In front of its siblings.
   void BringToFront();

@@ -7,7 +7,8 @@ namespace quendra::forms {
 
 enum class Alignment { Leading, Trailing, Centre };
 
-/// A text. One with a Click handler acts as a button: it takes the focus and Enter and Space press it.
+/// A text. One with a Click handler or a button's face acts as a button: it takes the focus and Enter and
+/// Space press it.
 class Label : public Control {
  public:
   using Control::Control;
@@ -18,6 +19,8 @@ class Label : public Control {
   /// How a label that acts as a button is drawn: as plain text, a link, or a button with a face.
   enum class Look { Plain, Link, Button };
   Property<Look, Aspect::Look> Style{*this, Look::Plain};
+  bool IsButton() const { return Click || Style() == Look::Button; }
+  bool TakesFocus() const override { return IsButton(); }
   /// The accessible name where the caption is empty.
   Text Description;
 };

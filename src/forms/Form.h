@@ -25,6 +25,10 @@ class Form : public Container {
   bool RightToLeft = true;
   /// Keys reach the form before the control that has the focus.
   bool KeyPreview = false;
+  /// Clicked by Enter where the control that has the focus doesn't take it, nullptr for none.
+  Control* Default = nullptr;
+  /// Clicked by Escape, nullptr for none.
+  Control* Cancel = nullptr;
 
   /// Puts every control into its state of design time. Run at each load, before Form_Load.
   virtual void Design() = 0;

@@ -86,6 +86,7 @@ class ListViewObserver {
 class ListView : public Control {
  public:
   using Control::Control;
+  bool TakesFocus() const override { return true; }
 
   void ClearColumns();
   void AddColumn(ColumnHeader column);

@@ -37,10 +37,12 @@ inline void Link(forms::Label& label, const char16_t* caption, forms::Font font,
   label.Style = forms::Label::Look::Link;
 }
 
+/// A button that nothing answers to is shown disabled until its form gives it a handler.
 inline void Button(forms::Label& label, const char16_t* caption) {
   Text(label, caption, kBody);
   label.Style = forms::Label::Look::Button;
   label.Align = forms::Alignment::Centre;
+  label.Enabled = static_cast<bool>(label.Click);
 }
 
 /// The one button of a page that leads on.

@@ -6,6 +6,7 @@ namespace quendra::shell {
 
 frmAbout::frmAbout(forms::Desktop& desktop) : Form(u"frmAbout"), desktop_(desktop) {
   Image1.Click = [this] { desktop_.Unload(*this); };
+  Default = Cancel = &Image1;
 }
 
 void frmAbout::Design() {

@@ -52,11 +52,6 @@ void frmMenu::WireMonitorPage() {
   main_cmdRpt.Click = [this] { modules_.supportExchange.main_cmdRpt_Click(); };
   main_Label2.DoubleClick = [this] { modules_.supportExchange.main_Label2_DblClick(); };
   main_Label3.DoubleClick = [this] { modules_.supportExchange.main_Label3_DblClick(); };
-  // The other actions have their places, looks and keys; what they do comes with the parts of the program
-  // that do it.
-  for (Label* action :
-       {&main_lblEndProcess, &main_lblJumpToPath, &main_cmdAddRemove, &main_cmdChecks, &main_cmdMemInfo})
-    action->Click = [] {};
 }
 
 void frmMenu::WireOtherPages() {

@@ -18,10 +18,11 @@ constexpr int kLinkRoom = 1;
 frmSplash::frmSplash(forms::Desktop& desktop, frmMenu& menu)
     : Form(u"frmSplash"), desktop_(desktop), menu_(menu), handCursor_(desktop),
       roll_(desktop, {picOut, picBuffer, picBackBuffer}, ReDrawTimer, lines_) {
-  Label1.Click = [this] { roll_.Show(); };
+  Default = &Label2;
+  Label1.Click = [this] { ShowAgreement(); };
   Label2.Click = [this] { Label2_Click(); };
   Label3.Click = [this] { desktop_.Unload(*this); };
-  picOut.Click = [this] { roll_.Hide(); };
+  picOut.Click = [this] { HideAgreement(); };
   ReDrawTimer.Tick = [this] { roll_.Tick(); };
   for (forms::Label* button : {&Label1, &Label2, &Label3})
     button->MouseMove = [this](int, int, int, int) { handCursor_.Show(); };
@@ -31,7 +32,7 @@ void frmSplash::Form_Load() {
   handCursor_.Load();
   lines_.Wrap(AgreementText(), desktop_.ScaleWidth(picBuffer) - kSideRoom,
               [this](TextView text) { return desktop_.TextWidth(picBuffer, text); });
-  roll_.Hide();
+  HideAgreement();
   PlaceLinkOnItsWord();
 }
 
@@ -44,6 +45,16 @@ void frmSplash::PlaceLinkOnItsWord() {
   place.left += RoundToInt32(desktop_.TextWidth(picBuffer, before) * twips);
   place.width = RoundToInt32((desktop_.TextWidth(picBuffer, Label1.Caption()) + kLinkRoom) * twips);
   Label1.Position = place;
+}
+
+void frmSplash::ShowAgreement() {
+  roll_.Show();
+  Cancel = &picOut;
+}
+
+void frmSplash::HideAgreement() {
+  roll_.Hide();
+  Cancel = &Label3;
 }
 
 void frmSplash::Label2_Click() {

@@ -39,6 +39,9 @@ class frmSplash : public forms::Form {
 
  private:
   void Label2_Click();
+  // Escape leaves what is in front: the agreement, then the program.
+  void ShowAgreement();
+  void HideAgreement();
   void PlaceLinkOnItsWord();
   void DesignTexts();
   void DesignPictures();

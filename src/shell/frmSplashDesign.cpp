@@ -30,6 +30,7 @@ void frmSplash::DesignTexts() {
               looks::kBody);
   lblWarning.Move(Px(24), Px(288), Px(560), Px(22));
   looks::Link(Label1, u"כאן", looks::kBody, looks::kLeaf);
+  Label1.TabIndex = 1; // the buttons come first
   Label1.Transparent = false;
   Label1.BackColour = looks::kPaper;
   Label1.Move(Px(24), Px(288), Px(30), Px(22));

@@ -166,19 +166,29 @@ TEST_F(MonitorPageSwitchTest, Choosing_another_adapter_follows_it) {
   EXPECT_EQ(machine.capture.ControlsMade, 2);
 }
 
-TEST_F(MonitorPageSwitchTest, The_actions_that_come_later_can_be_pressed_and_do_nothing) {
+TEST_F(MonitorPageSwitchTest, The_actions_that_come_later_are_disabled_and_the_report_is_not) {
   machine.AddProcess({100, 1, "one.exe", "C:\\one.exe"});
   ComeHome();
   ClickEntry(0);
   machine.Calls.clear();
   for (forms::Label* label : {&menu.main_lblEndProcess, &menu.main_lblJumpToPath, &menu.main_cmdAddRemove,
                               &menu.main_cmdChecks, &menu.main_cmdMemInfo}) {
-    EXPECT_TRUE(static_cast<bool>(label->Click)) << ToUtf8(label->Name());
-    EXPECT_TRUE(desktop.Click(*label)) << ToUtf8(label->Name());
+    EXPECT_FALSE(label->Enabled()) << ToUtf8(label->Name());
+    EXPECT_FALSE(desktop.Click(*label)) << ToUtf8(label->Name());
   }
+  EXPECT_TRUE(menu.main_cmdRpt.Enabled());
   EXPECT_TRUE(machine.Calls.empty());
   EXPECT_TRUE(desktop.Boxes.empty());
   EXPECT_EQ(menu.main_ListView1.Count(), 1);
+}
+
+TEST_F(MonitorPageSwitchTest, An_action_is_enabled_by_the_design_once_it_has_a_handler) {
+  menu.main_cmdMemInfo.Click = [] {};
+
+  menu.Design();
+
+  EXPECT_TRUE(menu.main_cmdMemInfo.Enabled());
+  EXPECT_FALSE(menu.main_cmdChecks.Enabled());
 }
 
 } // namespace

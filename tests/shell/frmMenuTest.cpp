@@ -1,5 +1,6 @@
 #include "shell/frmMenu.h"
 
+#include "forms/Keyboard.h"
 #include "shell/MenuFixture.h"
 
 namespace quendra::shell {
@@ -41,6 +42,7 @@ TEST_F(MainWindow, Every_label_that_acts_as_a_button_sets_the_hand_cursor) {
   for (forms::Label* label :
        {&menu.Label1, &menu.main_lblEndProcess, &menu.main_lblJumpToPath, &menu.main_cmdAddRemove,
         &menu.main_cmdChecks, &menu.main_cmdMemInfo, &menu.main_cmdRpt}) {
+    label->Enabled = true; // as it is once its action stands
     desktop.Calls.clear();
     EXPECT_TRUE(desktop.MouseMove(*label)) << ToUtf8(label->Name());
     EXPECT_EQ(desktop.Calls, (std::vector<std::string>{"SetCursor 5"})) << ToUtf8(label->Name());
@@ -145,6 +147,23 @@ TEST_F(MainWindow, A_click_on_its_picture_closes_the_about_box) {
   EXPECT_FALSE(desktop.Ended);
   EXPECT_TRUE(desktop.Click(menu.Label1));
   EXPECT_TRUE(program.frmAbout.Visible());
+}
+
+TEST_F(MainWindow, Escape_and_Enter_close_the_about_box_as_the_click_does) {
+  ComeHome();
+  for (const int key : {forms::kEscapeKey, forms::kEnterKey}) {
+    desktop.Click(menu.Label1);
+    EXPECT_TRUE(desktop.KeyDown(program.frmAbout, key));
+    EXPECT_FALSE(program.frmAbout.IsLoaded());
+  }
+  EXPECT_FALSE(desktop.Ended);
+}
+
+TEST_F(MainWindow, Escape_does_nothing_in_the_main_window) {
+  ComeHome();
+  desktop.KeyDown(menu, forms::kEscapeKey);
+  EXPECT_TRUE(menu.Visible());
+  EXPECT_FALSE(desktop.Ended);
 }
 
 } // namespace

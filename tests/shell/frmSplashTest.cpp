@@ -1,5 +1,6 @@
 #include "shell/frmSplash.h"
 
+#include "forms/Keyboard.h"
 #include "shell/ProgramFixture.h"
 
 namespace quendra::shell {
@@ -179,6 +180,56 @@ TEST_F(Splash, Ends_the_program_when_it_is_closed_and_the_main_window_never_load
   EXPECT_EQ(desktop.EndStatus, 0);
   EXPECT_FALSE(program.frmMenu.IsLoaded());
   EXPECT_TRUE(machine.Calls.empty());
+}
+
+TEST_F(Splash, Has_its_button_that_goes_on_first_in_the_tab_order_and_its_link_last) {
+  program.Start();
+  EXPECT_EQ(forms::FirstFocus(splash), &splash.Label2);
+  std::vector<forms::Control*> buttons;
+  for (forms::Control* control : forms::TabOrder(splash))
+    if (control->Click && dynamic_cast<forms::Label*>(control)) buttons.push_back(control);
+  EXPECT_EQ(buttons, (std::vector<forms::Control*>{&splash.Label2, &splash.Label3, &splash.Label1}));
+}
+
+TEST_F(Splash, Goes_on_with_Enter) {
+  program.Start();
+  EXPECT_TRUE(desktop.KeyDown(splash, forms::kEnterKey));
+  EXPECT_TRUE(program.frmMenu.Visible());
+}
+
+TEST_F(Splash, Ends_the_program_with_Escape_as_its_close_button_does) {
+  program.Start();
+  EXPECT_TRUE(desktop.KeyDown(splash, forms::kEscapeKey));
+  EXPECT_TRUE(desktop.Ended);
+  EXPECT_EQ(desktop.EndStatus, 0);
+}
+
+TEST_F(Splash, Hides_the_agreement_with_Escape_while_it_rolls_and_stays) {
+  program.Start();
+  desktop.Click(splash.Label1);
+  desktop.Advance(50);
+  EXPECT_TRUE(desktop.KeyDown(splash, forms::kEscapeKey));
+  EXPECT_TRUE(AgreementHidden());
+  EXPECT_FALSE(splash.ReDrawTimer.Enabled());
+  EXPECT_FALSE(desktop.Ended);
+}
+
+TEST_F(Splash, Ends_the_program_with_a_second_Escape_behind_the_agreement) {
+  program.Start();
+  desktop.Click(splash.Label1);
+  desktop.Advance(60000);
+  desktop.KeyDown(splash, forms::kEscapeKey);
+  EXPECT_TRUE(AgreementHidden());
+  desktop.KeyDown(splash, forms::kEscapeKey);
+  EXPECT_TRUE(desktop.Ended);
+}
+
+TEST_F(Splash, Closes_with_Escape_after_the_agreement_was_clicked_away) {
+  program.Start();
+  desktop.Click(splash.Label1);
+  desktop.Click(splash.picOut);
+  desktop.KeyDown(splash, forms::kEscapeKey);
+  EXPECT_TRUE(desktop.Ended);
 }
 
 } // namespace

@@ -62,6 +62,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   bool DoubleClick(Control& control);
   bool MouseMove(Control& control, int button = 0, int shift = 0, int x = 0, int y = 0);
   bool MouseDown(Control& control, int button = kLeftButton, int shift = 0, int x = 0, int y = 0);
+  /// A key that no control takes: the form's preview, then its Default or Cancel control.
   bool KeyDown(Form& form, int keyCode, int shift = 0);
   bool CloseBox(Form& form);
   /// An item from 0; one that the list lacks can't be chosen.

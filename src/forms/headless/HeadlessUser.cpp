@@ -1,20 +1,10 @@
+#include "forms/Keyboard.h"
 #include "forms/headless/HeadlessDesktop.h"
 
 namespace quendra::forms {
 
-namespace {
-
-bool IsUsable(const Control& control) {
-  if (!control.IsShown()) return false;
-  for (const Control* at = &control; at; at = at->Parent())
-    if (!at->Enabled()) return false;
-  return true;
-}
-
-} // namespace
-
 bool HeadlessDesktop::Act(Control& control, const std::function<void()>& action) {
-  if (Ended || !IsUsable(control)) return false;
+  if (Ended || !control.IsUsable()) return false;
   Dispatch(action);
   return true;
 }
@@ -36,7 +26,11 @@ bool HeadlessDesktop::MouseDown(Control& control, int button, int shift, int x, 
 }
 
 bool HeadlessDesktop::KeyDown(Form& form, int keyCode, int shift) {
-  return form.KeyPreview && Act(form, [&] { form.Form_KeyDown(keyCode, shift); });
+  if (!form.KeyPreview && !ControlPressedBy(form, keyCode, shift)) return false;
+  return Act(form, [&] {
+    if (form.KeyPreview) form.Form_KeyDown(keyCode, shift);
+    if (const Control* pressed = ControlPressedBy(form, keyCode, shift)) pressed->Click();
+  });
 }
 
 bool HeadlessDesktop::CloseBox(Form& form) {

@@ -1,5 +1,6 @@
 #include "forms/qt/FormView.h"
 
+#include "forms/Keyboard.h"
 #include "forms/qt/FrameView.h"
 #include "forms/qt/ViewFactory.h"
 
@@ -12,7 +13,7 @@
 #include <QScreen>
 #include <QWindow>
 
-#include <algorithm>
+#include <utility>
 
 namespace quendra::forms::qt {
 
@@ -52,14 +53,13 @@ void FormView::AddViews(const Container& container, QWidget& parent) {
 }
 
 void FormView::OrderTabs() const {
-  std::vector<WidgetView*> views;
-  for (View* view : views_)
-    if (auto* widgetView = dynamic_cast<WidgetView*>(view)) views.push_back(widgetView);
-  const auto before = [](const WidgetView* left, const WidgetView* right) {
-    return left->TheControl()->TabIndex < right->TheControl()->TabIndex;
-  };
-  std::stable_sort(views.begin(), views.end(), before);
-  for (std::size_t i = 1; i < views.size(); ++i) setTabOrder(&views[i - 1]->Widget(), &views[i]->Widget());
+  QWidget* before = nullptr;
+  for (const Control* control : TabOrder(*TheForm())) {
+    auto* view = dynamic_cast<WidgetView*>(control->View());
+    if (!view) continue;
+    if (before) setTabOrder(before, &view->Widget());
+    before = &view->Widget();
+  }
 }
 
 void FormView::Release() {
@@ -106,6 +106,14 @@ void FormView::ShowOver(const QWidget* owner) {
   show();
   raise();
   activateWindow();
+  if (!std::exchange(hadFocus_, true)) FocusFirst();
+}
+
+// The toolkit's order is a ring, which says nothing of where it is entered.
+void FormView::FocusFirst() {
+  const Control* first = TheForm() ? FirstFocus(*TheForm()) : nullptr;
+  if (auto* view = first ? dynamic_cast<WidgetView*>(first->View()) : nullptr)
+    view->Widget().setFocus(Qt::ActiveWindowFocusReason);
 }
 
 void FormView::RunModal(QWidget* owner) {

@@ -38,12 +38,14 @@ class FormView : public QWidget, public WidgetView {
  private:
   void AddViews(const Container& container, QWidget& parent);
   void OrderTabs() const;
+  void FocusFirst();
 
   WindowHandle handle_;
   std::vector<View*> views_;
   std::vector<std::unique_ptr<View>> ownedViews_;
   QEventLoop* modalLoop_ = nullptr;
   bool wasPlaced_ = false;
+  bool hadFocus_ = false;
 };
 
 } // namespace quendra::forms::qt

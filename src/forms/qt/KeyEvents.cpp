@@ -1,9 +1,11 @@
 #include "forms/qt/KeyEvents.h"
 
+#include "forms/Keyboard.h"
 #include "forms/qt/FormView.h"
 #include "forms/qt/MouseEvents.h"
 
 #include <QKeyEvent>
+#include <QPointer>
 
 #include <algorithm>
 #include <iterator>
@@ -55,17 +57,28 @@ int KeyCodeOf(const QKeyEvent& event) {
 bool KeyEvents::eventFilter(QObject* watched, QEvent* event) {
   if (event->type() != QEvent::KeyPress || !watched->isWidgetType()) return false;
   auto* widget = static_cast<QWidget*>(watched);
-  auto* view = dynamic_cast<FormView*>(widget->window());
-  if (!view || !view->TheForm()) return false;
+  const QPointer<FormView> view = dynamic_cast<FormView*>(widget->window());
+  if (!view) return false;
+  const auto& key = static_cast<const QKeyEvent&>(*event);
   // A key that a control doesn't want climbs through its containers; the form hears of it where it came in.
   const QWidget* focused = view->focusWidget();
-  if (widget != (focused ? focused : view)) return false;
-  if (!view->TheForm()->KeyPreview && widget != view) return false;
-  const auto& key = static_cast<const QKeyEvent&>(*event);
+  if (widget == (focused ? focused : view.data())) Preview(*view, *widget, key);
+  return view && widget == view && Press(*view, key);
+}
+
+void KeyEvents::Preview(FormView& view, const QWidget& widget, const QKeyEvent& key) {
+  if (!view.TheForm() || (!view.TheForm()->KeyPreview && &widget != &view)) return;
   const int code = KeyCodeOf(key);
   const int shift = ShiftStateOf(key.modifiers());
-  if (code != 0) dispatcher_.Dispatch([&] { view->TheForm()->Form_KeyDown(code, shift); });
-  return false;
+  if (code != 0) dispatcher_.Dispatch([&] { view.TheForm()->Form_KeyDown(code, shift); });
+}
+
+bool KeyEvents::Press(FormView& view, const QKeyEvent& key) {
+  // A key held down is one press: what it closes may lie on something else that it would close next.
+  if (!view.TheForm() || key.isAutoRepeat()) return false;
+  const Control* pressed = ControlPressedBy(*view.TheForm(), KeyCodeOf(key), ShiftStateOf(key.modifiers()));
+  if (pressed) dispatcher_.Dispatch([&] { pressed->Click(); });
+  return pressed;
 }
 
 } // namespace quendra::forms::qt

@@ -8,8 +8,7 @@ class LabelView : public QWidget, public WidgetView {
  public:
   LabelView(ViewContext& context, Label& label, QWidget* parent);
 
-  /// A label with a Click handler is a button.
-  bool IsButton() const;
+  bool IsButton() const { return TheControl() && TheLabel()->IsButton(); }
   QAccessible::Role Role() const override {
     return IsButton() ? QAccessible::Button : QAccessible::StaticText;
   }
@@ -17,6 +16,7 @@ class LabelView : public QWidget, public WidgetView {
  protected:
   void Apply(Aspect aspect) override;
   QString AccessibleName() const override;
+  void Place() override;
 
   bool event(QEvent* event) override;
   void keyPressEvent(QKeyEvent* event) override;
@@ -27,6 +27,11 @@ class LabelView : public QWidget, public WidgetView {
   void PaintFace(QPainter& painter) const;
   void PaintText(QPainter& painter) const;
   void PaintFocus(QPainter& painter) const;
+  /// Where the control lies. A link's widget reaches beyond it, with room for its ring.
+  QRect LabelRect() const;
+  int RingRoom() const;
+  QRectF RingOfLink() const;
+  QColor FaceColour() const;
   QColor InkColour() const;
   bool IsHeldDown() const;
 };

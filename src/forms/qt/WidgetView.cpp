@@ -27,7 +27,7 @@ void WidgetView::Changed(Aspect aspect) {
   if (aspect == Aspect::All) Identify();
   if (Concerns(aspect, Aspect::Geometry)) Place();
   if (Concerns(aspect, Aspect::Font)) widget_.setFont(ToQFont(control_->TextFont()));
-  if (Concerns(aspect, Aspect::Enabled)) widget_.setEnabled(control_->Enabled());
+  if (Concerns(aspect, Aspect::Enabled)) Enable();
   if (aspect == Aspect::Order) widget_.raise();
   Apply(aspect);
   if (Concerns(aspect, Aspect::Caption)) widget_.setAccessibleName(AccessibleName());
@@ -40,6 +40,12 @@ void WidgetView::Changed(Aspect aspect) {
 void WidgetView::Identify() {
   widget_.setObjectName(ToQString(control_->Name()));
   widget_.setAccessibleDescription(ToQString(control_->Name()));
+}
+
+void WidgetView::Enable() {
+  widget_.setEnabled(control_->Enabled());
+  // No handler is asked any more, so the hand of a button that was under the mouse would stay.
+  if (!control_->Enabled()) widget_.unsetCursor();
 }
 
 void WidgetView::Place() { PlaceAt(control_->Position()); }
@@ -62,7 +68,7 @@ void WidgetView::PlaceAt(const Geometry& geometry) {
 
 void WidgetView::Press() {
   context_.dispatcher.Dispatch([this] {
-    if (control_ && control_->Enabled()) control_->Click();
+    if (control_ && control_->IsUsable()) control_->Click();
   });
 }
 

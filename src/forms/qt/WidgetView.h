@@ -63,6 +63,7 @@ class WidgetView : public View {
 
  private:
   void Identify();
+  void Enable();
 
   ViewContext& context_;
   Control* control_;

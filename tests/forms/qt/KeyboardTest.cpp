@@ -202,4 +202,104 @@ TEST_F(Keyboard, Ctrl_and_a_letter_over_a_table_belong_to_the_form) {
   EXPECT_EQ(list.SelectedItem()->Key(), u"p1");
 }
 
+TEST_F(Keyboard, Escape_clicks_the_cancel_control_wherever_the_focus_is) {
+  Label label(form, u"label");
+  ComboBox combo(form, u"combo");
+  ListView list(form, u"list");
+  Image picture(form, u"picture");
+  int clicks = 0;
+  label.Click = [] {};
+  picture.Click = [&] { ++clicks; };
+  form.Cancel = &picture;
+  list.AddColumn({u"name", 3000});
+  list.Add(u"p1", u"alpha", 0);
+  ShowActive();
+
+  for (const Control* focused : std::initializer_list<const Control*>{&label, &combo, &list}) {
+    WidgetOf(*focused).setFocus();
+    PressKey(WidgetOf(*focused), Qt::Key_Escape, QStringLiteral("\x1b"));
+  }
+
+  EXPECT_EQ(clicks, 3);
+}
+
+TEST_F(Keyboard, Escape_and_Enter_click_in_a_form_where_nothing_takes_the_focus) {
+  Image picture(form, u"picture");
+  int clicks = 0;
+  picture.Click = [&] { ++clicks; };
+  form.Default = form.Cancel = &picture;
+  ShowActive();
+
+  PressKey(WidgetOf(form), Qt::Key_Escape, QStringLiteral("\x1b"));
+  PressKey(WidgetOf(form), Qt::Key_Return, QStringLiteral("\r"));
+  PressKey(WidgetOf(form), Qt::Key_Enter, QStringLiteral("\r"));
+
+  EXPECT_EQ(clicks, 3);
+}
+
+TEST_F(Keyboard, Enter_presses_the_label_that_has_the_focus_and_not_the_default_one) {
+  Label ok(form, u"ok");
+  Label other(form, u"other");
+  std::string pressed;
+  ok.Click = [&] { pressed += "ok "; };
+  other.Click = [&] { pressed += "other "; };
+  form.Default = &ok;
+  ShowActive();
+  WidgetOf(other).setFocus();
+
+  PressKey(WidgetOf(other), Qt::Key_Return, QStringLiteral("\r"));
+
+  EXPECT_EQ(pressed, "other ");
+}
+
+TEST_F(Keyboard, A_key_that_is_held_down_clicks_once) {
+  Image picture(form, u"picture");
+  int clicks = 0;
+  picture.Click = [&] { ++clicks; };
+  form.Cancel = &picture;
+  ShowActive();
+
+  PressKey(WidgetOf(form), Qt::Key_Escape);
+  QKeyEvent repeated(QEvent::KeyPress, Qt::Key_Escape, Qt::NoModifier, {}, true);
+  QCoreApplication::sendEvent(&WidgetOf(form), &repeated);
+
+  EXPECT_EQ(clicks, 1);
+}
+
+TEST_F(Keyboard, Escape_may_unload_the_form_that_it_reached) {
+  TestForm other;
+  desktop.Show(other);
+  Image picture(form, u"picture");
+  picture.Click = [&] { desktop.Unload(form); };
+  form.Cancel = &picture;
+  ShowActive();
+
+  PressKey(WidgetOf(form), Qt::Key_Escape);
+
+  EXPECT_FALSE(form.IsLoaded());
+}
+
+TEST_F(Keyboard, The_first_control_of_the_tab_order_has_the_focus_when_a_form_comes_up) {
+  Label link(form, u"link");
+  Label button(form, u"button");
+  link.TabIndex = 1;
+  link.Click = [] {};
+  button.Click = [] {};
+
+  ShowActive();
+
+  EXPECT_TRUE(RunUntil([&] { return QApplication::focusWidget() == &WidgetOf(button); }));
+}
+
+TEST_F(Keyboard, A_form_where_nothing_takes_the_focus_comes_up_all_the_same) {
+  Label first(form, u"first");
+  Label second(form, u"second");
+  second.TabIndex = -1;
+
+  ShowActive();
+
+  EXPECT_TRUE(WidgetOf(form).isVisible());
+  EXPECT_FALSE(WidgetOf(first).hasFocus());
+}
+
 } // namespace quendra::forms

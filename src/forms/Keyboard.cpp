@@ -1,0 +1,41 @@
+#include "forms/Keyboard.h"
+
+#include <algorithm>
+
+namespace quendra::forms {
+
+namespace {
+
+void AddChildren(const Container& container, std::vector<Control*>& controls) {
+  for (Control* child : container.Children()) {
+    controls.push_back(child);
+    if (const auto* inner = dynamic_cast<const Container*>(child)) AddChildren(*inner, controls);
+  }
+}
+
+} // namespace
+
+std::vector<Control*> TabOrder(const Form& form) {
+  std::vector<Control*> controls;
+  AddChildren(form, controls);
+  std::stable_sort(controls.begin(), controls.end(), [](const Control* left, const Control* right) {
+    return left->TabIndex < right->TabIndex;
+  });
+  return controls;
+}
+
+Control* FirstFocus(const Form& form) {
+  for (Control* control : TabOrder(form))
+    if (control->TakesFocus() && control->IsUsable()) return control;
+  return nullptr;
+}
+
+Control* ControlPressedBy(const Form& form, int keyCode, int shift) {
+  if (shift != kNoShift) return nullptr;
+  Control* const control = keyCode == kEnterKey    ? form.Default
+                           : keyCode == kEscapeKey ? form.Cancel
+                                                   : nullptr;
+  return control && control->IsUsable() ? control : nullptr;
+}
+
+} // namespace quendra::forms
