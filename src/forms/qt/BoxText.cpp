@@ -21,6 +21,8 @@ BoxText::BoxText(const QString& text, QSize room, Qt::LayoutDirection direction,
   QTextOption option = document()->defaultTextOption();
   option.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
   option.setTextDirection(direction);
+  const bool rightToLeft = direction == Qt::RightToLeft;
+  option.setAlignment(Qt::AlignAbsolute | (rightToLeft ? Qt::AlignRight : Qt::AlignLeft));
   document()->setDefaultTextOption(option);
   setPlainText(text);
   const QRect lines(0, 0, std::max(1, room.width() - kMargins.width()), 0);

@@ -19,6 +19,7 @@ class Boxes : public QtFixture {
     bool isScrolled = false; ///< the text stands in a field of its own
     int hiddenBelow = 0;     ///< how far that can be scrolled, in lines
     QString text;
+    bool beginsAtRight = false; ///< where its first letter stands
     Qt::LayoutDirection direction = Qt::LayoutDirectionAuto;
   };
 
@@ -47,6 +48,7 @@ class Boxes : public QtFixture {
         seen.isScrolled = field->isVisible();
         seen.hiddenBelow = field->verticalScrollBar()->maximum();
         seen.text = field->toPlainText();
+        seen.beginsAtRight = field->cursorRect().x() > field->viewport()->width() / 2;
         seen.direction = field->document()->defaultTextOption().textDirection();
       }
       button->click();
@@ -108,6 +110,11 @@ TEST_F(Boxes, Scroll_a_text_in_the_direction_of_its_box) {
 
   EXPECT_EQ(Show(tall, kInformation | kHebrewBox).direction, Qt::RightToLeft);
   EXPECT_EQ(Show(tall, kExclamation).direction, Qt::LeftToRight);
+}
+
+TEST_F(Boxes, Begin_a_scrolled_text_at_the_side_where_it_is_read) {
+  EXPECT_TRUE(Show(u"מספר" + Text(500, u'\n'), kInformation | kHebrewBox).beginsAtRight);
+  EXPECT_FALSE(Show(u"text" + Text(500, u'\n'), kExclamation).beginsAtRight);
 }
 
 TEST_F(Boxes, Give_the_focus_to_their_button_and_not_to_the_text) {
