@@ -15,7 +15,8 @@ void CopyPadded(const std::string& text, std::array<char, 255>& field) {
 
 } // namespace
 
-LinuxCapture::LinuxCapture(EventLoop& loop) : core_(std::make_shared<LinuxCaptureCore>(loop)) {}
+LinuxCapture::LinuxCapture(EventLoop& loop, PcapLibrary library)
+    : core_(std::make_shared<LinuxCaptureCore>(loop, std::move(library))) {}
 
 LinuxCapture::~LinuxCapture() { core_->End(); }
 

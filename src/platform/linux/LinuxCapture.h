@@ -2,6 +2,7 @@
 
 #include "platform/Capture.h"
 #include "platform/EventLoop.h"
+#include "platform/linux/PcapLibrary.h"
 
 #include <memory>
 
@@ -19,7 +20,7 @@ struct CaptureCounters {
 /// when frames have arrived, the library delivers them. The session follows vpSetCurrentAdapter.
 class LinuxCapture : public CaptureLibrary, public CaptureControls {
  public:
-  explicit LinuxCapture(EventLoop& loop);
+  explicit LinuxCapture(EventLoop& loop, PcapLibrary library = PcapLibrary());
   ~LinuxCapture() override;
 
   std::int32_t VBPcapInit() override;

@@ -13,7 +13,6 @@
 #include <net/if_arp.h>
 #include <netinet/in.h>
 #include <optional>
-#include <pcap/pcap.h>
 #include <sys/ioctl.h>
 #include <sys/socket.h>
 #include <unistd.h>
@@ -136,11 +135,11 @@ std::vector<RankedAdapter> RankedAdapters(const pcap_if_t* devices) {
 
 } // namespace
 
-std::vector<CaptureAdapter> ListCaptureAdapters() {
+std::vector<CaptureAdapter> ListCaptureAdapters(const PcapLibrary& library) {
   char error[PCAP_ERRBUF_SIZE];
   pcap_if_t* devices = nullptr;
-  if (pcap_findalldevs(&devices, error) != 0) return {};
-  const std::unique_ptr<pcap_if_t, decltype(&pcap_freealldevs)> owner(devices, &pcap_freealldevs);
+  if (library.findalldevs(&devices, error) != 0) return {};
+  const std::unique_ptr<pcap_if_t, decltype(library.freealldevs)> owner(devices, library.freealldevs);
 
   auto ranked = RankedAdapters(devices);
   std::sort(ranked.begin(), ranked.end(), [](const RankedAdapter& a, const RankedAdapter& b) {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/linux/PcapLibrary.h"
+
 #include <cstdint>
 #include <string>
 #include <vector>
@@ -15,7 +17,7 @@ struct CaptureAdapter {
 /// The interfaces that are up and whose packets can be shown as Ethernet frames: the one of the default route
 /// first, loopback last, so that the first adapter with the host's address is the one that a subscriber
 /// means.
-std::vector<CaptureAdapter> ListCaptureAdapters();
+std::vector<CaptureAdapter> ListCaptureAdapters(const PcapLibrary& library);
 
 /// The interface's first IPv4 address as it lies in memory (network order), 0 for none.
 std::uint32_t AddressOfAdapter(const std::string& name);

@@ -13,7 +13,11 @@ constexpr int kMostBatches = 256;
 
 void LinuxCaptureCore::ListAdapters() {
   using Availability = CaptureLibrary::Availability;
-  adapters_ = ListCaptureAdapters();
+  if (!library_.IsThere()) {
+    availability_ = Availability::NoLibrary;
+    return;
+  }
+  adapters_ = ListCaptureAdapters(library_);
   availability_ = adapters_.empty() ? Availability::NoAdapters
                   : MayCapture()    ? Availability::Available
                                     : Availability::NoRights;
@@ -43,7 +47,7 @@ void LinuxCaptureCore::End() {
 
 void LinuxCaptureCore::Open() {
   Close();
-  if (!CurrentName().empty()) session_ = PcapSession::Open(CurrentName(), queue_);
+  if (!CurrentName().empty()) session_ = PcapSession::Open(library_, CurrentName(), queue_);
   UpdateBell();
 }
 

@@ -17,7 +17,7 @@ namespace quendra::platform::linux_ {
 /// yields is never entered again from here; the kernel's ring does the waiting.
 class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
  public:
-  explicit LinuxCaptureCore(EventLoop& loop) : loop_(loop) {}
+  LinuxCaptureCore(EventLoop& loop, PcapLibrary library) : loop_(loop), library_(std::move(library)) {}
 
   void ListAdapters();
   const std::vector<CaptureAdapter>& Adapters() const { return adapters_; }
@@ -53,6 +53,7 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   void RingAgain();
 
   EventLoop& loop_;
+  const PcapLibrary library_;
   std::vector<CaptureAdapter> adapters_;
   CaptureLibrary::Availability availability_ = CaptureLibrary::Availability::NoAdapters;
   int current_ = -1;

@@ -1,7 +1,5 @@
 #include "platform/linux/PcapSession.h"
 
-#include <pcap/pcap.h>
-
 namespace quendra::platform::linux_ {
 
 namespace {
@@ -25,17 +23,18 @@ void FetchAhead(const unsigned char* frame) {
 
 } // namespace
 
-PcapSession::PcapSession(pcap* handle, PcapFrameQueue& queue) : handle_(handle), shaper_(queue) {}
+PcapSession::PcapSession(const PcapLibrary& library, pcap* handle, PcapFrameQueue& queue)
+    : library_(library), handle_(handle), shaper_(queue) {}
 
-PcapSession::~PcapSession() { pcap_close(handle_); }
+PcapSession::~PcapSession() { library_.close(handle_); }
 
-std::unique_ptr<PcapSession> PcapSession::Open(const std::string& adapter, PcapFrameQueue& queue,
-                                               std::string* error) {
+std::unique_ptr<PcapSession> PcapSession::Open(const PcapLibrary& library, const std::string& adapter,
+                                               PcapFrameQueue& queue, std::string* error) {
   char buffer[PCAP_ERRBUF_SIZE] = "";
-  pcap_t* handle = pcap_create(adapter.c_str(), buffer);
+  pcap_t* handle = library.create(adapter.c_str(), buffer);
   std::string reason = buffer;
   if (handle != nullptr) {
-    std::unique_ptr<PcapSession> session(new PcapSession(handle, queue));
+    std::unique_ptr<PcapSession> session(new PcapSession(library, handle, queue));
     if (session->Prepare(reason)) return session;
   }
   if (error != nullptr) *error = adapter + ": " + reason;
@@ -43,15 +42,15 @@ std::unique_ptr<PcapSession> PcapSession::Open(const std::string& adapter, PcapF
 }
 
 bool PcapSession::Prepare(std::string& error) {
-  pcap_set_snaplen(handle_, kSnapLength);
-  pcap_set_promisc(handle_, 0);
-  pcap_set_timeout(handle_, kBlockMilliseconds);
-  pcap_set_buffer_size(handle_, kRingBytes);
-  if (const int status = pcap_activate(handle_); status < 0) {
-    error = pcap_statustostr(status);
+  library_.set_snaplen(handle_, kSnapLength);
+  library_.set_promisc(handle_, 0);
+  library_.set_timeout(handle_, kBlockMilliseconds);
+  library_.set_buffer_size(handle_, kRingBytes);
+  if (const int status = library_.activate(handle_); status < 0) {
+    error = library_.statustostr(status);
     return false;
   }
-  const auto form = LinkFormOf(pcap_datalink(handle_));
+  const auto form = LinkFormOf(library_.datalink(handle_));
   if (!form) {
     error = "a link of an unknown kind";
     return false;
@@ -61,18 +60,19 @@ bool PcapSession::Prepare(std::string& error) {
   // A filter that takes everything: only with a filter does the kernel cut the frames before it copies them.
   bpf_program everything{};
   char buffer[PCAP_ERRBUF_SIZE] = "";
-  const bool ready = pcap_compile(handle_, &everything, "", 1, PCAP_NETMASK_UNKNOWN) == 0 &&
-                     pcap_setfilter(handle_, &everything) == 0 && pcap_setnonblock(handle_, 1, buffer) == 0;
-  pcap_freecode(&everything);
-  descriptor_ = pcap_get_selectable_fd(handle_);
-  if (!ready) error = pcap_geterr(handle_);
+  const bool ready = library_.compile(handle_, &everything, "", 1, PCAP_NETMASK_UNKNOWN) == 0 &&
+                     library_.setfilter(handle_, &everything) == 0 &&
+                     library_.setnonblock(handle_, 1, buffer) == 0;
+  library_.freecode(&everything);
+  descriptor_ = library_.get_selectable_fd(handle_);
+  if (!ready) error = library_.geterr(handle_);
   return ready && descriptor_ >= 0;
 }
 
 int PcapSession::Fill() {
   if (failed_) return -1;
   const int count =
-      pcap_dispatch(handle_, kBatch, &PcapSession::Take, reinterpret_cast<unsigned char*>(this));
+      library_.dispatch(handle_, kBatch, &PcapSession::Take, reinterpret_cast<unsigned char*>(this));
   if (count < 0) {
     failed_ = true;
     return -1;
@@ -91,7 +91,7 @@ void PcapSession::Take(unsigned char* session, const pcap_pkthdr* header, const 
 PcapSession::Statistics PcapSession::GetStatistics() const {
   Statistics result{received_, 0};
   pcap_stat counted{};
-  if (pcap_stats(handle_, &counted) == 0) result.dropped = counted.ps_drop;
+  if (library_.stats(handle_, &counted) == 0) result.dropped = counted.ps_drop;
   return result;
 }
 

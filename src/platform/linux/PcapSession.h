@@ -1,16 +1,14 @@
 #pragma once
 
 #include "platform/linux/PcapFrameShaper.h"
+#include "platform/linux/PcapLibrary.h"
 
 #include <memory>
 #include <string>
 
-struct pcap;
-struct pcap_pkthdr;
-
 namespace quendra::platform::linux_ {
 
-/// A live capture on one interface, non-blocking.
+/// A live capture on one interface, non-blocking. The library outlives it.
 class PcapSession {
  public:
   /// The most packets that one call to Fill takes from the kernel: few enough to stay in the nearest caches
@@ -25,8 +23,8 @@ class PcapSession {
   };
 
   /// nullptr when the interface can't be opened; `error`, when given, then says why.
-  static std::unique_ptr<PcapSession> Open(const std::string& adapter, PcapFrameQueue& queue,
-                                           std::string* error = nullptr);
+  static std::unique_ptr<PcapSession> Open(const PcapLibrary& library, const std::string& adapter,
+                                           PcapFrameQueue& queue, std::string* error = nullptr);
   ~PcapSession();
 
   int Descriptor() const { return descriptor_; }
@@ -37,10 +35,11 @@ class PcapSession {
   Statistics GetStatistics() const;
 
  private:
-  PcapSession(pcap* handle, PcapFrameQueue& queue);
+  PcapSession(const PcapLibrary& library, pcap* handle, PcapFrameQueue& queue);
   bool Prepare(std::string& error);
   static void Take(unsigned char* session, const pcap_pkthdr* header, const unsigned char* bytes);
 
+  const PcapLibrary& library_;
   pcap* handle_;
   int descriptor_ = -1;
   bool failed_ = false;

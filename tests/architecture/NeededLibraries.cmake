@@ -1,0 +1,10 @@
+# The capture library is looked up at run time: the executable has to start on a machine that lacks it.
+execute_process(COMMAND ${READELF} -d ${EXECUTABLE} OUTPUT_VARIABLE section COMMAND_ERROR_IS_FATAL ANY)
+string(REGEX MATCHALL "\\(NEEDED\\)[^\n]*" needed "${section}")
+list(JOIN needed "\n" needed)
+if(NOT needed MATCHES "libc\\.so")
+  message(FATAL_ERROR "No list of needed libraries in ${EXECUTABLE}:\n${section}")
+endif()
+if(needed MATCHES "pcap")
+  message(FATAL_ERROR "${EXECUTABLE} needs the capture library:\n${needed}")
+endif()
