@@ -51,10 +51,12 @@ class CaptureLibrary {
  public:
   virtual ~CaptureLibrary() = default;
 
-  /// The last adapter's index, -1 when capture isn't available.
+  /// The last adapter's index, -1 when capture isn't available. Asked once, so a library on a machine whose
+  /// adapters come and go counts some in advance: an index without an adapter of its own repeats another one.
   virtual std::int32_t VBPcapInit() = 0;
   virtual void VBPcapTerminate() = 0;
-  /// Leaves `info` as it was for an index that the library lacks.
+  /// Leaves `info` as it was for an index that the library lacks. Index 0 outside a session begins a new
+  /// list: what stands behind the indexes holds until then.
   virtual void vpGetAdapterInfo(std::int16_t adapter, AdapterInfo& info) = 0;
   virtual void vpSetCurrentAdapter(std::int16_t adapter) = 0;
   /// Opens a session on the current adapter.

@@ -338,6 +338,15 @@ TEST_F(CaptureSessionTest, The_state_line_goes_when_capture_runs) {
   EXPECT_EQ(StateLine(), u"");
 }
 
+TEST_F(CaptureSessionTest, An_adapter_that_stands_behind_several_indexes_is_listed_once) {
+  AddAdapter("eth0", kOwnAddress);
+  AddAdapter("eth1");
+  for (int spare = 0; spare < 3; ++spare) AddAdapter("eth1");
+  StartCapture();
+  EXPECT_EQ(Listed(), (Items{u"Card eth0", u"Card eth1"}));
+  EXPECT_EQ(capture.CurrentAdapter, 0);
+}
+
 TEST_F(CaptureSessionTest, The_control_goes_with_the_session) {
   AddAdapter("eth0");
   {

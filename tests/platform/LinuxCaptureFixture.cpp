@@ -32,8 +32,12 @@ AdapterInfo LinuxCaptureFixture::InfoOf(int adapter) {
 }
 
 int LinuxCaptureFixture::IndexOf(const std::string& name) {
-  const int last = capture->VBPcapInit();
-  for (int index = 0; index <= last; ++index)
+  lastIndex = capture->VBPcapInit();
+  return IndexAmongListed(name);
+}
+
+int LinuxCaptureFixture::IndexAmongListed(const std::string& name) {
+  for (int index = 0; index <= lastIndex; ++index)
     if (name == InfoOf(index).AdapterName.data()) return index;
   return -1;
 }

@@ -21,6 +21,8 @@ class LinuxCaptureFixture : public testing::Test {
   void AddLink(const std::string& near, const std::string& far, const std::string& address);
   /// The index of an adapter by its name, -1 for none. VBPcapInit comes first.
   int IndexOf(const std::string& name);
+  /// The same, of the list that stands.
+  int IndexAmongListed(const std::string& name);
   AdapterInfo InfoOf(int adapter);
   /// What the page does when it opens: a session on the adapter and a control that listens to it.
   void Start(const std::string& adapter);
@@ -41,6 +43,7 @@ class LinuxCaptureFixture : public testing::Test {
   std::unique_ptr<integration::NetworkNamespace> network;
   forms::HeadlessDesktop desktop;
   std::optional<LinuxCapture> capture;
+  std::int32_t lastIndex = -1; ///< as VBPcapInit told
   std::unique_ptr<CaptureControl> control;
   int events = 0;
   std::function<void()> onEvent;

@@ -45,16 +45,15 @@ using LinuxCaptureTest = LinuxCaptureFixture;
 
 TEST_F(LinuxCaptureTest, The_adapters_are_the_interfaces_that_are_up) {
   RunCommand("ip link add down0 type veth peer name down1");
-  EXPECT_EQ(capture->VBPcapInit(), 1);
-  EXPECT_STREQ(InfoOf(0).AdapterName.data(), "qv1");
-  EXPECT_STREQ(InfoOf(1).AdapterName.data(), "qv0");
+  EXPECT_EQ(IndexOf("qv1"), 0);
+  EXPECT_EQ(IndexOf("qv0"), 1);
+  EXPECT_EQ(IndexOf("down0"), -1);
   EXPECT_EQ(capture->availability(), CaptureLibrary::Availability::Available);
 }
 
 TEST_F(LinuxCaptureTest, Loopback_is_the_last_adapter) {
   RunCommand("ip link set lo up");
-  EXPECT_EQ(capture->VBPcapInit(), 2);
-  EXPECT_STREQ(InfoOf(2).AdapterName.data(), "lo");
+  EXPECT_EQ(IndexOf("lo"), 2);
   EXPECT_EQ(DescriptionOf(InfoOf(2)), "Loopback (lo)");
 }
 
@@ -99,9 +98,9 @@ TEST_F(LinuxCaptureTest, A_control_gives_the_address_of_any_adapter) {
   EXPECT_EQ(address, 0u);
 }
 
-TEST_F(LinuxCaptureTest, Without_an_interface_that_is_up_the_library_gives_minus_1) {
+TEST_F(LinuxCaptureTest, Without_an_interface_that_is_up_a_session_delivers_nothing) {
   RunCommand("ip link del qv0");
-  EXPECT_EQ(capture->VBPcapInit(), -1);
+  EXPECT_GE(capture->VBPcapInit(), 0);
   EXPECT_EQ(capture->availability(), CaptureLibrary::Availability::NoAdapters);
   capture->VBPcapTerminate();
   capture->vpSetCurrentAdapter(0);
@@ -324,13 +323,13 @@ TEST_F(LinuxCaptureTest, Without_rights_the_adapters_are_listed_and_a_session_de
   ASSERT_GE(child, 0);
   if (child == 0) {
     if (setgid(65534) != 0 || setuid(65534) != 0) _exit(10);
-    const int last = capture->VBPcapInit();
-    if (last != 1) _exit(11);
+    if (capture->VBPcapInit() < 1) _exit(11);
     if (capture->availability() != CaptureLibrary::Availability::NoRights) _exit(12);
     capture->vpSetCurrentAdapter(0);
     capture->vpBegin(1000);
     StartControl(InfoOf(0).AdapterName.data());
     desktop.PumpOnce();
+    if (capture->availability() != CaptureLibrary::Availability::NoRights) _exit(16);
     FrameBytes frame;
     CaptureHeader header{};
     if (capture->vpCapture(frame, header) >= 0 || frame.UpperBound() != 59) _exit(13);

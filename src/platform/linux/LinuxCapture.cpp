@@ -21,17 +21,18 @@ LinuxCapture::LinuxCapture(EventLoop& loop, PcapLibrary library)
 LinuxCapture::~LinuxCapture() { core_->End(); }
 
 std::int32_t LinuxCapture::VBPcapInit() {
-  core_->ListAdapters();
-  return static_cast<std::int32_t>(core_->Adapters().size()) - 1;
+  core_->CountAdapters();
+  return core_->Indexes() - 1;
 }
 
 void LinuxCapture::VBPcapTerminate() { core_->End(); }
 
 void LinuxCapture::vpGetAdapterInfo(std::int16_t adapter, AdapterInfo& info) {
-  const auto& adapters = core_->Adapters();
-  if (adapter < 0 || static_cast<std::size_t>(adapter) >= adapters.size()) return;
-  CopyPadded(adapters[adapter].name, info.AdapterName);
-  CopyPadded(ToCodePage(FromUtf8(adapters[adapter].description)), info.AdapterDescription);
+  if (adapter == 0) core_->ListAdaptersAfresh();
+  const CaptureAdapter* found = core_->AdapterAt(adapter);
+  if (found == nullptr) return;
+  CopyPadded(found->name, info.AdapterName);
+  CopyPadded(ToCodePage(FromUtf8(found->description)), info.AdapterDescription);
 }
 
 void LinuxCapture::vpSetCurrentAdapter(std::int16_t adapter) { core_->SelectAdapter(adapter); }

@@ -1,9 +1,10 @@
 #include "platform/linux/LinuxCaptureAdapters.h"
 
+#include "platform/linux/NetworkInterfaces.h"
+
 #include <algorithm>
 #include <arpa/inet.h>
 #include <cstring>
-#include <fstream>
 #include <ifaddrs.h>
 #include <linux/ethtool.h>
 #include <linux/if_packet.h>
@@ -88,27 +89,11 @@ std::string KindOf(const Socket& socket, const pcap_if_t& device) {
 
 /// Empty without a default route.
 std::string DefaultRouteInterface() {
-  std::ifstream routes("/proc/net/route");
-  std::string line;
-  std::getline(routes, line);
-  std::string name;
-  std::string destination;
-  std::string best;
-  unsigned long bestMetric = ~0UL;
-  while (std::getline(routes, line)) {
-    char interface[64];
-    unsigned long target = 0;
-    unsigned long mask = 0;
-    unsigned long metric = 0;
-    if (std::sscanf(line.c_str(), "%63s %lx %*x %*x %*d %*d %lu %lx", interface, &target, &metric, &mask) !=
-        4)
-      continue;
-    if (target != 0 || mask != 0 || metric >= bestMetric) continue;
-    best = interface;
-    bestMetric = metric;
-  }
-  return best;
+  const auto routes = ParseDefaultRoutes(ProcFolder("/proc").File("thread-self/net/route").value_or(""));
+  return routes.empty() ? std::string() : routes.front().interface;
 }
+
+CaptureAdapter LoopbackAdapter() { return {"lo", "Loopback (lo)"}; }
 
 struct RankedAdapter {
   CaptureAdapter adapter;
@@ -138,7 +123,7 @@ std::vector<RankedAdapter> RankedAdapters(const pcap_if_t* devices) {
 std::vector<CaptureAdapter> ListCaptureAdapters(const PcapLibrary& library) {
   char error[PCAP_ERRBUF_SIZE];
   pcap_if_t* devices = nullptr;
-  if (library.findalldevs(&devices, error) != 0) return {};
+  if (library.findalldevs(&devices, error) != 0) devices = nullptr;
   const std::unique_ptr<pcap_if_t, decltype(library.freealldevs)> owner(devices, library.freealldevs);
 
   auto ranked = RankedAdapters(devices);
@@ -147,6 +132,7 @@ std::vector<CaptureAdapter> ListCaptureAdapters(const PcapLibrary& library) {
   });
   std::vector<CaptureAdapter> adapters;
   for (auto& entry : ranked) adapters.push_back(std::move(entry.adapter));
+  if (adapters.empty()) adapters.push_back(LoopbackAdapter());
   return adapters;
 }
 
@@ -160,6 +146,13 @@ std::uint32_t AddressOfAdapter(const std::string& name) {
     return reinterpret_cast<const sockaddr_in*>(entry->ifa_addr)->sin_addr.s_addr;
   }
   return 0;
+}
+
+unsigned NumberOfAdapterThatIsUp(const std::string& name) {
+  const Socket socket(AF_INET, SOCK_DGRAM);
+  ifreq request = RequestFor(name);
+  if (ioctl(socket.Descriptor(), SIOCGIFFLAGS, &request) != 0 || (request.ifr_flags & IFF_UP) == 0) return 0;
+  return if_nametoindex(name.c_str());
 }
 
 bool MayCapture() { return Socket(AF_PACKET, SOCK_RAW).IsOpen(); }

@@ -16,11 +16,15 @@ struct CaptureAdapter {
 
 /// The interfaces that are up and whose packets can be shown as Ethernet frames: the one of the default route
 /// first, loopback last, so that the first adapter with the host's address is the one that a subscriber
-/// means.
+/// means. When none is up loopback stands there alone.
 std::vector<CaptureAdapter> ListCaptureAdapters(const PcapLibrary& library);
 
 /// The interface's first IPv4 address as it lies in memory (network order), 0 for none.
 std::uint32_t AddressOfAdapter(const std::string& name);
+
+/// The kernel's number for the interface as long as it is up, otherwise 0. One that is made again under its
+/// name has another number.
+unsigned NumberOfAdapterThatIsUp(const std::string& name);
 
 /// Whether this process may open a capture.
 bool MayCapture();

@@ -1,15 +1,38 @@
 #include "platform/linux/LinuxCaptureCore.h"
 
+#include <algorithm>
+
 namespace quendra::platform::linux_ {
 
 namespace {
 
 constexpr std::uint8_t kBlankFrame[60] = {};
+/// How many adapters may come while the program runs: the indexes are counted once, but a page lists its
+/// adapters at each opening. Until they come, their indexes repeat the last adapter, as a second mention adds
+/// nothing to a list.
+constexpr int kSpareIndexes = 16;
+/// An index has 15 bits; far fewer are of use to anybody.
+constexpr int kMostIndexes = 1024;
 constexpr int kPaceMilliseconds = 50;
 // So that a line faster than this loop doesn't keep it for ever.
 constexpr int kMostBatches = 256;
 
 } // namespace
+
+void LinuxCaptureCore::CountAdapters() {
+  ListAdapters();
+  const int found = static_cast<int>(std::min<std::size_t>(adapters_.size(), kMostIndexes));
+  indexes_ = found == 0 ? 0 : found + kSpareIndexes;
+}
+
+void LinuxCaptureCore::ListAdaptersAfresh() {
+  if (!begun_ && indexes_ != 0) ListAdapters();
+}
+
+const CaptureAdapter* LinuxCaptureCore::AdapterAt(int index) const {
+  if (index < 0 || index >= indexes_) return nullptr;
+  return &adapters_[std::min<std::size_t>(index, adapters_.size() - 1)];
+}
 
 void LinuxCaptureCore::ListAdapters() {
   using Availability = CaptureLibrary::Availability;
@@ -18,14 +41,16 @@ void LinuxCaptureCore::ListAdapters() {
     return;
   }
   adapters_ = ListCaptureAdapters(library_);
-  availability_ = adapters_.empty() ? Availability::NoAdapters
-                  : MayCapture()    ? Availability::Available
-                                    : Availability::NoRights;
+  // What is listed when there is nothing to list is down.
+  availability_ = NumberOfAdapterThatIsUp(adapters_.front().name) == 0 ? Availability::NoAdapters
+                  : MayCapture()                                       ? Availability::Available
+                                                                       : Availability::NoRights;
 }
 
 const std::string& LinuxCaptureCore::CurrentName() const {
   static const std::string none;
-  return current_ >= 0 && current_ < static_cast<int>(adapters_.size()) ? adapters_[current_].name : none;
+  const CaptureAdapter* adapter = AdapterAt(current_);
+  return adapter != nullptr ? adapter->name : none;
 }
 
 void LinuxCaptureCore::SelectAdapter(int adapter) {

@@ -19,8 +19,15 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
  public:
   LinuxCaptureCore(EventLoop& loop, PcapLibrary library) : loop_(loop), library_(std::move(library)) {}
 
-  void ListAdapters();
+  /// Lists the adapters and fixes the number of indexes for good.
+  void CountAdapters();
+  /// 0 without the library.
+  int Indexes() const { return indexes_; }
+  /// During a session the list stands: what the user chooses from must be what he sees.
+  void ListAdaptersAfresh();
   const std::vector<CaptureAdapter>& Adapters() const { return adapters_; }
+  /// nullptr beyond the indexes.
+  const CaptureAdapter* AdapterAt(int index) const;
   CaptureLibrary::Availability Availability() const { return availability_; }
 
   void SelectAdapter(int adapter);
@@ -39,6 +46,7 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
  private:
   class Event;
 
+  void ListAdapters();
   const std::string& CurrentName() const;
   void Open();
   void Close();
@@ -55,6 +63,7 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   EventLoop& loop_;
   const PcapLibrary library_;
   std::vector<CaptureAdapter> adapters_;
+  int indexes_ = 0;
   CaptureLibrary::Availability availability_ = CaptureLibrary::Availability::NoAdapters;
   int current_ = -1;
   bool begun_ = false;
