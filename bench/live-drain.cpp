@@ -5,11 +5,13 @@
 
 #include "platform/linux/LinuxCapture.h"
 
+#include <array>
 #include <csignal>
 #include <cstdio>
 #include <cstring>
 #include <deque>
 #include <poll.h>
+#include <vector>
 
 namespace {
 
@@ -17,12 +19,13 @@ using namespace quendra;
 
 volatile std::sig_atomic_t ended = 0;
 
-/// The least of a loop: one descriptor, one timer and what was posted.
+/// The least of a loop: two descriptors, one timer and what was posted.
 class PollLoop : public platform::EventLoop {
  public:
   void Post(std::function<void()> work) override { posted_.push_back(std::move(work)); }
   std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override {
-    return Keep(watch_, {descriptor, std::move(ready)});
+    auto& place = watches_.front() ? watches_.back() : watches_.front();
+    return Keep(place, {descriptor, std::move(ready)});
   }
   std::unique_ptr<Subscription> StartTimer(int milliseconds, std::function<void()> tick) override {
     return Keep(timer_, {milliseconds, std::move(tick)});
@@ -31,14 +34,14 @@ class PollLoop : public platform::EventLoop {
 
   void Pump(int milliseconds) {
     for (; !posted_.empty(); posted_.pop_front()) std::function<void()>(posted_.front())();
-    const auto watch = watch_;
+    const auto watches = watches_;
     const auto timer = timer_;
-    pollfd polled{watch ? watch->number : -1, POLLIN, 0};
-    const int ready = poll(&polled, 1, timer ? timer->number : milliseconds);
-    if (ready > 0)
-      watch->call();
-    else if (ready == 0 && timer)
-      timer->call();
+    std::vector<pollfd> polled;
+    for (const auto& watch : watches) polled.push_back({watch ? watch->number : -1, POLLIN, 0});
+    const int ready = poll(polled.data(), polled.size(), timer ? timer->number : milliseconds);
+    for (std::size_t i = 0; i < watches.size() && ready > 0; ++i)
+      if (watches[i] && polled[i].revents != 0) watches[i]->call();
+    if (ready == 0 && timer) timer->call();
   }
 
  private:
@@ -60,7 +63,7 @@ class PollLoop : public platform::EventLoop {
     return std::make_unique<Ending>(place);
   }
 
-  std::shared_ptr<Source> watch_;
+  std::array<std::shared_ptr<Source>, 2> watches_; // of the machine's links and of the frames
   std::shared_ptr<Source> timer_;
   std::deque<std::function<void()>> posted_;
 };

@@ -36,9 +36,15 @@ CaptureSession::CaptureSession(const platform::Machine& machine, forms::Desktop&
   UnloadMainWindow = [this] { desktop_.Unload(page_.frameMain.OwnerForm()); };
 }
 
-CaptureSession::~CaptureSession() { fields_.vpacket.reset(); }
+CaptureSession::~CaptureSession() {
+  machine_.captureLibrary.AdapterChanged = nullptr;
+  fields_.vpacket.reset();
+}
 
-void CaptureSession::InitLibrary() { fields_.CaptureInitResult = machine_.captureLibrary.VBPcapInit(); }
+void CaptureSession::InitLibrary() {
+  machine_.captureLibrary.AdapterChanged = [this] { OnAdapterChanged(); };
+  fields_.CaptureInitResult = machine_.captureLibrary.VBPcapInit();
+}
 
 void CaptureSession::CreateControl() {
   RetireControl();
@@ -116,6 +122,7 @@ void CaptureSession::StartControl() {
   Control().SetValueC(kChannelSize);
   Control().StartEvents(ignored);
   fields_.CaptureRunning = true;
+  goneSince_.reset();
   ShowCaptureState();
 }
 
@@ -164,12 +171,24 @@ void CaptureSession::main_DoCapture() {
   library.vpEnd();
 }
 
+/// A device that is dialled again or found by the network again may have another address, by which its own
+/// packets are known.
+void CaptureSession::OnAdapterChanged() {
+  using Availability = platform::CaptureLibrary::Availability;
+  goneSince_.reset();
+  if (machine_.captureLibrary.availability() == Availability::AdapterGone)
+    goneSince_ = machine_.system.SecondOfDay();
+  else
+    ReadLocalAddresses();
+  ShowCaptureState();
+}
+
 void CaptureSession::ShowCaptureState() {
   using Availability = platform::CaptureLibrary::Availability;
   Availability availability = machine_.captureLibrary.availability();
   if (availability == Availability::Available && fields_.CaptureInitResult == -1)
     availability = Availability::NoLibrary;
-  page_.main_lblCaptureState.Caption = CaptureStateText(availability);
+  page_.main_lblCaptureState.Caption = CaptureStateText(availability, goneSince_);
 }
 
 platform::CaptureControl& CaptureSession::Control() {

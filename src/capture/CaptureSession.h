@@ -10,6 +10,7 @@
 
 #include <functional>
 #include <memory>
+#include <optional>
 #include <vector>
 
 namespace quendra::capture {
@@ -46,6 +47,7 @@ class CaptureSession {
   void AddDescription(const platform::AdapterInfo& info);
   bool CarriesKnownAddress(const platform::AdapterInfo& info);
   void StartControl();
+  void OnAdapterChanged();
   void ShowCaptureState();
   platform::CaptureControl& Control();
   void RetireControl();
@@ -60,6 +62,7 @@ class CaptureSession {
   /// way.
   std::vector<std::unique_ptr<platform::CaptureControl>> retired_;
   int eventsUnderWay_ = 0;
+  std::optional<std::int32_t> goneSince_; ///< the second of the day at which the adapter was seen to go
   int controlsMade_ = 0; ///< the number of `vpacket`: a new control may lie where a dropped one lay
 };
 

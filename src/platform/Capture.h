@@ -66,9 +66,15 @@ class CaptureLibrary {
   virtual std::int32_t vpCapture(FrameBytes& frame, CaptureHeader& header) = 0;
   virtual void vpEnd() = 0;
   virtual void vpSetParam(std::int32_t parameter, std::int32_t value) = 0;
-  /// Why nothing can be captured, as a bit that the page turns into a sentence.
-  enum class Availability { Available, NoRights, NoAdapters, NoLibrary };
+  /// Why nothing can be captured, as a bit that the page turns into a sentence. AdapterGone: the adapter of
+  /// the open session has been taken away, renamed or switched off. The session waits for its return under
+  /// its name and goes on by itself.
+  enum class Availability { Available, NoRights, NoAdapters, NoLibrary, AdapterGone };
   virtual Availability availability() const = 0;
+
+  /// Raised from the loop, never inside a call: the adapter of the open session has gone, is there again or
+  /// has its address again, as availability() tells.
+  std::function<void()> AdapterChanged;
 };
 
 /// The capture control: signals new traffic on the adapter it is bound to.

@@ -23,6 +23,8 @@ class System {
   virtual void Sleep(std::uint32_t milliseconds) = 0;
   /// The current local date as the language numbers days: 1 is 31 December 1899.
   virtual std::int32_t DayNumber() = 0;
+  /// The current local time: seconds since midnight.
+  virtual std::int32_t SecondOfDay() = 0;
 };
 
 } // namespace quendra::platform

@@ -306,6 +306,14 @@ TEST_F(CaptureSessionTest, The_state_line_says_which_right_or_part_is_missing) {
   EXPECT_EQ(CaptureStateText(Availability::NoRights), u"התעבורה אינה נמדדת: אין הרשאה ללכוד מנות ברשת");
   EXPECT_EQ(CaptureStateText(Availability::NoAdapters), u"התעבורה אינה נמדדת: לא נמצא מתאם רשת");
   EXPECT_EQ(CaptureStateText(Availability::NoLibrary), u"התעבורה אינה נמדדת: ספריית לכידת המנות חסרה");
+  EXPECT_EQ(CaptureStateText(Availability::AdapterGone), u"התעבורה אינה נמדדת: ההתקן אינו מחובר");
+}
+
+TEST_F(CaptureSessionTest, The_state_line_tells_hour_and_minute_with_two_digits_each) {
+  const auto lineOf = [](std::int32_t second) { return CaptureStateText(Availability::AdapterGone, second); };
+  EXPECT_EQ(lineOf(0), u"התעבורה אינה נמדדת: ההתקן נותק בשעה 00:00");
+  EXPECT_EQ(lineOf(9 * 3600 + 5 * 60 + 59), u"התעבורה אינה נמדדת: ההתקן נותק בשעה 09:05");
+  EXPECT_EQ(lineOf(86399), u"התעבורה אינה נמדדת: ההתקן נותק בשעה 23:59");
 }
 
 TEST_F(CaptureSessionTest, Without_adapters_the_page_says_so) {
@@ -345,6 +353,19 @@ TEST_F(CaptureSessionTest, An_adapter_that_stands_behind_several_indexes_is_list
   StartCapture();
   EXPECT_EQ(Listed(), (Items{u"Card eth0", u"Card eth1"}));
   EXPECT_EQ(capture.CurrentAdapter, 0);
+}
+
+TEST_F(CaptureSessionTest, A_session_that_has_gone_is_told_of_no_adapter) {
+  AddAdapter("eth0");
+  {
+    CaptureFields other;
+    CaptureSession brief(machine.Operations(), desktop, form.Page(), other, attribution);
+    brief.InitLibrary();
+  }
+  machine.capture.vpSetCurrentAdapter(0);
+  machine.capture.vpBegin(1000);
+  machine.capture.RemoveAdapter("eth0");
+  EXPECT_EQ(StateLine(), u"");
 }
 
 TEST_F(CaptureSessionTest, The_control_goes_with_the_session) {

@@ -17,6 +17,11 @@ class LinkedNamespaces {
   LinkedNamespaces() {
     near_ = std::make_unique<NetworkNamespace>();
     far_ = std::make_unique<NetworkNamespace>();
+    MakeLink();
+  }
+
+  /// Makes the link; again, when it has been taken away.
+  void MakeLink() {
     near_->Enter();
     const std::string far = "/proc/" + std::to_string(getpid()) + "/fd/" + std::to_string(far_->Descriptor());
     RunCommand("ip link add qnear address 02:00:00:00:00:01 type veth peer name qfar address "

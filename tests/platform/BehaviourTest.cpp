@@ -387,6 +387,11 @@ TEST_P(BehaviourTest, The_day_number_is_one_of_this_century) {
   EXPECT_LT(machine.system.DayNumber(), 73050);
 }
 
+TEST_P(BehaviourTest, The_second_of_the_day_lies_between_midnight_and_midnight) {
+  EXPECT_GE(machine.system.SecondOfDay(), 0);
+  EXPECT_LT(machine.system.SecondOfDay(), 86400);
+}
+
 // Capture.
 
 TEST_P(BehaviourTest, The_capture_library_has_named_adapters_or_says_that_there_are_none) {

@@ -69,6 +69,15 @@ TEST_F(LinuxCaptureListTest, The_adapter_of_a_default_route_that_came_later_is_t
   EXPECT_EQ(List().front(), "qv0");
 }
 
+TEST_F(LinuxCaptureListTest, Loopback_that_comes_up_during_a_session_is_captured_from) {
+  List();
+  capture->vpSetCurrentAdapter(0);
+  capture->vpBegin(1000);
+  EXPECT_EQ(capture->availability(), Availability::NoAdapters);
+  RunCommand("ip link set lo up");
+  WaitUntil([&] { return capture->availability() == Availability::Available; }, "loopback");
+}
+
 TEST_F(LinuxCaptureListTest, Each_index_has_an_adapter_and_spare_ones_repeat_the_last) {
   AddLink("qv0", "qv1", "10.9.0.1/24");
   EXPECT_EQ(List().size(), 2u);

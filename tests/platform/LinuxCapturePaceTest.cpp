@@ -1,5 +1,7 @@
 #include "platform/LinuxCaptureFixture.h"
 
+#include <sys/socket.h>
+
 namespace quendra::platform::linux_ {
 
 using integration::RawLink;
@@ -7,14 +9,16 @@ using integration::TcpFrame;
 
 namespace {
 
-/// A desktop's loop that tells how many descriptors and timers are in use.
+/// A desktop's loop that tells how many descriptors of captures and how many timers are in use.
 class CountingLoop : public EventLoop {
  public:
   explicit CountingLoop(EventLoop& loop) : loop_(loop) {}
 
   void Post(std::function<void()> work) override { loop_.Post(std::move(work)); }
   std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override {
-    return std::make_unique<Counted>(loop_.WatchDescriptor(descriptor, std::move(ready)), watches);
+    auto subscription = loop_.WatchDescriptor(descriptor, std::move(ready));
+    if (!IsCapture(descriptor)) return subscription;
+    return std::make_unique<Counted>(std::move(subscription), watches);
   }
   std::unique_ptr<Subscription> StartTimer(int milliseconds, std::function<void()> tick) override {
     return std::make_unique<Counted>(loop_.StartTimer(milliseconds, std::move(tick)), timers);
@@ -36,6 +40,12 @@ class CountingLoop : public EventLoop {
     std::unique_ptr<Subscription> inner_;
     int& count_;
   };
+
+  static bool IsCapture(int descriptor) {
+    int domain = 0;
+    socklen_t size = sizeof domain;
+    return getsockopt(descriptor, SOL_SOCKET, SO_DOMAIN, &domain, &size) == 0 && domain == AF_PACKET;
+  }
 
   EventLoop& loop_;
 };

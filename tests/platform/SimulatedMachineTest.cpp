@@ -286,7 +286,8 @@ TEST_F(SimulatedMachineTest, Host_names_fail_when_told_to) {
 // Capture.
 
 struct SimulatedCaptureTest : SimulatedMachineTest {
-  SimulatedCaptureTest() { machine.AddCaptureAdapter({"\\Device\\NPF_{1}", "Ethernet", "10.0.0.7"}); }
+  static constexpr const char* kAdapter = "\\Device\\NPF_{1}";
+  SimulatedCaptureTest() { machine.AddCaptureAdapter({kAdapter, "Ethernet", "10.0.0.7"}); }
   std::int32_t result = 0;
   FrameBytes frame;
   CaptureHeader header{};
@@ -405,6 +406,34 @@ TEST_F(SimulatedCaptureTest, Making_a_control_faults_when_told_to) {
   EXPECT_THROW((void)operations.captureControls.Create(), Fault);
 
   EXPECT_EQ(machine.capture.LiveControls(), 0);
+}
+
+TEST_F(SimulatedCaptureTest, An_adapter_that_is_removed_in_its_session_is_told_of_and_delivers_nothing) {
+  std::vector<CaptureLibrary::Availability> told;
+  machine.capture.AdapterChanged = [&] { told.push_back(machine.capture.availability()); };
+  operations.captureLibrary.vpSetCurrentAdapter(0);
+  operations.captureLibrary.vpBegin(1000);
+  machine.capture.RemoveAdapter(kAdapter);
+  machine.capture.RemoveAdapter(kAdapter);
+  machine.Deliver(Bytes(60));
+  EXPECT_LT(operations.captureLibrary.vpCapture(frame, header), 0);
+  machine.capture.ReturnAdapter(kAdapter);
+  machine.Deliver(Bytes(60));
+  EXPECT_EQ(operations.captureLibrary.vpCapture(frame, header), 60);
+  EXPECT_EQ(told, (std::vector{CaptureLibrary::Availability::AdapterGone,
+                               CaptureLibrary::Availability::Available}));
+}
+
+TEST_F(SimulatedCaptureTest, An_adapter_that_is_removed_outside_its_session_is_not_told_of) {
+  int told = 0;
+  machine.capture.AdapterChanged = [&] { ++told; };
+  machine.capture.RemoveAdapter(kAdapter);
+  EXPECT_EQ(machine.capture.availability(), CaptureLibrary::Availability::Available);
+  operations.captureLibrary.vpSetCurrentAdapter(0);
+  operations.captureLibrary.vpBegin(1000);
+  EXPECT_EQ(machine.capture.availability(), CaptureLibrary::Availability::AdapterGone);
+  machine.capture.RemoveAdapter("eth1");
+  EXPECT_EQ(told, 0);
 }
 
 TEST_F(SimulatedCaptureTest, The_library_gives_the_last_adapters_index_or_what_it_is_told) {

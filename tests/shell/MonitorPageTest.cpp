@@ -35,6 +35,7 @@ class Recorder : public forms::ListViewObserver, public platform::HostNames, pub
   std::uint32_t GetTickCount() override { return machine_.system.GetTickCount(); }
   bool GetVersionExA(platform::OsVersion& version) override { return machine_.system.GetVersionExA(version); }
   void Sleep(std::uint32_t milliseconds) override { machine_.system.Sleep(milliseconds); }
+  std::int32_t SecondOfDay() override { return machine_.system.SecondOfDay(); }
   std::int32_t DayNumber() override {
     Note("day number");
     return machine_.system.DayNumber();

@@ -21,6 +21,7 @@ class RecordingSystem : public platform::System {
   }
   void Sleep(std::uint32_t milliseconds) override { system_.Sleep(milliseconds); }
   std::int32_t DayNumber() override { return system_.DayNumber(); }
+  std::int32_t SecondOfDay() override { return system_.SecondOfDay(); }
 
  private:
   platform::System& system_;

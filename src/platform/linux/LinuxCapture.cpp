@@ -16,7 +16,11 @@ void CopyPadded(const std::string& text, std::array<char, 255>& field) {
 } // namespace
 
 LinuxCapture::LinuxCapture(EventLoop& loop, PcapLibrary library)
-    : core_(std::make_shared<LinuxCaptureCore>(loop, std::move(library))) {}
+    : core_(std::make_shared<LinuxCaptureCore>(loop, std::move(library))) {
+  core_->OnAdapterChanged = [this] {
+    if (const auto handler = AdapterChanged) handler();
+  };
+}
 
 LinuxCapture::~LinuxCapture() { core_->End(); }
 

@@ -37,14 +37,20 @@ const CaptureAdapter* LinuxCaptureCore::AdapterAt(int index) const {
 void LinuxCaptureCore::ListAdapters() {
   using Availability = CaptureLibrary::Availability;
   if (!library_.IsThere()) {
-    availability_ = Availability::NoLibrary;
+    listed_ = Availability::NoLibrary;
     return;
   }
   adapters_ = ListCaptureAdapters(library_);
   // What is listed when there is nothing to list is down.
-  availability_ = NumberOfAdapterThatIsUp(adapters_.front().name) == 0 ? Availability::NoAdapters
-                  : MayCapture()                                       ? Availability::Available
-                                                                       : Availability::NoRights;
+  listed_ = NumberOfAdapterThatIsUp(adapters_.front().name) == 0 ? Availability::NoAdapters
+            : MayCapture()                                       ? Availability::Available
+                                                                 : Availability::NoRights;
+}
+
+CaptureLibrary::Availability LinuxCaptureCore::Availability() const {
+  using Availability = CaptureLibrary::Availability;
+  if (listed_ == Availability::NoAdapters && session_ != nullptr) return Availability::Available;
+  return listed_ == Availability::Available && gone_ ? Availability::AdapterGone : listed_;
 }
 
 const std::string& LinuxCaptureCore::CurrentName() const {
@@ -62,21 +68,38 @@ void LinuxCaptureCore::SelectAdapter(int adapter) {
 
 void LinuxCaptureCore::Begin() {
   begun_ = true;
-  if (!HasSession()) Open();
+  if (HasSession()) return;
+  links_ = std::make_unique<LinkWatch>(loop_, [weak = weak_from_this()] {
+    if (const auto core = weak.lock()) core->LinksChanged();
+  });
+  Open();
 }
 
 void LinuxCaptureCore::End() {
   begun_ = false;
+  links_.reset();
   Close();
 }
 
 void LinuxCaptureCore::Open() {
   Close();
-  if (!CurrentName().empty()) session_ = PcapSession::Open(library_, CurrentName(), queue_);
-  UpdateBell();
+  OpenSession();
 }
 
 void LinuxCaptureCore::Close() {
+  CloseSession();
+  queue_.Clear();
+  gone_ = awaitsAddress_ = false;
+}
+
+void LinuxCaptureCore::OpenSession() {
+  link_ = CurrentName().empty() ? 0 : NumberOfAdapterThatIsUp(CurrentName());
+  if (link_ != 0) session_ = PcapSession::Open(library_, CurrentName(), queue_);
+  gone_ = session_ == nullptr;
+  UpdateBell();
+}
+
+void LinuxCaptureCore::CloseSession() {
   watch_.reset();
   pace_.reset();
   if (session_ != nullptr) {
@@ -85,7 +108,39 @@ void LinuxCaptureCore::Close() {
     earlier_.droppedByKernel += statistics.dropped;
   }
   session_.reset();
-  queue_.Clear();
+}
+
+/// Some interface has come, gone or changed, perhaps the session's.
+void LinuxCaptureCore::LinksChanged() {
+  // What came before the interface went is still to be charged.
+  if (!FollowsLink() && !inEvent_ && !secondRingPosted_) Serve();
+  if (!begun_) return; // the event has left the page
+  if (FollowsLink())
+    AwaitAddress();
+  else
+    TakeUpLink();
+}
+
+/// Whether the session is on the interface that bears its name now.
+bool LinuxCaptureCore::FollowsLink() const {
+  return NumberOfAdapterThatIsUp(CurrentName()) == link_ && HasSession() == (link_ != 0);
+}
+
+/// Frames that wait stay, for the drain that may be under way.
+void LinuxCaptureCore::TakeUpLink() {
+  const bool wasGone = gone_;
+  if (HasSession()) Gather(kMostBatches);
+  CloseSession();
+  OpenSession();
+  if (wasGone && gone_) return;
+  awaitsAddress_ = !gone_ && AddressOfAdapter(CurrentName()) == 0;
+  OnAdapterChanged();
+}
+
+void LinuxCaptureCore::AwaitAddress() {
+  if (!awaitsAddress_ || AddressOfAdapter(CurrentName()) == 0) return;
+  awaitsAddress_ = false;
+  OnAdapterChanged();
 }
 
 std::int32_t LinuxCaptureCore::Capture(FrameBytes& frame, CaptureHeader& header) {
@@ -153,6 +208,13 @@ bool LinuxCaptureCore::Serve() {
   // none all of them move, so that the record by which the next event is judged is the newest there is.
   const int batches = queue_.Empty() ? 1 : kMostBatches;
   queue_.Rewind();
+  const bool moved = Gather(batches);
+  if (moved) Ring();
+  return moved;
+}
+
+/// False when the kernel had nothing.
+bool LinuxCaptureCore::Gather(int batches) {
   bool moved = false;
   for (int batch = 0; batch < batches; ++batch) {
     MakeRoom();
@@ -160,7 +222,6 @@ bool LinuxCaptureCore::Serve() {
     moved = moved || count > 0;
     if (count < PcapSession::kBatch) break;
   }
-  if (moved) Ring();
   return moved;
 }
 

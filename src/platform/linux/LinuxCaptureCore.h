@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/linux/LinkWatch.h"
 #include "platform/linux/LinuxCapture.h"
 #include "platform/linux/LinuxCaptureAdapters.h"
 #include "platform/linux/PcapSession.h"
@@ -28,7 +29,9 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   const std::vector<CaptureAdapter>& Adapters() const { return adapters_; }
   /// nullptr beyond the indexes.
   const CaptureAdapter* AdapterAt(int index) const;
-  CaptureLibrary::Availability Availability() const { return availability_; }
+  CaptureLibrary::Availability Availability() const;
+  /// As CaptureLibrary::AdapterChanged.
+  std::function<void()> OnAdapterChanged;
 
   void SelectAdapter(int adapter);
   void Begin();
@@ -50,12 +53,19 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   const std::string& CurrentName() const;
   void Open();
   void Close();
+  void OpenSession();
+  void CloseSession();
+  void LinksChanged();
+  bool FollowsLink() const;
+  void TakeUpLink();
+  void AwaitAddress();
   bool HasSession() const { return session_ != nullptr && !session_->Failed(); }
   bool MayRing() const;
   void UpdateBell();
   void DescriptorReady();
   void LookAgain();
   bool Serve();
+  bool Gather(int batches);
   void MakeRoom();
   void Ring();
   void RingAgain();
@@ -64,13 +74,18 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   const PcapLibrary library_;
   std::vector<CaptureAdapter> adapters_;
   int indexes_ = 0;
-  CaptureLibrary::Availability availability_ = CaptureLibrary::Availability::NoAdapters;
+  CaptureLibrary::Availability listed_ =
+      CaptureLibrary::Availability::NoAdapters; // when adapters were listed
   int current_ = -1;
   bool begun_ = false;
 
   PcapFrameQueue queue_;
   std::unique_ptr<PcapSession> session_;
-  CaptureCounters earlier_; // of sessions that were closed; droppedByQueue and rejected of all
+  std::unique_ptr<LinkWatch> links_; // from begin to end
+  unsigned link_ = 0;                // the number of the interface that the session was opened on, 0 for none
+  bool gone_ = false;                // the session waits for its interface
+  bool awaitsAddress_ = false;       // the interface has come back without one
+  CaptureCounters earlier_;          // of sessions that were closed; droppedByQueue and rejected of all
 
   CaptureControl* control_ = nullptr;
   std::string controlAdapter_;

@@ -20,6 +20,7 @@ class LinuxSystem : public System {
   bool GetVersionExA(OsVersion& version) override;
   void Sleep(std::uint32_t milliseconds) override;
   std::int32_t DayNumber() override;
+  std::int32_t SecondOfDay() override;
 
  private:
   Clock clock_;

@@ -88,6 +88,7 @@ SimulatedCapture::~SimulatedCapture() {
 }
 
 void SimulatedCapture::Deliver(std::vector<std::uint8_t> frame, std::uint32_t wireLength) {
+  if (IsGone()) return;
   const auto length = static_cast<std::uint32_t>(frame.size());
   newest_ = {std::move(frame), core_.tickCount, wireLength == 0 ? length : wireLength, 0};
   waiting_.push_back(newest_);
@@ -95,6 +96,30 @@ void SimulatedCapture::Deliver(std::vector<std::uint8_t> frame, std::uint32_t wi
 
 void SimulatedCapture::FailCapture(std::int32_t result) {
   waiting_.push_back({{}, core_.tickCount, 0, result});
+}
+
+const CaptureAdapter* SimulatedCapture::AdapterOfSession() const {
+  const auto index = static_cast<std::size_t>(SelectedAdapter);
+  return SessionOpen && SelectedAdapter >= 0 && index < Adapters.size() ? &Adapters[index] : nullptr;
+}
+
+bool SimulatedCapture::IsGone() const {
+  const CaptureAdapter* adapter = AdapterOfSession();
+  return adapter != nullptr && removed_.contains(adapter->name);
+}
+
+void SimulatedCapture::RemoveAdapter(const std::string& name) {
+  if (removed_.insert(name).second) TellOfAdapter(name);
+}
+
+void SimulatedCapture::ReturnAdapter(const std::string& name) {
+  if (removed_.erase(name) != 0) TellOfAdapter(name);
+}
+
+void SimulatedCapture::TellOfAdapter(const std::string& name) {
+  const CaptureAdapter* adapter = AdapterOfSession();
+  if (adapter == nullptr || adapter->name != name) return;
+  if (const auto handler = AdapterChanged) handler();
 }
 
 bool SimulatedCapture::SignalPackets() {
@@ -146,7 +171,7 @@ std::int32_t SimulatedCapture::vpCapture(FrameBytes& frame, CaptureHeader& heade
   ++CaptureCalls;
   if (RecordFrameCalls) Record("vpCapture");
   frame = FrameBytes(kBlankFrame.data(), static_cast<int>(kBlankFrame.size()));
-  if (waiting_.empty()) return 0;
+  if (waiting_.empty()) return IsGone() ? -1 : 0;
   if (waiting_.front().failure != 0) {
     const std::int32_t failure = waiting_.front().failure;
     waiting_.pop_front();
@@ -175,7 +200,9 @@ void SimulatedCapture::vpSetParam(std::int32_t parameter, std::int32_t value) {
 }
 
 CaptureLibrary::Availability SimulatedCapture::availability() const {
-  return Available.value_or(Adapters.empty() ? Availability::NoAdapters : Availability::Available);
+  return Available.value_or(Adapters.empty() ? Availability::NoAdapters
+                            : IsGone()       ? Availability::AdapterGone
+                                             : Availability::Available);
 }
 
 std::unique_ptr<CaptureControl> SimulatedCapture::Create() {

@@ -5,6 +5,7 @@
 
 #include <deque>
 #include <optional>
+#include <set>
 
 namespace quendra::platform::simulated {
 
@@ -27,7 +28,7 @@ class SimulatedCapture : public CaptureLibrary, public CaptureControls {
   std::vector<CaptureAdapter> Adapters;
   /// What VBPcapInit gives in place of the last adapter's index.
   std::optional<std::int32_t> InitResult;
-  /// Unset: Available with adapters, NoAdapters without.
+  /// Unset: Available with adapters, NoAdapters without, AdapterGone in a session on one that was removed.
   std::optional<Availability> Available;
   /// Other than 0: the fault that Create raises.
   int CreateFault = 0;
@@ -40,6 +41,11 @@ class SimulatedCapture : public CaptureLibrary, public CaptureControls {
   /// The header length that capture records state.
   std::uint16_t RecordHeaderLength = 20;
   bool RecordFrameCalls = false;
+
+  /// The adapter goes or is there again under its name; its index stands. On the adapter of the open session
+  /// this raises AdapterChanged, and while it is gone no frame arrives.
+  void RemoveAdapter(const std::string& name);
+  void ReturnAdapter(const std::string& name);
 
   /// Raises PacketReceived of the live control. False when there is none, its events aren't started or nobody
   /// listens.
@@ -77,9 +83,13 @@ class SimulatedCapture : public CaptureLibrary, public CaptureControls {
     std::int32_t failure = 0;
   };
 
+  const CaptureAdapter* AdapterOfSession() const;
+  bool IsGone() const;
+  void TellOfAdapter(const std::string& name);
   void Record(std::string call) { core_.calls.push_back(std::move(call)); }
 
   Core& core_;
+  std::set<std::string> removed_;
   std::deque<Frame> waiting_;
   Frame current_;
   Frame newest_;

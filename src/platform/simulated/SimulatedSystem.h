@@ -16,7 +16,8 @@ class SimulatedSystem : public System {
   /// Family 2, version 5.1 unless set.
   OsVersion Version{2, 5, 1};
   bool FailVersion = false;
-  std::int32_t Day = 38353; ///< 1 January 2005
+  std::int32_t Day = 38353;        ///< 1 January 2005
+  std::int32_t Second = 12 * 3600; ///< of the day
 
   std::uint32_t GetTickCount() override { return core_.tickCount; }
   bool GetVersionExA(OsVersion& version) override {
@@ -28,6 +29,7 @@ class SimulatedSystem : public System {
     core_.tickCount += milliseconds;
   }
   std::int32_t DayNumber() override { return Day; }
+  std::int32_t SecondOfDay() override { return Second; }
 
  private:
   Core& core_;
