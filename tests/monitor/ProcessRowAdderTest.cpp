@@ -199,6 +199,19 @@ TEST_F(NewRow, Is_the_systems_below_any_of_the_five) {
   }
 }
 
+TEST_F(NewRow, Of_the_kernel_and_of_process_1_is_the_systems_in_a_snapshot_as_Linux_gives_it) {
+  machine.AddProcess({2, 2, "System", ""});
+  machine.AddProcess({1, 2, "services.exe", ""});
+  machine.AddProcess({3, 2, "kworker", ""});
+  machine.AddProcess({400, 1, "sshd", ""});
+  machine.AddProcess({500, 1, "explorer.exe", ""});
+  machine.AddProcess({600, 500, "browser", ""});
+  Pass();
+  for (const std::uint32_t id : {1u, 2u, 3u}) EXPECT_EQ(ClassOf(id), u"System") << id;
+  for (const std::uint32_t id : {400u, 500u}) EXPECT_EQ(ClassOf(id), u"Service") << id;
+  EXPECT_EQ(ClassOf(600), u"User");
+}
+
 TEST_F(NewRow, Of_an_unknown_parent_takes_the_class_of_the_row_added_before_it) {
   machine.AddProcess({100, 9999, "services.exe", ""});
   machine.AddProcess({11, 100, "a.exe", ""});

@@ -1,8 +1,10 @@
 #include "LinuxFixture.h"
+#include "platform/linux/ProcFolder.h"
 
 #include <fcntl.h>
 #include <poll.h>
 #include <signal.h>
+#include <sys/syscall.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -10,6 +12,7 @@
 #include <filesystem>
 #include <fstream>
 #include <stdexcept>
+#include <thread>
 
 namespace quendra::platform::linux_ {
 
@@ -84,6 +87,17 @@ void FakeProc::RemoveDescriptor(std::uint32_t processId, std::uint32_t descripto
   fs::remove(FolderOf(processId) + "/fd/" + std::to_string(descriptor));
 }
 
+void FakeProc::AddThread(std::uint32_t processId, std::uint32_t threadId, const Process& figures) {
+  WriteProcess(FolderOf(processId) + "/task/" + std::to_string(threadId), threadId, figures);
+}
+
+void FakeProc::AddSocketOfThread(std::uint32_t processId, std::uint32_t threadId, std::uint32_t descriptor,
+                                 std::uint32_t node) {
+  fs::create_symlink("socket:[" + std::to_string(node) + "]", FolderOf(processId) + "/task/" +
+                                                                  std::to_string(threadId) + "/fd/" +
+                                                                  std::to_string(descriptor));
+}
+
 namespace {
 
 /// What comes through the pipe until its other end goes; at most ten seconds between two pieces.
@@ -150,6 +164,34 @@ void Child::End() {
   ::kill(id_, SIGKILL);
   ::waitpid(id_, nullptr, 0);
   id_ = -1;
+}
+
+ProcessWithoutFirstThread::ProcessWithoutFirstThread() {
+  id_ = ::fork();
+  if (id_ < 0) throw std::runtime_error("no process");
+  if (id_ == 0) {
+    ::alarm(60);
+    std::thread([] {
+      for (;;) ::pause();
+    }).detach();
+    ::syscall(SYS_exit, 0);
+  }
+  const ProcFolder proc;
+  if (!Wait([&] { return proc.Stat(Id()).value_or(ProcessStat{}).state == 'Z'; }))
+    throw std::runtime_error("the first thread does not end");
+}
+
+ProcessWithoutFirstThread::~ProcessWithoutFirstThread() {
+  ::kill(id_, SIGKILL);
+  ::waitpid(id_, nullptr, 0);
+}
+
+bool Wait(const std::function<bool()>& done) {
+  for (int i = 0; i < 2000; ++i) {
+    if (done()) return true;
+    ::usleep(1000);
+  }
+  return done();
 }
 
 bool RunShell(const std::string& command) { return std::system((command + " >/dev/null 2>&1").c_str()) == 0; }

@@ -49,6 +49,10 @@ class FakeProc {
   void AddDescriptor(std::uint32_t processId, std::uint32_t descriptor, const std::string& target);
   void AddSocket(std::uint32_t processId, std::uint32_t descriptor, std::uint32_t node);
   void RemoveDescriptor(std::uint32_t processId, std::uint32_t descriptor);
+  /// A thread of the process with figures, an executable and descriptors of its own.
+  void AddThread(std::uint32_t processId, std::uint32_t threadId, const Process& figures);
+  void AddSocketOfThread(std::uint32_t processId, std::uint32_t threadId, std::uint32_t descriptor,
+                         std::uint32_t node);
   std::string FolderOf(std::uint32_t processId) const { return folder_ / std::to_string(processId); }
 
  private:
@@ -82,6 +86,23 @@ class Child {
   pid_t id_ = -1;
   std::string answer_;
 };
+
+/// A process of the test's own whose first thread has ended while another waits to be ended. It inherits what
+/// the test has open.
+class ProcessWithoutFirstThread {
+ public:
+  ProcessWithoutFirstThread();
+  ~ProcessWithoutFirstThread();
+  ProcessWithoutFirstThread(const ProcessWithoutFirstThread&) = delete;
+
+  std::uint32_t Id() const { return static_cast<std::uint32_t>(id_); }
+
+ private:
+  pid_t id_ = -1;
+};
+
+/// Asks again until `done` says so, for two seconds at most; false when the time ran out.
+bool Wait(const std::function<bool()>& done);
 
 /// Runs a command of the shell, bounded by its own nature; true for status 0.
 bool RunShell(const std::string& command);

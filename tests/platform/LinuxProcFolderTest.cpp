@@ -2,7 +2,11 @@
 #include "platform/linux/ProcFolder.h"
 
 #include <gtest/gtest.h>
+#include <sys/socket.h>
+#include <sys/stat.h>
 #include <unistd.h>
+
+#include <algorithm>
 
 namespace quendra::platform::linux_ {
 
@@ -104,6 +108,107 @@ TEST(LinuxProcFolder, The_path_of_a_replaced_file_is_told_without_the_kernels_re
   FakeProc proc;
   proc.Add(5, {"browser", 1, "/opt/browser (deleted)"});
   EXPECT_EQ(ProcFolder(proc.Path()).Executable(5), "/opt/browser");
+}
+
+/// A copy of a program that waits, started.
+struct StartedCopy {
+  explicit StartedCopy(const std::string& name)
+      : path(folder / name), isCopied(RunShell("cp /bin/sleep '" + path + "'")), child({path, "50"}) {}
+  std::optional<std::string> Path() const {
+    return ProcFolder().Executable(static_cast<std::uint32_t>(child.Id()));
+  }
+  bool IsHere() const {
+    const ProcFolder proc;
+    const auto file = ProcFolder::Executable(proc.Open(static_cast<std::uint32_t>(child.Id())));
+    return file && file->isHere;
+  }
+
+  TemporaryFolder folder;
+  std::string path;
+  bool isCopied;
+  Child child;
+};
+
+TEST(LinuxProcFolder, A_file_that_is_really_named_like_a_deleted_one_keeps_its_whole_name) {
+  const StartedCopy tool("tool (deleted)");
+  EXPECT_EQ(tool.Path(), tool.path);
+  EXPECT_TRUE(tool.IsHere());
+}
+
+TEST(LinuxProcFolder, Of_a_deleted_file_that_was_named_like_one_only_the_kernels_remark_is_cut) {
+  const StartedCopy tool("tool (deleted)");
+  ASSERT_EQ(::unlink(tool.path.c_str()), 0);
+  EXPECT_EQ(tool.Path(), tool.path);
+}
+
+TEST(LinuxProcFolder, A_file_that_took_the_name_of_the_kernels_remark_does_not_keep_it_on_another) {
+  const StartedCopy tool("tool");
+  ASSERT_EQ(::unlink(tool.path.c_str()), 0);
+  tool.folder.Write("tool (deleted)", "other", true);
+  EXPECT_EQ(tool.Path(), tool.path);
+}
+
+TEST(LinuxProcFolder, A_process_whose_file_an_update_replaced_still_runs_the_program_of_that_path) {
+  const StartedCopy tool("tool");
+  ASSERT_EQ(::unlink(tool.path.c_str()), 0);
+  EXPECT_TRUE(tool.IsHere());
+  tool.folder.Write("tool", "newer", true);
+  EXPECT_TRUE(tool.IsHere());
+}
+
+TEST(LinuxProcFolder, A_process_whose_file_another_user_replaced_does_not_run_the_program_of_that_path) {
+  if (::geteuid() != 0) GTEST_SKIP() << "only the administrator can give a file to another user";
+  const StartedCopy tool("tool");
+  ASSERT_EQ(::unlink(tool.path.c_str()), 0);
+  tool.folder.Write("tool", "other", true);
+  ASSERT_EQ(::chown(tool.path.c_str(), 4242, 4242), 0);
+  EXPECT_FALSE(tool.IsHere());
+}
+
+TEST(LinuxProcFolder, A_process_that_runs_another_file_under_a_path_does_not_run_the_one_that_is_here) {
+  if (::geteuid() != 0) GTEST_SKIP() << "only the administrator may mount";
+  const TemporaryFolder folder;
+  const std::string program = folder.Write("program", "not this one", true);
+  const Child child({"/usr/bin/unshare", "--mount", "/bin/sh", "-c",
+                     "mount --bind /bin/sleep " + program + " && exec " + program + " 50"});
+  const ProcFolder proc;
+  const auto id = static_cast<std::uint32_t>(child.Id());
+  ASSERT_TRUE(Wait([&] { return proc.Executable(id) == program; }));
+  const auto file = ProcFolder::Executable(proc.Open(id));
+  ASSERT_TRUE(file);
+  EXPECT_FALSE(file->isHere);
+}
+
+TEST(LinuxProcFolder, A_process_whose_first_thread_has_ended_is_asked_about_through_another) {
+  int ends[2];
+  ASSERT_EQ(::socketpair(AF_UNIX, SOCK_STREAM, 0, ends), 0);
+  struct stat socket {};
+  ASSERT_EQ(::fstat(ends[0], &socket), 0);
+  const ProcessWithoutFirstThread process;
+  const ProcFolder proc;
+  const std::string own = proc.Executable(static_cast<std::uint32_t>(::getpid())).value_or("(none)");
+  EXPECT_TRUE(proc.HasLivingThread(process.Id()));
+  EXPECT_EQ(proc.Executable(process.Id()), own);
+  const auto file = ProcFolder::Executable(proc.Open(process.Id()));
+  ASSERT_TRUE(file);
+  EXPECT_EQ(file->path, own);
+  EXPECT_TRUE(file->isHere);
+  EXPECT_EQ(proc.SocketOf(process.Id(), static_cast<std::uint32_t>(ends[0])), socket.st_ino);
+  ProcFolder::Descriptors descriptors(proc, process.Id());
+  std::vector<std::uint32_t> numbers;
+  descriptors.List(numbers);
+  EXPECT_TRUE(std::ranges::count(numbers, static_cast<std::uint32_t>(ends[0])));
+  EXPECT_EQ(descriptors.SocketOf(static_cast<std::uint32_t>(ends[0])), socket.st_ino);
+  ::close(ends[0]);
+  ::close(ends[1]);
+}
+
+TEST(LinuxProcFolder, A_process_that_has_ended_as_a_whole_has_no_living_thread) {
+  FakeProc proc;
+  proc.Add(5, {"a", 1, "", 'Z'});
+  EXPECT_FALSE(ProcFolder(proc.Path()).HasLivingThread(5));
+  for (const std::uint32_t thread : {5u, 6u}) proc.AddThread(5, thread, {"a", 1, "", 'Z'});
+  EXPECT_FALSE(ProcFolder(proc.Path()).HasLivingThread(5));
 }
 
 TEST(LinuxProcFolder, The_own_process_is_found_in_the_real_folder) {

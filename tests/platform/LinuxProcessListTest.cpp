@@ -9,6 +9,8 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <algorithm>
+
 namespace quendra::platform::linux_ {
 
 namespace {
@@ -105,6 +107,40 @@ TEST_F(LinuxProcessList, A_process_that_has_ended_and_waits_for_its_parent_is_le
   EXPECT_EQ(NameOf(9), "(none)");
 }
 
+TEST_F(LinuxProcessList, A_process_whose_first_thread_alone_has_ended_keeps_its_row_and_its_name) {
+  proc.Add(9, {"Main", 4, "", 'Z'});
+  proc.AddThread(9, 9, {"Main", 4, "", 'Z'});
+  proc.AddThread(9, 10, {"Worker", 4, "/usr/bin/worker"});
+  EXPECT_EQ(NameOf(9), "worker");
+}
+
+TEST_F(LinuxProcessList, System_comes_first_as_the_parent_of_itself_and_of_process_1) {
+  proc.Add(1, {"systemd", 0, "/usr/lib/systemd/systemd", 'S', false, 1});
+  proc.Add(2, {"kthreadd", 0, "", 'S', true, 1});
+  proc.Add(3, {"kworker/0:1", 2, "", 'I', true, 1});
+  const auto rows = Rows();
+  ASSERT_EQ(rows.size(), 3u);
+  EXPECT_EQ(rows[0].name, "System");
+  EXPECT_EQ(rows[0].parentProcessId, 2u);
+  EXPECT_EQ(rows[1].name, "services.exe");
+  EXPECT_EQ(rows[1].parentProcessId, 2u);
+  EXPECT_EQ(rows[2].parentProcessId, 2u);
+}
+
+TEST_F(LinuxProcessList, A_parent_that_cannot_be_seen_is_no_processs_id) {
+  proc.Add(1, {"init", 0, "/sbin/init"});
+  EXPECT_EQ(Rows()[0].parentProcessId, 0xFFFFFFFFu);
+}
+
+TEST_F(LinuxProcessList, Processes_come_in_the_order_of_their_starts_also_when_the_ids_have_begun_anew) {
+  proc.Add(300, {"young", 32000, "/bin/young", 'S', false, 900});
+  proc.Add(32000, {"old", 1, "/bin/old", 'S', false, 800});
+  proc.Add(31000, {"older", 1, "/bin/older", 'S', false, 700});
+  std::vector<std::uint32_t> ids;
+  for (const auto& row : Rows()) ids.push_back(row.processId);
+  EXPECT_EQ(ids, (std::vector<std::uint32_t>{31000, 32000, 300}));
+}
+
 TEST_F(LinuxProcessList, A_Hebrew_file_name_comes_in_the_code_page) {
   proc.Add(9, {"x", 1, "/home/user/דפדפן"});
   EXPECT_EQ(NameOf(9), ToCodePage(u"דפדפן"));
@@ -196,6 +232,17 @@ TEST(LinuxProcessListOfThisMachine, Programs_under_hostile_file_names_are_listed
       if (row.processId == static_cast<std::uint32_t>(child.Id())) found = row.name;
     EXPECT_EQ(found, name);
   }
+}
+
+TEST(LinuxProcessListOfThisMachine, A_process_whose_first_thread_has_ended_has_its_row) {
+  const ProcessWithoutFirstThread process;
+  const ProcFolder proc;
+  ProcessList list(proc);
+  std::vector<ProcessList::Row> rows;
+  ASSERT_TRUE(list.Read(rows));
+  const auto row = std::ranges::find(rows, process.Id(), &ProcessList::Row::processId);
+  ASSERT_NE(row, rows.end());
+  EXPECT_EQ(row->name, "platform_test");
 }
 
 TEST(LinuxProcessListOfThisMachine, Processes_that_vanish_while_they_are_read_do_no_harm) {

@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <cstring>
+#include <map>
 
 namespace quendra::platform::linux_ {
 
@@ -19,6 +20,14 @@ struct LinuxProcessesTest : testing::Test {
   LinuxProcesses processes{folder, handles, paths, clock.AsClock()};
 
   Handle Snapshot() { return processes.CreateToolhelp32Snapshot(Processes::kSnapProcess, 0); }
+  TemporaryFolder files;
+
+  /// A process that runs a file of this name below a folder of the test's own; gives the file's path.
+  std::string AddRunning(std::uint32_t processId, const std::string& name) {
+    const std::string path = files.Write(name, "program", true);
+    proc.Add(processId, {"x", 1, path});
+    return path;
+  }
   /// The path as the program asks for it: into 260 blanks, stating 500.
   std::string PathOf(std::uint32_t processId) {
     const Handle process = processes.OpenProcess(1040, false, processId);
@@ -40,10 +49,11 @@ TEST_F(LinuxProcessesTest, A_snapshot_is_walked_from_its_first_process_to_its_la
   Processes::Entry entry;
   ASSERT_TRUE(processes.Process32First(snapshot, entry));
   EXPECT_EQ(entry.processId, 1u);
-  EXPECT_EQ(entry.parentProcessId, 0u);
+  EXPECT_EQ(entry.parentProcessId, 0xFFFFFFFFu);
   EXPECT_STREQ(entry.exeFile.data(), "services.exe");
   ASSERT_TRUE(processes.Process32Next(snapshot, entry));
   EXPECT_EQ(entry.processId, 7u);
+  EXPECT_EQ(entry.parentProcessId, 1u);
   EXPECT_STREQ(entry.exeFile.data(), "seven");
   EXPECT_FALSE(processes.Process32Next(snapshot, entry));
   EXPECT_EQ(processes.GetLastError(), 18u);
@@ -94,8 +104,8 @@ TEST_F(LinuxProcessesTest, A_closed_handle_is_none_any_more) {
 }
 
 TEST_F(LinuxProcessesTest, A_thousand_opened_and_closed_processes_leave_no_handle) {
-  proc.Add(7, {"seven", 1, "/bin/seven"});
-  for (int i = 0; i < 1000; ++i) ASSERT_EQ(PathOf(7), "/bin/seven");
+  const std::string file = AddRunning(7, "seven");
+  for (int i = 0; i < 1000; ++i) ASSERT_EQ(PathOf(7), file);
   EXPECT_EQ(handles.Count(), 0u);
 }
 
@@ -123,60 +133,100 @@ TEST_F(LinuxProcessesTest, An_opened_process_is_not_mixed_up_with_one_that_takes
   EXPECT_FALSE(processes.EnumProcessModules(process, modules));
 }
 
-TEST_F(LinuxProcessesTest, A_path_is_written_over_the_start_of_the_text_and_its_length_given) {
-  proc.Add(7, {"seven", 1, "/usr/bin/seven"});
-  const Handle process = processes.OpenProcess(1040, false, 7);
-  std::string path(20, ' ');
-  EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, path, 500), 14u);
-  EXPECT_EQ(path, "/usr/bin/seven      ");
+TEST_F(LinuxProcessesTest, A_process_that_runs_no_file_of_this_machine_has_no_module) {
+  proc.Add(7, {"x", 1, "/nowhere/at/all"});
+  EXPECT_EQ(PathOf(7), "");
+  EXPECT_EQ(processes.GetLastError(), 299u);
 }
 
-TEST_F(LinuxProcessesTest, A_path_is_cut_to_the_size_stated_and_to_the_text) {
-  proc.Add(7, {"seven", 1, "/usr/bin/seven"});
+TEST_F(LinuxProcessesTest, A_path_is_written_over_the_start_of_the_text_and_its_length_given) {
+  const std::string file = AddRunning(7, "seven");
+  const Handle process = processes.OpenProcess(1040, false, 7);
+  std::string path(file.size() + 6, ' ');
+  EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, path, 500), file.size());
+  EXPECT_EQ(path, file + "      ");
+}
+
+TEST_F(LinuxProcessesTest, No_path_is_longer_than_the_size_stated_or_the_text) {
+  AddRunning(7, "seven");
   const Handle process = processes.OpenProcess(1040, false, 7);
   std::string path(20, ' ');
   EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, path, 4), 4u);
-  EXPECT_EQ(path, "/usr                ");
+  EXPECT_EQ(path.substr(4), std::string(16, ' '));
   std::string shortText(8, ' ');
   EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, shortText, 500), 8u);
-  EXPECT_EQ(shortText, "/usr/bin");
+  EXPECT_EQ(shortText.size(), 8u);
   std::string none;
   EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, none, 500), 0u);
 }
 
 TEST_F(LinuxProcessesTest, A_module_that_a_process_lacks_has_no_path) {
-  proc.Add(7, {"seven", 1, "/usr/bin/seven"});
+  AddRunning(7, "seven");
   const Handle process = processes.OpenProcess(1040, false, 7);
   std::string path(20, ' ');
   EXPECT_EQ(processes.GetModuleFileNameExA(process, 5, path, 500), 0u);
 }
 
-TEST_F(LinuxProcessesTest, A_path_of_Hebrew_letters_leads_back_to_its_file) {
-  const std::string raw = "/home/user/תוכנה";
-  proc.Add(7, {"x", 1, raw});
+TEST_F(LinuxProcessesTest, A_path_of_Hebrew_letters_stays_itself_and_leads_back_to_its_file) {
+  const std::string raw = AddRunning(7, "תוכנה");
   const std::string path = PathOf(7);
-  EXPECT_EQ(path, "/home/user/" + ToCodePage(u"תוכנה"));
+  EXPECT_EQ(path, files / ToCodePage(u"תוכנה"));
   EXPECT_EQ(paths.ToRaw(path), raw);
 }
 
 TEST_F(LinuxProcessesTest, A_hostile_path_is_cleaned_and_leads_back_to_its_file) {
-  const std::string raw = "/home/user/a\nb\u202E\u0001";
-  proc.Add(7, {"x", 1, raw});
-  EXPECT_EQ(PathOf(7), "/home/user/a?b??");
-  EXPECT_EQ(paths.ToRaw("/home/user/a?b??"), raw);
+  const std::string raw = AddRunning(7, "a\nb\u202E\u0001");
+  const std::string path = PathOf(7);
+  EXPECT_TRUE(path.ends_with(files / "a?b??")) << path;
+  EXPECT_EQ(paths.ToRaw(path), raw);
 }
 
 TEST_F(LinuxProcessesTest, A_path_cut_to_the_text_leads_back_to_its_file) {
-  const std::string raw = "/" + std::string(200, 'a') + "/" + std::string(200, 'b');
-  proc.Add(7, {"x", 1, raw});
-  EXPECT_EQ(PathOf(7), raw.substr(0, 260));
-  EXPECT_EQ(paths.ToRaw(raw.substr(0, 260)), raw);
+  const std::string raw = AddRunning(7, std::string(200, 'a') + "/" + std::string(200, 'b'));
+  const std::string path = PathOf(7);
+  EXPECT_EQ(path.size(), 260u);
+  EXPECT_EQ(paths.ToRaw(path), raw);
 }
 
-TEST_F(LinuxProcessesTest, Paths_that_lead_back_are_remembered_up_to_a_bound) {
-  for (int i = 0; i < 20'000; ++i) paths.ToSystem("/\n" + std::to_string(i));
-  EXPECT_EQ(paths.ToRaw("/?19999"), "/\n19999");
-  EXPECT_EQ(paths.ToRaw("/?1"), "/?1");
+TEST_F(LinuxProcessesTest, Files_whose_names_are_equal_in_the_code_page_have_different_paths) {
+  const std::vector<std::string> names = {"жук", "λόγ", "a\nb", "a\tb", "???", "a?b", "\xFF\xFE\xFD"};
+  std::map<std::string, std::string> rawOf;
+  for (std::uint32_t i = 0; i < names.size(); ++i) {
+    const std::string raw = AddRunning(100 + i, names[i]);
+    const std::string path = PathOf(100 + i);
+    EXPECT_TRUE(rawOf.emplace(path, raw).second) << path;
+    EXPECT_EQ(PathOf(100 + i), path);
+  }
+  for (const auto& [path, raw] : rawOf) EXPECT_EQ(paths.ToRaw(path), raw);
+}
+
+TEST_F(LinuxProcessesTest, Long_files_that_begin_alike_have_different_paths) {
+  const std::string folder = std::string(200, 'a') + "/" + std::string(100, 'b');
+  const std::string one = AddRunning(7, folder + "1"), other = AddRunning(8, folder + "2");
+  EXPECT_NE(PathOf(7), PathOf(8));
+  EXPECT_EQ(paths.ToRaw(PathOf(7)), one);
+  EXPECT_EQ(paths.ToRaw(PathOf(8)), other);
+}
+
+TEST_F(LinuxProcessesTest, A_path_that_begins_like_a_number_is_no_number) {
+  const std::string numbered = paths.ToSystem("/\n");
+  EXPECT_NE(paths.ToSystem(numbered), numbered);
+  EXPECT_EQ(paths.ToRaw(paths.ToSystem(numbered)), numbered);
+  EXPECT_EQ(paths.ToRaw("//"), "");
+  EXPECT_EQ(paths.ToRaw("//99/x"), "");
+}
+
+TEST_F(LinuxProcessesTest,
+       Paths_that_lead_back_are_remembered_up_to_a_bound_and_never_given_to_another_file) {
+  const std::string first = paths.ToSystem("/\n1");
+  std::string last;
+  for (int i = 2; i < 20'000; ++i) {
+    last = paths.ToSystem("/\n" + std::to_string(i));
+    ASSERT_NE(last, first);
+  }
+  EXPECT_EQ(paths.ToRaw(last), "/\n19999");
+  EXPECT_EQ(paths.ToRaw(first), "");
+  EXPECT_NE(paths.ToSystem("/\n1"), first);
 }
 
 TEST_F(LinuxProcessesTest, The_own_process_has_a_path) {

@@ -150,11 +150,67 @@ TEST_F(LinuxPrograms, A_program_is_found_through_the_path_and_through_links) {
   EXPECT_EQ(Field(folder / "bin2/other"), "Other");
 }
 
-TEST_F(LinuxPrograms, A_program_behind_a_script_of_its_name_is_found_by_the_name) {
-  const auto path = Program("lib/browser/browser-esr");
-  folder.Write("bin/browser-esr", "#!/bin/sh\nexec browser\n", true);
-  AddEntry("b.desktop", "Name=Browser\nExec=browser-esr %u\n");
+/// A program "browser" of the session's packages that a script starts.
+struct LinuxScriptedPrograms : LinuxPrograms {
+  void SetUp() override {
+    if (::geteuid() != 0) GTEST_SKIP() << "the folders must be the administrator's, as packages' are";
+    folder.Write("bin/browser", "#!/bin/sh\nexec browser\n", true);
+    AddEntry("b.desktop", "Name=Browser\nIcon=" + AddIcon("pictures/b.png") + "\nExec=browser %u\n");
+  }
+  /// What the file passes for: the entry's name when its icon is shown too.
+  std::string Identity(const std::string& path) {
+    const std::string name = Field(path);
+    EXPECT_EQ(IconOf(path), name.empty() ? "" : kPng);
+    return name;
+  }
+};
+
+TEST_F(LinuxScriptedPrograms, The_program_of_a_scripts_package_is_found_behind_the_script) {
+  for (const char* name :
+       {"lib/browser/browser", "lib64/browser/browser", "libexec/browser/browser", "share/browser/browser"})
+    EXPECT_EQ(Identity(Program(name)), "Browser") << name;
+}
+
+TEST_F(LinuxScriptedPrograms, The_program_of_a_folder_of_its_own_is_found_behind_the_script_in_it) {
+  folder.Write("opt/editor/bin/editor", "#!/bin/sh\n", true);
+  std::filesystem::create_symlink(folder / "opt/editor/bin/editor", folder / "bin/editor");
+  AddEntry("e.desktop", "Name=Editor\nExec=editor\n");
+  EXPECT_EQ(Field(Program("opt/editor/editor")), "Editor");
+}
+
+TEST_F(LinuxScriptedPrograms, A_foreign_file_of_the_scripts_name_is_not_that_program) {
+  for (const char* name : {"home/browser", "home/of/browser/browser", "home/lib/browser/browser",
+                           "bin2/browser", "lib/other/browser", "lib/browser/plugins/browser"})
+    EXPECT_EQ(Identity(Program(name)), "") << name;
+}
+
+TEST_F(LinuxScriptedPrograms, A_file_that_an_ordinary_user_could_have_laid_there_is_not_that_program) {
+  const auto path = Program("lib/browser/browser");
+  const auto nameWith = [&](const std::string& file, mode_t mode, uid_t owner) {
+    struct stat before {};
+    EXPECT_EQ(::stat(file.c_str(), &before), 0);
+    EXPECT_EQ(::chmod(file.c_str(), mode) + ::chown(file.c_str(), owner, 0), 0);
+    const std::string name = Field(path);
+    EXPECT_EQ(::chmod(file.c_str(), before.st_mode) + ::chown(file.c_str(), 0, 0), 0);
+    return name;
+  };
+  for (const std::string& file : {path, folder / "lib/browser", folder / "lib", folder / "bin/browser"}) {
+    EXPECT_EQ(nameWith(file, 0755, 0), "Browser") << file;
+    EXPECT_EQ(nameWith(file, 0755, 4242), "") << file;
+    EXPECT_EQ(nameWith(file, 0777, 0), "") << file;
+    EXPECT_EQ(nameWith(file, 0775, 0), "") << file;
+  }
+}
+
+TEST_F(LinuxPrograms, Files_whose_names_are_equal_in_the_code_page_do_not_share_a_program) {
+  const auto one = Program("bin/жук"), other = Program("bin/лук");
+  AddEntry("b.desktop", "Name=Browser\nIcon=" + AddIcon("pictures/b.png") + "\nExec=жук\n");
+  const std::string path = paths.ToSystem(one), otherPath = paths.ToSystem(other);
   EXPECT_EQ(Field(path), "Browser");
+  EXPECT_EQ(IconOf(path), kPng);
+  EXPECT_NE(otherPath, path);
+  EXPECT_EQ(Field(otherPath), "");
+  EXPECT_EQ(IconOf(otherPath), "");
 }
 
 TEST_F(LinuxPrograms, An_entry_whose_program_or_required_program_is_missing_does_not_hold) {

@@ -211,6 +211,34 @@ TEST_F(LinuxSocketOwners, Processes_whose_descriptors_may_not_be_read_are_passed
   EXPECT_EQ(owners->OwnerOf(700), 11u);
 }
 
+TEST_F(LinuxSocketOwners, Sockets_of_a_process_whose_first_thread_has_ended_stay_its_own) {
+  proc.Add(10, {"a"});
+  proc.AddThread(10, 10, {"a", 1, "", 'Z'});
+  proc.AddThread(10, 11, {"a"});
+  proc.AddSocketOfThread(10, 11, 5, 700);
+  Open(700);
+  Pass();
+  EXPECT_EQ(owners->OwnerOf(700), 10u);
+  for (int pass = 0; pass < 20; ++pass) {
+    Pass();
+    EXPECT_EQ(owners->ProcessesRead(), 0u);
+    EXPECT_EQ(owners->OwnerOf(700), 10u);
+  }
+}
+
+TEST_F(LinuxSocketOwners, A_first_thread_that_ends_later_leaves_its_sockets_with_the_process) {
+  proc.Add(10, {"a"});
+  proc.AddSocket(10, 5, 700);
+  Open(700);
+  Pass();
+  proc.RemoveDescriptor(10, 5);
+  proc.AddThread(10, 10, {"a", 1, "", 'Z'});
+  proc.AddThread(10, 11, {"a"});
+  proc.AddSocketOfThread(10, 11, 5, 700);
+  for (int pass = 0; pass < 5; ++pass) Pass();
+  EXPECT_EQ(owners->OwnerOf(700), 10u);
+}
+
 TEST_F(LinuxSocketOwners, Without_rights_another_users_socket_causes_no_search) {
   UseRights({false, 1000});
   proc.Add(10, {"a"});

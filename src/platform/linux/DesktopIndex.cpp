@@ -2,6 +2,7 @@
 
 #include "platform/linux/Descriptor.h"
 #include "platform/linux/Files.h"
+#include "platform/linux/StartScript.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -41,9 +42,11 @@ DesktopIndex::DesktopIndex(UserFolders folders, Clock clock)
 const DesktopEntry* DesktopIndex::EntryFor(const std::string& executable) {
   if (watch_.HasChanged() || generation_ == 0) Build();
   if (const auto found = entryOf_.find(executable); found != entryOf_.end()) return &found->second.entry;
-  // A script of the same name in a folder of programs often does nothing but start it.
+  // A script of the same name often does nothing but start it. The name alone says nothing: any file can have
+  // it.
   const auto found = entryOfScript_.find(FileNameOf(executable));
-  return found == entryOfScript_.end() ? nullptr : &found->second.entry;
+  if (found == entryOfScript_.end() || !IsProgramOfScript(executable, found->second.program)) return nullptr;
+  return &found->second.entry;
 }
 
 void DesktopIndex::Build() {
@@ -86,7 +89,7 @@ void DesktopIndex::AddEntry(const std::string& path) {
 
   const bool isScript = IsScript(program);
   const std::string key = isScript ? FileNameOf(entry->program) : program;
-  Ranked ranked{std::move(*entry), 0};
+  Ranked ranked{std::move(*entry), program, 0};
   ranked.rank = (ranked.entry.isShown ? 0 : 2) + (ranked.entry.hasArguments ? 1 : 0);
   auto& entries = isScript ? entryOfScript_ : entryOf_;
   const auto [place, isNew] = entries.try_emplace(key, ranked);

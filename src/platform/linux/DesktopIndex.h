@@ -28,6 +28,7 @@ class DesktopIndex {
  private:
   struct Ranked {
     DesktopEntry entry;
+    std::string program; ///< the file that it starts
     int rank = 0;
   };
 
@@ -39,8 +40,7 @@ class DesktopIndex {
   UserFolders folders_;
   FolderWatch watch_;
   std::unordered_map<std::string, Ranked> entryOf_;
-  std::unordered_map<std::string, Ranked>
-      entryOfScript_; ///< by the file name of a script that the entry starts
+  std::unordered_map<std::string, Ranked> entryOfScript_; ///< by the name of a script that the entry starts
   int generation_ = 0;
   int entriesRead_ = 0;
 };

@@ -75,8 +75,12 @@ std::optional<std::string> LinuxProcesses::ExecutableOf(Handle process) {
     return {};
   }
   auto executable = ProcFolder::Executable(opened->folder);
-  if (!executable) Fail(kPartialCopy);
-  return executable;
+  // Under the path of a file elsewhere it would pass for the program that has this path here.
+  if (!executable || !executable->isHere) {
+    Fail(kPartialCopy);
+    return {};
+  }
+  return std::move(executable->path);
 }
 
 bool LinuxProcesses::EnumProcessModules(Handle process, std::span<std::uint32_t> modules) {

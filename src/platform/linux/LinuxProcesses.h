@@ -8,7 +8,7 @@
 namespace quendra::platform::linux_ {
 
 /// Processes from /proc. A process can be opened by everybody; its one module, the executable, is known only
-/// to those who may look at the process.
+/// to those who may look at the process, and only where its path leads to it.
 class LinuxProcesses : public Processes {
  public:
   LinuxProcesses(const ProcFolder& folder, HandleTable& handles, SystemPaths& paths,

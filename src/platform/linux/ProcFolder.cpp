@@ -20,6 +20,7 @@ namespace {
 
 constexpr std::uint32_t kKernelThreadFlag = 0x00200000;
 constexpr std::size_t kFileLimit = 1 << 20;
+constexpr std::size_t kMostThreads = 8;
 
 struct DirectoryEntry {
   std::uint64_t node;
@@ -77,13 +78,6 @@ Name NameOf(std::uint32_t processId, const char* file) {
   return name;
 }
 
-std::optional<std::string> LinkText(int folder, const char* name) {
-  std::array<char, PATH_MAX> text;
-  const ssize_t length = ::readlinkat(folder, name, text.data(), text.size());
-  if (length <= 0) return {};
-  return std::string(text.data(), static_cast<std::size_t>(length));
-}
-
 std::uint32_t SocketAt(int folder, const char* name) {
   std::array<char, 64> text;
   const ssize_t length = ::readlinkat(folder, name, text.data(), text.size());
@@ -93,13 +87,47 @@ std::uint32_t SocketAt(int folder, const char* name) {
   return WholeNumber(target.substr(8, target.size() - 9)).value_or(0);
 }
 
-std::optional<std::string> ExecutableAt(int folder, const char* name) {
-  auto path = LinkText(folder, name);
-  // The file that a process was started from may have been replaced by an update since; its path still names
-  // it.
-  constexpr std::string_view kDeleted = " (deleted)";
-  if (path && path->ends_with(kDeleted)) path->resize(path->size() - kDeleted.size());
-  return path;
+std::optional<ProcessStat> StatAt(int folder, const char* name) {
+  const Descriptor file(::openat(folder, name, O_RDONLY | O_CLOEXEC));
+  if (!file) return {};
+  char line[1024];
+  const ssize_t count = ::read(file.Number(), line, sizeof line);
+  if (count <= 0) return {};
+  return ParseStat({line, static_cast<std::size_t>(count)});
+}
+
+/// Some threads of a process beside its first, by the names of their folders.
+std::vector<std::string> ThreadsOf(int folder, const std::string& process) {
+  const std::string threads = process + "/task";
+  struct stat figures {};
+  // A folder has two links of its own and one for each folder in it.
+  if (::fstatat(folder, threads.c_str(), &figures, 0) != 0 || figures.st_nlink == 3) return {};
+  const Descriptor list(::openat(folder, threads.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+  std::vector<std::string> names;
+  ForEachEntry(list.Number(), [&](std::string_view name, std::uint64_t) {
+    if (names.size() < kMostThreads && WholeNumber(name) && name != process)
+      names.push_back(threads + "/" + std::string(name));
+  });
+  return names;
+}
+
+/// A process whose first thread has ended lives on in its others, and what the kernel no longer tells of the
+/// process it tells of them. Gives the first answer that is one.
+template <typename Ask> auto AskThreads(int folder, const std::string& process, Ask ask) {
+  decltype(ask(process)) answer{};
+  for (const std::string& thread : ThreadsOf(folder, process))
+    if ((answer = ask(thread))) break;
+  return answer;
+}
+
+std::optional<ExecutableFile> ExecutableAt(int folder, const std::string& process) {
+  const auto ask = [folder](const std::string& task) { return ReadExecutableFile(folder, task + "/exe"); };
+  if (auto file = ask(process)) return file;
+  return AskThreads(folder, process, ask);
+}
+
+Descriptor OpenDescriptors(int folder, const std::string& process) {
+  return Descriptor(::openat(folder, (process + "/fd").c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
 }
 
 } // namespace
@@ -142,12 +170,14 @@ bool ProcFolder::List(std::vector<Place>& places) const {
 }
 
 std::optional<ProcessStat> ProcFolder::Stat(std::uint32_t processId) const {
-  const Descriptor file(::openat(folder_.Number(), NameOf(processId, "stat").data(), O_RDONLY | O_CLOEXEC));
-  if (!file) return {};
-  char line[1024];
-  const ssize_t count = ::read(file.Number(), line, sizeof line);
-  if (count <= 0) return {};
-  return ParseStat({line, static_cast<std::size_t>(count)});
+  return StatAt(folder_.Number(), NameOf(processId, "stat").data());
+}
+
+bool ProcFolder::HasLivingThread(std::uint32_t processId) const {
+  return AskThreads(folder_.Number(), std::to_string(processId), [this](const std::string& thread) {
+    const auto stat = StatAt(folder_.Number(), (thread + "/stat").c_str());
+    return stat && !stat->HasEnded();
+  });
 }
 
 Descriptor ProcFolder::Open(std::uint32_t processId) const {
@@ -162,17 +192,22 @@ std::optional<std::uint32_t> ProcFolder::UserOf(std::uint32_t processId) const {
 }
 
 std::optional<std::string> ProcFolder::Executable(std::uint32_t processId) const {
-  return ExecutableAt(folder_.Number(), NameOf(processId, "exe").data());
+  auto file = ExecutableAt(folder_.Number(), std::to_string(processId));
+  if (!file) return {};
+  return std::move(file->path);
 }
 
-std::optional<std::string> ProcFolder::Executable(const Descriptor& processFolder) {
-  return ExecutableAt(processFolder.Number(), "exe");
+std::optional<ExecutableFile> ProcFolder::Executable(const Descriptor& processFolder) {
+  return ExecutableAt(processFolder.Number(), ".");
 }
 
 std::uint32_t ProcFolder::SocketOf(std::uint32_t processId, std::uint32_t descriptor) const {
   Name name;
   std::snprintf(name.data(), name.size(), "%u/fd/%u", processId, descriptor);
-  return SocketAt(folder_.Number(), name.data());
+  if (const std::uint32_t node = SocketAt(folder_.Number(), name.data())) return node;
+  return AskThreads(folder_.Number(), std::to_string(processId), [&](const std::string& thread) {
+    return SocketAt(folder_.Number(), (thread + "/fd/" + std::to_string(descriptor)).c_str());
+  });
 }
 
 std::optional<std::string> ProcFolder::File(const std::string& name) const {
@@ -180,14 +215,27 @@ std::optional<std::string> ProcFolder::File(const std::string& name) const {
 }
 
 ProcFolder::Descriptors::Descriptors(const ProcFolder& folder, std::uint32_t processId)
-    : folder_(::openat(folder.folder_.Number(), NameOf(processId, "fd").data(),
-                       O_RDONLY | O_DIRECTORY | O_CLOEXEC)) {}
+    : processes_(folder.folder_.Number()), processId_(processId),
+      folder_(OpenDescriptors(processes_, std::to_string(processId))) {
+  if (!folder_) folder_ = OfThread();
+}
 
-void ProcFolder::Descriptors::List(std::vector<std::uint32_t>& numbers) const {
+Descriptor ProcFolder::Descriptors::OfThread() const {
+  return AskThreads(processes_, std::to_string(processId_),
+                    [this](const std::string& thread) { return OpenDescriptors(processes_, thread); });
+}
+
+void ProcFolder::Descriptors::List(std::vector<std::uint32_t>& numbers) {
   numbers.clear();
-  ForEachEntry(folder_.Number(), [&](std::string_view name, std::uint64_t) {
+  const auto add = [&](std::string_view name, std::uint64_t) {
     if (const auto number = WholeNumber(name)) numbers.push_back(*number);
-  });
+  };
+  ForEachEntry(folder_.Number(), add);
+  if (!numbers.empty()) return;
+  if (Descriptor ofThread = OfThread()) {
+    folder_ = std::move(ofThread);
+    ForEachEntry(folder_.Number(), add);
+  }
 }
 
 std::uint32_t ProcFolder::Descriptors::SocketOf(std::uint32_t descriptor) const {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/linux/Descriptor.h"
+#include "platform/linux/ExecutableFile.h"
 
 #include <cstdint>
 #include <optional>
@@ -17,6 +18,8 @@ struct ProcessStat {
   std::uint32_t parent = 0;
   bool isKernelThread = false;
   std::uint64_t startTime = 0;
+
+  bool HasEnded() const { return state == 'Z' || state == 'X'; }
 };
 
 /// Reads that line. The name in it may hold brackets, blanks and line breaks; nothing when the line is no
@@ -42,9 +45,11 @@ class ProcFolder {
   Descriptor Open(std::uint32_t processId) const;
   /// The effective user id.
   std::optional<std::uint32_t> UserOf(std::uint32_t processId) const;
+  /// Whether one of its threads runs: the figures of a process are those of its first one.
+  bool HasLivingThread(std::uint32_t processId) const;
   /// The path of the executable; nothing when there is none or it may not be known.
   std::optional<std::string> Executable(std::uint32_t processId) const;
-  static std::optional<std::string> Executable(const Descriptor& processFolder);
+  static std::optional<ExecutableFile> Executable(const Descriptor& processFolder);
   /// The socket behind a descriptor of the process, by its node number; 0 when it is no socket or can't be
   /// read.
   std::uint32_t SocketOf(std::uint32_t processId, std::uint32_t descriptor) const;
@@ -57,10 +62,14 @@ class ProcFolder {
     Descriptors(const ProcFolder& folder, std::uint32_t processId);
     /// False when the process is gone or its descriptors may not be seen.
     explicit operator bool() const { return static_cast<bool>(folder_); }
-    void List(std::vector<std::uint32_t>& numbers) const;
+    void List(std::vector<std::uint32_t>& numbers);
     std::uint32_t SocketOf(std::uint32_t descriptor) const;
 
    private:
+    Descriptor OfThread() const;
+
+    int processes_;
+    std::uint32_t processId_;
     Descriptor folder_;
   };
 

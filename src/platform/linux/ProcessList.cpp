@@ -3,6 +3,7 @@
 #include "platform/linux/Files.h"
 #include "platform/linux/SystemNames.h"
 
+#include <algorithm>
 #include <array>
 #include <cstdlib>
 
@@ -12,6 +13,8 @@ namespace {
 
 constexpr std::uint64_t kSeriesMilliseconds = 5000;
 constexpr std::uint32_t kFirstProcess = 1;
+// No process has it: the kernel's own limit is far below.
+constexpr std::uint32_t kNoProcess = 0xFFFFFFFF;
 
 // Those that show the desktop and start what the user picks there; a bare window manager only where no panel
 // runs.
@@ -58,10 +61,11 @@ bool ProcessList::Read(std::vector<Row>& rows) {
     if (!Update(known, place, now))
       known_.erase(place.processId);
     else if (!known.ended)
-      rows.push_back({place.processId, known.parent, known.name});
+      rows.push_back({place.processId, known.parent, known.name, known.startTime});
   }
   previous_.clear();
   NameDesktopShell(rows);
+  PutInOrder(rows);
   return true;
 }
 
@@ -82,7 +86,7 @@ bool ProcessList::Update(Known& known, const ProcFolder::Place& place, std::uint
     known.firstSeen = now;
   }
   known.parent = stat->parent;
-  known.ended = stat->state == 'Z' || stat->state == 'X';
+  known.ended = stat->HasEnded() && !folder_.HasLivingThread(place.processId);
   if (known.readAt == 0 || known.comm != stat->comm) NameIt(known, place.processId, *stat);
   known.node = place.node;
   known.startTime = stat->startTime;
@@ -93,9 +97,10 @@ bool ProcessList::Update(Known& known, const ProcFolder::Place& place, std::uint
 void ProcessList::NameIt(Known& known, std::uint32_t processId, const ProcessStat& stat) {
   known.comm = stat.comm;
   known.shellRank = 0;
+  known.isSystem = stat.isKernelThread && stat.parent == 0;
   if (processId == kFirstProcess) {
     known.name = "services.exe";
-  } else if (stat.isKernelThread && stat.parent == 0) {
+  } else if (known.isSystem) {
     known.name = "System";
   } else if (stat.isKernelThread) {
     known.name = NameFor(stat, {});
@@ -129,6 +134,21 @@ void ProcessList::NameDesktopShell(std::vector<Row>& rows) const {
     bestRank = rank;
   }
   if (shell != nullptr) shell->name = "explorer.exe";
+}
+
+/// A process comes behind the one that started it, whatever the ids, which begin anew when they run out. What
+/// the kernel started has "System" above it, which is the kernel and so comes first and is its own parent: 0
+/// would be the parent of all that isn't known yet.
+void ProcessList::PutInOrder(std::vector<Row>& rows) const {
+  std::stable_sort(rows.begin(), rows.end(),
+                   [](const Row& left, const Row& right) { return left.startTime < right.startTime; });
+  const auto system = std::find_if(rows.begin(), rows.end(), [this](const Row& row) {
+    return known_.find(row.processId)->second.isSystem;
+  });
+  const std::uint32_t systemId = system == rows.end() ? kNoProcess : system->processId;
+  if (system != rows.end()) std::rotate(rows.begin(), system, system + 1);
+  for (Row& row : rows)
+    if (row.parentProcessId == 0) row.parentProcessId = systemId;
 }
 
 } // namespace quendra::platform::linux_

@@ -21,11 +21,13 @@ class ProcessList {
     std::uint32_t processId = 0;
     std::uint32_t parentProcessId = 0;
     std::string name; ///< in the code page, at most 259 bytes
+    std::uint64_t startTime = 0;
   };
 
-  /// The processes of this moment in ascending order of their ids; false when they can't be listed. A process
-  /// known from before is looked at again while it is young, since it may yet become another program, and
-  /// from time to time later.
+  /// The processes of this moment, "System" first, then in the order in which they were started; false when
+  /// they can't be listed. No parent is 0: that of "System" and of process 1 is "System", one that can't be
+  /// seen an id that no process has. A process known from before is looked at again while it is young, since
+  /// it may yet become another program, and from time to time later.
   bool Read(std::vector<Row>& rows);
 
   static constexpr std::uint64_t kYoungMilliseconds = 3000;
@@ -41,6 +43,7 @@ class ProcessList {
     std::uint32_t parent = 0;
     int shellRank = 0; ///< 0 for no desktop shell, else the better the lower
     bool ended = false;
+    bool isSystem = false;
     std::string comm;
     std::string name;
   };
@@ -50,6 +53,7 @@ class ProcessList {
   void NameIt(Known& known, std::uint32_t processId, const ProcessStat& stat);
   bool BelongsToSession(std::uint32_t processId) const;
   void NameDesktopShell(std::vector<Row>& rows) const;
+  void PutInOrder(std::vector<Row>& rows) const;
 
   const ProcFolder& folder_;
   Clock clock_;

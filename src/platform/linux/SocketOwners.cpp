@@ -129,7 +129,7 @@ std::vector<std::uint32_t> SocketOwners::LikelyProcesses() {
 
 bool SocketOwners::SearchIn(std::uint32_t processId) {
   if (!read_.insert(processId).second) return false;
-  const ProcFolder::Descriptors descriptors(folder_, processId);
+  ProcFolder::Descriptors descriptors(folder_, processId);
   ++processesRead_;
   if (!descriptors) return false;
   descriptors.List(numbers_);
