@@ -145,10 +145,7 @@ void MeasureTable(int passes) {
 
 /// The whole program with its window on the monitor page; painting counts.
 int MeasureProgram(int passes) {
-  int count = 1;
-  char name[] = "table_pass_bench";
-  char* words[] = {name, nullptr};
-  forms::QtDesktop desktop(count, words);
+  forms::QtDesktop desktop("table_pass_bench");
   platform::linux_::LinuxMachine machine(desktop);
   const platform::Machine operations = machine.Operations();
   app::Program program(operations, desktop);

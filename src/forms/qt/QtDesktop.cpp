@@ -30,8 +30,9 @@ std::unique_ptr<QApplication> MakeApplication(int& argc, char** argv) {
 
 } // namespace
 
-QtDesktop::QtDesktop(int& argc, char** argv)
-    : application_(MakeApplication(argc, argv)),
+QtDesktop::QtDesktop(std::string programName)
+    : programName_(std::move(programName)), arguments_{programName_.data(), nullptr},
+      application_(MakeApplication(argumentCount_, arguments_.data())),
       dispatcher_([](const Text& text) { qt::ShowBox(FrontWindow(), text, kCritical, u"Quendra"); }),
       mouse_(dispatcher_, scale_),
       keys_(dispatcher_), context_{*this, dispatcher_, scale_, pictures_, mouse_}, drawing_(scale_),

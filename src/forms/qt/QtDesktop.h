@@ -10,15 +10,18 @@
 #include <QApplication>
 #include <QRegion>
 
+#include <array>
 #include <map>
+#include <string>
 
 namespace quendra::forms {
 
 /// The desktop of the Linux edition. Its window toolkit is Qt 6 Widgets.
 class QtDesktop : public Desktop, public platform::EventLoop {
  public:
-  /// Makes the toolkit's application object where the process has none yet. `argc` must outlive the desktop.
-  QtDesktop(int& argc, char** argv);
+  /// Makes the toolkit's application object where the process has none yet. It gets the program's name and no
+  /// other word of the command line, so that the toolkit's switches have no effect.
+  explicit QtDesktop(std::string programName);
   ~QtDesktop() override;
 
   /// Runs `start` as the first handler and then the loop, until the last form has gone or the program ends.
@@ -93,6 +96,10 @@ class QtDesktop : public Desktop, public platform::EventLoop {
   qt::FormView* ViewOf(WindowHandle window) const;
   static qt::FormView* ViewOf(const Form& form) { return static_cast<qt::FormView*>(form.View()); }
 
+  // The toolkit keeps pointers to all three.
+  std::string programName_;
+  std::array<char*, 2> arguments_{};
+  int argumentCount_ = 1;
   std::unique_ptr<QApplication> application_;
   qt::Dispatcher dispatcher_;
   qt::Scale scale_;

@@ -174,8 +174,7 @@ TEST_F(EventLoop, A_timer_ticks_until_its_subscription_goes) {
 TEST_F(EventLoop, A_subscription_may_outlive_its_desktop) {
   std::unique_ptr<platform::EventLoop::Subscription> timer;
   {
-    int count = 0;
-    QtDesktop other(count, nullptr);
+    QtDesktop other("other");
     timer = other.StartTimer(1, [] {});
   }
   timer.reset();

@@ -40,7 +40,7 @@ void SendMouse(QWidget& widget, QEvent::Type type, QPoint place, Qt::MouseButton
 
 } // namespace
 
-QtFixture::QtFixture() : desktop(argumentCount, arguments) {}
+QtFixture::QtFixture() : desktop(programName) {}
 
 QtFixture::~QtFixture() { form.unload = {}; }
 
