@@ -1,4 +1,5 @@
-# Renders artwork/*.svg, each at its own size and at twice that, into the resources of a target under :/artwork.
+# Renders artwork/*.svg, each at its own size and at twice that, into the resources of a target under :/artwork; the
+# fonts of artwork/fonts go under :/fonts as they are.
 find_program(RSVG_CONVERT rsvg-convert REQUIRED)
 
 function(quendra_artwork target)
@@ -18,12 +19,18 @@ function(quendra_artwork target)
     list(APPEND images ${folder}/${name}.png ${folder}/${name}@2x.png)
     string(APPEND list "<file>${name}.png</file>\n<file>${name}@2x.png</file>\n")
   endforeach()
+  string(APPEND list "</qresource>\n<qresource prefix=\"/fonts\">\n")
+  file(GLOB fonts CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/artwork/fonts/*.ttf)
+  foreach(font ${fonts})
+    get_filename_component(name ${font} NAME)
+    string(APPEND list "<file alias=\"${name}\">${font}</file>\n")
+  endforeach()
   string(APPEND list "</qresource>\n</RCC>\n")
   file(CONFIGURE OUTPUT ${folder}/artwork.qrc CONTENT "${list}" @ONLY)
   add_custom_command(
     OUTPUT ${folder}/qrc_artwork.cpp
     COMMAND Qt6::rcc --name artwork --no-compress --output ${folder}/qrc_artwork.cpp ${folder}/artwork.qrc
-    DEPENDS ${folder}/artwork.qrc ${images}
+    DEPENDS ${folder}/artwork.qrc ${images} ${fonts}
     VERBATIM)
   target_sources(${target} PRIVATE ${folder}/qrc_artwork.cpp)
 endfunction()

@@ -1,5 +1,7 @@
 #include "forms/qt/Palette.h"
 
+#include "forms/qt/Fonts.h"
+
 #include <QApplication>
 #include <QFont>
 #include <QIcon>
@@ -31,6 +33,7 @@ QPalette HousePalette() {
 void DressApplication(QApplication& application) {
   QApplication::setStyle(QStringLiteral("fusion"));
   QApplication::setPalette(HousePalette());
+  AddMissingFonts();
   QFont font;
   font.setFamilies({QStringLiteral("Noto Sans"), QStringLiteral("Noto Sans Hebrew"),
                     QStringLiteral("DejaVu Sans"), QStringLiteral("Sans Serif")});

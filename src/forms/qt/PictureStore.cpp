@@ -1,15 +1,13 @@
 #include "forms/qt/PictureStore.h"
 
+#include "forms/qt/Resources.h"
+
 #include <QFile>
 #include <QGuiApplication>
 #include <QPainter>
 
 #include <cstdio>
 #include <cstring>
-
-// Resources of a static library register themselves only when somebody asks for them; the name has no
-// namespace.
-static void RegisterArtwork() { Q_INIT_RESOURCE(artwork); }
 
 namespace quendra::forms::qt {
 
@@ -35,7 +33,7 @@ QPixmap PictureStore::PixmapOf(const Picture& picture) {
 }
 
 QPixmap PictureStore::LoadArtwork(const std::string& name) {
-  RegisterArtwork();
+  RegisterResources();
   const QString base = QStringLiteral(":/artwork/") + QString::fromStdString(name);
   const bool dense = qGuiApp->devicePixelRatio() > 1;
   QPixmap pixmap(base + (dense ? QStringLiteral("@2x.png") : QStringLiteral(".png")));
