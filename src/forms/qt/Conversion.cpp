@@ -24,9 +24,9 @@ char16_t VisibleUnit(char16_t unit) {
 
 } // namespace
 
-QFont ToQFont(const Font& font) {
+QFont ToQFont(const Font& font, double zoom) {
   QFont result;
-  result.setPointSize(std::max(1, font.size));
+  result.setPointSizeF(std::max(1.0, font.size * zoom));
   result.setBold(font.bold);
   result.setUnderline(font.underline);
   return result;

@@ -19,7 +19,7 @@ inline QColor ToQColor(Colour colour) {
   return QColor(static_cast<int>(colour & 0xFF), static_cast<int>(colour >> 8 & 0xFF),
                 static_cast<int>(colour >> 16 & 0xFF));
 }
-QFont ToQFont(const Font& font);
+QFont ToQFont(const Font& font, double zoom = 1);
 
 enum class LineBreaks { Keep, Show };
 

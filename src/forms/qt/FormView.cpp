@@ -11,6 +11,7 @@
 #include <QPainter>
 #include <QPointer>
 #include <QScreen>
+#include <QScrollBar>
 #include <QWindow>
 
 #include <utility>
@@ -18,6 +19,15 @@
 namespace quendra::forms::qt {
 
 namespace {
+
+/// What a window manager puts round a window, until it has told so itself; rather too much than too little.
+constexpr QMargins kLikelyFrame{4, 36, 4, 4};
+
+Extent ExtentOf(QSize size) { return {size.width(), size.height()}; }
+
+Area AreaOf(const QRect& rectangle) { return {{rectangle.x(), rectangle.y()}, ExtentOf(rectangle.size())}; }
+
+QRect UsableScreen(const QWidget& window) { return window.screen()->availableGeometry(); }
 
 Qt::WindowFlags WindowFlagsOf(const Form& form) {
   if (form.Border == BorderStyle::None) return Qt::Window | Qt::FramelessWindowHint;
@@ -32,11 +42,23 @@ Qt::WindowFlags WindowFlagsOf(const Form& form) {
 } // namespace
 
 FormView::FormView(ViewContext& context, Form& form, WindowHandle handle)
-    : QWidget(nullptr, WindowFlagsOf(form)), WidgetView(context, form, *this), handle_(handle) {
+    : FormContext(context), WidgetView(shared_, form, *this), handle_(handle), page_(new QWidget) {
+  setWindowFlags(WindowFlagsOf(form));
   setLayoutDirection(form.RightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
-  setAttribute(Qt::WA_OpaquePaintEvent);
-  AddViews(form, *this);
+  setFrameShape(QFrame::NoFrame);
+  setFocusPolicy(Qt::NoFocus);
+  viewport()->setAttribute(Qt::WA_OpaquePaintEvent);
+  viewport()->setMouseTracking(true);
+  page_->setMouseTracking(true);
+  setWidget(page_);
+  page_->setAutoFillBackground(false);
+  AddViews(form, *page_);
   OrderTabs();
+  connect(screen(), &QScreen::availableGeometryChanged, this, [this] {
+    if (!TheForm()) return;
+    Place();
+    ComeOnScreen();
+  });
 }
 
 FormView::~FormView() = default;
@@ -77,15 +99,77 @@ void FormView::ControlGone() {
 void FormView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Caption)) setWindowTitle(VisibleText(TheForm()->Caption()));
   if (aspect == Aspect::Geometry) PlaceChildren(*TheForm());
+  viewport()->update();
 }
 
 void FormView::Place() {
   const Geometry place = TheForm()->Position();
-  const QSize size(Context().scale.PixelsX(place.width), Context().scale.PixelsY(place.height));
+  const Scale laidOut = scale_.Unzoomed();
+  const Extent room = Room();
+  const Fitting fitting = FittingScale({laidOut.PixelsX(place.width), laidOut.PixelsY(place.height)}, room);
+  Zoom(fitting.scale);
+  page_->resize(scale_.PixelsX(place.width), scale_.PixelsY(place.height));
+  for (void (QAbstractScrollArea::*setPolicy)(Qt::ScrollBarPolicy) :
+       {&QAbstractScrollArea::setHorizontalScrollBarPolicy, &QAbstractScrollArea::setVerticalScrollBarPolicy})
+    (this->*setPolicy)(fitting.scrolls ? Qt::ScrollBarAsNeeded : Qt::ScrollBarAlwaysOff);
+  const Extent inside = WindowExtent(ExtentOf(page_->size()), room, verticalScrollBar()->sizeHint().width());
   if (TheForm()->Border == BorderStyle::Sizable)
-    resize(size);
+    resize(inside.width, inside.height);
   else
-    setFixedSize(size);
+    setFixedSize(inside.width, inside.height);
+}
+
+void FormView::Zoom(double factor) {
+  if (factor == scale_.zoom) return;
+  scale_ = scale_.Unzoomed().Zoomed(factor);
+  for (View* view : views_) {
+    view->Changed(Aspect::Font);
+    view->Changed(Aspect::Geometry);
+  }
+  CutOut();
+}
+
+void FormView::Shape(std::optional<RoundRect> shape) {
+  shape_ = shape;
+  CutOut();
+}
+
+void FormView::CutOut() {
+  if (shape_)
+    setMask(RegionOf(shape_->Zoomed(scale_.zoom)));
+  else
+    clearMask();
+}
+
+QMargins FormView::Frame() const {
+  if (windowFlags() & Qt::FramelessWindowHint) return {};
+  const QMargins known = windowHandle() ? windowHandle()->frameMargins() : QMargins();
+  return known.isNull() ? kLikelyFrame : known;
+}
+
+Extent FormView::Room() const { return ExtentOf(UsableScreen(*this).marginsRemoved(Frame()).size()); }
+
+// The window manager tells its frame once the window is up.
+void FormView::SettleFrame() {
+  if (frameIsKnown_ || !TheForm() || !windowHandle() || windowHandle()->frameMargins().isNull()) return;
+  frameIsKnown_ = true;
+  const QSize before = size();
+  Place();
+  if (size() == before) return ComeOnScreen();
+  CentreOver(UsableScreen(*this));
+}
+
+void FormView::CentreOver(const QRect& over) {
+  const Spot corner =
+      CornerOver(ExtentOf(size().grownBy(Frame())), AreaOf(over), AreaOf(UsableScreen(*this)));
+  move(corner.left, corner.top);
+}
+
+void FormView::ComeOnScreen() {
+  const QRect window = geometry().marginsAdded(Frame());
+  const Spot corner = CornerOnScreen(AreaOf(window), AreaOf(UsableScreen(*this)));
+  const QPoint there(corner.left, corner.top);
+  if (there != window.topLeft()) move(there);
 }
 
 // Showing is the desktop's, which knows how and over what; hiding is the form's own.
@@ -98,11 +182,7 @@ void FormView::Show() {
 QString FormView::AccessibleName() const { return VisibleText(TheForm()->Caption()); }
 
 void FormView::ShowOver(const QWidget* owner) {
-  if (!std::exchange(wasPlaced_, true)) {
-    const QRect around =
-        owner ? owner->frameGeometry() : QGuiApplication::primaryScreen()->availableGeometry();
-    move(around.center() - rect().center());
-  }
+  if (!std::exchange(wasPlaced_, true)) CentreOver(owner ? owner->frameGeometry() : UsableScreen(*this));
   show();
   raise();
   activateWindow();
@@ -132,12 +212,13 @@ void FormView::RunModal(QWidget* owner) {
 
 // Painted, not set as the window's palette, which the lists and their scroll bars would take over.
 void FormView::paintEvent(QPaintEvent* event) {
-  QPainter painter(this);
+  QPainter painter(viewport());
   if (TheForm()) painter.fillRect(event->rect(), ToQColor(TheForm()->BackColour()));
 }
 
 void FormView::changeEvent(QEvent* event) {
-  QWidget::changeEvent(event);
+  QScrollArea::changeEvent(event);
+  SettleFrame();
   if (event->type() != QEvent::ActivationChange || !TheForm()) return;
   Context().dispatcher.Dispatch([this] {
     if (isActiveWindow())
@@ -145,6 +226,11 @@ void FormView::changeEvent(QEvent* event) {
     else
       TheForm()->Form_Deactivate();
   });
+}
+
+void FormView::moveEvent(QMoveEvent* event) {
+  QScrollArea::moveEvent(event);
+  SettleFrame();
 }
 
 void FormView::closeEvent(QCloseEvent* event) {

@@ -32,10 +32,12 @@ void FrameView::paintEvent(QPaintEvent* /*event*/) {
   painter.setBrush(ToQColor(TheFrame().BackColour()));
   painter.setPen(border ? QPen(palette::kBorder, 1) : QPen(Qt::NoPen));
   const double edge = border ? 0.5 : 0;
-  painter.drawRoundedRect(QRectF(rect()).adjusted(edge, top + edge, -edge, -edge), 8, 8);
+  const int round = Context().scale.Pixels(8);
+  painter.drawRoundedRect(QRectF(rect()).adjusted(edge, top + edge, -edge, -edge), round, round);
   if (!titled) return;
-  const int textWidth = fontMetrics().horizontalAdvance(caption) + 12;
-  const int left = ReadsFromRightToLeft() ? width() - 12 - textWidth : 12;
+  const int inset = Context().scale.Pixels(12);
+  const int textWidth = fontMetrics().horizontalAdvance(caption) + inset;
+  const int left = ReadsFromRightToLeft() ? width() - inset - textWidth : inset;
   const QRect title(left, 0, textWidth, fontMetrics().height());
   painter.fillRect(title, ToQColor(TheFrame().BackColour()));
   painter.setPen(TheFrame().ForeColour() == kBlack ? palette::kQuietInk : ToQColor(TheFrame().ForeColour()));

@@ -18,12 +18,12 @@ constexpr qsizetype kMostShown = 300;
 
 } // namespace
 
-int ListDelegate::RowHeight(const QFontMetrics& metrics) {
-  return std::max(kIconSide + 6, metrics.height() + 10);
+int ListDelegate::RowHeight(const QFontMetrics& metrics, const Scale& scale) {
+  return std::max(scale.Pixels(kIconSide + 6), metrics.height() + scale.Pixels(10));
 }
 
 QSize ListDelegate::sizeHint(const QStyleOptionViewItem& option, const QModelIndex& /*index*/) const {
-  return {40, RowHeight(option.fontMetrics)};
+  return {40, RowHeight(option.fontMetrics, scale_)};
 }
 
 void ListDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
@@ -32,7 +32,8 @@ void ListDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
   if (option.state & QStyle::State_Selected) painter->fillRect(option.rect, palette::kSelection);
   const int cell = index.column();
   if (!row || cell > row->CellCount()) return;
-  QRect room = option.rect.adjusted(kPadding, 0, -kPadding, 0);
+  const int padding = scale_.Pixels(kPadding);
+  QRect room = option.rect.adjusted(padding, 0, -padding, 0);
   if (cell == 0) room = DrawIcon(*painter, room, *row);
   if (row->CellText(cell).empty() || room.width() <= 0) return;
 
@@ -50,16 +51,16 @@ void ListDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
 }
 
 QRect ListDelegate::DrawIcon(QPainter& painter, const QRect& room, const ListRow& row) const {
-  const QPixmap icon = model_.SmallIcon(row, kIconSide);
-  const int left = rightToLeft_ ? room.right() + 1 - kIconSide : room.left();
-  const QRect place(left, room.center().y() - kIconSide / 2 + 1, kIconSide, kIconSide);
+  const int side = scale_.Pixels(kIconSide);
+  const QPixmap icon = model_.SmallIcon(row, side);
+  const int left = rightToLeft_ ? room.right() + 1 - side : room.left();
+  const QRect place(left, room.center().y() - side / 2 + 1, side, side);
   if (!icon.isNull()) {
     const QSizeF size = icon.deviceIndependentSize();
     painter.drawPixmap(
-        QPointF(place.left() + (kIconSide - size.width()) / 2, place.top() + (kIconSide - size.height()) / 2),
-        icon);
+        QPointF(place.left() + (side - size.width()) / 2, place.top() + (side - size.height()) / 2), icon);
   }
-  const int taken = kIconSide + kPadding;
+  const int taken = side + scale_.Pixels(kPadding);
   return rightToLeft_ ? room.adjusted(0, 0, -taken, 0) : room.adjusted(taken, 0, 0, 0);
 }
 

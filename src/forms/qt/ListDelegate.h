@@ -1,6 +1,7 @@
 #pragma once
 
 #include "forms/qt/ListModel.h"
+#include "forms/qt/Scale.h"
 
 #include <QStyledItemDelegate>
 
@@ -10,18 +11,19 @@ namespace quendra::forms::qt {
 /// second.
 class ListDelegate : public QStyledItemDelegate {
  public:
-  ListDelegate(const ListModel& model, bool rightToLeft, QObject* parent)
-      : QStyledItemDelegate(parent), model_(model), rightToLeft_(rightToLeft) {}
+  ListDelegate(const ListModel& model, const Scale& scale, bool rightToLeft, QObject* parent)
+      : QStyledItemDelegate(parent), model_(model), scale_(scale), rightToLeft_(rightToLeft) {}
 
   void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
   QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
 
-  static int RowHeight(const QFontMetrics& metrics);
+  static int RowHeight(const QFontMetrics& metrics, const Scale& scale);
 
  private:
   QRect DrawIcon(QPainter& painter, const QRect& room, const ListRow& row) const;
 
   const ListModel& model_;
+  const Scale& scale_;
   bool rightToLeft_;
 };
 

@@ -8,15 +8,17 @@
 
 namespace quendra::forms::qt {
 
-ListHeader::ListHeader(const ListModel& model, bool rightToLeft, QWidget* parent)
-    : QHeaderView(Qt::Horizontal, parent), model_(model), rightToLeft_(rightToLeft) {
+ListHeader::ListHeader(const ListModel& model, const Scale& scale, bool rightToLeft, QWidget* parent)
+    : QHeaderView(Qt::Horizontal, parent), model_(model), scale_(scale), rightToLeft_(rightToLeft) {
   setSectionsClickable(true);
   setHighlightSections(false);
   setMinimumSectionSize(0);
   setStretchLastSection(false);
 }
 
-QSize ListHeader::sizeHint() const { return {QHeaderView::sizeHint().width(), fontMetrics().height() + 16}; }
+QSize ListHeader::sizeHint() const {
+  return {QHeaderView::sizeHint().width(), fontMetrics().height() + scale_.Pixels(16)};
+}
 
 void ListHeader::paintSection(QPainter* painter, const QRect& rect, int section) const {
   if (rect.width() <= 0 || section >= model_.columnCount()) return;
@@ -27,12 +29,12 @@ void ListHeader::paintSection(QPainter* painter, const QRect& rect, int section)
   painter->setPen(palette::kBorder);
   painter->drawLine(rect.bottomLeft(), rect.bottomRight());
   const int divider = rightToLeft_ ? rect.left() : rect.right();
-  painter->drawLine(divider, rect.top() + 7, divider, rect.bottom() - 7);
+  painter->drawLine(divider, rect.top() + scale_.Pixels(7), divider, rect.bottom() - scale_.Pixels(7));
   if (list.Sorted() && list.SortKey() == section) DrawArrow(*painter, rect);
 
   const QPixmap icon = model_.HeaderIcon(section);
   if (!icon.isNull()) {
-    const QSizeF size = icon.deviceIndependentSize();
+    const QSizeF size = icon.deviceIndependentSize() * scale_.zoom;
     const QSizeF fitted =
         size.scaled(QSizeF(rect.size()) - QSizeF(4, 8), Qt::KeepAspectRatio).boundedTo(size);
     QRectF place(QPointF(), fitted);
@@ -43,14 +45,16 @@ void ListHeader::paintSection(QPainter* painter, const QRect& rect, int section)
   const QString text = VisibleText(column.caption);
   painter->setPen(palette::kQuietInk);
   painter->setLayoutDirection(DirectionOf(text));
+  const int padding = scale_.Pixels(8);
   painter->drawText(
-      rect.adjusted(8, 0, -8, 0),
+      rect.adjusted(padding, 0, -padding, 0),
       static_cast<int>(SideOf(column.alignment, rightToLeft_) | Qt::AlignVCenter) | Qt::TextSingleLine, text);
   painter->restore();
 }
 
 void ListHeader::DrawArrow(QPainter& painter, const QRect& rect) const {
-  const double x = rightToLeft_ ? rect.left() + 14 : rect.right() - 14;
+  const int inset = scale_.Pixels(14);
+  const double x = rightToLeft_ ? rect.left() + inset : rect.right() - inset;
   const double y = rect.center().y() + 1;
   const double tip = model_.List()->Order() == SortOrder::Ascending ? -2.5 : 2.5;
   painter.setRenderHint(QPainter::Antialiasing);

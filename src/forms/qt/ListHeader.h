@@ -1,6 +1,7 @@
 #pragma once
 
 #include "forms/qt/ListModel.h"
+#include "forms/qt/Scale.h"
 
 #include <QHeaderView>
 
@@ -9,7 +10,7 @@ namespace quendra::forms::qt {
 /// The header of a list: captions or icons, and an arrow on the column that the rows are sorted by.
 class ListHeader : public QHeaderView {
  public:
-  ListHeader(const ListModel& model, bool rightToLeft, QWidget* parent);
+  ListHeader(const ListModel& model, const Scale& scale, bool rightToLeft, QWidget* parent);
   QSize sizeHint() const override;
 
  protected:
@@ -19,6 +20,7 @@ class ListHeader : public QHeaderView {
   void DrawArrow(QPainter& painter, const QRect& rect) const;
 
   const ListModel& model_;
+  const Scale& scale_;
   bool rightToLeft_;
 };
 

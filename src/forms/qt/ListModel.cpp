@@ -2,6 +2,8 @@
 
 #include "forms/qt/Conversion.h"
 
+#include <QGuiApplication>
+
 namespace quendra::forms::qt {
 
 namespace {
@@ -90,13 +92,13 @@ QPixmap ListModel::SmallIcon(const ListRow& row, int side) const {
   const auto place = static_cast<std::size_t>(row.SmallIcon() - 1);
   if (icons_.size() <= place) icons_.resize(place + 1);
   CachedIcon& cached = icons_[place];
-  if (cached.pixmap.isNull() || cached.picture != *picture ||
-      cached.pixmap.deviceIndependentSize().width() > side) {
+  if (cached.pixmap.isNull() || cached.picture != *picture || cached.side != side) {
     const QPixmap whole = pictures_.PixmapOf(*picture);
     if (whole.isNull()) return {};
-    const qreal ratio = whole.devicePixelRatio();
+    // As fine as the screen, also where the picture itself doesn't say how fine it is.
+    const qreal ratio = qGuiApp->devicePixelRatio();
     const int pixels = static_cast<int>(side * ratio);
-    cached = {*picture, whole.scaled(pixels, pixels, Qt::KeepAspectRatio, Qt::SmoothTransformation)};
+    cached = {*picture, side, whole.scaled(pixels, pixels, Qt::KeepAspectRatio, Qt::SmoothTransformation)};
     cached.pixmap.setDevicePixelRatio(ratio);
   }
   return cached.pixmap;

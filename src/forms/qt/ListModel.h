@@ -38,6 +38,7 @@ class ListModel : public QAbstractTableModel {
  private:
   struct CachedIcon {
     Picture picture;
+    int side = 0;
     QPixmap pixmap;
   };
 

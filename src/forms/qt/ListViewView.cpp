@@ -1,5 +1,6 @@
 #include "forms/qt/ListViewView.h"
 
+#include "forms/ListLayout.h"
 #include "forms/qt/ListDelegate.h"
 #include "forms/qt/ListHeader.h"
 #include "forms/qt/MouseEvents.h"
@@ -21,14 +22,15 @@ ListViewView::ListViewView(ViewContext& context, ListView& list, QWidget* parent
   setTabKeyNavigation(false);
   setEditTriggers(QAbstractItemView::NoEditTriggers);
   setSelectionMode(QAbstractItemView::SingleSelection);
-  setVerticalScrollMode(QAbstractItemView::ScrollPerPixel);
+  setVerticalScrollMode(QAbstractItemView::ScrollPerItem);
   setHorizontalScrollMode(QAbstractItemView::ScrollPerPixel);
   setTextElideMode(Qt::ElideRight);
-  auto* header = new ListHeader(model_, ReadsFromRightToLeft(), this);
+  auto* header = new ListHeader(model_, context.scale, ReadsFromRightToLeft(), this);
   setHeader(header);
   header->setSectionsClickable(true); // setHeader takes it away
   connect(header, &QHeaderView::sectionClicked, this, [this](int section) { HeaderClicked(section); });
-  setItemDelegate(new ListDelegate(model_, ReadsFromRightToLeft(), this));
+  connect(header, &QHeaderView::sectionResized, this, [this] { sizedByHand_ = sizedByHand_ || !sizing_; });
+  setItemDelegate(new ListDelegate(model_, context.scale, ReadsFromRightToLeft(), this));
   setModel(&model_);
   Context().mouse.Watch(*viewport(), *this);
   list.Observe(this);
@@ -53,6 +55,8 @@ template <typename Change> void ListViewView::Quietly(Change change) {
 
 void ListViewView::Apply(Aspect aspect) {
   if (aspect == Aspect::All) ColumnsChanged();
+  if (aspect == Aspect::Geometry) FitColumns();
+  if (aspect == Aspect::Font && isVisible()) FitRows();
   if (Concerns(aspect, Aspect::Selection)) ShowSelection();
 }
 
@@ -75,8 +79,8 @@ void ListViewView::RowsCleared() {
 void ListViewView::RowChanged(int index, int cell) {
   if (QAccessible::isActive()) model_.TellCellChanged(index, cell);
   if (cell >= model_.columnCount() || !isVisible()) return;
-  const int height = ListDelegate::RowHeight(fontMetrics());
-  const int top = (index - 1) * height - verticalScrollBar()->value();
+  const int height = RowHeight();
+  const int top = (index - 1 - verticalScrollBar()->value()) * height;
   if (top + height < 0 || top > viewport()->height()) return;
   viewport()->update(columnViewportPosition(cell), top, columnWidth(cell), height);
 }
@@ -95,13 +99,39 @@ void ListViewView::ColumnsChanged() {
 }
 
 void ListViewView::SizeColumns() {
+  sizedByHand_ = false;
+  std::vector<int> told;
+  for (const ColumnHeader& column : List().Columns()) told.push_back(Context().scale.PixelsX(column.width));
+  const bool before = std::exchange(sizing_, true);
   int section = 0;
-  for (const ColumnHeader& column : List().Columns()) {
-    const int width = Context().scale.PixelsX(column.width);
+  for (const int width : ColumnWidths(told, viewport()->width())) {
     header()->setSectionHidden(section, width < 1);
     if (width >= 1) header()->resizeSection(section, width);
     ++section;
   }
+  sizing_ = before;
+}
+
+void ListViewView::FitColumns() {
+  if (TheControl() && !sizedByHand_) SizeColumns();
+}
+
+int ListViewView::RowHeight() const { return ListDelegate::RowHeight(fontMetrics(), Context().scale); }
+
+void ListViewView::FitRows() {
+  if (!TheControl()) return;
+  const Geometry place = List().Position();
+  const int room = Context().scale.PixelsY(place.top + place.height) - Context().scale.PixelsY(place.top);
+  // Frame, header and a scroll bar below the rows.
+  const int around = height() - viewport()->height();
+  resize(width(), around + WholeRows(room - around, RowHeight()));
+}
+
+// Comes for the list and for the part of it that the rows have: a scroll bar takes from the second alone.
+void ListViewView::resizeEvent(QResizeEvent* event) {
+  QTreeView::resizeEvent(event);
+  FitColumns();
+  FitRows();
 }
 
 void ListViewView::ShowSelection() {

@@ -84,11 +84,11 @@ bool MouseEvents::Handle(WidgetView& view, QMouseEvent& event) {
 void MouseEvents::Raise(WidgetView& view, const Event<int, int, int, int>& raised, int button,
                         const QMouseEvent& event) {
   if (!raised) return;
-  const double x = event.position().x();
-  const double fromLeading = view.ReadsFromRightToLeft() ? view.Widget().width() - x : x;
+  const QPointF place = view.Body().mapFromGlobal(event.globalPosition());
+  const double fromLeading = view.ReadsFromRightToLeft() ? view.Body().width() - place.x() : place.x();
+  const Scale& scale = view.Context().scale;
   dispatcher_.Dispatch([&] {
-    raised(button, ShiftStateOf(event.modifiers()), scale_.TwipsX(fromLeading),
-           scale_.TwipsY(event.position().y()));
+    raised(button, ShiftStateOf(event.modifiers()), scale.TwipsX(fromLeading), scale.TwipsY(place.y()));
   });
 }
 

@@ -17,7 +17,7 @@ int ShiftStateOf(Qt::KeyboardModifiers modifiers);
 /// windows.
 class MouseEvents : public QObject {
  public:
-  MouseEvents(Dispatcher& dispatcher, const Scale& scale) : dispatcher_(dispatcher), scale_(scale) {}
+  explicit MouseEvents(Dispatcher& dispatcher) : dispatcher_(dispatcher) {}
 
   /// Events of this widget become events of the view's control.
   void Watch(QWidget& widget, WidgetView& view);
@@ -46,7 +46,6 @@ class MouseEvents : public QObject {
   void Raise(WidgetView& view, const Event<int, int, int, int>& raised, int button, const QMouseEvent& event);
 
   Dispatcher& dispatcher_;
-  const Scale& scale_;
   QHash<QObject*, WidgetView*> views_;
   WidgetView* pressed_ = nullptr;
   QPointer<QWidget> moving_;

@@ -13,8 +13,16 @@ PictureBoxView::PictureBoxView(ViewContext& context, PictureBox& box, QWidget* p
   setAttribute(Qt::WA_OpaquePaintEvent);
 }
 
+QSize PictureBoxView::LaidOutSize() const {
+  if (!TheControl()) return {};
+  const Scale scale = Context().scale.Unzoomed();
+  const Geometry place = Box().Position();
+  return {scale.PixelsX(place.left + place.width) - scale.PixelsX(place.left),
+          scale.PixelsY(place.top + place.height) - scale.PixelsY(place.top)};
+}
+
 QSize PictureBoxView::SurfaceSize() const {
-  return (QSizeF(size()) * devicePixelRatioF()).toSize().expandedTo({1, 1});
+  return (QSizeF(LaidOutSize()) * devicePixelRatioF()).toSize().expandedTo({1, 1});
 }
 
 QImage& PictureBoxView::Surface() {
@@ -32,16 +40,19 @@ void PictureBoxView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Geometry)) PlaceChildren(Box());
 }
 
-void PictureBoxView::PaintLayers(QPainter& painter, Ground ground) const {
-  if (ground == Ground::Drawn) painter.fillRect(rect(), ToQColor(Box().BackColour()));
-  DrawStretched(painter, rect(), Context().pictures.PixmapOf(Box().Contents()));
-  if (!surface_.isNull()) painter.drawImage(0, 0, surface_);
+void PictureBoxView::PaintLayers(QPainter& painter, QSize size, Ground ground) const {
+  const QRect room(QPoint(), size);
+  if (ground == Ground::Drawn) painter.fillRect(room, ToQColor(Box().BackColour()));
+  DrawStretched(painter, room, Context().pictures.PixmapOf(Box().Contents()));
+  if (surface_.isNull()) return;
+  painter.setRenderHint(QPainter::SmoothPixmapTransform, size != LaidOutSize());
+  painter.drawImage(room, surface_);
 }
 
 void PictureBoxView::paintEvent(QPaintEvent* /*event*/) {
   QPainter painter(this);
   if (!TheControl()) return;
-  PaintLayers(painter, Ground::Drawn);
+  PaintLayers(painter, size(), Ground::Drawn);
   if (!Box().Border()) return;
   painter.setPen(palette::kBorder);
   painter.drawRect(rect().adjusted(0, 0, -1, -1));

@@ -13,12 +13,15 @@ class PictureBoxView : public QWidget, public WidgetView {
   PictureBoxView(ViewContext& context, PictureBox& box, QWidget* parent);
   QAccessible::Role Role() const override { return QAccessible::Graphic; }
 
-  /// The drawings, see-through where nothing was drawn, in logical pixels by its device pixel ratio.
+  /// The box's size as it was laid out, in logical pixels. Drawings are made in this size, whatever size the
+  /// form is shown in: what is measured, drawn and copied doesn't depend on the screen.
+  QSize LaidOutSize() const;
+  /// The drawings, see-through where nothing was drawn, in pixels of LaidOutSize by its device pixel ratio.
   QImage& Surface();
   void ClearSurface() { surface_ = {}; }
   /// Ground (when wanted), picture and drawings, in this order.
   enum class Ground { Drawn, SeeThrough };
-  void PaintLayers(QPainter& painter, Ground ground) const;
+  void PaintLayers(QPainter& painter, QSize size, Ground ground) const;
 
  protected:
   void Apply(Aspect aspect) override;

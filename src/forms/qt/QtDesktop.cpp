@@ -2,7 +2,6 @@
 
 #include "forms/qt/Boxes.h"
 #include "forms/qt/Palette.h"
-#include "forms/qt/Shapes.h"
 
 #include <QImageReader>
 #include <QScreen>
@@ -34,9 +33,8 @@ QtDesktop::QtDesktop(std::string programName)
     : programName_(std::move(programName)), arguments_{programName_.data(), nullptr},
       application_(MakeApplication(argumentCount_, arguments_.data())),
       dispatcher_([](const Text& text) { qt::ShowBox(FrontWindow(), text, kCritical, u"Quendra"); }),
-      mouse_(dispatcher_, scale_),
-      keys_(dispatcher_), context_{*this, dispatcher_, scale_, pictures_, mouse_}, drawing_(scale_),
-      loop_(dispatcher_) {
+      mouse_(dispatcher_), keys_(dispatcher_), context_{*this, dispatcher_, scale_, pictures_, mouse_},
+      drawing_(scale_), loop_(dispatcher_) {
   qt::DressApplication(*qApp);
   qt::InstallAccessibility();
   const QScreen* screen = QGuiApplication::primaryScreen();
@@ -109,7 +107,7 @@ std::int32_t QtDesktop::SendMessage(WindowHandle window, std::uint32_t message, 
 
 RegionHandle QtDesktop::CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
                                            int ellipseHeight) {
-  regions_[++lastRegion_] = qt::RoundedRegion(left, top, right, bottom, ellipseWidth, ellipseHeight);
+  regions_[++lastRegion_] = {left, top, right, bottom, ellipseWidth, ellipseHeight};
   return lastRegion_;
 }
 
@@ -118,10 +116,7 @@ void QtDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, bool redr
   if (!view) return;
   // A window owns the region that it was given, so the handle ends here; none takes the shape away.
   const auto found = regions_.extract(region);
-  if (found)
-    view->setMask(found.mapped());
-  else
-    view->clearMask();
+  view->Shape(found ? std::optional(found.mapped()) : std::nullopt);
   if (redraw) view->update();
 }
 

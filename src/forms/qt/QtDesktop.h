@@ -8,7 +8,6 @@
 #include "forms/qt/QtEventLoop.h"
 
 #include <QApplication>
-#include <QRegion>
 
 #include <array>
 #include <map>
@@ -102,7 +101,7 @@ class QtDesktop : public Desktop, public platform::EventLoop {
   int argumentCount_ = 1;
   std::unique_ptr<QApplication> application_;
   qt::Dispatcher dispatcher_;
-  qt::Scale scale_;
+  qt::Scale scale_; ///< the screen's
   qt::PictureStore pictures_;
   qt::MouseEvents mouse_;
   qt::KeyEvents keys_;
@@ -111,7 +110,7 @@ class QtDesktop : public Desktop, public platform::EventLoop {
   qt::QtEventLoop loop_;
   std::map<WindowHandle, qt::FormView*> windows_;
   WindowHandle lastWindow_ = 0;
-  std::map<RegionHandle, QRegion> regions_;
+  std::map<RegionHandle, qt::RoundRect> regions_;
   RegionHandle lastRegion_ = 0;
 };
 

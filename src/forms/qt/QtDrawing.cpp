@@ -82,7 +82,8 @@ void QtDrawing::Print(PictureBox& box, TextView text) {
     const bool rightToLeft = ReadsFromRightToLeft(box);
     const int x = PixelsX(box, box.CurrentX) + (rightToLeft ? kEdge : 0);
     const int left = rightToLeft ? 0 : x;
-    const QRect place(left, PixelsY(box, box.CurrentY), view->width() - x, PixelsY(box, lineHeight));
+    const QRect place(left, PixelsY(box, box.CurrentY), view->LaidOutSize().width() - x,
+                      PixelsY(box, lineHeight));
     QPainter painter(&view->Surface());
     painter.setFont(ToQFont(box.TextFont()));
     painter.setPen(ToQColor(box.ForeColour()));
@@ -104,7 +105,7 @@ void QtDrawing::BitBlt(PictureBox& target, int x, int y, int width, int height, 
   painter.translate(x - sourceX, y - sourceY);
   // What lies outside the source has nothing to give: its layers end with it.
   painter.setClipRect(sourceX, sourceY, width, height);
-  from->PaintLayers(painter, PictureBoxView::Ground::Drawn);
+  from->PaintLayers(painter, from->LaidOutSize(), PictureBoxView::Ground::Drawn);
 }
 
 void QtDrawing::Refresh(PictureBox& box) {
@@ -128,13 +129,13 @@ bool QtDrawing::DrawIconEx(PictureBox& box, int x, int y, const std::vector<std:
 Picture QtDrawing::ImageOf(const PictureBox& box) const {
   const PictureBoxView* view = ViewOf(box);
   if (!view) return box.Contents();
-  QImage image(view->size().expandedTo({1, 1}) * view->devicePixelRatioF(),
+  QImage image(view->LaidOutSize().expandedTo({1, 1}) * view->devicePixelRatioF(),
                QImage::Format_ARGB32_Premultiplied);
   image.setDevicePixelRatio(view->devicePixelRatioF());
   image.fill(Qt::transparent);
   QPainter painter(&image);
   // Without the ground colour: an icon drawn in a box then sits well on a selected row, too.
-  view->PaintLayers(painter, PictureBoxView::Ground::SeeThrough);
+  view->PaintLayers(painter, view->LaidOutSize(), PictureBoxView::Ground::SeeThrough);
   painter.end();
   return PictureStore::PictureOf(image);
 }

@@ -4,7 +4,8 @@
 
 namespace quendra::forms::qt {
 
-/// The drawing operations on picture boxes. A box whose form isn't loaded has no surface; drawing on it does
+/// The drawing operations on picture boxes, in the pixels of a form as it was laid out: a view that shows the
+/// form smaller shows its drawings smaller. A box whose form isn't loaded has no surface; drawing on it does
 /// nothing.
 class QtDrawing {
  public:

@@ -1,10 +1,18 @@
 #include "forms/qt/Shapes.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace quendra::forms::qt {
 
-QRegion RoundedRegion(int left, int top, int right, int bottom, int ellipseWidth, int ellipseHeight) {
+RoundRect RoundRect::Zoomed(double factor) const {
+  const auto zoomed = [=](int pixels) { return static_cast<int>(std::lround(pixels * factor)); };
+  return {zoomed(left),   zoomed(top),          zoomed(right),
+          zoomed(bottom), zoomed(ellipseWidth), zoomed(ellipseHeight)};
+}
+
+QRegion RegionOf(const RoundRect& shape) {
+  const auto& [left, top, right, bottom, ellipseWidth, ellipseHeight] = shape;
   const QRect box(QPoint(std::min(left, right), std::min(top, bottom)),
                   QPoint(std::max(left, right) - 1, std::max(top, bottom) - 1));
   const int width = std::clamp(ellipseWidth, 0, box.width());

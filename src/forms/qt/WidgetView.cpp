@@ -26,7 +26,7 @@ void WidgetView::Changed(Aspect aspect) {
   if (!control_) return;
   if (aspect == Aspect::All) Identify();
   if (Concerns(aspect, Aspect::Geometry)) Place();
-  if (Concerns(aspect, Aspect::Font)) widget_.setFont(ToQFont(control_->TextFont()));
+  if (Concerns(aspect, Aspect::Font)) widget_.setFont(ToQFont(control_->TextFont(), context_.scale.zoom));
   if (Concerns(aspect, Aspect::Enabled)) Enable();
   if (aspect == Aspect::Order) widget_.raise();
   Apply(aspect);

@@ -17,6 +17,7 @@ class MouseEvents;
 struct ViewContext {
   Desktop& desktop;
   Dispatcher& dispatcher;
+  /// That of the form; without a form, that of the screen.
   const Scale& scale;
   PictureStore& pictures;
   MouseEvents& mouse;
@@ -41,6 +42,8 @@ class WidgetView : public View {
   /// nullptr once released.
   Control* TheControl() const { return control_; }
   QWidget& Widget() const { return widget_; }
+  /// The widget in which places in the control are told.
+  virtual QWidget& Body() const { return widget_; }
   ViewContext& Context() const { return context_; }
   bool ReadsFromRightToLeft() const { return rightToLeft_; }
 

@@ -137,6 +137,78 @@ TEST_F(TableView, Columns_take_their_width_in_twips_and_one_of_2_twips_is_hidden
   EXPECT_TRUE(View().header()->isSectionHidden(2));
 }
 
+TEST_F(TableView, Columns_with_too_little_room_are_shown_in_proportion_and_need_no_scroll_bar) {
+  list.AddColumn({u"יוצר", 6000});
+
+  desktop.Show(form);
+
+  const int room = View().viewport()->width();
+  EXPECT_EQ(View().header()->length(), room);
+  EXPECT_NEAR(View().header()->sectionSize(0), room / 6.0, 1);
+  EXPECT_FALSE(View().horizontalScrollBar()->isVisible());
+}
+
+TEST_F(TableView, Columns_in_proportion_make_room_for_the_scroll_bar_of_many_rows) {
+  list.AddColumn({u"יוצר", 6000});
+  desktop.Show(form);
+
+  for (int i = 0; i < 200; ++i) AddRow(DecimalText(1000 + i));
+
+  EXPECT_TRUE(RunUntil([&] { return View().verticalScrollBar()->isVisible(); }));
+  EXPECT_EQ(View().header()->length(), View().viewport()->width());
+}
+
+TEST_F(TableView, A_column_that_the_user_sized_stays_so_until_the_columns_are_set_up_anew) {
+  desktop.Show(form);
+  View().header()->resizeSection(0, 250);
+  for (int i = 0; i < 200; ++i) AddRow(DecimalText(1000 + i));
+  QCoreApplication::processEvents();
+  EXPECT_EQ(View().header()->sectionSize(0), 250);
+
+  list.ClearColumns();
+  list.AddColumn({u"יחיד", 1500});
+
+  EXPECT_EQ(View().header()->sectionSize(0), 100);
+}
+
+TEST_F(TableView, Only_whole_rows_are_shown_whatever_the_height_and_the_letters) {
+  for (int i = 0; i < 200; ++i) AddRow(DecimalText(1000 + i));
+  desktop.Show(form);
+
+  for (const int points : {7, 9, 11})
+    for (int height = 3990; height < 4500; height += 45) {
+      list.TextFont = Font{points, false, false};
+      list.Move(0, 0, 6000, height);
+      QCoreApplication::processEvents();
+      const int row = View().visualRect(View().model()->index(0, 0)).height();
+      EXPECT_EQ(View().viewport()->height() % row, 0) << points << " " << height;
+      EXPECT_LE(View().height(), height / kPixel);
+      EXPECT_GT(View().height(), height / kPixel - row);
+    }
+}
+
+TEST_F(TableView, Only_whole_rows_are_shown_above_the_scroll_bar_of_wide_columns) {
+  for (int i = 0; i < 200; ++i) AddRow(DecimalText(1000 + i));
+  desktop.Show(form);
+
+  View().header()->resizeSection(0, 900);
+
+  ASSERT_TRUE(RunUntil([&] { return View().horizontalScrollBar()->isVisible(); }));
+  EXPECT_EQ(View().viewport()->height() % View().visualRect(View().model()->index(0, 0)).height(), 0);
+  EXPECT_LE(View().height(), 300);
+}
+
+TEST_F(TableView, A_scrolled_list_starts_with_a_whole_row) {
+  for (int i = 0; i < 200; ++i) AddRow(DecimalText(1000 + i));
+  desktop.Show(form);
+
+  View().verticalScrollBar()->setValue(View().verticalScrollBar()->maximum());
+
+  const QRect last = View().visualRect(View().model()->index(199, 0));
+  EXPECT_EQ(last.bottom(), View().viewport()->height() - 1);
+  EXPECT_EQ(View().visualRect(View().indexAt({5, 1})).top(), 0);
+}
+
 TEST_F(TableView, Columns_set_up_anew_replace_the_old_ones) {
   desktop.Show(form);
 

@@ -2,6 +2,8 @@
 
 #include <QScreen>
 
+#include <cstdlib>
+
 namespace quendra::forms {
 
 class Window : public QtFixture {};
@@ -14,11 +16,36 @@ TEST_F(Window, A_form_takes_its_size_in_twips_and_is_fixed) {
 }
 
 TEST_F(Window, A_form_comes_up_in_the_middle_of_the_screen) {
+  form.Border = BorderStyle::None;
+
   desktop.Show(form);
 
   const QPoint offset =
       WidgetOf(form).geometry().center() - QGuiApplication::primaryScreen()->availableGeometry().center();
-  EXPECT_LE(offset.manhattanLength(), 4);
+  EXPECT_LE(offset.manhattanLength(), 2);
+}
+
+TEST_F(Window, A_form_with_a_title_bar_comes_up_in_the_middle_with_its_frame) {
+  desktop.Show(form);
+
+  const QPoint offset =
+      WidgetOf(form).geometry().center() - QGuiApplication::primaryScreen()->availableGeometry().center();
+  constexpr int kHighestTitleBar = 40;
+  EXPECT_LE(std::abs(offset.x()), 2);
+  EXPECT_LE(std::abs(offset.y()), kHighestTitleBar / 2);
+}
+
+TEST_F(Window, A_form_over_an_owner_at_the_edge_of_the_screen_stays_on_the_screen) {
+  TestForm other;
+  other.Border = BorderStyle::None;
+  desktop.Show(form);
+  WidgetOf(form).move(-300, -200);
+  other.load = [&] { desktop.Show(other, Modality::Modeless, &form); };
+
+  desktop.Load(other);
+
+  const QRect screen = QGuiApplication::primaryScreen()->availableGeometry();
+  EXPECT_EQ(WidgetOf(other).geometry().topLeft(), screen.topLeft());
 }
 
 TEST_F(Window, A_loaded_form_is_not_shown_yet) {
