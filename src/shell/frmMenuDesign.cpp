@@ -87,11 +87,11 @@ void frmMenu::DesignLines() {
 void frmMenu::DesignWelcome() {
   looks::Text(lblWelcome, u"ברוכים הבאים", {24, true, false}, looks::kForest);
   lblWelcome.Align = forms::Alignment::Centre;
-  lblWelcome.Move(Px(kMargin), Px(500), Px(kPageWidth), Px(44));
+  lblWelcome.Move(Px(kMargin), Px(442), Px(kPageWidth), Px(44));
   looks::Text(lblWelcomeHint, u"בחרו נושא בתפריט שלמעלה ונתחיל לבדוק יחד", {13, false, false},
               looks::kForest);
   lblWelcomeHint.Align = forms::Alignment::Centre;
-  lblWelcomeHint.Move(Px(kMargin), Px(548), Px(kPageWidth), Px(30));
+  lblWelcomeHint.Move(Px(kMargin), Px(488), Px(kPageWidth), Px(30));
 }
 
 void frmMenu::DesignPages() {

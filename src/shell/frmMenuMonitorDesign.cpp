@@ -10,10 +10,10 @@ namespace {
 using layout::kPageWidth;
 
 constexpr int kInset = 6;
-constexpr int kTableTop = 54;
-constexpr int kTableHeight = 450;
-constexpr int kActionsTop = kTableTop + kTableHeight + 10;
-constexpr int kAdaptersTop = kActionsTop + 44;
+constexpr int kTableTop = 46;
+constexpr int kTableHeight = 413;
+constexpr int kActionsTop = kTableTop + kTableHeight + 7;
+constexpr int kAdaptersTop = kActionsTop + 38;
 
 struct Meter {
   forms::Label& caption;
@@ -24,19 +24,19 @@ struct Meter {
 void Place(const Meter& meter, const char16_t* caption, int left) {
   looks::Text(meter.caption, caption, looks::kBody, looks::kQuiet);
   meter.caption.Align = forms::Alignment::Trailing;
-  meter.caption.Move(Px(left), Px(18), Px(70), Px(22));
+  meter.caption.Move(Px(left), Px(14), Px(70), Px(22));
   looks::Text(meter.figure, u"0.0", looks::kFigure, looks::kForest);
   meter.figure.Align = forms::Alignment::Centre;
-  meter.figure.Move(Px(left + 72), Px(12), Px(116), Px(30));
+  meter.figure.Move(Px(left + 72), Px(8), Px(116), Px(30));
   looks::Text(meter.unit, u"ק\"ב לשנייה", looks::kSmall, looks::kQuiet);
-  meter.unit.Move(Px(left + 190), Px(19), Px(76), Px(20));
+  meter.unit.Move(Px(left + 190), Px(15), Px(76), Px(20));
 }
 
 } // namespace
 
 void frmMenu::DesignMonitorPage() {
   looks::Text(main_Label4, u"תהליכים פעילים:", looks::kHeading, looks::kForest);
-  main_Label4.Move(Px(18), Px(12), Px(320), Px(32));
+  main_Label4.Move(Px(16), Px(8), Px(320), Px(32));
   DesignMeters();
   DesignTable();
   DesignActions();
@@ -74,16 +74,16 @@ void frmMenu::DesignActions() {
     int width;
   };
   const Action actions[] = {
-      {main_lblEndProcess, u"סיים תהליך", 6, 130},
-      {main_lblJumpToPath, u"אתר קובץ", 146, 130},
-      {main_cmdChecks, u"בדיקת פורטים", 308, 150},
-      {main_cmdMemInfo, u"מידע על הזיכרון", 468, 160},
-      {main_cmdAddRemove, u"הוספה/הסרה של תוכניות", 638, 210},
-      {main_cmdRpt, u"שלח דוח", kPageWidth - 166, 160},
+      {main_lblEndProcess, u"סיים תהליך", 6, 112},
+      {main_lblJumpToPath, u"אתר קובץ", 126, 112},
+      {main_cmdChecks, u"בדיקת פורטים", 262, 130},
+      {main_cmdMemInfo, u"מידע על הזיכרון", 400, 146},
+      {main_cmdAddRemove, u"הוספה/הסרה של תוכניות", 554, 188},
+      {main_cmdRpt, u"שלח דוח", kPageWidth - 146, 140},
   };
   for (const Action& action : actions) {
     looks::Button(action.label, action.caption);
-    action.label.Move(Px(action.left), Px(kActionsTop), Px(action.width), Px(34));
+    action.label.Move(Px(action.left), Px(kActionsTop), Px(action.width), Px(32));
   }
   looks::LeadingButton(main_cmdRpt, u"שלח דוח");
 }
@@ -93,12 +93,12 @@ void frmMenu::DesignAdapters() {
   main_Frame1.Border = true;
   main_Frame1.BackColour = looks::kPaper;
   main_Frame1.TextFont = looks::kSmall;
-  main_Frame1.Move(Px(kInset), Px(kAdaptersTop), Px(kPageWidth - 2 * kInset), Px(62));
+  main_Frame1.Move(Px(kInset), Px(kAdaptersTop), Px(kPageWidth - 2 * kInset), Px(60));
   main_cmbAdapters.Clear();
   main_cmbAdapters.TextFont = looks::kSmall;
-  main_cmbAdapters.Move(Px(12), Px(22), Px(480), Px(28));
+  main_cmbAdapters.Move(Px(12), Px(21), Px(440), Px(28));
   looks::Text(main_lblCaptureState, u"", looks::kSmall, looks::kAlert);
-  main_lblCaptureState.Move(Px(508), Px(26), Px(580), Px(22));
+  main_lblCaptureState.Move(Px(466), Px(25), Px(480), Px(22));
 }
 
 } // namespace quendra::shell

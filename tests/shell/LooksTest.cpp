@@ -1,6 +1,9 @@
+#include "forms/FormPlacement.h"
+#include "forms/ListLayout.h"
 #include "shell/ProgramFixture.h"
 
 #include <functional>
+#include <numeric>
 
 namespace quendra::shell {
 namespace {
@@ -92,13 +95,28 @@ TEST_F(Looks, Every_menu_label_covers_its_picture_and_lets_it_shine_through) {
   }
 }
 
-TEST_F(Looks, The_table_shows_all_its_columns_beside_a_scroll_bar) {
+TEST_F(Looks, The_table_shows_all_its_columns_beside_a_scroll_bar_and_wide_enough_to_be_read) {
   ComeHome();
   ClickEntry(0);
-  int columns = 0;
-  for (const forms::ColumnHeader& column : program.frmMenu.main_ListView1.Columns()) columns += column.width;
-  constexpr int kScrollBar = 17 * 15;
-  EXPECT_GE(program.frmMenu.main_ListView1.Position().width, columns + kScrollBar);
+  std::vector<int> told;
+  for (const forms::ColumnHeader& column : program.frmMenu.main_ListView1.Columns())
+    told.push_back(column.width / 15);
+  constexpr int kScrollBarAndFrame = 17 + 2;
+  const int room = program.frmMenu.main_ListView1.Position().width / 15 - kScrollBarAndFrame;
+
+  const std::vector<int> shown = forms::ColumnWidths(told, room);
+
+  EXPECT_LE(std::accumulate(shown.begin(), shown.end(), 0), room);
+  for (std::size_t i = 0; i < told.size(); ++i) EXPECT_GE(shown[i], told[i] * 8 / 10) << i;
+}
+
+TEST_F(Looks, Every_form_with_its_frame_has_room_on_a_screen_of_1024_by_768_with_a_panel) {
+  constexpr forms::Extent kRoom{1024 - 2 * 4, 768 - 40 - 36 - 4};
+  for (forms::Form* form : forms) {
+    const forms::Geometry place = form->Position;
+    EXPECT_EQ(forms::FittingScale({place.width / 15, place.height / 15}, kRoom).scale, 1)
+        << ToUtf8(form->Name());
+  }
 }
 
 TEST_F(Looks, Every_form_reads_from_right_to_left_and_every_control_has_its_own_name) {
