@@ -4,6 +4,7 @@ side by side."""
 
 import contextlib
 import os
+import re
 import signal
 import subprocess
 import tempfile
@@ -40,8 +41,8 @@ def started(command, **options):
 
 
 @contextlib.contextmanager
-def display(directory, width=1280, height=860):
-    """A virtual display with a window manager; gives its name."""
+def display(directory, width=1280, height=860, panel=0):
+    """A virtual display with a window manager, which keeps `panel` pixels at the lower edge free; gives its name."""
     read_end, write_end = os.pipe()
     server = ["Xvfb", "-displayfd", str(write_end), "-screen", "0", f"{width}x{height}x24", "-nolisten", "tcp"]
     with open(f"{directory}/display.log", "w") as log, started(server, pass_fds=[write_end], stdout=log, stderr=log):
@@ -51,9 +52,20 @@ def display(directory, width=1280, height=860):
         if not number:
             raise RuntimeError("Xvfb found no display number: " + open(f"{directory}/display.log").read())
         name = ":" + number
-        with started(["openbox"], env=dict(os.environ, DISPLAY=name), stdout=log, stderr=log):
+        manager = ["openbox", "--config-file", manager_rules(directory, panel)]
+        with started(manager, env=dict(os.environ, DISPLAY=name), stdout=log, stderr=log):
             await_window_manager(name)
             yield name
+
+
+def manager_rules(directory, panel):
+    """The window manager's own rules, save for the room of a panel."""
+    with open("/etc/xdg/openbox/rc.xml") as system:
+        rules = system.read()
+    head, margins, rest = rules.partition("<margins>")
+    with open(f"{directory}/rc.xml", "w") as own:
+        own.write(head + margins + re.sub(r"<bottom>\d+</bottom>", f"<bottom>{panel}</bottom>", rest, count=1))
+    return own.name
 
 
 def await_window_manager(name):

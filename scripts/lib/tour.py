@@ -92,11 +92,11 @@ def walk_through(walk, child, ports, support):
     return wrong
 
 
-def set_scene(stack):
+def set_scene(stack, *screen):
     """Display and buses; gives the environment that the program and this script share."""
     directory = stack.enter_context(stage.private_directory())
     os.environ.update(XDG_RUNTIME_DIR=directory, XDG_DATA_HOME=f"{directory}/data")
-    os.environ["DISPLAY"] = stack.enter_context(stage.display(directory))
+    os.environ["DISPLAY"] = stack.enter_context(stage.display(directory, *screen))
     os.environ["DBUS_SESSION_BUS_ADDRESS"] = stack.enter_context(stage.message_bus(directory))
     os.environ["QT_LINUX_ACCESSIBILITY_ALWAYS_ON"] = "1"
     os.environ["QT_QPA_PLATFORM"] = "xcb"

@@ -8,11 +8,13 @@ from accessible import NAME, centre_of, wait_for
 
 
 class Walk:
-    """Steps of the tour, in the order in which a user takes them. Pictures are numbered and go to a folder."""
+    """Steps of the tour, in the order in which a user takes them. Pictures are numbered and go to a folder. A program that
+    the toolkit shows at a scale tells its places in pixels of its own, each `scale` of the screen's wide."""
 
-    def __init__(self, program, folder):
+    def __init__(self, program, folder, scale=1):
         self.program = program
         self.folder = folder
+        self.scale = scale
         self.pictures = 0
 
     def xdotool(self, *words):
@@ -22,8 +24,11 @@ class Walk:
         self.pictures += 1
         stage.run("import", "-window", "root", f"{self.folder}/{self.pictures:02}-{name}.png")
 
+    def windows(self):
+        return self.xdotool("search", "--onlyvisible", "--pid", self.program.process).split()
+
     def point_at(self, control):
-        self.xdotool("mousemove", *centre_of(control))
+        self.xdotool("mousemove", *(self.scale * place for place in centre_of(control)))
 
     def click(self, name):
         self.point_at(self.program.control(name))
@@ -96,7 +101,7 @@ class Walk:
             self.click(back)
 
     def close(self):
-        window = self.xdotool("search", "--onlyvisible", "--pid", self.program.process).split()[-1]
+        window = self.windows()[-1]
         self.xdotool("windowactivate", "--sync", window)
         x, y = close_button_of(window)
         self.xdotool("mousemove", x, y, "click", 1)
