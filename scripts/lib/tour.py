@@ -7,6 +7,7 @@ when the program, the table, a rate or the report isn't as it should be.
 The link and the traffic need root. Without it the program runs on this machine as it is and the table has no rates."""
 
 import contextlib
+import glob
 import os
 import signal
 import subprocess
@@ -106,8 +107,8 @@ def set_scene(stack, *screen):
 
 def perform():
     os.makedirs(SCREENS, exist_ok=True)
-    for old in os.listdir(SCREENS):
-        os.remove(f"{SCREENS}/{old}")
+    for old in glob.glob(f"{SCREENS}/*.png"):
+        os.remove(old)
     with contextlib.ExitStack() as stack:
         set_scene(stack)
         command, ports, spaces = [PROGRAM], {}, []

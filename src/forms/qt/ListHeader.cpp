@@ -27,7 +27,8 @@ void ListHeader::paintSection(QPainter* painter, const QRect& rect, int section)
   painter->save();
   painter->fillRect(rect, palette::kQuietPage);
   painter->setPen(palette::kBorder);
-  painter->drawLine(rect.bottomLeft(), rect.bottomRight());
+  // Filled: at a scale of the screen a line ends short of its last pixel.
+  painter->fillRect(QRect(rect.left(), rect.bottom(), rect.width(), 1), palette::kBorder);
   const int divider = rightToLeft_ ? rect.left() : rect.right();
   painter->drawLine(divider, rect.top() + scale_.Pixels(7), divider, rect.bottom() - scale_.Pixels(7));
   if (list.Sorted() && list.SortKey() == section) DrawArrow(*painter, rect);
