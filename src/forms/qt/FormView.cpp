@@ -98,7 +98,10 @@ void FormView::ControlGone() {
 
 void FormView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Caption)) setWindowTitle(VisibleText(TheForm()->Caption()));
-  if (aspect == Aspect::Geometry) PlaceChildren(*TheForm());
+  if (aspect == Aspect::Geometry) {
+    PlaceChildren(*TheForm());
+    if (isVisible()) ComeOnScreen();
+  }
   viewport()->update();
 }
 
@@ -109,9 +112,9 @@ void FormView::Place() {
   const Fitting fitting = FittingScale({laidOut.PixelsX(place.width), laidOut.PixelsY(place.height)}, room);
   Zoom(fitting.scale);
   page_->resize(scale_.PixelsX(place.width), scale_.PixelsY(place.height));
-  for (void (QAbstractScrollArea::*setPolicy)(Qt::ScrollBarPolicy) :
-       {&QAbstractScrollArea::setHorizontalScrollBarPolicy, &QAbstractScrollArea::setVerticalScrollBarPolicy})
-    (this->*setPolicy)(fitting.scrolls ? Qt::ScrollBarAsNeeded : Qt::ScrollBarAlwaysOff);
+  const Qt::ScrollBarPolicy bars = fitting.scrolls ? Qt::ScrollBarAsNeeded : Qt::ScrollBarAlwaysOff;
+  setHorizontalScrollBarPolicy(bars);
+  setVerticalScrollBarPolicy(bars);
   const Extent inside = WindowExtent(ExtentOf(page_->size()), room, verticalScrollBar()->sizeHint().width());
   if (TheForm()->Border == BorderStyle::Sizable)
     resize(inside.width, inside.height);
@@ -182,7 +185,11 @@ void FormView::Show() {
 QString FormView::AccessibleName() const { return VisibleText(TheForm()->Caption()); }
 
 void FormView::ShowOver(const QWidget* owner) {
-  if (!std::exchange(wasPlaced_, true)) CentreOver(owner ? owner->frameGeometry() : UsableScreen(*this));
+  if (!std::exchange(wasPlaced_, true)) {
+    if (owner) setScreen(owner->screen());
+    Place();
+    CentreOver(owner ? owner->frameGeometry() : UsableScreen(*this));
+  }
   show();
   raise();
   activateWindow();

@@ -29,7 +29,8 @@ ListViewView::ListViewView(ViewContext& context, ListView& list, QWidget* parent
   setHeader(header);
   header->setSectionsClickable(true); // setHeader takes it away
   connect(header, &QHeaderView::sectionClicked, this, [this](int section) { HeaderClicked(section); });
-  connect(header, &QHeaderView::sectionResized, this, [this] { sizedByHand_ = sizedByHand_ || !sizing_; });
+  connect(header, &QHeaderView::sectionResized, this,
+          [this] { sizedByHand_ = sizedByHand_ || !(sizing_ || quiet_); });
   setItemDelegate(new ListDelegate(model_, context.scale, ReadsFromRightToLeft(), this));
   setModel(&model_);
   Context().mouse.Watch(*viewport(), *this);

@@ -108,6 +108,16 @@ TEST_F(FormOnSmallScreen, Fits_again_when_its_size_changes) {
   EXPECT_DOUBLE_EQ(WidgetOf(label).font().pointSizeF(), 12);
 }
 
+TEST_F(FormOnSmallScreen, Comes_back_on_the_screen_when_it_grows_beyond_its_edge) {
+  LayOut(0.25, 0.25);
+  desktop.Show(form);
+  WidgetOf(form).move(screen.right() - 220, screen.bottom() - 220);
+
+  form.Move(0, 0, 400 * kPixel, 300 * kPixel);
+
+  EXPECT_EQ(WidgetOf(form).geometry(), QRect(screen.right() - 399, screen.bottom() - 299, 400, 300));
+}
+
 TEST_F(FormOnSmallScreen, Gives_places_of_the_mouse_in_the_twips_of_its_layout) {
   std::pair<int, int> place;
   label.MouseMove = [&](int, int, int x, int y) { place = {x, y}; };
