@@ -12,7 +12,7 @@ namespace quendra::capture {
 
 namespace {
 
-constexpr std::int32_t kRefreshInterval = 1000;
+constexpr std::uint32_t kRefreshInterval = 1000;
 
 /// What a round finds when the library has put nothing there.
 constexpr std::array<std::uint8_t, 60> kBlankFrame{};
@@ -128,9 +128,8 @@ void PacketAttribution::ChargePacket(const FrameDecoders& decoders) {
 }
 
 void PacketAttribution::RefreshWhenDue() {
-  const std::uint32_t elapsed =
-      machine_.system.GetTickCount() - static_cast<std::uint32_t>(fields_.LastRefreshTick);
-  if (static_cast<std::int32_t>(elapsed) < kRefreshInterval || !page_.frameMain.Visible()) return;
+  if (fields_.SinceLastRefresh(machine_.system.GetTickCount()) < kRefreshInterval) return;
+  if (!page_.frameMain.Visible()) return;
   table_.RefreshProcessTable({});
   fields_.LastRefreshTick = static_cast<std::int32_t>(machine_.system.GetTickCount());
 }

@@ -25,6 +25,13 @@ struct MonitorFields {
   std::int32_t OsVersionCode =
       0; ///< 0, 32, 95, 98, 351, 40, 2000 or 2002; written when the main window loads
   std::int32_t LastRefreshTick = 0; ///< milliseconds; set by whoever runs a pass, never by the pass
+
+  /// Milliseconds from the last refresh to `tick`, modulo 2^32 and without a sign: with one, a page opened
+  /// when the system has been up for 25 days or more would never refresh, as the day number that seeds it
+  /// would lie ahead.
+  std::uint32_t SinceLastRefresh(std::uint32_t tick) const {
+    return tick - static_cast<std::uint32_t>(LastRefreshTick);
+  }
 };
 
 } // namespace quendra::monitor

@@ -41,9 +41,7 @@ void ProcessTable::RefreshProcessTable(const Text&) {
 }
 
 double ProcessTable::SecondsSinceLastRefresh() const {
-  const std::uint32_t now = machine_.system.GetTickCount();
-  // A difference of 32-bit ticks, right across their wrap.
-  return static_cast<std::int32_t>(now - static_cast<std::uint32_t>(fields_.LastRefreshTick)) / 1000.0;
+  return fields_.SinceLastRefresh(machine_.system.GetTickCount()) / 1000.0;
 }
 
 void ProcessTable::ClearMarks() {

@@ -265,11 +265,28 @@ TEST_F(DrainLoop, The_second_is_measured_across_the_wrap_of_the_tick) {
   EXPECT_EQ(Passes(), 1);
 }
 
-TEST_F(DrainLoop, A_last_tick_that_lies_ahead_is_no_second_ago) {
-  fields.LastRefreshTick = 5000;
-  machine.SetTick(1000);
-  Receive({Outgoing(1025)});
-  EXPECT_EQ(Passes(), 0);
+TEST_F(DrainLoop, A_day_number_as_last_tick_makes_the_first_event_refresh_at_any_uptime) {
+  int passes = 0;
+  for (const std::uint32_t tick : {1000u, 0x7FFFFFFFu, 0x80000000u, 0x80000000u + 46000, 0xFFFFFFFFu}) {
+    fields.LastRefreshTick = 46000;
+    machine.SetTick(tick);
+    Receive({Outgoing(1025)});
+    EXPECT_EQ(Passes(), ++passes) << tick;
+  }
+}
+
+TEST_F(DrainLoop, From_the_25th_day_of_uptime_on_a_pass_runs_each_second_too) {
+  constexpr std::uint32_t k25Days = 25u * 24 * 60 * 60 * 1000;
+  machine.SetTick(k25Days);
+  fields.LastRefreshTick = static_cast<std::int32_t>(k25Days);
+  for (int second = 1; second <= 3; ++second) {
+    machine.AdvanceTick(999);
+    Receive({Outgoing(1025)});
+    EXPECT_EQ(Passes(), second - 1);
+    machine.AdvanceTick(1);
+    Receive({Outgoing(1025)});
+    EXPECT_EQ(Passes(), second);
+  }
 }
 
 TEST_F(DrainLoop, The_round_that_ends_a_drain_refreshes_too) {

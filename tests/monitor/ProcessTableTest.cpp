@@ -1,4 +1,5 @@
 #include "monitor/MonitorFixture.h"
+#include "runtime/Format.h"
 
 namespace quendra::monitor {
 
@@ -57,14 +58,18 @@ TEST_F(ProcessTableTest, The_seconds_are_right_while_the_signed_tick_is_below_ze
   EXPECT_EQ(CellOf(10, kUploadCell), u"02.00");
 }
 
-TEST_F(ProcessTableTest, A_last_refresh_that_lies_ahead_turns_the_rates_negative) {
+TEST_F(ProcessTableTest, The_seconds_since_the_day_number_are_positive_at_any_uptime) {
   AddProcesses({10});
-  Pass();
-  Charge(10, 2, 0);
-  fields.LastRefreshTick = Tick() + 2000;
-  table.RefreshProcessTable(u"");
-  EXPECT_EQ(CellOf(10, kUploadCell), u"");
-  EXPECT_EQ(CellOf(10, kTotalCell), u"-1.00");
+  constexpr std::uint32_t kDay = 24 * 60 * 60 * 1000;
+  for (const std::uint32_t day : {1u, 24u, 25u, 30u, 49u}) {
+    machine.SetTick(day * kDay);
+    Pass(0);
+    Charge(10, 1024 * 1024, 0);
+    fields.LastRefreshTick = machine.system.DayNumber();
+    table.RefreshProcessTable(u"");
+    const double rate = 1024.0 * 1024 / (day * 86400.0 - machine.system.DayNumber() / 1000.0);
+    EXPECT_EQ(CellOf(10, kUploadCell), Format(rate, u"###00.00")) << day;
+  }
 }
 
 TEST_F(ProcessTableTest, A_pass_at_the_tick_of_the_last_refresh_divides_traffic_by_zero) {
