@@ -31,6 +31,7 @@ class PollLoop : public platform::EventLoop {
     return Keep(timer_, {milliseconds, std::move(tick)});
   }
   void PumpOnce() override { Pump(0); }
+  int ModalDepth() const override { return 0; }
 
   void Pump(int milliseconds) {
     for (; !posted_.empty(); posted_.pop_front()) std::function<void()>(posted_.front())();

@@ -1,5 +1,7 @@
 #include "forms/Desktop.h"
 
+#include <optional>
+
 namespace quendra::forms {
 
 void Desktop::Load(Form& form) {
@@ -16,6 +18,8 @@ void Desktop::Load(Form& form) {
 void Desktop::Show(Form& form, Modality modality, Form* owner) {
   Load(form);
   form.Visible = true;
+  std::optional<Standing> standing;
+  if (modality == Modality::Modal) standing.emplace(*this);
   ShowView(form, modality, owner);
 }
 

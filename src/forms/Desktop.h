@@ -99,6 +99,19 @@ class Desktop {
   virtual Picture ImageOf(const PictureBox& box) const = 0;
 
  protected:
+  /// A message box or a modal form, counted as standing as long as this lives.
+  class Standing {
+   public:
+    explicit Standing(Desktop& desktop) : count_(desktop.standing_) { ++count_; }
+    ~Standing() { --count_; }
+    Standing(const Standing&) = delete;
+    Standing& operator=(const Standing&) = delete;
+
+   private:
+    int& count_;
+  };
+  int StandingCount() const { return standing_; }
+
   virtual void CreateView(Form& form) = 0;
   virtual void DestroyView(Form& form) = 0;
   virtual void ShowView(Form& form, Modality modality, Form* owner) = 0;
@@ -107,6 +120,7 @@ class Desktop {
 
  private:
   int loadedForms_ = 0;
+  int standing_ = 0;
 };
 
 } // namespace quendra::forms

@@ -31,6 +31,10 @@ class EventLoop {
                                                                  std::function<void()> tick) = 0;
   /// Handles what waits, without waiting for more.
   virtual void PumpOnce() = 0;
+  /// How many message boxes and modal forms stand, one over the other. Each handles events in a loop of its
+  /// own while the handler that opened it waits. A handler that finds the number above that of its own start
+  /// in what runs inside it knows that it is held up by one of them, and not merely pumping.
+  virtual int ModalDepth() const = 0;
 };
 
 } // namespace quendra::platform

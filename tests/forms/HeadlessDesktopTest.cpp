@@ -391,6 +391,39 @@ TEST_F(HeadlessDesktopTest, A_modal_form_stands_as_long_as_its_script_runs) {
   EXPECT_EQ(desktop.CountOf("Show frmMenu modal owner frmMenu"), 1);
 }
 
+TEST_F(HeadlessDesktopTest, A_box_stands_as_long_as_its_script_runs) {
+  std::size_t boxes = 0;
+  desktop.OnBox = [&] { boxes = desktop.Boxes.size(); };
+  desktop.AnswerNextBox(7);
+
+  EXPECT_EQ(desktop.MessageBox(u"text", 0, u"title"), 7);
+
+  EXPECT_EQ(boxes, 1U);
+}
+
+TEST_F(HeadlessDesktopTest, The_end_of_the_program_unwinds_the_handler_whose_box_stands) {
+  desktop.OnBox = [&] { desktop.Dispatch([&] { desktop.End(3); }); };
+
+  EXPECT_THROW(desktop.MessageBox(u"text", 0, u"title"), ProgramEnded);
+}
+
+TEST_F(HeadlessDesktopTest, The_loop_tells_how_many_boxes_and_modal_forms_stand) {
+  MainForm dialog;
+  std::vector<int> depths;
+  desktop.OnBox = [&] { depths.push_back(desktop.ModalDepth()); };
+  desktop.OnModal = [&](Form&) {
+    depths.push_back(desktop.ModalDepth());
+    desktop.MessageBox(u"text", 0, u"title");
+    depths.push_back(desktop.ModalDepth());
+  };
+
+  desktop.Show(dialog, Modality::Modal);
+  desktop.DoEvents();
+  depths.push_back(desktop.ModalDepth());
+
+  EXPECT_EQ(depths, (std::vector<int>{1, 2, 1, 0}));
+}
+
 // What is recorded.
 
 TEST_F(HeadlessDesktopTest, Window_calls_are_recorded_with_names_and_numbers) {

@@ -24,6 +24,7 @@ class CountingLoop : public EventLoop {
     return std::make_unique<Counted>(loop_.StartTimer(milliseconds, std::move(tick)), timers);
   }
   void PumpOnce() override { loop_.PumpOnce(); }
+  int ModalDepth() const override { return loop_.ModalDepth(); }
 
   int watches = 0;
   int timers = 0;

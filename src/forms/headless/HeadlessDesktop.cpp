@@ -90,6 +90,11 @@ void HeadlessDesktop::End(int status) {
 
 int HeadlessDesktop::MessageBox(const Text& text, int flags, const Text& title) {
   Boxes.push_back({text, flags, title});
+  if (OnBox) {
+    const Standing box(*this);
+    OnBox();
+    if (Ended) throw ProgramEnded{EndStatus};
+  }
   if (answers_.empty()) return 1;
   const int answer = answers_.front();
   answers_.pop_front();

@@ -21,6 +21,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
                    std::uint32_t lParam) override {
     Post([=, this] { Windows.Dispatch(window, message, wParam, lParam); });
   }
+  int ModalDepth() const override { return StandingCount(); }
 
   /// Pixels: how wide each character and how high each line is in any font.
   static constexpr int CharacterWidth = 8;
@@ -52,6 +53,8 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   CursorHandle CursorHandleToGive = 5;
   /// Called at each DoEvents, before the queue is handled; not from within itself.
   std::function<void()> OnYield;
+  /// What happens while a message box stands. Without it a box is answered at once.
+  std::function<void()> OnBox;
   /// What happens while a modal form stands. Without it a modal form returns at once and stays visible.
   std::function<void(Form&)> OnModal;
 

@@ -71,6 +71,7 @@ QWidget* QtDesktop::FrontWindow() {
 }
 
 int QtDesktop::MessageBox(const Text& text, int flags, const Text& title) {
+  const Standing box(*this);
   const int answer = qt::ShowBox(FrontWindow(), text, flags, title);
   dispatcher_.UnwindIfEnded();
   return answer;

@@ -77,6 +77,7 @@ class QtDesktop : public Desktop, public platform::EventLoop {
     return loop_.StartTimer(milliseconds, std::move(tick));
   }
   void PumpOnce() override { loop_.PumpOnce(); }
+  int ModalDepth() const override { return StandingCount(); }
 
   /// Whether the program has ended, and with which status.
   bool Ended() const { return dispatcher_.Ended(); }

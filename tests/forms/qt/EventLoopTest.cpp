@@ -171,6 +171,53 @@ TEST_F(EventLoop, A_timer_ticks_until_its_subscription_goes) {
   EXPECT_EQ(ticks, before);
 }
 
+TEST_F(EventLoop, A_timer_that_another_replaces_in_its_tick_leaves_the_other_to_tick_in_a_box_opened_there) {
+  Box box;
+  int ticks = 0;
+  std::unique_ptr<platform::EventLoop::Subscription> timer;
+  std::function<void()> tick = [&] {
+    timer.reset();
+    timer = desktop.StartTimer(1, tick);
+    const int number = ++ticks;
+    if (number == 1) desktop.MessageBox(u"text", 0, u"title");
+    if (number == 5) AnswerBox(box);
+  };
+
+  timer = desktop.StartTimer(1, tick);
+
+  ASSERT_TRUE(RunUntil([&] { return box.count == 1; }));
+  EXPECT_GE(ticks, 5);
+}
+
+TEST_F(EventLoop, It_tells_how_many_boxes_and_modal_forms_stand) {
+  std::vector<int> depths;
+  Box box;
+  desktop.Post([&] {
+    depths.push_back(desktop.ModalDepth());
+    desktop.Post([&] {
+      depths.push_back(desktop.ModalDepth());
+      AnswerBox(box);
+    });
+    desktop.MessageBox(u"text", 0, u"title");
+    depths.push_back(desktop.ModalDepth());
+    form.Visible = false;
+  });
+
+  desktop.Show(form, Modality::Modal);
+  depths.push_back(desktop.ModalDepth());
+
+  EXPECT_EQ(depths, (std::vector<int>{1, 2, 1, 0}));
+}
+
+TEST_F(EventLoop, Pumping_is_no_modal_loop) {
+  int depth = -1;
+  desktop.Post([&] { depth = desktop.ModalDepth(); });
+
+  desktop.DoEvents();
+
+  EXPECT_EQ(depth, 0);
+}
+
 TEST_F(EventLoop, A_subscription_may_outlive_its_desktop) {
   std::unique_ptr<platform::EventLoop::Subscription> timer;
   {
