@@ -58,7 +58,12 @@ void FrameLedger::Enter(const pcap_pkthdr& header, const unsigned char* frame) {
   if (source == local_)
     (*byPort_)[WordAt(frame + 34)].upload += WordAt(frame + 16);
   else
-    (*byPort_)[WordAt(frame + 36)].download += WordAt(frame + 16);
+    EnterDownload(header, WordAt(frame + 36), WordAt(frame + 16));
+}
+
+void FrameLedger::EnterDownload(const pcap_pkthdr& header, unsigned port, unsigned bytes) {
+  (*byPort_)[port].download += bytes;
+  if (port == watchedPort_) watched_.push_back({header.ts.tv_sec * 1'000'000LL + header.ts.tv_usec, bytes});
 }
 
 FrameLedger::Page FrameLedger::Read() const {
@@ -69,9 +74,14 @@ FrameLedger::Page FrameLedger::Read() const {
   return page;
 }
 
-std::uint64_t FrameLedger::Frames() const {
+void FrameLedger::Watch(std::uint16_t port) {
   const std::lock_guard guard(lock_);
-  return frames_;
+  watchedPort_ = port;
+}
+
+std::vector<FrameLedger::Arrival> FrameLedger::Watched() const {
+  const std::lock_guard guard(lock_);
+  return watched_;
 }
 
 std::uint64_t FrameLedger::TcpFrames() const {

@@ -9,6 +9,7 @@
 #include <string>
 #include <sys/types.h>
 #include <thread>
+#include <vector>
 
 struct pcap;
 struct pcap_pkthdr;
@@ -41,18 +42,27 @@ class FrameLedger {
     std::map<std::uint16_t, Totals> byPort;
   };
 
+  /// A frame of TCP, by the clock of the link.
+  struct Arrival {
+    std::int64_t microseconds = 0; ///< since 1970
+    std::uint32_t bytes = 0;       ///< IP total length
+  };
+
   FrameLedger(const std::string& link, const std::string& localAddress);
   ~FrameLedger();
 
   Page Read() const;
-  std::uint64_t Frames() const;
   std::uint64_t TcpFrames() const;
+  /// From now on every frame that comes for this local port is kept.
+  void Watch(std::uint16_t port);
+  std::vector<Arrival> Watched() const;
   /// Frames that this capture missed.
   std::uint64_t Drops() const;
 
  private:
   static void Take(unsigned char* ledger, const pcap_pkthdr* header, const unsigned char* frame);
   void Enter(const pcap_pkthdr& header, const unsigned char* frame);
+  void EnterDownload(const pcap_pkthdr& header, unsigned port, unsigned bytes);
 
   pcap* capture_;
   std::uint32_t local_ = 0;
@@ -61,6 +71,8 @@ class FrameLedger {
   std::uint64_t tcpFrames_ = 0;
   std::uint64_t udpFrames_ = 0;
   std::uint64_t icmpFrames_ = 0;
+  std::uint16_t watchedPort_ = 0;
+  std::vector<Arrival> watched_;
   std::unique_ptr<std::array<Totals, 65536>> byPort_ = std::make_unique<std::array<Totals, 65536>>();
   std::thread thread_;
 };

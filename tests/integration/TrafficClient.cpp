@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <array>
+#include <ctime>
 #include <netinet/ip_icmp.h>
 #include <netinet/tcp.h>
 #include <unistd.h>
@@ -18,6 +19,23 @@ void LimitWaiting(int descriptor) {
   const timeval limit{30, 0};
   setsockopt(descriptor, SOL_SOCKET, SO_RCVTIMEO, &limit, sizeof limit);
 }
+
+/// Keeps to a rate over any length of time.
+class Pace {
+ public:
+  explicit Pace(const Order& order) : pause_(order.pause) { clock_gettime(CLOCK_MONOTONIC, &next_); }
+  void Wait() {
+    if (pause_ == 0) return;
+    next_.tv_nsec += pause_ * 1000L;
+    next_.tv_sec += next_.tv_nsec / 1'000'000'000;
+    next_.tv_nsec %= 1'000'000'000;
+    clock_nanosleep(CLOCK_MONOTONIC, TIMER_ABSTIME, &next_, nullptr);
+  }
+
+ private:
+  long pause_;
+  timespec next_{};
+};
 
 void Exchange(int connection, const Order& order) {
   std::vector<char> bytes(static_cast<std::size_t>(std::max(order.request, order.reply)) +
@@ -62,14 +80,20 @@ void TrafficClient::Run(int channel) {
 std::vector<std::uint16_t> TrafficClient::Obey(const Order& order) {
   switch (order.kind) {
   case Order::Kind::Connect: return MakeConnections(order.count);
-  case Order::Kind::Exchange:
-    for (const int connection : connections_)
-      for (int i = 0; i < order.count; ++i) Exchange(connection, order);
-    break;
+  case Order::Kind::Exchange: Exchanges(order); break;
   case Order::Kind::ShortConnections: ShortConnections(order); break;
   case Order::Kind::Datagrams: Datagrams(order); break;
   }
   return {};
+}
+
+void TrafficClient::Exchanges(const Order& order) const {
+  Pace pace(order);
+  for (const int connection : connections_)
+    for (int i = 0; i < order.count; ++i) {
+      Exchange(connection, order);
+      pace.Wait();
+    }
 }
 
 int TrafficClient::Connect() const {
@@ -110,10 +134,11 @@ void TrafficClient::Datagrams(const Order& order) const {
   const int echoes = Check(socket(AF_INET, SOCK_RAW | SOCK_CLOEXEC, IPPROTO_ICMP), "raw socket");
   const sockaddr_in server = InetAddress(address_, port_);
   const std::vector<char> bytes(static_cast<std::size_t>(order.request));
+  Pace pace(order);
   for (int i = 0; i < order.count; ++i) {
     sendto(datagrams, bytes.data(), bytes.size(), 0, Generic(server), sizeof server);
     if (i % 5 == 0) Ping(echoes, server);
-    usleep(500);
+    pace.Wait();
   }
   close(datagrams);
   close(echoes);

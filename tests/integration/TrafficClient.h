@@ -16,6 +16,7 @@ class TrafficClient {
   int Connect() const;
   std::vector<std::uint16_t> Obey(const Order& order);
   std::vector<std::uint16_t> MakeConnections(int count);
+  void Exchanges(const Order& order) const;
   void ShortConnections(const Order& order) const;
   void Datagrams(const Order& order) const;
 

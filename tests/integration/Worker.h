@@ -17,6 +17,7 @@ struct Order {
   std::int32_t count = 0;   ///< connections, exchanges on each connection, or datagrams
   std::int32_t request = 0; ///< bytes that each exchange sends
   std::int32_t reply = 0;   ///< bytes that each exchange gets back
+  std::int32_t pause = 0;   ///< microseconds from one exchange or datagram to the next, 0 for no wait
 };
 
 /// What a worker answers when it has done as told.

@@ -9,7 +9,6 @@ using integration::Bytes;
 using integration::RawLink;
 using integration::RunCommand;
 using integration::TcpFrame;
-using integration::UdpFrame;
 
 namespace {
 
@@ -110,13 +109,13 @@ TEST_F(LinuxCaptureEventsTest, Frames_that_were_left_are_read_with_those_that_co
 }
 
 TEST_F(LinuxCaptureEventsTest, The_buffer_holds_the_newest_record_with_a_header_of_18_bytes) {
-  RawLink("qv1").SendTogether({TcpFrame(1025, 80, 1500), UdpFrame(1026, 53, 200)});
+  RawLink("qv1").SendTogether({TcpFrame(1025, 80, 1500), TcpFrame(1026, 53, 200)});
   WaitForEvents(1);
   const Record record(*control);
   EXPECT_EQ(record.captured, 96u);
   EXPECT_EQ(record.wire, 214u);
   EXPECT_EQ(record.headerLength, 18);
-  EXPECT_EQ(record.bytes[18 + 14 + 9], 17);
+  EXPECT_EQ(record.bytes[18 + 14 + 9], 6);
   const Bytes frame(record.bytes.begin() + 18, record.bytes.begin() + 18 + 96);
   EXPECT_EQ(SourcePort(frame), 1026u);
 }
@@ -308,7 +307,7 @@ TEST_F(LinuxCaptureEventsTest, When_events_take_nothing_the_oldest_frames_go_fir
   RawLink far("qv1");
   constexpr std::uint64_t kFrames = PcapFrameQueue::kCapacity + 50000;
   for (std::uint64_t sent = 0; sent < kFrames; ++sent) {
-    far.Send(UdpFrame(1025, 53));
+    far.Send(TcpFrame(1025, 53));
     if (sent % 2000 == 0) desktop.Advance(100);
   }
   far.Send(TcpFrame(4000, 80));

@@ -158,17 +158,19 @@ TEST_F(LinuxCaptureTest, Frames_sent_from_this_side_are_delivered_once_too) {
 TEST_F(LinuxCaptureTest, Packets_on_loopback_are_delivered_once) {
   RunCommand("ip link set lo up");
   Start("lo");
-  const int sender = socket(AF_INET, SOCK_DGRAM | SOCK_CLOEXEC, 0);
+  const int client = socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
   sockaddr_in target{};
   target.sin_family = AF_INET;
   target.sin_port = htons(4000);
   target.sin_addr.s_addr = inet_addr("127.0.0.1");
-  ASSERT_EQ(sendto(sender, "x", 1, 0, reinterpret_cast<sockaddr*>(&target), sizeof target), 1);
-  close(sender);
-  WaitUntil([&] { return events > 0; }, "the packet");
-  int packets = 0;
-  while (const auto frame = NextFrame()) packets += (*frame)[23] == 17;
-  EXPECT_EQ(packets, 1);
+  ASSERT_NE(connect(client, reinterpret_cast<sockaddr*>(&target), sizeof target), 0);
+  close(client);
+  WaitUntil([&] { return events > 0; }, "the packets");
+  std::vector<int> flags;
+  while (const auto frame = NextFrame()) flags.push_back((*frame)[47]);
+  constexpr int kSyn = 0x02;
+  constexpr int kAckAndReset = 0x14;
+  EXPECT_EQ(flags, (std::vector<int>{kSyn, kAckAndReset}));
 }
 
 TEST_F(LinuxCaptureTest, Frames_are_cut_to_what_the_decoders_need_but_tell_their_length) {

@@ -132,6 +132,32 @@ TEST_F(PcapFrameShaperTest, Headers_of_other_links_give_way_to_an_Ethernet_heade
   }
 }
 
+TEST_F(PcapFrameShaperTest, A_long_packet_shows_as_many_bytes_whatever_the_header_of_its_link) {
+  const Bytes packet = Ipv4Packet(6, "1.2.3.4", 1025, "5.6.7.8", 80, 200);
+  Bytes cooked(16);
+  PutWord(cooked, 14, 0x0800);
+  Bytes cooked2(20);
+  PutWord(cooked2, 0, 0x0800);
+  const std::pair<LinkForm, Bytes> links[] = {
+      {LinkForm::Ethernet, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 8, 0}},
+      {LinkForm::RawIp, {}},
+      {LinkForm::Family, {2, 0, 0, 0}},
+      {LinkForm::LinuxCooked, cooked},
+      {LinkForm::LinuxCooked2, cooked2},
+      {LinkForm::Ppp, {0xFF, 0x03, 0x00, 0x21}},
+  };
+  for (const auto& [form, header] : links) {
+    shaper.SetForm(form);
+    Bytes captured = Joined(header, packet);
+    captured.resize(PcapRecord::kRoom + PcapFrameShaper::kMostHeaderLost);
+    Deliver(captured);
+    const Bytes frame = Next();
+    EXPECT_EQ(frame.size(), 96u) << static_cast<int>(form);
+    EXPECT_EQ(Bytes(frame.begin() + 14, frame.end()), Bytes(packet.begin(), packet.begin() + 82))
+        << static_cast<int>(form);
+  }
+}
+
 TEST_F(PcapFrameShaperTest, Packets_shorter_than_their_links_header_become_blank_frames) {
   for (const LinkForm form : {LinkForm::RawIp, LinkForm::Family, LinkForm::LinuxCooked,
                               LinkForm::LinuxCooked2, LinkForm::Ppp, LinkForm::Ethernet}) {

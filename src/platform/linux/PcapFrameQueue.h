@@ -8,7 +8,9 @@ namespace quendra::platform::linux_ {
 
 /// A frame as it waits: when it came, how much of it is here, how long it was.
 struct PcapRecord {
-  static constexpr std::uint32_t kRoom = 144;
+  /// A TCP header inside a tunnel ends at index 93, and frames that reach index 94 are taken for tunnelled;
+  /// what lies behind is of no use to the decoders.
+  static constexpr std::uint32_t kRoom = 96;
 
   std::uint32_t seconds;
   std::uint32_t microseconds;
@@ -16,15 +18,13 @@ struct PcapRecord {
   std::uint32_t wire;
   std::array<std::uint8_t, kRoom> bytes;
 };
-static_assert(sizeof(PcapRecord) == 160);
+static_assert(sizeof(PcapRecord) == 112);
 
 /// Frames on their way from the kernel's ring to the capture loop. Bounded; pages are touched only as far as
 /// it fills. The frame popped last stays as it is until the next one is popped.
 class PcapFrameQueue {
  public:
-  /// Events that take nothing, because a datagram came last each time, must not cost frames: room for seconds
-  /// of a busy line.
-  static constexpr std::uint32_t kCapacity = 1 << 19;
+  static constexpr std::uint32_t kCapacity = 65536;
 
   PcapFrameQueue() : records_(new PcapRecord[kCapacity]) {}
 

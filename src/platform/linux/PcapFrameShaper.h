@@ -27,6 +27,8 @@ class PcapFrameShaper {
  public:
   /// A record of a packet yields at most so many frames.
   static constexpr std::uint32_t kMostPieces = 17;
+  /// So many bytes is an Ethernet header shorter than the longest header that it replaces.
+  static constexpr std::uint32_t kMostHeaderLost = 6;
 
   explicit PcapFrameShaper(PcapFrameQueue& queue) : queue_(queue) {}
   void SetForm(LinkForm form) { form_ = form; }
