@@ -101,7 +101,7 @@ class CaptureControl {
   virtual void SetValueC(std::int32_t value) = 0;
 
   /// Raised when frames have arrived, and once more through the queue after an event that took frames and
-  /// left some.
+  /// left some; not inside itself, save while a box or a modal form stands that was opened in it.
   std::function<void()> PacketReceived;
 };
 

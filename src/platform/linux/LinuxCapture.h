@@ -13,7 +13,6 @@ struct CaptureCounters {
   std::uint64_t received = 0;        ///< packets taken from the kernel
   std::uint64_t droppedByKernel = 0; ///< packets that the kernel's ring had no room for
   std::uint64_t droppedByQueue = 0;  ///< frames that waited too long behind events that took none
-  std::uint64_t rejected = 0;        ///< frames that a decoder found too short
 };
 
 /// The capture library and its control over libpcap. Both share one session on one adapter: the control rings

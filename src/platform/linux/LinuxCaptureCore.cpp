@@ -1,6 +1,7 @@
 #include "platform/linux/LinuxCaptureCore.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace quendra::platform::linux_ {
 
@@ -18,6 +19,30 @@ constexpr int kPaceMilliseconds = 50;
 constexpr int kMostBatches = 256;
 
 } // namespace
+
+/// An event under way, also when its handler ends by an exception. What it takes from the queue is its own:
+/// events inside it use the queue meanwhile, and may even end the session.
+class LinuxCaptureCore::Event {
+ public:
+  explicit Event(LinuxCaptureCore& core)
+      : core_(core), outer_(std::exchange(core.event_, this)), modalDepth_(core.loop_.ModalDepth()) {}
+  ~Event() {
+    core_.event_ = outer_;
+    if (outer_ != nullptr) outer_->taken += taken;
+  }
+  Event(const Event&) = delete;
+  Event& operator=(const Event&) = delete;
+
+  bool IsHeldUp() const { return core_.loop_.ModalDepth() > modalDepth_; }
+
+  std::uint32_t taken = 0; ///< frames, also by events inside this one
+  PcapRecord frame{};      ///< the last of its own
+
+ private:
+  LinuxCaptureCore& core_;
+  Event* outer_;
+  int modalDepth_;
+};
 
 void LinuxCaptureCore::CountAdapters() {
   ListAdapters();
@@ -113,7 +138,7 @@ void LinuxCaptureCore::CloseSession() {
 /// Some interface has come, gone or changed, perhaps the session's.
 void LinuxCaptureCore::LinksChanged() {
   // What came before the interface went is still to be charged.
-  if (!FollowsLink() && !inEvent_ && !secondRingPosted_) Serve();
+  if (!FollowsLink() && !Busy() && !secondRingPosted_) Serve();
   if (!begun_) return; // the event has left the page
   if (FollowsLink())
     AwaitAddress();
@@ -150,12 +175,14 @@ std::int32_t LinuxCaptureCore::Capture(FrameBytes& frame, CaptureHeader& header)
     queue_.Rewind();
     if (session_->Fill() < 0) return -1;
   }
-  const PcapRecord* record = queue_.Pop();
-  if (record == nullptr) return 0;
-  ++taken_;
-  frame = FrameBytes(record->bytes.data(), static_cast<int>(record->captured));
-  header = {record->seconds, record->microseconds, record->captured, record->wire, 0, 0};
-  return static_cast<std::int32_t>(record->captured);
+  const PcapRecord* next = queue_.Pop();
+  if (next == nullptr) return 0;
+  if (event_ != nullptr) ++event_->taken;
+  PcapRecord& record = event_ != nullptr ? event_->frame : frame_;
+  record = *next;
+  frame = FrameBytes(record.bytes.data(), static_cast<int>(record.captured));
+  header = {record.seconds, record.microseconds, record.captured, record.wire, 0, 0};
+  return static_cast<std::int32_t>(record.captured);
 }
 
 void LinuxCaptureCore::Listen(CaptureControl& control, const std::string& adapterName) {
@@ -186,17 +213,27 @@ void LinuxCaptureCore::UpdateBell() {
   });
 }
 
-void LinuxCaptureCore::DescriptorReady() {
-  watch_.reset();
-  if (!MayRing()) return;
+bool LinuxCaptureCore::Busy() const { return event_ != nullptr && !event_->IsHeldUp(); }
+
+void LinuxCaptureCore::StartPace() {
+  pace_.reset();
   pace_ = loop_.StartTimer(kPaceMilliseconds, [weak = weak_from_this()] {
     if (const auto core = weak.lock()) core->LookAgain();
   });
-  if (!inEvent_ && !secondRingPosted_) Serve();
+}
+
+void LinuxCaptureCore::DescriptorReady() {
+  watch_.reset();
+  if (!MayRing()) return;
+  StartPace();
+  if (!Busy() && !secondRingPosted_) Serve();
 }
 
 void LinuxCaptureCore::LookAgain() {
-  if (inEvent_ || secondRingPosted_ || Serve()) return;
+  // A timer doesn't tick inside its own tick, in which a box may come up that stands for long: hence another
+  // one each time.
+  StartPace();
+  if (Busy() || secondRingPosted_ || Serve()) return;
   pace_.reset();
   UpdateBell();
 }
@@ -209,7 +246,8 @@ bool LinuxCaptureCore::Serve() {
   const int batches = queue_.Empty() ? 1 : kMostBatches;
   queue_.Rewind();
   const bool moved = Gather(batches);
-  if (moved) Ring();
+  // An event that is held up may have left frames; nobody else comes for them while it is.
+  if (moved || (event_ != nullptr && !queue_.Empty())) Ring();
   return moved;
 }
 
@@ -232,34 +270,16 @@ void LinuxCaptureCore::MakeRoom() {
   earlier_.droppedByQueue += PcapSession::kRoomOfBatch;
 }
 
-/// Marks an event as under way, also when its handler ends by an exception.
-class LinuxCaptureCore::Event {
- public:
-  explicit Event(LinuxCaptureCore& core) : core_(core) {
-    core_.inEvent_ = true;
-    core_.taken_ = 0;
-  }
-  ~Event() { core_.inEvent_ = false; }
-  Event(const Event&) = delete;
-  Event& operator=(const Event&) = delete;
-
- private:
-  LinuxCaptureCore& core_;
-};
-
 void LinuxCaptureCore::Ring() {
   // The control may go while its own event runs, so its handler is held here.
   const auto handler = control_->PacketReceived;
+  std::uint32_t taken = 0;
   if (handler) {
-    const Event event(*this);
-    try {
-      handler();
-    } catch (const Fault& fault) {
-      if (fault.number != Fault::kSubscript) throw;
-      ++earlier_.rejected;
-    }
+    Event event(*this);
+    handler();
+    taken = event.taken;
   }
-  if (taken_ > 0 && !queue_.Empty() && MayRing()) {
+  if (taken > 0 && !queue_.Empty() && MayRing() && !secondRingPosted_) {
     secondRingPosted_ = true;
     loop_.Post([weak = weak_from_this()] {
       if (const auto core = weak.lock()) core->RingAgain();
@@ -270,7 +290,7 @@ void LinuxCaptureCore::Ring() {
 
 void LinuxCaptureCore::RingAgain() {
   secondRingPosted_ = false;
-  if (MayRing() && !inEvent_ && !queue_.Empty())
+  if (MayRing() && !Busy() && !queue_.Empty())
     Ring();
   else
     UpdateBell();

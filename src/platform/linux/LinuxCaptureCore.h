@@ -15,7 +15,8 @@ namespace quendra::platform::linux_ {
 /// On a silent line the descriptor is watched. Once it has rung, a timer looks for packets as long as there
 /// are some: a busy line rings twenty times a second and not with every block of the kernel, as each ring
 /// costs the loop more than a hundred frames do. During an event nothing is served, so that a handler which
-/// yields is never entered again from here; the kernel's ring does the waiting.
+/// merely yields is not entered again from here; the kernel's ring does the waiting. While a box or a modal
+/// form stands that was opened in an event, that could take minutes: then events go on inside it.
 class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
  public:
   LinuxCaptureCore(EventLoop& loop, PcapLibrary library) : loop_(loop), library_(std::move(library)) {}
@@ -62,6 +63,9 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   bool HasSession() const { return session_ != nullptr && !session_->Failed(); }
   bool MayRing() const;
   void UpdateBell();
+  /// Whether an event is under way that no box or modal form holds up.
+  bool Busy() const;
+  void StartPace();
   void DescriptorReady();
   void LookAgain();
   bool Serve();
@@ -85,15 +89,15 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   unsigned link_ = 0;                // the number of the interface that the session was opened on, 0 for none
   bool gone_ = false;                // the session waits for its interface
   bool awaitsAddress_ = false;       // the interface has come back without one
-  CaptureCounters earlier_;          // of sessions that were closed; droppedByQueue and rejected of all
+  CaptureCounters earlier_;          // of sessions that were closed; droppedByQueue of all
 
   CaptureControl* control_ = nullptr;
   std::string controlAdapter_;
   std::unique_ptr<EventLoop::Subscription> watch_; // on a silent line
   std::unique_ptr<EventLoop::Subscription> pace_;  // on a busy line; never both
-  bool inEvent_ = false;
   bool secondRingPosted_ = false;
-  std::uint32_t taken_ = 0; // frames that the event under way took
+  Event* event_ = nullptr; // the innermost one under way
+  PcapRecord frame_{};     // what was taken last outside of events
 };
 
 } // namespace quendra::platform::linux_
