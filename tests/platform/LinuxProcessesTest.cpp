@@ -147,15 +147,15 @@ TEST_F(LinuxProcessesTest, A_path_is_written_over_the_start_of_the_text_and_its_
   EXPECT_EQ(path, file + "      ");
 }
 
-TEST_F(LinuxProcessesTest, No_path_is_longer_than_the_size_stated_or_the_text) {
-  AddRunning(7, "seven");
+TEST_F(LinuxProcessesTest, A_path_is_cut_to_the_size_stated_and_to_the_text) {
+  const std::string file = AddRunning(7, "seven");
   const Handle process = processes.OpenProcess(1040, false, 7);
   std::string path(20, ' ');
   EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, path, 4), 4u);
-  EXPECT_EQ(path.substr(4), std::string(16, ' '));
+  EXPECT_EQ(path, file.substr(0, 4) + std::string(16, ' '));
   std::string shortText(8, ' ');
   EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, shortText, 500), 8u);
-  EXPECT_EQ(shortText.size(), 8u);
+  EXPECT_EQ(shortText, file.substr(0, 8));
   std::string none;
   EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, none, 500), 0u);
 }

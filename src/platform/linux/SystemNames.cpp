@@ -6,6 +6,7 @@ namespace {
 
 constexpr std::size_t kReadableLength = 255;
 constexpr std::string_view kNumberMark = "//";
+constexpr std::size_t kPathRoom = 260;
 
 bool IsControl(char16_t unit) {
   return unit < 0x20 || (unit >= 0x7F && unit < 0xA0) || unit == 0x2028 || unit == 0x2029;
@@ -37,7 +38,7 @@ Text ReadableText(std::string_view utf8) {
 std::string SystemPaths::ToSystem(const std::string& rawPath, std::size_t limit) {
   std::string path = SystemName(rawPath);
   const bool leadsBack = ToUtf8(FromCodePage(path)) == rawPath && !path.starts_with(kNumberMark);
-  if (leadsBack && path.size() <= limit) return path;
+  if (leadsBack && (path.size() <= limit || limit < kPathRoom)) return path.substr(0, limit);
   if (path.starts_with('/')) path.erase(0, 1);
   return (Number(rawPath) + path).substr(0, limit);
 }
@@ -56,7 +57,7 @@ std::string SystemPaths::Number(const std::string& rawPath) {
     numberOf_.clear();
     rawOf_.clear();
   }
-  const std::string number = std::string(kNumberMark) + std::to_string(++lastNumber_) + "/";
+  std::string number = std::string(kNumberMark) + std::to_string(++lastNumber_) + "/";
   numberOf_[rawPath] = number;
   rawOf_[number] = rawPath;
   return number;
