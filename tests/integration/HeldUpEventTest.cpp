@@ -26,7 +26,7 @@ class HeadlessWithSlowBoxes : public forms::HeadlessDesktop {
 
 class QtWithSlowBoxes : public forms::QtDesktop {
  public:
-  QtWithSlowBoxes() : QtDesktop(argumentCount_, nullptr) {}
+  QtWithSlowBoxes() : QtDesktop("integration_test") {}
 
   int MessageBox(const Text& text, int flags, const Text& title) override {
     QTimer::singleShot(kBoxStands, qApp, [] {
@@ -47,9 +47,6 @@ class QtWithSlowBoxes : public forms::QtDesktop {
                                       kMostMilliseconds);
     }
   }
-
- private:
-  static inline int argumentCount_ = 0;
 };
 
 /// An event of the capture control that opens a box in its first yield.

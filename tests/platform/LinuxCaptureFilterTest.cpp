@@ -109,7 +109,7 @@ class CookedCaptureTest : public LinuxCaptureFixture {
   void SetUp() override {
     LinuxCaptureFixture::SetUp();
     if (IsSkipped()) return;
-    session = PcapSession::Open("any", queue);
+    session = PcapSession::Open(library, "any", queue);
     ASSERT_NE(session, nullptr);
   }
   const PcapRecord* Next() {
@@ -117,6 +117,7 @@ class CookedCaptureTest : public LinuxCaptureFixture {
     return queue.Pop();
   }
 
+  PcapLibrary library;
   PcapFrameQueue queue;
   std::unique_ptr<PcapSession> session;
 };
