@@ -7,7 +7,7 @@
 #include "monitor/MonitorControls.h"
 #include "monitor/ProcessRow.h"
 #include "monitor/ProcessTable.h"
-#include "platform/linux/LinuxSystem.h"
+#include "platform/linux/system/LinuxSystem.h"
 #include "platform/simulated/SimulatedMachine.h"
 
 #include <benchmark/benchmark.h>

@@ -17,8 +17,8 @@
 #include "monitor/MonitorControls.h"
 #include "monitor/ProcessRow.h"
 #include "monitor/ProcessTable.h"
-#include "platform/System.h"
 #include "platform/linux/LinuxMachine.h"
+#include "platform/system/System.h"
 
 #include <fcntl.h>
 #include <sys/resource.h>

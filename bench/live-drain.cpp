@@ -3,7 +3,7 @@
 //
 //   live-drain LINK
 
-#include "platform/linux/LinuxCapture.h"
+#include "platform/linux/capture/LinuxCapture.h"
 
 #include <array>
 #include <csignal>

@@ -5,8 +5,8 @@
 
 #include "forms/headless/HeadlessDesktop.h"
 #include "foundation/CSocketPlus.h"
-#include "platform/linux/LinuxHostNames.h"
-#include "platform/linux/LinuxSockets.h"
+#include "platform/linux/net/LinuxHostNames.h"
+#include "platform/linux/net/LinuxSockets.h"
 
 #include <sys/resource.h>
 

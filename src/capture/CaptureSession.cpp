@@ -2,7 +2,7 @@
 
 #include "capture/CaptureState.h"
 #include "capture/mod_functions.h"
-#include "platform/System.h"
+#include "platform/system/System.h"
 
 namespace quendra::capture {
 

@@ -5,8 +5,8 @@
 #include "capture/PacketAttribution.h"
 #include "forms/Desktop.h"
 #include "monitor/MonitorPage.h"
-#include "platform/Capture.h"
 #include "platform/Machine.h"
+#include "platform/capture/Capture.h"
 
 #include <functional>
 #include <memory>

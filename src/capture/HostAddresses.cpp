@@ -1,8 +1,8 @@
 #include "capture/HostAddresses.h"
 
 #include "capture/mod_functions.h"
-#include "platform/HostNames.h"
-#include "platform/IpHelper.h"
+#include "platform/net/HostNames.h"
+#include "platform/net/IpHelper.h"
 
 namespace quendra::capture {
 

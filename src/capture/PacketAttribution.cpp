@@ -6,7 +6,7 @@
 #include "capture/mod_get_proto.h"
 #include "monitor/ProcessRow.h"
 #include "monitor/ProcessTable.h"
-#include "platform/System.h"
+#include "platform/system/System.h"
 
 namespace quendra::capture {
 

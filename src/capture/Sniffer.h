@@ -4,7 +4,7 @@
 #include "forms/Controls.h"
 #include "forms/ListView.h"
 #include "platform/Machine.h"
-#include "platform/Sockets.h"
+#include "platform/net/Sockets.h"
 
 #include <functional>
 #include <optional>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Capture.h"
+#include "platform/capture/Capture.h"
 #include "runtime/Text.h"
 
 #include <optional>

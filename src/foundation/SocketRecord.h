@@ -1,7 +1,7 @@
 #pragma once
 
 #include "foundation/Value.h"
-#include "platform/Sockets.h"
+#include "platform/net/Sockets.h"
 
 #include <map>
 #include <memory>

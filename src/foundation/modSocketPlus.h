@@ -2,8 +2,8 @@
 
 #include "forms/Desktop.h"
 #include "foundation/HandleOwners.h"
-#include "platform/HostNames.h"
-#include "platform/Sockets.h"
+#include "platform/net/HostNames.h"
+#include "platform/net/Sockets.h"
 #include "runtime/Text.h"
 
 #include <map>

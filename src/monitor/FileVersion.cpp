@@ -1,5 +1,5 @@
 #include "monitor/mdlFileInfo.h"
-#include "platform/VersionInfo.h"
+#include "platform/process/VersionInfo.h"
 
 #include <algorithm>
 

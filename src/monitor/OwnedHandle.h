@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Processes.h"
+#include "platform/process/Processes.h"
 
 namespace quendra::monitor {
 

@@ -2,8 +2,8 @@
 
 #include "forms/Desktop.h"
 #include "monitor/ProcessRow.h"
-#include "platform/Icons.h"
-#include "platform/System.h"
+#include "platform/process/Icons.h"
+#include "platform/system/System.h"
 
 namespace quendra::monitor {
 

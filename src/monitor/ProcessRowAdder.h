@@ -3,7 +3,7 @@
 #include "monitor/MonitorPage.h"
 #include "monitor/mdlFileInfo.h"
 #include "platform/Machine.h"
-#include "platform/Processes.h"
+#include "platform/process/Processes.h"
 
 namespace quendra::forms {
 class Desktop;

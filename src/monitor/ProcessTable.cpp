@@ -5,7 +5,7 @@
 #include "monitor/PortsByOwner.h"
 #include "monitor/ProcessRow.h"
 #include "monitor/ProcessRowAdder.h"
-#include "platform/System.h"
+#include "platform/system/System.h"
 
 namespace quendra::monitor {
 

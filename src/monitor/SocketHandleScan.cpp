@@ -1,7 +1,7 @@
 #include "monitor/SocketHandleScan.h"
 
 #include "monitor/OwnedHandle.h"
-#include "platform/Handles.h"
+#include "platform/process/Handles.h"
 #include "runtime/Integers.h"
 
 #include <cstring>

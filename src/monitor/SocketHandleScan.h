@@ -1,7 +1,7 @@
 #pragma once
 
 #include "platform/Machine.h"
-#include "platform/Processes.h"
+#include "platform/process/Processes.h"
 #include "runtime/Text.h"
 
 #include <optional>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/IpHelper.h"
+#include "platform/net/IpHelper.h"
 
 namespace quendra::monitor {
 

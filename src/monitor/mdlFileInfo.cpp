@@ -1,8 +1,8 @@
 #include "monitor/mdlFileInfo.h"
 
 #include "monitor/OwnedHandle.h"
-#include "platform/Processes.h"
-#include "platform/Tokens.h"
+#include "platform/process/Processes.h"
+#include "platform/process/Tokens.h"
 
 #include <algorithm>
 

@@ -2,7 +2,7 @@
 
 #include "forms/Desktop.h"
 #include "platform/Machine.h"
-#include "platform/Processes.h"
+#include "platform/process/Processes.h"
 #include "runtime/Integers.h"
 
 #include <array>

@@ -5,8 +5,8 @@
 #include "monitor/SocketHandleScan.h"
 #include "monitor/TcpOwnerEntry.h"
 #include "monitor/mdlFileInfo.h"
-#include "platform/IpHelper.h"
 #include "platform/Machine.h"
+#include "platform/net/IpHelper.h"
 #include "runtime/Integers.h"
 
 #include <vector>

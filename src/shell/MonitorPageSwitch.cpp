@@ -1,6 +1,6 @@
 #include "shell/MonitorPageSwitch.h"
 
-#include "platform/System.h"
+#include "platform/system/System.h"
 
 namespace quendra::shell {
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/System.h"
+#include "platform/system/System.h"
 
 namespace quendra::shell {
 

@@ -1,8 +1,8 @@
 #include "shell/frmMenu.h"
 
 #include "monitor/modProcPort.h"
-#include "platform/ShellStart.h"
-#include "platform/System.h"
+#include "platform/system/ShellStart.h"
+#include "platform/system/System.h"
 #include "shell/OsVersionCode.h"
 #include "shell/frmAbout.h"
 #include "shell/frmSplash.h"

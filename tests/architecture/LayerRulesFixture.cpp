@@ -52,13 +52,16 @@ const std::map<std::string, Names>& Allowed() {
 bool IsDesktop(const std::string& folder) { return folder.starts_with("forms/"); }
 bool IsBackend(const std::string& folder) { return folder.find('/') != std::string::npos; }
 
-/// "forms/qt" for "forms/qt/QtDesktop.h", "forms" for "forms/Form.h", empty for a path outside the layers.
+/// The layer or backend that a path lies in, however deep: "forms/qt" for "forms/qt/views/FormView.h",
+/// "forms" for "forms/Form.h", "platform" for "platform/net/Sockets.h", empty for a path outside the layers.
 std::string FolderOf(const std::string& path) {
   const auto first = path.find('/');
   if (first == std::string::npos) return {};
   const auto second = path.find('/', first + 1);
-  const std::string folder = path.substr(0, second == std::string::npos ? first : second);
-  return Allowed().contains(folder) ? folder : std::string{};
+  if (second != std::string::npos && Allowed().contains(path.substr(0, second)))
+    return path.substr(0, second);
+  const std::string layer = path.substr(0, first);
+  return Allowed().contains(layer) ? layer : std::string{};
 }
 
 const Names kStandardHeaders{"algorithm",
@@ -154,8 +157,7 @@ bool IsQtHeader(const std::string& header) {
 }
 
 /// Headers of a system or toolkit that a source may name.
-bool MayNameSystemHeader(const std::string& path, const std::string& folder, const std::string& header) {
-  if (path == "runtime/CodePage.cpp") return header == "iconv.h";
+bool MayNameSystemHeader(const std::string& folder, const std::string& header) {
   if (folder == "forms/qt") return IsQtHeader(header);
   if (folder == "forms/headless") return header == "poll.h" || header == "unistd.h";
   if (folder == "forms/win32" || folder == "platform/linux" || folder == "platform/windows")
@@ -175,7 +177,7 @@ std::string WhyNotIncluded(const std::string& path, const std::string& header) {
 
 std::string WhyNotSystem(const std::string& path, const std::string& header) {
   if (kStandardHeaders.contains(header)) return {};
-  return MayNameSystemHeader(path, FolderOf(path), header) ? "" : "is a header of a system or toolkit";
+  return MayNameSystemHeader(FolderOf(path), header) ? "" : "is a header of a system or toolkit";
 }
 
 std::string WhyWrongLine(const std::string& path, const std::string& line) {

@@ -26,14 +26,13 @@ TEST(LayerRules, An_include_that_goes_down_is_allowed) {
       {"shell/frmMenu.h", "#include \"capture/CaptureSession.h\""},
       {"app/main_linux.cpp", "#include \"platform/linux/LinuxMachine.h\""},
       {"app/main_linux.cpp", "#include \"forms/qt/QtDesktop.h\""},
-      {"foundation/CSocketPlus.h", "#include \"platform/Sockets.h\""},
+      {"foundation/CSocketPlus.h", "#include \"platform/net/Sockets.h\""},
       {"forms/qt/QtDesktop.h", "#include \"platform/EventLoop.h\""},
       {"forms/headless/HeadlessLoop.h", "#include \"platform/EventLoop.h\""},
       {"forms/qt/QtDesktop.cpp", "#include <QApplication>"},
       {"forms/headless/HeadlessLoop.cpp", "#include <poll.h>"},
-      {"platform/linux/LinuxCapture.cpp", "#include <pcap/pcap.h>"},
+      {"platform/linux/capture/LinuxCapture.cpp", "#include <pcap/pcap.h>"},
       {"platform/windows/WindowsMachine.cpp", "#include <windows.h>"},
-      {"runtime/CodePage.cpp", "#include <iconv.h>"},
       {"runtime/Text.cpp", "  #  include <string>  // why"},
   };
   for (const Case& row : cases) EXPECT_TRUE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
@@ -52,7 +51,7 @@ TEST(LayerRules, An_include_that_goes_up_or_sideways_is_found) {
       {"report/Report.h", "#include \"capture/clsIP.h\""},
       {"shell/frmMenu.h", "#include \"app/Program.h\""},
       {"forms/qt/QtDesktop.h", "#include \"platform/Machine.h\""},
-      {"forms/headless/HeadlessLoop.h", "#include \"platform/Processes.h\""},
+      {"forms/headless/HeadlessLoop.h", "#include \"platform/process/Processes.h\""},
       {"platform/linux/LinuxMachine.h", "#include \"forms/Form.h\""},
       {"platform/simulated/SimulatedMachine.h", "#include \"monitor/ProcessRow.h\""},
   };
@@ -74,6 +73,7 @@ TEST(LayerRules, A_backend_that_is_named_outside_app_is_found) {
 TEST(LayerRules, A_header_of_a_system_or_toolkit_outside_its_backend_is_found) {
   const Case cases[] = {
       {"monitor/ProcessTable.cpp", "#include <unistd.h>"},
+      {"runtime/CodePage.cpp", "#include <iconv.h>"},
       {"capture/CaptureSession.cpp", "#include <pcap/pcap.h>"},
       {"shell/frmMenu.cpp", "#include <windows.h>"},
       {"forms/Form.h", "#include <QWidget>"},
@@ -112,7 +112,7 @@ TEST(LayerRules, A_condition_on_an_operating_system_above_the_backends_is_found)
 
 TEST(LayerRules, Other_conditions_and_those_of_backends_are_allowed) {
   EXPECT_TRUE(IsAllowed("runtime/Text.cpp", "#if defined(__cpp_lib_to_chars)"));
-  EXPECT_TRUE(IsAllowed("platform/linux/LinuxCapture.cpp", "#ifdef __linux__"));
+  EXPECT_TRUE(IsAllowed("platform/linux/capture/LinuxCapture.cpp", "#ifdef __linux__"));
   EXPECT_TRUE(IsAllowed("monitor/Rates.cpp", "// the #ifdef _WIN32 of old is gone"));
 }
 

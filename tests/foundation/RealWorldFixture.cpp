@@ -1,6 +1,6 @@
 #include "foundation/WorldFixture.h"
-#include "platform/linux/LinuxHostNames.h"
-#include "platform/linux/LinuxSockets.h"
+#include "platform/linux/net/LinuxHostNames.h"
+#include "platform/linux/net/LinuxSockets.h"
 
 #include <arpa/inet.h>
 #include <fcntl.h>

@@ -4,8 +4,8 @@
 #include "integration/LinkedNamespaces.h"
 #include "integration/Worker.h"
 #include "monitor/ProcessRow.h"
-#include "platform/linux/LinuxCapture.h"
 #include "platform/linux/LinuxMachine.h"
+#include "platform/linux/capture/LinuxCapture.h"
 
 #include <cmath>
 #include <deque>

@@ -2,7 +2,7 @@
 #include "forms/qt/QtDesktop.h"
 #include "integration/MonitoredDownload.h"
 #include "integration/RawFrames.h"
-#include "platform/linux/LinuxCapture.h"
+#include "platform/linux/capture/LinuxCapture.h"
 
 #include <QAbstractButton>
 #include <QMessageBox>

@@ -1,6 +1,6 @@
 #include "monitor/MonitorFixture.h"
 
-#include "platform/Handles.h"
+#include "platform/process/Handles.h"
 
 namespace quendra::monitor {
 

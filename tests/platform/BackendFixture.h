@@ -2,7 +2,7 @@
 
 #include "forms/headless/HeadlessDesktop.h"
 #include "platform/Machine.h"
-#include "platform/Sockets.h"
+#include "platform/net/Sockets.h"
 
 #include <cstdint>
 #include <memory>

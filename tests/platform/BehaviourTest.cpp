@@ -1,12 +1,12 @@
 #include "platform/BackendFixture.h"
-#include "platform/Capture.h"
-#include "platform/Handles.h"
-#include "platform/HostNames.h"
-#include "platform/Icons.h"
-#include "platform/IpHelper.h"
-#include "platform/System.h"
-#include "platform/Tokens.h"
-#include "platform/VersionInfo.h"
+#include "platform/capture/Capture.h"
+#include "platform/net/HostNames.h"
+#include "platform/net/IpHelper.h"
+#include "platform/process/Handles.h"
+#include "platform/process/Icons.h"
+#include "platform/process/Tokens.h"
+#include "platform/process/VersionInfo.h"
+#include "platform/system/System.h"
 
 #include <gtest/gtest.h>
 

@@ -1,5 +1,5 @@
 #include "platform/BackendFixture.h"
-#include "platform/HostNames.h"
+#include "platform/net/HostNames.h"
 
 #include <gtest/gtest.h>
 

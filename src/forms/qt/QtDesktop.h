@@ -1,11 +1,11 @@
 #pragma once
 
 #include "forms/Desktop.h"
-#include "forms/qt/FormView.h"
-#include "forms/qt/KeyEvents.h"
-#include "forms/qt/MouseEvents.h"
-#include "forms/qt/QtDrawing.h"
-#include "forms/qt/QtEventLoop.h"
+#include "forms/qt/drawing/QtDrawing.h"
+#include "forms/qt/input/KeyEvents.h"
+#include "forms/qt/input/MouseEvents.h"
+#include "forms/qt/loop/QtEventLoop.h"
+#include "forms/qt/views/FormView.h"
 
 #include <QApplication>
 

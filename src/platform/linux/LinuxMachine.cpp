@@ -1,16 +1,16 @@
 #include "platform/linux/LinuxMachine.h"
 
-#include "platform/linux/LinuxCapture.h"
-#include "platform/linux/LinuxHostNames.h"
-#include "platform/linux/LinuxIcons.h"
-#include "platform/linux/LinuxIpHelper.h"
-#include "platform/linux/LinuxProcesses.h"
-#include "platform/linux/LinuxShellStart.h"
-#include "platform/linux/LinuxSockets.h"
-#include "platform/linux/LinuxSystem.h"
-#include "platform/linux/LinuxTokens.h"
-#include "platform/linux/LinuxVersionInfo.h"
-#include "platform/linux/NotAvailable.h"
+#include "platform/linux/capture/LinuxCapture.h"
+#include "platform/linux/net/LinuxHostNames.h"
+#include "platform/linux/net/LinuxIpHelper.h"
+#include "platform/linux/net/LinuxSockets.h"
+#include "platform/linux/process/LinuxProcesses.h"
+#include "platform/linux/process/LinuxTokens.h"
+#include "platform/linux/process/NotAvailable.h"
+#include "platform/linux/programs/LinuxIcons.h"
+#include "platform/linux/programs/LinuxVersionInfo.h"
+#include "platform/linux/system/LinuxShellStart.h"
+#include "platform/linux/system/LinuxSystem.h"
 
 namespace quendra::platform::linux_ {
 

@@ -1,11 +1,11 @@
 #pragma once
 
 #include "platform/Machine.h"
-#include "platform/simulated/SimulatedCapture.h"
-#include "platform/simulated/SimulatedNetwork.h"
-#include "platform/simulated/SimulatedProcesses.h"
-#include "platform/simulated/SimulatedSockets.h"
-#include "platform/simulated/SimulatedSystem.h"
+#include "platform/simulated/capture/SimulatedCapture.h"
+#include "platform/simulated/net/SimulatedNetwork.h"
+#include "platform/simulated/net/SimulatedSockets.h"
+#include "platform/simulated/process/SimulatedProcesses.h"
+#include "platform/simulated/system/SimulatedSystem.h"
 
 namespace quendra::platform::simulated {
 

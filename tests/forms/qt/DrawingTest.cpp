@@ -1,6 +1,6 @@
 #include "forms/qt/QtFixture.h"
 
-#include "forms/qt/ImageDecoder.h"
+#include "forms/qt/drawing/ImageDecoder.h"
 
 #include <QBuffer>
 

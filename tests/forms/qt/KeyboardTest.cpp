@@ -1,6 +1,6 @@
 #include "forms/qt/QtFixture.h"
 
-#include "forms/qt/KeyEvents.h"
+#include "forms/qt/input/KeyEvents.h"
 
 #include <QKeyEvent>
 

@@ -1,6 +1,6 @@
 #include "forms/qt/QtFixture.h"
 
-#include "forms/qt/Conversion.h"
+#include "forms/qt/drawing/Conversion.h"
 
 #include <QHeaderView>
 #include <QPaintEvent>

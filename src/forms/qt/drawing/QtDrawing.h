@@ -1,0 +1,37 @@
+#pragma once
+
+#include "forms/qt/views/PictureBoxView.h"
+
+namespace quendra::forms::qt {
+
+/// The drawing operations on picture boxes, in the pixels of a form as it was laid out: a view that shows the
+/// form smaller shows its drawings smaller. A box whose form isn't loaded has no surface; drawing on it does
+/// nothing.
+class QtDrawing {
+ public:
+  explicit QtDrawing(const Scale& scale) : scale_(scale) {}
+
+  int ScaleWidth(const PictureBox& box) const;
+  int ScaleHeight(const PictureBox& box) const;
+  int TextWidth(const PictureBox& box, TextView text) const;
+  int TextHeight(const PictureBox& box, TextView text) const;
+  void Cls(PictureBox& box);
+  void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour);
+  void Print(PictureBox& box, TextView text);
+  void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
+              int sourceY);
+  void Refresh(PictureBox& box);
+  bool DrawIconEx(PictureBox& box, int x, int y, const std::vector<std::uint8_t>& image, int width,
+                  int height);
+  Picture ImageOf(const PictureBox& box) const;
+
+ private:
+  int PixelsX(const PictureBox& box, int units) const;
+  int PixelsY(const PictureBox& box, int units) const;
+  int UnitsX(const PictureBox& box, double pixels) const;
+  int UnitsY(const PictureBox& box, double pixels) const;
+
+  const Scale& scale_;
+};
+
+} // namespace quendra::forms::qt

@@ -1,0 +1,50 @@
+#include "forms/qt/views/WidgetView.h"
+
+#include <QAccessibleWidget>
+
+namespace quendra::forms::qt {
+
+namespace {
+
+/// What assistive technology sees of a widget that the program draws itself.
+class ControlInterface : public QAccessibleWidget {
+ public:
+  ControlInterface(QWidget* widget, WidgetView& view) : QAccessibleWidget(widget, view.Role()), view_(view) {}
+
+  // Asked each time: a label becomes a button with its handler.
+  QAccessible::Role role() const override { return view_.Role(); }
+
+  QStringList actionNames() const override {
+    QStringList names = QAccessibleWidget::actionNames();
+    if (IsPressable()) names.prepend(pressAction());
+    return names;
+  }
+
+  void doAction(const QString& action) override {
+    if (action == pressAction() && IsPressable()) return view_.Press();
+    QAccessibleWidget::doAction(action);
+  }
+
+ private:
+  bool IsPressable() const { return role() == QAccessible::Button && widget()->isEnabled(); }
+
+  WidgetView& view_;
+};
+
+QAccessibleInterface* MakeInterface(const QString& /*className*/, QObject* object) {
+  auto* view = dynamic_cast<WidgetView*>(object);
+  if (!view || view->Role() == QAccessible::NoRole) return nullptr;
+  return new ControlInterface(&view->Widget(), *view);
+}
+
+} // namespace
+
+void InstallAccessibility() {
+  static const bool installed = [] {
+    QAccessible::installFactory(MakeInterface);
+    return true;
+  }();
+  static_cast<void>(installed);
+}
+
+} // namespace quendra::forms::qt

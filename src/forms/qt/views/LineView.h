@@ -1,0 +1,21 @@
+#pragma once
+
+#include "forms/qt/views/WidgetView.h"
+
+namespace quendra::forms::qt {
+
+class LineView : public QWidget, public WidgetView {
+ public:
+  LineView(ViewContext& context, Line& line, QWidget* parent);
+  QAccessible::Role Role() const override { return QAccessible::Separator; }
+
+ protected:
+  void Place() override;
+  void paintEvent(QPaintEvent* event) override;
+
+ private:
+  const Line& TheLine() const { return static_cast<const Line&>(*TheControl()); }
+  int Margin() const;
+};
+
+} // namespace quendra::forms::qt

@@ -1,0 +1,30 @@
+#pragma once
+
+#include "forms/qt/Scale.h"
+#include "forms/qt/views/ListModel.h"
+
+#include <QStyledItemDelegate>
+
+namespace quendra::forms::qt {
+
+/// Draws the cells. By hand, as every cell chooses its own reading direction and all are drawn anew each
+/// second.
+class ListDelegate : public QStyledItemDelegate {
+ public:
+  ListDelegate(const ListModel& model, const Scale& scale, bool rightToLeft, QObject* parent)
+      : QStyledItemDelegate(parent), model_(model), scale_(scale), rightToLeft_(rightToLeft) {}
+
+  void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+  QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
+
+  static int RowHeight(const QFontMetrics& metrics, const Scale& scale);
+
+ private:
+  QRect DrawIcon(QPainter& painter, const QRect& room, const ListRow& row) const;
+
+  const ListModel& model_;
+  const Scale& scale_;
+  bool rightToLeft_;
+};
+
+} // namespace quendra::forms::qt

@@ -1,0 +1,75 @@
+#include "forms/qt/views/WidgetView.h"
+
+#include "forms/qt/input/MouseEvents.h"
+
+#include <algorithm>
+
+namespace quendra::forms::qt {
+
+WidgetView::WidgetView(ViewContext& context, Control& control, QWidget& widget)
+    : context_(context), control_(&control), widget_(widget), rightToLeft_(control.OwnerForm().RightToLeft) {
+  context_.mouse.Watch(widget_, *this);
+}
+
+void WidgetView::Release() {
+  if (!control_) return;
+  control_->Attach(nullptr);
+  ControlGone();
+}
+
+void WidgetView::ControlGone() {
+  context_.mouse.Forget(*this);
+  control_ = nullptr;
+}
+
+void WidgetView::Changed(Aspect aspect) {
+  if (!control_) return;
+  if (aspect == Aspect::All) Identify();
+  if (Concerns(aspect, Aspect::Geometry)) Place();
+  if (Concerns(aspect, Aspect::Font)) widget_.setFont(ToQFont(control_->TextFont(), context_.scale.zoom));
+  if (Concerns(aspect, Aspect::Enabled)) Enable();
+  if (aspect == Aspect::Order) widget_.raise();
+  Apply(aspect);
+  if (Concerns(aspect, Aspect::Caption)) widget_.setAccessibleName(AccessibleName());
+  if (Concerns(aspect, Aspect::Visible)) Show();
+  if (aspect != Aspect::Tag && aspect != Aspect::Visible) widget_.update();
+}
+
+// Not when the widget is made: assistive technology would be told at once and take it for the bare base that
+// it still is.
+void WidgetView::Identify() {
+  widget_.setObjectName(ToQString(control_->Name()));
+  widget_.setAccessibleDescription(ToQString(control_->Name()));
+}
+
+void WidgetView::Enable() {
+  widget_.setEnabled(control_->Enabled());
+  // No handler is asked any more, so the hand of a button that was under the mouse would stay.
+  if (!control_->Enabled()) widget_.unsetCursor();
+}
+
+void WidgetView::Place() { PlaceAt(control_->Position()); }
+
+void WidgetView::Show() { widget_.setVisible(control_->Visible()); }
+
+void WidgetView::PlaceAt(const Geometry& geometry) {
+  const Scale& scale = context_.scale;
+  // Both edges are rounded, not the width: controls that touch in twips touch in pixels.
+  int left = scale.PixelsX(geometry.left);
+  int right = scale.PixelsX(geometry.left + geometry.width);
+  if (rightToLeft_ && control_->Parent()) {
+    const int container = scale.PixelsX(control_->Parent()->Position().width);
+    left = container - std::exchange(right, container - left);
+  }
+  const int top = scale.PixelsY(geometry.top);
+  const int bottom = scale.PixelsY(geometry.top + geometry.height);
+  widget_.setGeometry(left, top, std::max(0, right - left), std::max(0, bottom - top));
+}
+
+void WidgetView::Press() {
+  context_.dispatcher.Dispatch([this] {
+    if (control_ && control_->IsUsable()) control_->Click();
+  });
+}
+
+} // namespace quendra::forms::qt

@@ -1,0 +1,80 @@
+#pragma once
+
+#include "forms/Desktop.h"
+#include "forms/qt/Scale.h"
+#include "forms/qt/drawing/Conversion.h"
+#include "forms/qt/drawing/PictureStore.h"
+#include "forms/qt/loop/Dispatcher.h"
+
+#include <QAccessible>
+#include <QWidget>
+
+namespace quendra::forms::qt {
+
+class MouseEvents;
+
+/// What every view of a desktop needs of it.
+struct ViewContext {
+  Desktop& desktop;
+  Dispatcher& dispatcher;
+  /// That of the form; without a form, that of the screen.
+  const Scale& scale;
+  PictureStore& pictures;
+  MouseEvents& mouse;
+};
+
+/// A view that lasts no longer than its form's window and lets go of its control before.
+class View : public ControlView {
+ public:
+  /// Lets go of the control; the widget may live on for a while without it.
+  virtual void Release() = 0;
+};
+
+/// What all widgets that stand for a control have in common. Made as the second base of the widget itself.
+class WidgetView : public View {
+ public:
+  WidgetView(ViewContext& context, Control& control, QWidget& widget);
+
+  void Changed(Aspect aspect) override;
+  void Release() override;
+  void ControlGone() override;
+
+  /// nullptr once released.
+  Control* TheControl() const { return control_; }
+  QWidget& Widget() const { return widget_; }
+  /// The widget in which places in the control are told.
+  virtual QWidget& Body() const { return widget_; }
+  ViewContext& Context() const { return context_; }
+  bool ReadsFromRightToLeft() const { return rightToLeft_; }
+
+  /// A press by the mouse, a key or assistive technology.
+  void Press();
+  /// False for widgets that need mouse events for themselves, too.
+  virtual bool TakesMouse() const { return true; }
+  /// NoRole leaves the widget to the toolkit's own description.
+  virtual QAccessible::Role Role() const { return QAccessible::NoRole; }
+
+ protected:
+  /// The parts of the state that only this kind of control has.
+  virtual void Apply(Aspect /*aspect*/) {}
+  virtual void Place();
+  virtual void Show();
+  virtual QString AccessibleName() const { return {}; }
+  /// Moves the widget to a place in its container, mirrored where the form reads from right to left.
+  void PlaceAt(const Geometry& geometry);
+  static bool Concerns(Aspect told, Aspect wanted) { return told == wanted || told == Aspect::All; }
+
+ private:
+  void Identify();
+  void Enable();
+
+  ViewContext& context_;
+  Control* control_;
+  QWidget& widget_;
+  bool rightToLeft_;
+};
+
+/// Gives the names and roles of the views to assistive technology. Once a process.
+void InstallAccessibility();
+
+} // namespace quendra::forms::qt

@@ -1,0 +1,136 @@
+#include "platform/linux/capture/PcapFrameShaper.h"
+
+#include <algorithm>
+#include <cstring>
+#include <pcap/dlt.h>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+constexpr std::uint32_t kEthernetHeader = 14;
+constexpr std::uint32_t kShortestFrame = 60;
+constexpr std::uint32_t kLargestTotal = 32767;
+constexpr std::uint16_t kTypeIpv4 = 0x0800;
+constexpr std::uint16_t kTypeIpv6 = 0x86DD;
+constexpr std::uint16_t kTypePpp = 0x880B;
+
+std::uint16_t WordAt(std::span<const std::uint8_t> bytes, std::size_t index) {
+  return index + 1 < bytes.size() ? static_cast<std::uint16_t>(bytes[index] << 8 | bytes[index + 1]) : 0;
+}
+
+std::uint16_t TypeByVersion(std::span<const std::uint8_t> packet) {
+  const int version = packet.empty() ? 0 : packet[0] >> 4;
+  return version == 4 ? kTypeIpv4 : version == 6 ? kTypeIpv6 : 0;
+}
+
+/// Where the packet begins behind its link's own header, and what it is.
+struct Payload {
+  std::size_t offset = 0;
+  std::uint16_t type = 0;
+};
+
+Payload PppPayload(std::span<const std::uint8_t> packet) {
+  std::size_t offset = WordAt(packet, 0) == 0xFF03 ? 2 : 0;
+  const bool compressed = offset < packet.size() && (packet[offset] & 1);
+  const std::uint16_t protocol = compressed ? packet[offset] : WordAt(packet, offset);
+  offset += compressed ? 1 : 2;
+  return {offset, protocol == 0x21 ? kTypeIpv4 : protocol == 0x57 ? kTypeIpv6 : kTypePpp};
+}
+
+Payload PayloadOf(LinkForm form, std::span<const std::uint8_t> packet) {
+  switch (form) {
+  case LinkForm::Family: return {4, TypeByVersion(packet.subspan(std::min<std::size_t>(4, packet.size())))};
+  case LinkForm::LinuxCooked: return {16, WordAt(packet, 14)};
+  case LinkForm::LinuxCooked2: return {20, WordAt(packet, 0)};
+  case LinkForm::Ppp: return PppPayload(packet);
+  default: return {0, TypeByVersion(packet)};
+  }
+}
+
+void FillEthernet(PcapRecord& record, std::span<const std::uint8_t> packet, std::uint32_t wire) {
+  record.captured = static_cast<std::uint32_t>(std::min<std::size_t>(packet.size(), PcapRecord::kRoom));
+  record.wire = wire;
+  std::copy_n(packet.begin(), record.captured, record.bytes.begin());
+}
+
+/// The link's own header gives way to an Ethernet header without addresses.
+void FillOther(PcapRecord& record, LinkForm form, std::span<const std::uint8_t> packet, std::uint32_t wire) {
+  const Payload payload = PayloadOf(form, packet);
+  const std::size_t skipped = std::min(payload.offset, packet.size());
+  const std::size_t length =
+      std::min<std::size_t>(packet.size() - skipped, PcapRecord::kRoom - kEthernetHeader);
+  std::memset(record.bytes.data(), 0, 12);
+  record.bytes[12] = static_cast<std::uint8_t>(payload.type >> 8);
+  record.bytes[13] = static_cast<std::uint8_t>(payload.type);
+  const auto payloadBytes = packet.subspan(skipped, length);
+  std::copy(payloadBytes.begin(), payloadBytes.end(), record.bytes.begin() + kEthernetHeader);
+  record.captured = static_cast<std::uint32_t>(kEthernetHeader + length);
+  record.wire = std::max<std::uint32_t>(wire, static_cast<std::uint32_t>(skipped)) -
+                static_cast<std::uint32_t>(skipped) + kEthernetHeader;
+}
+
+/// What the packet's frames have to add up to; 0 when it can stay one frame. A total length that the frame
+/// doesn't have is a lie of the sender and stays one frame too.
+std::uint32_t OversizedTotal(const PcapRecord& record) {
+  const auto& bytes = record.bytes;
+  if (bytes[12] != 0x08 || bytes[13] != 0x00 || bytes[14] >> 4 != 4 || bytes[23] != 6) return 0;
+  const std::uint32_t present = record.wire - kEthernetHeader;
+  const std::uint32_t told = static_cast<std::uint32_t>(bytes[16] << 8 | bytes[17]);
+  // A packet beyond 64 KB has no room for its length in the header, which reads 0 then.
+  if (told == 0 && present > 0xFFFF) return present;
+  return told > kLargestTotal && told <= present ? told : 0;
+}
+
+void SetTotalLength(PcapRecord& record, std::uint32_t total) {
+  record.bytes[16] = static_cast<std::uint8_t>(total >> 8);
+  record.bytes[17] = static_cast<std::uint8_t>(total);
+  record.wire = kEthernetHeader + total;
+}
+
+} // namespace
+
+std::optional<LinkForm> LinkFormOf(int dataLinkType) {
+  switch (dataLinkType) {
+  case DLT_EN10MB: return LinkForm::Ethernet;
+  case DLT_RAW:
+  case DLT_IPV4:
+  case DLT_IPV6: return LinkForm::RawIp;
+  case DLT_NULL:
+  case DLT_LOOP: return LinkForm::Family;
+  case DLT_LINUX_SLL: return LinkForm::LinuxCooked;
+  case DLT_LINUX_SLL2: return LinkForm::LinuxCooked2;
+  case DLT_PPP:
+  case DLT_PPP_SERIAL: return LinkForm::Ppp;
+  default: return std::nullopt;
+  }
+}
+
+void PcapFrameShaper::Deliver(PacketTimes times, std::span<const std::uint8_t> packet, std::uint32_t wire) {
+  PcapRecord& record = queue_.Push();
+  record.seconds = times.seconds;
+  record.microseconds = times.microseconds;
+  if (form_ == LinkForm::Ethernet)
+    FillEthernet(record, packet, wire);
+  else
+    FillOther(record, form_, packet, wire);
+  if (record.captured < kShortestFrame) {
+    std::memset(record.bytes.data() + record.captured, 0, kShortestFrame - record.captured);
+    record.captured = kShortestFrame;
+  }
+  if (record.wire > kEthernetHeader + kLargestTotal) SplitOversized(record);
+}
+
+void PcapFrameShaper::SplitOversized(PcapRecord& first) {
+  std::uint32_t left = OversizedTotal(first);
+  if (left == 0 || left > kMostPieces * kLargestTotal) return;
+  const PcapRecord whole = first;
+  SetTotalLength(first, std::min(left, kLargestTotal));
+  for (left -= std::min(left, kLargestTotal); left > 0; left -= std::min(left, kLargestTotal)) {
+    PcapRecord& next = queue_.Push();
+    next = whole;
+    SetTotalLength(next, std::min(left, kLargestTotal));
+  }
+}
+
+} // namespace quendra::platform::linux_

@@ -1,0 +1,27 @@
+#pragma once
+
+#include "platform/linux/net/SocketDiagnostics.h"
+#include "platform/linux/net/SocketOwners.h"
+#include "platform/net/IpHelper.h"
+
+namespace quendra::platform::linux_ {
+
+/// The owner table from socket diagnostics and the descriptors of the processes; adapters from the kernel's
+/// interfaces.
+class LinuxIpHelper : public IpHelper {
+ public:
+  LinuxIpHelper(const ProcFolder& folder, SocketOwners::Rights rights, Clock clock = CoarseMilliseconds);
+
+  std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) override;
+  /// Connections of others aren't ended on this system.
+  std::uint32_t SetTcpEntry(std::span<const std::uint8_t, 20>) override { return kErrorNotSupported; }
+  std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
+
+ private:
+  const ProcFolder& folder_;
+  SocketDiagnostics diagnostics_;
+  SocketOwners owners_;
+  std::vector<TcpSocket> sockets_;
+};
+
+} // namespace quendra::platform::linux_

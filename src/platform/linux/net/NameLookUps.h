@@ -1,0 +1,40 @@
+#pragma once
+
+#include "platform/EventLoop.h"
+#include "platform/net/HostNames.h"
+
+#include <cstdint>
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace quendra::platform::linux_ {
+
+/// Name look-ups on threads of their own, a bounded number at a time; what they find comes through the loop.
+class NameLookUps {
+ public:
+  static constexpr int kMostThreads = 16;
+
+  /// The addresses (network order as they lie in memory) or an error number of the socket library.
+  using Done = std::function<void(std::int32_t error, const std::vector<std::uint32_t>& addresses)>;
+
+  NameLookUps(EventLoop& loop, HostNames& hostNames);
+  /// Look-ups under way end without a word.
+  ~NameLookUps();
+
+  /// The look-up's handle, 0 when the system has no thread for it. `done` runs from the loop, never before
+  /// this returns.
+  std::uint32_t Start(const std::string& name, Done done);
+  /// False when it isn't under way any more.
+  bool Cancel(std::uint32_t lookUp);
+
+ private:
+  struct Shared;
+  static void Work(const std::shared_ptr<Shared>& shared);
+
+  HostNames& hostNames_;
+  std::shared_ptr<Shared> shared_;
+};
+
+} // namespace quendra::platform::linux_

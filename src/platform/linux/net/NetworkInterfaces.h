@@ -1,0 +1,43 @@
+#pragma once
+
+#include "platform/linux/process/ProcFolder.h"
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace quendra::platform::linux_ {
+
+/// An interface that is up and has IPv4 addresses. Addresses are as they lie in memory (network order).
+struct NetworkInterface {
+  std::string name;
+  bool isLoopback = false;
+  bool hasDefaultRoute = false;
+  std::vector<std::uint32_t> addresses; ///< the main one first
+  std::vector<std::uint32_t> gateways;  ///< of default routes, the preferred one first
+  std::uint32_t metric = 0;             ///< of the preferred default route
+};
+
+/// A default route as the kernel lists it.
+struct DefaultRoute {
+  std::string interface;
+  std::uint32_t gateway = 0; ///< 0 for a route without one
+  std::uint32_t metric = 0;
+};
+
+/// The default routes in a text such as that of /proc/net/route, the preferred one first. Lines that are no
+/// such lines are left out.
+std::vector<DefaultRoute> ParseDefaultRoutes(std::string_view text);
+
+/// Of this network namespace, in the kernel's order.
+std::vector<NetworkInterface> ReadNetworkInterfaces(const ProcFolder& folder);
+
+/// Loopback first, the interface that the preferred default route uses last; an interface's main address last
+/// of its own.
+std::vector<std::uint32_t> HostAddressOrder(std::vector<NetworkInterface> interfaces);
+
+/// Dotted text of an address as it lies in memory.
+std::string DottedText(std::uint32_t address);
+
+} // namespace quendra::platform::linux_

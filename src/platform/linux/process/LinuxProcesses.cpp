@@ -1,0 +1,105 @@
+#include "platform/linux/process/LinuxProcesses.h"
+
+#include <algorithm>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+constexpr std::uint32_t kExecutableModule = 1;
+
+} // namespace
+
+LinuxProcesses::LinuxProcesses(const ProcFolder& folder, HandleTable& handles, SystemPaths& paths,
+                               Clock clock)
+    : folder_(folder), handles_(handles), paths_(paths), list_(folder, std::move(clock)) {}
+
+bool LinuxProcesses::Fail(std::uint32_t error) {
+  handles_.lastError = error;
+  return false;
+}
+
+Handle LinuxProcesses::CreateToolhelp32Snapshot(std::uint32_t flags, std::uint32_t) {
+  Snapshot snapshot;
+  if ((flags & kSnapProcess) == 0) {
+    Fail(kInvalidParameter);
+    return kInvalidHandle;
+  }
+  if (!list_.Read(snapshot.rows)) {
+    Fail(kAccessDenied);
+    return kInvalidHandle;
+  }
+  return handles_.Add(std::move(snapshot));
+}
+
+bool LinuxProcesses::Process32First(Handle handle, Entry& entry) {
+  Snapshot* snapshot = handles_.Find<Snapshot>(handle);
+  if (snapshot != nullptr) snapshot->next = 0;
+  return NextOf(snapshot, entry);
+}
+
+bool LinuxProcesses::Process32Next(Handle handle, Entry& entry) {
+  return NextOf(handles_.Find<Snapshot>(handle), entry);
+}
+
+bool LinuxProcesses::NextOf(Snapshot* snapshot, Entry& entry) {
+  if (snapshot == nullptr) return Fail(kErrorInvalidHandle);
+  if (snapshot->next >= snapshot->rows.size()) return Fail(kNoMoreFiles);
+  const ProcessList::Row& row = snapshot->rows[snapshot->next++];
+  entry.processId = row.processId;
+  entry.parentProcessId = row.parentProcessId;
+  entry.exeFile.fill('\0');
+  std::copy_n(row.name.begin(), std::min(row.name.size(), ProcessList::kNameLength), entry.exeFile.begin());
+  return true;
+}
+
+Handle LinuxProcesses::OpenProcess(std::uint32_t, bool, std::uint32_t processId) {
+  Descriptor folder = processId == 0 ? Descriptor() : folder_.Open(processId);
+  if (!folder) {
+    Fail(kInvalidParameter);
+    return kNoHandle;
+  }
+  return handles_.Add(OpenedProcess{std::move(folder)});
+}
+
+bool LinuxProcesses::CloseHandle(Handle handle) {
+  if (handle == kOwnProcess) return true;
+  return handles_.Close(handle) || Fail(kErrorInvalidHandle);
+}
+
+std::optional<std::string> LinuxProcesses::ExecutableOf(Handle process) {
+  if (process == kOwnProcess) return folder_.Executable(static_cast<std::uint32_t>(::getpid()));
+  OpenedProcess* opened = handles_.Find<OpenedProcess>(process);
+  if (opened == nullptr) {
+    Fail(kErrorInvalidHandle);
+    return {};
+  }
+  auto executable = ProcFolder::Executable(opened->folder);
+  // Under the path of a file elsewhere it would pass for the program that has this path here.
+  if (!executable || !executable->isHere) {
+    Fail(kPartialCopy);
+    return {};
+  }
+  return std::move(executable->path);
+}
+
+bool LinuxProcesses::EnumProcessModules(Handle process, std::span<std::uint32_t> modules) {
+  if (!ExecutableOf(process)) return false;
+  if (!modules.empty()) modules[0] = kExecutableModule;
+  return true;
+}
+
+std::uint32_t LinuxProcesses::GetModuleFileNameExA(Handle process, std::uint32_t module, std::string& path,
+                                                   std::uint32_t size) {
+  const auto executable = ExecutableOf(process);
+  if (!executable) return 0;
+  if (module != kExecutableModule && module != 0) {
+    Fail(kModuleNotFound);
+    return 0;
+  }
+  const std::string name = paths_.ToSystem(*executable, std::min<std::size_t>(size, path.size()));
+  std::copy(name.begin(), name.end(), path.begin());
+  return static_cast<std::uint32_t>(name.size());
+}
+
+} // namespace quendra::platform::linux_

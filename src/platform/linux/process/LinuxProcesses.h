@@ -1,0 +1,39 @@
+#pragma once
+
+#include "platform/linux/process/HandleTable.h"
+#include "platform/linux/process/ProcessList.h"
+#include "platform/linux/process/SystemNames.h"
+#include "platform/process/Processes.h"
+
+namespace quendra::platform::linux_ {
+
+/// Processes from /proc. A process can be opened by everybody; its one module, the executable, is known only
+/// to those who may look at the process, and only where its path leads to it.
+class LinuxProcesses : public Processes {
+ public:
+  LinuxProcesses(const ProcFolder& folder, HandleTable& handles, SystemPaths& paths,
+                 Clock clock = CoarseMilliseconds);
+
+  Handle CreateToolhelp32Snapshot(std::uint32_t flags, std::uint32_t processId) override;
+  bool Process32First(Handle snapshot, Entry& entry) override;
+  bool Process32Next(Handle snapshot, Entry& entry) override;
+  Handle OpenProcess(std::uint32_t access, bool inherit, std::uint32_t processId) override;
+  Handle GetCurrentProcess() override { return kOwnProcess; }
+  bool CloseHandle(Handle handle) override;
+  bool EnumProcessModules(Handle process, std::span<std::uint32_t> modules) override;
+  std::uint32_t GetModuleFileNameExA(Handle process, std::uint32_t module, std::string& path,
+                                     std::uint32_t size) override;
+  std::uint32_t GetLastError() override { return handles_.lastError; }
+
+ private:
+  bool Fail(std::uint32_t error);
+  bool NextOf(Snapshot* snapshot, Entry& entry);
+  std::optional<std::string> ExecutableOf(Handle process);
+
+  const ProcFolder& folder_;
+  HandleTable& handles_;
+  SystemPaths& paths_;
+  ProcessList list_;
+};
+
+} // namespace quendra::platform::linux_

@@ -1,0 +1,92 @@
+#include "platform/linux/system/LinuxShellStart.h"
+
+#include "platform/linux/programs/UserFolders.h"
+#include "platform/linux/system/Descriptor.h"
+#include "runtime/Text.h"
+
+#include <fcntl.h>
+#include <sys/wait.h>
+
+#include <cerrno>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+/// In the child of a fork: only calls that are safe there. Says on `report` why nothing could be started.
+[[noreturn]] void BecomeProgram(const std::vector<std::string>& files, char* const* words, int report) {
+  ::setsid();
+  const pid_t second = ::fork();
+  // The first child ends at once, so that the program is nobody's to wait for.
+  if (second > 0) ::_exit(0);
+  if (second == 0) {
+    const int nothing = ::open("/dev/null", O_RDONLY | O_CLOEXEC);
+    if (nothing >= 0) ::dup2(nothing, STDIN_FILENO);
+    // Not by execvp, which hands a text that is no program to a shell.
+    for (const std::string& file : files) ::execv(file.c_str(), words);
+  }
+  const int error = errno;
+  [[maybe_unused]] const ssize_t told = ::write(report, &error, sizeof error);
+  ::_exit(127);
+}
+
+/// Where the program may lie: as it is named, or by that name in each folder of programs.
+std::vector<std::string> FilesOf(const std::string& program) {
+  if (program.find('/') != std::string::npos) return {program};
+  std::vector<std::string> files;
+  for (const auto& folder : UserFolders::OfEnvironment().programDirs) files.push_back(folder + "/" + program);
+  return files;
+}
+
+/// True when the other end went without a word, as it does when the program takes its process over.
+bool StaysSilent(int report) {
+  int error = 0;
+  ssize_t count = 0;
+  do {
+    count = ::read(report, &error, sizeof error);
+  } while (count < 0 && errno == EINTR);
+  return count == 0;
+}
+
+} // namespace
+
+std::vector<std::string> CommandWords(std::string_view commandLine) {
+  std::vector<std::string> words;
+  bool inWord = false, quoted = false;
+  for (const char character : commandLine) {
+    if (character == '\0') break;
+    if (character == '"') {
+      quoted = !quoted;
+    } else if ((character == ' ' || character == '\t') && !quoted) {
+      inWord = false;
+      continue;
+    }
+    if (!inWord) words.emplace_back();
+    inWord = true;
+    if (character != '"') words.back().push_back(character);
+  }
+  return words;
+}
+
+bool LinuxShellStart::Shell(const std::string& commandLine, int) {
+  auto words = CommandWords(ToUtf8(FromCodePage(commandLine)));
+  if (words.empty() || words[0].empty()) return false;
+  const auto files = FilesOf(words[0]);
+  std::vector<char*> pointers;
+  for (auto& word : words) pointers.push_back(word.data());
+  pointers.push_back(nullptr);
+
+  int ends[2];
+  if (::pipe2(ends, O_CLOEXEC) != 0) return false;
+  const Descriptor reading(ends[0]);
+  Descriptor writing(ends[1]);
+  const pid_t child = ::fork();
+  if (child < 0) return false;
+  if (child == 0) BecomeProgram(files, pointers.data(), ends[1]);
+  writing = Descriptor();
+  while (::waitpid(child, nullptr, 0) < 0 && errno == EINTR) {
+  }
+  return StaysSilent(reading.Number());
+}
+
+} // namespace quendra::platform::linux_

@@ -1,0 +1,52 @@
+#include "platform/linux/system/LinuxSystem.h"
+
+#include <chrono>
+#include <ctime>
+#include <optional>
+#include <thread>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+constexpr std::int32_t kDayNumberOf1970 = 25569;
+/// Far above any day number and far below the sign bit.
+constexpr std::uint64_t kTickAtStart = 10'000'000;
+
+std::optional<std::tm> LocalTime() {
+  const std::time_t now = std::time(nullptr);
+  std::tm local{};
+  if (::localtime_r(&now, &local) == nullptr) return {};
+  return local;
+}
+
+} // namespace
+
+std::uint32_t LinuxSystem::GetTickCount() {
+  return static_cast<std::uint32_t>(kTickAtStart + clock_() - start_);
+}
+
+bool LinuxSystem::GetVersionExA(OsVersion& version) {
+  version = {2, 5, 1};
+  return true;
+}
+
+void LinuxSystem::Sleep(std::uint32_t milliseconds) {
+  std::this_thread::sleep_for(std::chrono::milliseconds(milliseconds));
+}
+
+std::int32_t LinuxSystem::DayNumber() {
+  const auto local = LocalTime();
+  if (!local) return 0;
+  const std::chrono::year_month_day date{std::chrono::year{local->tm_year + 1900},
+                                         std::chrono::month{static_cast<unsigned>(local->tm_mon + 1)},
+                                         std::chrono::day{static_cast<unsigned>(local->tm_mday)}};
+  return static_cast<std::int32_t>(std::chrono::sys_days{date}.time_since_epoch().count()) + kDayNumberOf1970;
+}
+
+std::int32_t LinuxSystem::SecondOfDay() {
+  const auto local = LocalTime();
+  return local ? (local->tm_hour * 60 + local->tm_min) * 60 + local->tm_sec : 0;
+}
+
+} // namespace quendra::platform::linux_

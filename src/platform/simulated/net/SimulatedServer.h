@@ -1,0 +1,75 @@
+#pragma once
+
+#include "platform/simulated/net/SimulatedPeer.h"
+
+namespace quendra::platform::simulated {
+
+/// Who listens at an address. Accepts and stays silent unless told otherwise; Greet, Answer, Close and Reset
+/// make up, in the order in which they are called, what each connection brings.
+class SimulatedServer {
+ public:
+  /// From now on connections end with this error.
+  SimulatedServer& Refuse(std::int32_t error = 10061);
+  /// From now on nobody answers those who connect.
+  SimulatedServer& StaySilent();
+
+  /// Sent without being asked.
+  SimulatedServer& Greet(std::string bytes);
+  /// Sent when the client has sent something (more); each piece arrives for itself.
+  SimulatedServer& Answer(std::vector<std::string> pieces);
+  SimulatedServer& Close();
+  SimulatedServer& Reset();
+  /// Each piece, close or reset waits for a Step of its own instead of the loop's next round.
+  SimulatedServer& Slowly();
+  /// All that comes goes back.
+  SimulatedServer& Echo();
+  /// Each connection takes at most this many bytes, then none until the loop's next round.
+  SimulatedServer& TakeAtMost(std::size_t bytes);
+
+  /// The connections so far, in the order in which they came.
+  std::vector<std::shared_ptr<SimulatedPeer>> Connections;
+
+  enum class Manner { Accepts, Refuses, Silent };
+  struct Action {
+    enum class Kind { Wait, Send, Close, Reset };
+    Kind kind;
+    std::string bytes{};
+  };
+
+ private:
+  friend class SimulatedSockets;
+  friend class ScriptedPeer;
+
+  SimulatedServer& Add(Action action);
+
+  Manner manner_ = Manner::Accepts;
+  std::int32_t refusal_ = 0;
+  std::vector<Action> script_;
+  bool slow_ = false;
+  bool echo_ = false;
+  std::size_t room_ = SocketEnd::kNoLimit;
+};
+
+/// A connection to a server: plays the server's script.
+class ScriptedPeer : public SimulatedPeer {
+ public:
+  ScriptedPeer(SimulatedSockets& sockets, std::weak_ptr<SocketEnd> near, const SimulatedServer& server);
+
+  /// The connection stands.
+  void Begin();
+  /// One action of a slow server; false when there is none to do now.
+  bool Step();
+  void OnReceived() override;
+
+ private:
+  bool CanAct() const;
+  void Schedule();
+  void Act();
+
+  const SimulatedServer& server_;
+  std::size_t next_ = 0;
+  std::size_t seen_ = 0;
+  bool scheduled_ = false;
+};
+
+} // namespace quendra::platform::simulated

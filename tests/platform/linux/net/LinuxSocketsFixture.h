@@ -1,0 +1,113 @@
+#pragma once
+
+#include "forms/headless/HeadlessDesktop.h"
+#include "platform/linux/net/LinuxHostNames.h"
+#include "platform/linux/net/LinuxSockets.h"
+
+#include <arpa/inet.h>
+#include <gtest/gtest.h>
+#include <sys/socket.h>
+
+#include <algorithm>
+
+namespace quendra::platform::linux_ {
+
+inline constexpr std::uint32_t kMessage = 32769;
+inline constexpr std::uint32_t kNameMessage = 32768;
+inline constexpr std::int32_t kAllEvents = 59;
+
+struct Seen {
+  SocketHandle socket;
+  std::int32_t event;
+  std::int32_t error;
+  friend bool operator==(const Seen&, const Seen&) = default;
+};
+
+/// Two sockets of the library that talk to each other over loopback, and a window that writes down what it is
+/// told.
+class LinuxSocketsTest : public testing::Test {
+ protected:
+  LinuxSocketsTest() {
+    window_ = desktop_.Windows.Create();
+    using Procedure = forms::WindowProcedure::element_type;
+    desktop_.Windows.Replace(window_,
+                             std::make_shared<Procedure>([this](auto, std::uint32_t message,
+                                                                std::uint32_t wParam, std::uint32_t lParam) {
+                               const auto high = static_cast<std::int32_t>(lParam >> 16);
+                               if (message == kMessage)
+                                 seen.push_back({wParam, static_cast<std::int32_t>(lParam & 0xFFFF), high});
+                               if (message == kNameMessage) names.push_back({wParam, 0, high});
+                               return 0;
+                             }));
+    sockets.WSAStartup(257);
+  }
+  static SocketAddress At(std::uint16_t port) { return {htonl(INADDR_LOOPBACK), port}; }
+
+  SocketHandle NewSocket(std::int32_t type = 1) { return sockets.socket(2, type, type == 1 ? 6 : 17); }
+  void Select(SocketHandle socket, std::int32_t events = kAllEvents) {
+    ASSERT_EQ(sockets.WSAAsyncSelect(socket, window_, kMessage, events), 0);
+  }
+  SocketHandle Listen(std::int32_t backlog = 5) {
+    const SocketHandle listener = NewSocket();
+    EXPECT_EQ(sockets.bind(listener, At(0)), 0);
+    Select(listener);
+    EXPECT_EQ(sockets.listen(listener, backlog), 0);
+    return listener;
+  }
+  std::uint16_t PortOf(SocketHandle socket) {
+    SocketAddress local;
+    EXPECT_EQ(sockets.getsockname(socket, local), 0);
+    return local.port;
+  }
+  bool Until(const std::function<bool()>& condition) { return desktop_.WaitFor(condition, 10'000); }
+  int Count(SocketHandle socket, std::int32_t event, std::int32_t error = 0) {
+    return static_cast<int>(std::count(seen.begin(), seen.end(), Seen{socket, event, error}));
+  }
+  bool Saw(SocketHandle socket, std::int32_t event, std::int32_t error = 0) {
+    return Until([&] { return Count(socket, event, error) > 0; });
+  }
+  void Settle() {
+    desktop_.WaitFor([] { return false; }, 30);
+  }
+  /// Connects `near` and `far`, with nothing seen yet.
+  void Pair() {
+    const SocketHandle listener = Listen();
+    near = NewSocket();
+    Select(near);
+    sockets.connect(near, At(PortOf(listener)));
+    ASSERT_TRUE(Saw(listener, kFdAccept));
+    far = sockets.accept(listener);
+    ASSERT_TRUE(Saw(near, kFdConnect));
+    ASSERT_TRUE(Saw(far, kFdWrite));
+    sockets.closesocket(listener);
+    Settle();
+    seen.clear();
+  }
+  std::int32_t Send(SocketHandle socket, const std::string& text) {
+    return sockets.send(socket, {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()}, 0);
+  }
+  std::string Read(SocketHandle socket, std::size_t size, std::int32_t flags = 0) {
+    std::string text(size, ' ');
+    const std::int32_t read =
+        sockets.recv(socket, {reinterpret_cast<std::uint8_t*>(text.data()), size}, flags);
+    return read < 0 ? "error " + std::to_string(sockets.WSAGetLastError())
+                    : text.substr(0, static_cast<std::size_t>(read));
+  }
+  int LastError() { return sockets.WSAGetLastError(); }
+
+ private:
+  forms::HeadlessDesktop desktop_;
+  forms::WindowHandle window_ = 0;
+  const ProcFolder folder_;
+  LinuxHostNames hostNames_{folder_};
+
+ protected:
+  forms::WindowHandle Window() const { return window_; }
+  LinuxSockets sockets{desktop_, hostNames_};
+  std::vector<Seen> seen;
+  std::vector<Seen> names;
+  SocketHandle near = kNoSocket;
+  SocketHandle far = kNoSocket;
+};
+
+} // namespace quendra::platform::linux_

@@ -1,0 +1,417 @@
+#include "platform/linux/net/LinuxSocketsFixture.h"
+#include "platform/linux/net/SocketErrorNumbers.h"
+
+#include <netdb.h>
+
+#include <array>
+#include <cerrno>
+#include <cstring>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+// The library.
+
+TEST_F(LinuxSocketsTest, Without_a_start_every_call_fails_with_10093) {
+  EXPECT_EQ(sockets.WSACleanup(), 0);
+  EXPECT_EQ(NewSocket(), kNoSocket);
+  EXPECT_EQ(LastError(), 10093);
+  EXPECT_EQ(sockets.closesocket(1), kSocketError);
+  EXPECT_EQ(LastError(), 10093);
+  EXPECT_EQ(sockets.WSACleanup(), kSocketError);
+  EXPECT_EQ(LastError(), 10093);
+  std::array<std::uint8_t, 64> buffer;
+  EXPECT_EQ(sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer), 0u);
+}
+
+TEST_F(LinuxSocketsTest, A_handle_that_is_no_socket_fails_with_10038) {
+  EXPECT_EQ(sockets.closesocket(4711), kSocketError);
+  EXPECT_EQ(LastError(), 10038);
+  const SocketHandle socket = NewSocket();
+  EXPECT_EQ(sockets.closesocket(socket), 0);
+  EXPECT_EQ(sockets.closesocket(socket), kSocketError);
+}
+
+TEST_F(LinuxSocketsTest, A_closed_sockets_number_is_not_given_again) {
+  const SocketHandle socket = NewSocket();
+  sockets.closesocket(socket);
+  EXPECT_NE(NewSocket(), socket);
+}
+
+TEST_F(LinuxSocketsTest, The_last_cleanup_closes_all_sockets) {
+  sockets.WSAStartup(257);
+  const SocketHandle socket = NewSocket();
+  sockets.WSACleanup();
+  EXPECT_EQ(sockets.listen(socket, 1), 0);
+  sockets.WSACleanup();
+  sockets.WSAStartup(257);
+  EXPECT_EQ(sockets.listen(socket, 1), kSocketError);
+}
+
+TEST_F(LinuxSocketsTest, Options_have_their_values_and_unknown_ones_fail_with_10042) {
+  const SocketHandle socket = NewSocket();
+  std::int32_t value = 0;
+  EXPECT_EQ(sockets.getsockopt(socket, 0xFFFF, 0x1001, value), 0);
+  EXPECT_GT(value, 0);
+  EXPECT_EQ(sockets.getsockopt(socket, 0xFFFF, 0x1002, value), 0);
+  EXPECT_GT(value, 0);
+  EXPECT_EQ(sockets.getsockopt(socket, 0xFFFF, 0x2003, value), 0);
+  EXPECT_EQ(value, 65507);
+  EXPECT_EQ(sockets.getsockopt(socket, 0xFFFF, 0x7777, value), kSocketError);
+  EXPECT_EQ(LastError(), 10042);
+  EXPECT_EQ(sockets.setsockopt(NewSocket(2), 0xFFFF, 0x20, 1), 0);
+}
+
+// Connecting.
+
+TEST_F(LinuxSocketsTest, A_connection_is_told_as_10035_then_FD_CONNECT_then_FD_WRITE) {
+  const SocketHandle listener = Listen();
+  const SocketHandle socket = NewSocket();
+  Select(socket);
+  EXPECT_EQ(sockets.connect(socket, At(PortOf(listener))), kSocketError);
+  EXPECT_EQ(LastError(), kWouldBlock);
+  ASSERT_TRUE(Saw(socket, kFdWrite));
+  Settle();
+  std::erase_if(seen, [&](const Seen& entry) { return entry.socket != socket; });
+  EXPECT_EQ(seen, (std::vector<Seen>{{socket, kFdConnect, 0}, {socket, kFdWrite, 0}}));
+}
+
+TEST_F(LinuxSocketsTest, A_refused_connection_is_told_as_FD_CONNECT_with_10061) {
+  const SocketHandle listener = Listen();
+  const std::uint16_t port = PortOf(listener);
+  sockets.closesocket(listener);
+  const SocketHandle socket = NewSocket();
+  Select(socket);
+  EXPECT_EQ(sockets.connect(socket, At(port)), kSocketError);
+  EXPECT_EQ(LastError(), kWouldBlock);
+  ASSERT_TRUE(Saw(socket, kFdConnect, 10061));
+  Settle();
+  EXPECT_EQ(seen.size(), 1u);
+}
+
+TEST_F(LinuxSocketsTest, Neither_address_0_nor_port_0_can_be_connected_to) {
+  const SocketHandle socket = NewSocket();
+  EXPECT_EQ(sockets.connect(socket, {0, 80}), kSocketError);
+  EXPECT_EQ(LastError(), kAddressNotAvailable);
+  EXPECT_EQ(sockets.connect(socket, At(0)), kSocketError);
+  EXPECT_EQ(LastError(), kAddressNotAvailable);
+}
+
+TEST_F(LinuxSocketsTest, Only_the_events_of_the_mask_are_announced) {
+  const SocketHandle listener = Listen();
+  const SocketHandle socket = NewSocket();
+  Select(socket, kFdConnect);
+  sockets.connect(socket, At(PortOf(listener)));
+  ASSERT_TRUE(Saw(socket, kFdConnect));
+  Settle();
+  EXPECT_EQ(Count(socket, kFdWrite), 0);
+}
+
+TEST_F(LinuxSocketsTest, Mask_0_ends_the_announcements) {
+  Pair();
+  Select(near, 0);
+  Send(far, "x");
+  Settle();
+  EXPECT_TRUE(seen.empty());
+}
+
+// Reading.
+
+TEST_F(LinuxSocketsTest, FD_READ_comes_once_until_a_read_and_again_while_data_remains) {
+  Pair();
+  Send(far, "abcdef");
+  ASSERT_TRUE(Saw(near, kFdRead));
+  Send(far, "ghi");
+  Settle();
+  EXPECT_EQ(Count(near, kFdRead), 1);
+  EXPECT_EQ(Read(near, 4), "abcd");
+  ASSERT_TRUE(Until([&] { return Count(near, kFdRead) == 2; }));
+  EXPECT_EQ(Read(near, 100), "efghi");
+  Settle();
+  EXPECT_EQ(Count(near, kFdRead), 2);
+}
+
+TEST_F(LinuxSocketsTest, A_peek_leaves_the_data_and_announces_it_again) {
+  Pair();
+  Send(far, "abc");
+  ASSERT_TRUE(Saw(near, kFdRead));
+  EXPECT_EQ(Read(near, 2, 2), "ab");
+  ASSERT_TRUE(Until([&] { return Count(near, kFdRead) == 2; }));
+  EXPECT_EQ(Read(near, 10), "abc");
+}
+
+TEST_F(LinuxSocketsTest, A_read_with_nothing_waiting_fails_with_10035) {
+  Pair();
+  EXPECT_EQ(Read(near, 10), "error 10035");
+}
+
+TEST_F(LinuxSocketsTest, FIONREAD_tells_the_bytes_of_a_stream) {
+  Pair();
+  Send(far, "abc");
+  ASSERT_TRUE(Saw(near, kFdRead));
+  std::uint32_t amount = 0;
+  EXPECT_EQ(sockets.ioctlsocket(near, 0x4004667F, amount), 0);
+  EXPECT_EQ(amount, 3u);
+  EXPECT_EQ(sockets.ioctlsocket(near, 1, amount), kSocketError);
+  EXPECT_EQ(LastError(), kInvalidArgument);
+}
+
+TEST_F(LinuxSocketsTest, FD_CLOSE_comes_once_and_behind_the_last_data) {
+  Pair();
+  Send(far, "abcdef");
+  sockets.closesocket(far);
+  ASSERT_TRUE(Saw(near, kFdRead));
+  Settle();
+  EXPECT_EQ(Count(near, kFdClose), 0);
+  EXPECT_EQ(Read(near, 4), "abcd");
+  ASSERT_TRUE(Until([&] { return Count(near, kFdRead) == 2; }));
+  EXPECT_EQ(Count(near, kFdClose), 0);
+  EXPECT_EQ(Read(near, 4), "ef");
+  ASSERT_TRUE(Saw(near, kFdClose));
+  EXPECT_EQ(Read(near, 4), "");
+  Settle();
+  EXPECT_EQ(Count(near, kFdClose), 1);
+}
+
+TEST_F(LinuxSocketsTest, A_reset_is_told_as_FD_CLOSE_with_10054_behind_the_last_data) {
+  Pair();
+  Send(near, "unread, so that the close is a reset");
+  ASSERT_TRUE(Saw(far, kFdRead));
+  Send(far, "abc");
+  sockets.closesocket(far);
+  ASSERT_TRUE(Saw(near, kFdRead));
+  Settle();
+  EXPECT_EQ(Read(near, 10), "abc");
+  EXPECT_TRUE(Saw(near, kFdClose, 10054));
+}
+
+// Writing.
+
+TEST_F(LinuxSocketsTest, FD_WRITE_comes_after_a_refused_send_when_there_is_room_again) {
+  Pair();
+  const std::string block(1'000'000, 'x');
+  while (Send(near, block) > 0) {
+  }
+  EXPECT_EQ(LastError(), kWouldBlock);
+  Settle();
+  EXPECT_EQ(Count(near, kFdWrite), 0);
+  std::int64_t read = 0;
+  ASSERT_TRUE(Until([&] {
+    read += static_cast<std::int64_t>(Read(far, 1'000'000).size());
+    return Count(near, kFdWrite) == 1;
+  }));
+  EXPECT_GT(Send(near, "more"), 0);
+  Settle();
+  EXPECT_EQ(Count(near, kFdWrite), 1);
+}
+
+TEST_F(LinuxSocketsTest, A_send_to_a_connection_that_was_reset_fails_without_a_signal) {
+  Pair();
+  Send(near, "unread");
+  ASSERT_TRUE(Saw(far, kFdRead));
+  sockets.closesocket(far);
+  ASSERT_TRUE(Saw(near, kFdClose, 10054));
+  EXPECT_EQ(Send(near, "x"), kSocketError);
+  EXPECT_EQ(LastError(), 10054);
+}
+
+// Accepting.
+
+TEST_F(LinuxSocketsTest, FD_ACCEPT_comes_once_until_accept_and_again_while_connections_wait) {
+  const SocketHandle listener = Listen();
+  for (int i = 0; i < 2; ++i) {
+    const SocketHandle socket = NewSocket();
+    Select(socket, kFdConnect);
+    sockets.connect(socket, At(PortOf(listener)));
+    ASSERT_TRUE(Saw(socket, kFdConnect));
+  }
+  Settle();
+  EXPECT_EQ(Count(listener, kFdAccept), 1);
+  EXPECT_NE(sockets.accept(listener), kNoSocket);
+  ASSERT_TRUE(Until([&] { return Count(listener, kFdAccept) == 2; }));
+  EXPECT_NE(sockets.accept(listener), kNoSocket);
+  Settle();
+  EXPECT_EQ(Count(listener, kFdAccept), 2);
+  EXPECT_EQ(sockets.accept(listener), kNoSocket);
+  EXPECT_EQ(LastError(), kWouldBlock);
+}
+
+TEST_F(LinuxSocketsTest, An_accepted_socket_has_its_listeners_selection) {
+  const SocketHandle listener = Listen();
+  const SocketHandle socket = NewSocket();
+  Select(socket);
+  sockets.connect(socket, At(PortOf(listener)));
+  ASSERT_TRUE(Saw(socket, kFdConnect));
+  Send(socket, "early");
+  ASSERT_TRUE(Saw(listener, kFdAccept));
+  const SocketHandle accepted = sockets.accept(listener);
+  EXPECT_TRUE(Saw(accepted, kFdRead));
+  EXPECT_EQ(Read(accepted, 10), "early");
+}
+
+TEST_F(LinuxSocketsTest, Both_ends_know_each_others_address) {
+  Pair();
+  SocketAddress local;
+  SocketAddress peer;
+  EXPECT_EQ(sockets.getsockname(near, local), 0);
+  EXPECT_EQ(sockets.getpeername(far, peer), 0);
+  EXPECT_EQ(local, peer);
+  EXPECT_EQ(sockets.getpeername(NewSocket(), peer), kSocketError);
+  EXPECT_EQ(LastError(), 10057);
+}
+
+TEST_F(LinuxSocketsTest, A_port_in_use_is_refused_with_10048) {
+  const SocketHandle listener = Listen();
+  EXPECT_EQ(sockets.bind(NewSocket(), At(PortOf(listener))), kSocketError);
+  EXPECT_EQ(LastError(), 10048);
+}
+
+// Datagrams.
+
+TEST_F(LinuxSocketsTest, A_datagram_is_announced_measured_and_read_with_its_sender) {
+  const SocketHandle receiver = NewSocket(2);
+  const SocketHandle sender = NewSocket(2);
+  sockets.bind(receiver, At(0));
+  sockets.bind(sender, At(0));
+  Select(receiver);
+  const std::array<std::uint8_t, 5> bytes{1, 2, 3, 4, 5};
+  EXPECT_EQ(sockets.sendto(sender, bytes, 0, At(PortOf(receiver))), 5);
+  EXPECT_EQ(sockets.sendto(sender, bytes, 0, At(PortOf(receiver))), 5);
+  ASSERT_TRUE(Saw(receiver, kFdRead));
+  std::uint32_t amount = 0;
+  sockets.ioctlsocket(receiver, 0x4004667F, amount);
+  EXPECT_EQ(amount, 5u);
+  std::array<std::uint8_t, 10> buffer{};
+  SocketAddress from;
+  EXPECT_EQ(sockets.recvfrom(receiver, buffer, 2, from), 5);
+  EXPECT_EQ(sockets.recvfrom(receiver, buffer, 0, from), 5);
+  EXPECT_EQ(from, At(PortOf(sender)));
+  // The second one fills a shorter buffer and is gone.
+  EXPECT_EQ(sockets.recvfrom(receiver, std::span(buffer).first(3), 0, from), kSocketError);
+  EXPECT_EQ(LastError(), kMessageTooLong);
+  EXPECT_EQ(sockets.recvfrom(receiver, buffer, 0, from), kSocketError);
+  EXPECT_EQ(LastError(), kWouldBlock);
+}
+
+TEST_F(LinuxSocketsTest, A_datagram_to_a_port_where_nobody_listens_does_not_stop_the_socket) {
+  const SocketHandle other = NewSocket(2);
+  sockets.bind(other, At(0));
+  const std::uint16_t closed = PortOf(other);
+  sockets.closesocket(other);
+  const SocketHandle socket = NewSocket(2);
+  sockets.bind(socket, At(0));
+  Select(socket);
+  const std::array<std::uint8_t, 1> byte{7};
+  sockets.sendto(socket, byte, 0, At(closed));
+  Settle();
+  EXPECT_EQ(sockets.sendto(socket, byte, 0, At(PortOf(socket))), 1);
+  EXPECT_TRUE(Saw(socket, kFdRead));
+}
+
+// Closing.
+
+TEST_F(LinuxSocketsTest, A_closed_socket_announces_nothing_more) {
+  Pair();
+  Send(far, "x");
+  sockets.closesocket(near);
+  Settle();
+  EXPECT_EQ(Count(near, kFdRead), 0);
+  EXPECT_EQ(Count(near, kFdClose), 0);
+}
+
+// Names.
+
+TEST_F(LinuxSocketsTest, A_name_is_found_and_its_addresses_stand_in_the_buffer) {
+  std::array<std::uint8_t, 1024> buffer{};
+  const std::uint32_t lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
+  ASSERT_NE(lookUp, 0u);
+  ASSERT_TRUE(Until([&] { return !names.empty(); }));
+  EXPECT_EQ(names, (std::vector<Seen>{{lookUp, 0, 0}}));
+  std::uint32_t words[2] = {};
+  std::memcpy(words, buffer.data(), sizeof words);
+  EXPECT_GE(words[0], 1u);
+  EXPECT_EQ(words[1], htonl(INADDR_LOOPBACK));
+}
+
+TEST_F(LinuxSocketsTest, A_name_that_no_host_can_have_is_not_found) {
+  std::array<std::uint8_t, 1024> buffer{};
+  for (const std::string& name : {std::string(300, 'x'), std::string(70'000, 'y')}) {
+    names.clear();
+    const std::uint32_t lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, name, buffer);
+    ASSERT_TRUE(Until([&] { return !names.empty(); }));
+    EXPECT_EQ(names, (std::vector<Seen>{{lookUp, 0, 11001}}));
+  }
+}
+
+TEST_F(LinuxSocketsTest, A_look_up_that_is_cancelled_tells_nothing_and_can_not_be_cancelled_twice) {
+  std::array<std::uint8_t, 1024> buffer{};
+  const std::uint32_t lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
+  EXPECT_EQ(sockets.WSACancelAsyncRequest(lookUp), 0);
+  EXPECT_EQ(sockets.WSACancelAsyncRequest(lookUp), kSocketError);
+  EXPECT_EQ(LastError(), kInvalidArgument);
+  Settle();
+  EXPECT_TRUE(names.empty());
+  EXPECT_EQ(buffer[0], 0);
+}
+
+TEST_F(LinuxSocketsTest, The_sockets_may_go_while_look_ups_run) {
+  std::array<std::uint8_t, 64> buffer{};
+  forms::HeadlessDesktop desktop;
+  const ProcFolder folder;
+  LinuxHostNames hostNames(folder);
+  for (int round = 0; round < 20; ++round) {
+    LinuxSockets gone(desktop, hostNames);
+    gone.WSAStartup(257);
+    for (int i = 0; i < 5; ++i) gone.WSAAsyncGetHostByName(1, kNameMessage, "localhost", buffer);
+  }
+  desktop.WaitFor([] { return false; }, 50);
+  EXPECT_FALSE(desktop.Ended);
+}
+
+// Numbers.
+
+TEST(SocketErrorNumbers, The_systems_numbers_have_their_names_in_the_library) {
+  const std::pair<int, std::int32_t> rows[] = {
+      {0, 0},
+      {EINTR, 10004},
+      {EACCES, 10013},
+      {EFAULT, 10014},
+      {EINVAL, 10022},
+      {EMFILE, 10024},
+      {EAGAIN, 10035},
+      {EINPROGRESS, 10035},
+      {EALREADY, 10037},
+      {ENOTSOCK, 10038},
+      {EDESTADDRREQ, 10039},
+      {EMSGSIZE, 10040},
+      {EADDRINUSE, 10048},
+      {EADDRNOTAVAIL, 10049},
+      {ENETDOWN, 10050},
+      {ENETUNREACH, 10051},
+      {ECONNABORTED, 10053},
+      {ECONNRESET, 10054},
+      {EPIPE, 10054},
+      {ENOBUFS, 10055},
+      {ENOSPC, 10055},
+      {EISCONN, 10056},
+      {ENOTCONN, 10057},
+      {ETIMEDOUT, 10060},
+      {ECONNREFUSED, 10061},
+      {EHOSTUNREACH, 10065},
+      {ENOSYS, 10091},
+  };
+  for (const auto& [system, library] : rows) EXPECT_EQ(SocketErrorOf(system), library) << system;
+}
+
+TEST(SocketErrorNumbers, The_ends_of_look_ups_are_11001_to_11004) {
+  EXPECT_EQ(LookUpErrorOf(0), 0);
+  EXPECT_EQ(LookUpErrorOf(EAI_NONAME), 11001);
+  EXPECT_EQ(LookUpErrorOf(EAI_AGAIN), 11002);
+  EXPECT_EQ(LookUpErrorOf(EAI_FAIL), 11003);
+  EXPECT_EQ(LookUpErrorOf(EAI_NODATA), 11004);
+}
+
+} // namespace
+
+} // namespace quendra::platform::linux_
