@@ -125,7 +125,7 @@ void Measure(const Subject& subject, double first, int passes) {
 /// The table alone: no window shows it.
 void MeasureTable(int passes) {
   forms::HeadlessDesktop desktop;
-  platform::linux_::LinuxMachine machine(desktop);
+  platform::linux_::LinuxMachine machine(desktop, desktop);
   const platform::Machine operations = machine.Operations();
   monitor::MonitorControls controls;
   monitor::MonitorFields fields{2002, 0};
@@ -146,7 +146,7 @@ void MeasureTable(int passes) {
 /// The whole program with its window on the monitor page; painting counts.
 int MeasureProgram(int passes) {
   forms::QtDesktop desktop("table_pass_bench");
-  platform::linux_::LinuxMachine machine(desktop);
+  platform::linux_::LinuxMachine machine(desktop, desktop);
   const platform::Machine operations = machine.Operations();
   app::Program program(operations, desktop);
   const Subject subject{program.frmMenu.main_ListView1,

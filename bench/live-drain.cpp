@@ -20,7 +20,7 @@ using namespace quendra;
 volatile std::sig_atomic_t ended = 0;
 
 /// The least of a loop: two descriptors, one timer and what was posted.
-class PollLoop : public platform::EventLoop {
+class PollLoop : public platform::EventLoop, public platform::DescriptorWatch {
  public:
   void Post(std::function<void()> work) override { posted_.push_back(std::move(work)); }
   std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override {
@@ -83,7 +83,7 @@ int IndexOf(platform::CaptureLibrary& library, const char* link) {
 
 int main(int argc, char** argv) {
   PollLoop loop;
-  platform::linux_::LinuxCapture capture(loop);
+  platform::linux_::LinuxCapture capture(loop, loop);
   const int adapter = argc == 2 ? IndexOf(capture, argv[1]) : -1;
   if (adapter < 0) {
     std::fprintf(stderr, "usage: live-drain LINK (needs the right to capture)\n");

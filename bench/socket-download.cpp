@@ -25,7 +25,7 @@ struct Download {
   forms::HeadlessDesktop desktop;
   platform::linux_::ProcFolder folder{"/proc"};
   platform::linux_::LinuxHostNames hostNames{folder};
-  platform::linux_::LinuxSockets library{desktop, hostNames};
+  platform::linux_::LinuxSockets library{desktop, desktop, hostNames};
   foundation::modSocketPlus module{library, hostNames, desktop};
   foundation::CSocketPlus sockets{module};
   bool take = true;

@@ -24,9 +24,6 @@ class EventLoop {
   /// any thread. A loop without windows loses it, as one for a window that has gone is lost.
   virtual void PostMessage(std::uint32_t /*window*/, std::uint32_t /*message*/, std::uint32_t /*wParam*/,
                            std::uint32_t /*lParam*/) {}
-  /// Calls `ready` whenever the descriptor can be read, again as long as it can.
-  [[nodiscard]] virtual std::unique_ptr<Subscription> WatchDescriptor(int descriptor,
-                                                                      std::function<void()> ready) = 0;
   [[nodiscard]] virtual std::unique_ptr<Subscription> StartTimer(int milliseconds,
                                                                  std::function<void()> tick) = 0;
   /// Handles what waits, without waiting for more.

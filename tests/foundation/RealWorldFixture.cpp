@@ -116,7 +116,7 @@ class RealFarDatagrams : public FarDatagrams {
 
 class RealWorld : public World {
  public:
-  RealWorld() : sockets_(Desktop, names_) {}
+  RealWorld() : sockets_(Desktop, Desktop, names_) {}
 
   platform::Sockets& Sockets() override { return sockets_; }
   platform::HostNames& Names() override { return names_; }

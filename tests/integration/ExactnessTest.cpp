@@ -26,7 +26,7 @@ class Exactness : public testing::Test {
     hosts.emplace();
     StartWorkers();
     ledger.emplace(LinkedNamespaces::kNearLink, LinkedNamespaces::kNearAddress);
-    machine.emplace(desktop);
+    machine.emplace(desktop, desktop);
     program.emplace(machine->Operations(), desktop);
     program->Start();
     ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));

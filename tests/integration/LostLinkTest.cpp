@@ -32,7 +32,7 @@ class LostLink : public testing::Test {
   void StartProgram() {
     program.reset();
     machine.reset();
-    machine.emplace(desktop);
+    machine.emplace(desktop, desktop);
     program.emplace(machine->Operations(), desktop);
     program->Start();
     ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));

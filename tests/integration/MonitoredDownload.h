@@ -41,7 +41,7 @@ class MonitoredDownload : public testing::Test {
   template <typename DesktopAndLoop> void OpenPage(DesktopAndLoop& desktop) {
     Download().Tell({Order::Kind::Connect, 1});
     port = Await(Download()).localPorts.at(0);
-    machine.emplace(desktop);
+    machine.emplace(desktop, desktop);
     program.emplace(machine->Operations(), desktop);
     program->Start();
     program->frmSplash.Label2.Click();

@@ -110,7 +110,7 @@ class RealFarEnd : public FarEnd {
 
 class LinuxBackend : public Backend {
  public:
-  LinuxBackend() : machine_(loop_) {}
+  LinuxBackend() : machine_(loop_, loop_) {}
   ~LinuxBackend() override {
     for (const int socket : sockets_) close(socket);
   }

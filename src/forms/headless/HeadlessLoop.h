@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/EventLoop.h"
+#include "platform/DescriptorWatch.h"
 
 #include <cstdint>
 #include <deque>
@@ -11,7 +11,7 @@ namespace quendra::forms {
 
 /// The loop of a program under test: posted work waits until it is pumped and timers follow a clock that the
 /// test moves.
-class HeadlessLoop : public platform::EventLoop {
+class HeadlessLoop : public platform::EventLoop, public platform::DescriptorWatch {
  public:
   void Post(std::function<void()> work) override;
   std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override;

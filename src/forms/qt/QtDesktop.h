@@ -6,6 +6,7 @@
 #include "forms/qt/input/MouseEvents.h"
 #include "forms/qt/loop/QtEventLoop.h"
 #include "forms/qt/views/FormView.h"
+#include "platform/DescriptorWatch.h"
 
 #include <QApplication>
 
@@ -16,7 +17,7 @@
 namespace quendra::forms {
 
 /// The desktop of the Linux edition. Its window toolkit is Qt 6 Widgets.
-class QtDesktop : public Desktop, public platform::EventLoop {
+class QtDesktop : public Desktop, public platform::EventLoop, public platform::DescriptorWatch {
  public:
   /// Makes the toolkit's application object where the process has none yet. It gets the program's name and no
   /// other word of the command line, so that the toolkit's switches have no effect.

@@ -15,8 +15,8 @@
 namespace quendra::platform::linux_ {
 
 struct LinuxMachine::Parts {
-  Parts(EventLoop& loop, const std::string& procRoot)
-      : folder(procRoot), capture(loop), sockets(loop, hostNames) {}
+  Parts(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot)
+      : folder(procRoot), capture(loop, descriptors), sockets(loop, descriptors, hostNames) {}
 
   ProcFolder folder;
   HandleTable handleTable;
@@ -37,8 +37,8 @@ struct LinuxMachine::Parts {
   LinuxVersionInfo versionInfo{desktopIndex, paths};
 };
 
-LinuxMachine::LinuxMachine(EventLoop& loop, const std::string& procRoot)
-    : parts_(std::make_unique<Parts>(loop, procRoot)) {}
+LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot)
+    : parts_(std::make_unique<Parts>(loop, descriptors, procRoot)) {}
 
 LinuxMachine::~LinuxMachine() = default;
 

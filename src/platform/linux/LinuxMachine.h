@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/EventLoop.h"
+#include "platform/DescriptorWatch.h"
 #include "platform/Machine.h"
 
 #include <memory>
@@ -15,7 +15,7 @@ class LinuxCapture;
 class LinuxMachine {
  public:
   /// `procRoot` is where the processes are found; tests give a folder of their own making.
-  explicit LinuxMachine(EventLoop& loop, const std::string& procRoot = "/proc");
+  LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot = "/proc");
   ~LinuxMachine();
 
   Machine Operations();

@@ -124,7 +124,7 @@ TEST(LinuxShellStartTest, Signs_that_a_shell_would_understand_are_plain_words) {
 
 struct LinuxMachineTest : testing::Test {
   forms::HeadlessDesktop desktop;
-  LinuxMachine machine{desktop};
+  LinuxMachine machine{desktop, desktop};
   Machine operations = machine.Operations();
 };
 
@@ -161,7 +161,7 @@ TEST_F(LinuxMachineTest, A_user_without_rights_gets_snapshot_table_and_host_addr
   const Child user([] {
     if (::setgid(65534) != 0 || ::setuid(65534) != 0) return std::string("no other user");
     forms::HeadlessDesktop loop;
-    LinuxMachine limited(loop);
+    LinuxMachine limited(loop, loop);
     const Machine machine = limited.Operations();
     std::string text;
     Processes::Entry entry;

@@ -29,7 +29,7 @@ class LiveReportTest : public testing::Test {
     folder = pattern;
     // Servers that drop their rights write here.
     std::filesystem::permissions(folder, std::filesystem::perms::all);
-    machine = std::make_unique<platform::linux_::LinuxMachine>(desktop);
+    machine = std::make_unique<platform::linux_::LinuxMachine>(desktop, desktop);
     program = std::make_unique<app::Program>(machine->Operations(), desktop);
   }
   void TearDown() override {

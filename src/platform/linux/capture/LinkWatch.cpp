@@ -33,13 +33,14 @@ void DiscardMessages(int descriptor) {
 
 } // namespace
 
-LinkWatch::LinkWatch(EventLoop& loop, std::function<void()> changed) : socket_(OpenLinkSocket()) {
+LinkWatch::LinkWatch(DescriptorWatch& descriptors, std::function<void()> changed)
+    : socket_(OpenLinkSocket()) {
   if (!socket_) return;
-  watch_ =
-      loop.WatchDescriptor(socket_.Number(), [descriptor = socket_.Number(), changed = std::move(changed)] {
-        DiscardMessages(descriptor);
-        changed();
-      });
+  watch_ = descriptors.WatchDescriptor(socket_.Number(),
+                                       [descriptor = socket_.Number(), changed = std::move(changed)] {
+                                         DiscardMessages(descriptor);
+                                         changed();
+                                       });
 }
 
 } // namespace quendra::platform::linux_

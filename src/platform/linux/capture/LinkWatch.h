@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/EventLoop.h"
+#include "platform/DescriptorWatch.h"
 #include "platform/linux/system/Descriptor.h"
 
 #include <functional>
@@ -13,7 +13,7 @@ namespace quendra::platform::linux_ {
 /// kernel had no room for is missed. Without the means to watch it stays silent.
 class LinkWatch {
  public:
-  LinkWatch(EventLoop& loop, std::function<void()> changed);
+  LinkWatch(DescriptorWatch& descriptors, std::function<void()> changed);
 
  private:
   Descriptor socket_;

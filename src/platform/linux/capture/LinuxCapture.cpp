@@ -15,8 +15,8 @@ void CopyPadded(const std::string& text, std::array<char, 255>& field) {
 
 } // namespace
 
-LinuxCapture::LinuxCapture(EventLoop& loop, PcapLibrary library)
-    : core_(std::make_shared<LinuxCaptureCore>(loop, std::move(library))) {
+LinuxCapture::LinuxCapture(EventLoop& loop, DescriptorWatch& descriptors, PcapLibrary library)
+    : core_(std::make_shared<LinuxCaptureCore>(loop, descriptors, std::move(library))) {
   core_->OnAdapterChanged = [this] {
     if (const auto handler = AdapterChanged) handler();
   };

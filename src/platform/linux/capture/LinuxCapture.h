@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/EventLoop.h"
+#include "platform/DescriptorWatch.h"
 #include "platform/capture/Capture.h"
 #include "platform/linux/capture/PcapLibrary.h"
 
@@ -19,7 +19,7 @@ struct CaptureCounters {
 /// when frames have arrived, the library delivers them. The session follows vpSetCurrentAdapter.
 class LinuxCapture : public CaptureLibrary, public CaptureControls {
  public:
-  explicit LinuxCapture(EventLoop& loop, PcapLibrary library = PcapLibrary());
+  LinuxCapture(EventLoop& loop, DescriptorWatch& descriptors, PcapLibrary library = PcapLibrary());
   ~LinuxCapture() override;
 
   std::int32_t VBPcapInit() override;

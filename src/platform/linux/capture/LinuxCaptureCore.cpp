@@ -94,7 +94,7 @@ void LinuxCaptureCore::SelectAdapter(int adapter) {
 void LinuxCaptureCore::Begin() {
   begun_ = true;
   if (HasSession()) return;
-  links_ = std::make_unique<LinkWatch>(loop_, [weak = weak_from_this()] {
+  links_ = std::make_unique<LinkWatch>(descriptors_, [weak = weak_from_this()] {
     if (const auto core = weak.lock()) core->LinksChanged();
   });
   Open();
@@ -208,7 +208,7 @@ void LinuxCaptureCore::UpdateBell() {
     return;
   }
   if (watch_ != nullptr || pace_ != nullptr) return;
-  watch_ = loop_.WatchDescriptor(session_->Descriptor(), [weak = weak_from_this()] {
+  watch_ = descriptors_.WatchDescriptor(session_->Descriptor(), [weak = weak_from_this()] {
     if (const auto core = weak.lock()) core->DescriptorReady();
   });
 }

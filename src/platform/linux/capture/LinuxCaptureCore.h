@@ -19,7 +19,8 @@ namespace quendra::platform::linux_ {
 /// form stands that was opened in an event, that could take minutes: then events go on inside it.
 class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
  public:
-  LinuxCaptureCore(EventLoop& loop, PcapLibrary library) : loop_(loop), library_(std::move(library)) {}
+  LinuxCaptureCore(EventLoop& loop, DescriptorWatch& descriptors, PcapLibrary library)
+      : loop_(loop), descriptors_(descriptors), library_(std::move(library)) {}
 
   /// Lists the adapters and fixes the number of indexes for good.
   void CountAdapters();
@@ -75,6 +76,7 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   void RingAgain();
 
   EventLoop& loop_;
+  DescriptorWatch& descriptors_;
   const PcapLibrary library_;
   std::vector<CaptureAdapter> adapters_;
   int indexes_ = 0;

@@ -8,8 +8,8 @@ namespace quendra::platform::linux_ {
 /// Real sockets under the rules of the socket library.
 class LinuxSockets : public Sockets {
  public:
-  LinuxSockets(EventLoop& loop, HostNames& hostNames)
-      : loop_(loop), notifier_(loop), lookUps_(loop, hostNames) {}
+  LinuxSockets(EventLoop& loop, DescriptorWatch& descriptors, HostNames& hostNames)
+      : loop_(loop), notifier_(loop, descriptors), lookUps_(loop, hostNames) {}
 
   std::int32_t WSAStartup(std::uint16_t version) override;
   std::int32_t WSACleanup() override;

@@ -78,7 +78,7 @@ void SocketNotifier::Clear() { sockets_.clear(); }
 bool SocketNotifier::Open() {
   if (epoll_) return true;
   epoll_ = Descriptor(::epoll_create1(EPOLL_CLOEXEC));
-  if (epoll_) watch_ = loop_.WatchDescriptor(epoll_.Number(), [this] { Serve(); });
+  if (epoll_) watch_ = descriptors_.WatchDescriptor(epoll_.Number(), [this] { Serve(); });
   return static_cast<bool>(epoll_);
 }
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/EventLoop.h"
+#include "platform/DescriptorWatch.h"
 #include "platform/linux/net/SocketEntry.h"
 
 #include <map>
@@ -13,7 +13,7 @@ namespace quendra::platform::linux_ {
 /// between two messages.
 class SocketNotifier {
  public:
-  explicit SocketNotifier(EventLoop& loop) : loop_(loop) {}
+  SocketNotifier(EventLoop& loop, DescriptorWatch& descriptors) : loop_(loop), descriptors_(descriptors) {}
 
   SocketEntry* Find(SocketHandle socket);
   SocketHandle Add(SocketEntry entry);
@@ -39,6 +39,7 @@ class SocketNotifier {
   void OnStreamReadable(SocketHandle socket, SocketEntry& entry, std::uint32_t ready);
 
   EventLoop& loop_;
+  DescriptorWatch& descriptors_;
   Descriptor epoll_;
   std::unique_ptr<EventLoop::Subscription> watch_;
   std::map<SocketHandle, SocketEntry> sockets_;

@@ -10,7 +10,7 @@ void LinuxCaptureFixture::SetUp() {
   if (!NetworkNamespace::Possible()) GTEST_SKIP() << NetworkNamespace::kSkipReason;
   network = std::make_unique<NetworkNamespace>();
   AddLink("qv0", "qv1", "10.9.0.1/24");
-  capture.emplace(desktop);
+  capture.emplace(desktop, desktop);
 }
 
 void LinuxCaptureFixture::TearDown() {

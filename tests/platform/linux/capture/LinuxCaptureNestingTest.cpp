@@ -242,7 +242,7 @@ TEST_P(HeldFrameTest, A_frame_outlives_the_library) {
   While([&] {
     control.reset();
     capture.reset();
-    capture.emplace(desktop);
+    capture.emplace(desktop, desktop);
   });
 }
 

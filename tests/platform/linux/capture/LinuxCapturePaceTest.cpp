@@ -10,13 +10,13 @@ using integration::TcpFrame;
 namespace {
 
 /// A desktop's loop that tells how many descriptors of captures and how many timers are in use.
-class CountingLoop : public EventLoop {
+class CountingLoop : public EventLoop, public DescriptorWatch {
  public:
-  explicit CountingLoop(EventLoop& loop) : loop_(loop) {}
+  CountingLoop(EventLoop& loop, DescriptorWatch& descriptors) : loop_(loop), descriptors_(descriptors) {}
 
   void Post(std::function<void()> work) override { loop_.Post(std::move(work)); }
   std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override {
-    auto subscription = loop_.WatchDescriptor(descriptor, std::move(ready));
+    auto subscription = descriptors_.WatchDescriptor(descriptor, std::move(ready));
     if (!IsCapture(descriptor)) return subscription;
     return std::make_unique<Counted>(std::move(subscription), watches);
   }
@@ -49,6 +49,7 @@ class CountingLoop : public EventLoop {
   }
 
   EventLoop& loop_;
+  DescriptorWatch& descriptors_;
 };
 
 class LinuxCapturePaceTest : public LinuxCaptureFixture {
@@ -56,7 +57,7 @@ class LinuxCapturePaceTest : public LinuxCaptureFixture {
   void SetUp() override {
     LinuxCaptureFixture::SetUp();
     if (IsSkipped()) return;
-    capture.emplace(loop);
+    capture.emplace(loop, loop);
     far.emplace("qv1");
     onEvent = [&] { Drain(); };
     Start("qv0");
@@ -75,7 +76,7 @@ class LinuxCapturePaceTest : public LinuxCaptureFixture {
     WaitUntil([&] { return events > before; }, "the frame");
   }
 
-  CountingLoop loop{desktop};
+  CountingLoop loop{desktop, desktop};
   std::optional<RawLink> far;
 };
 

@@ -14,7 +14,7 @@ constexpr const char* kOtherLibrary[] = {"libc.so.6"};
 
 /// The capture library and a control of it, on a machine that has only the libraries of these names.
 struct CaptureOver {
-  explicit CaptureOver(std::span<const char* const> names) : capture(desktop, PcapLibrary(names)) {}
+  explicit CaptureOver(std::span<const char* const> names) : capture(desktop, desktop, PcapLibrary(names)) {}
 
   forms::HeadlessDesktop desktop;
   LinuxCapture capture;

@@ -103,7 +103,7 @@ class LinuxSocketsTest : public testing::Test {
 
  protected:
   forms::WindowHandle Window() const { return window_; }
-  LinuxSockets sockets{desktop_, hostNames_};
+  LinuxSockets sockets{desktop_, desktop_, hostNames_};
   std::vector<Seen> seen;
   std::vector<Seen> names;
   SocketHandle near = kNoSocket;

@@ -361,7 +361,7 @@ TEST_F(LinuxSocketsTest, The_sockets_may_go_while_look_ups_run) {
   const ProcFolder folder;
   LinuxHostNames hostNames(folder);
   for (int round = 0; round < 20; ++round) {
-    LinuxSockets gone(desktop, hostNames);
+    LinuxSockets gone(desktop, desktop, hostNames);
     gone.WSAStartup(257);
     for (int i = 0; i < 5; ++i) gone.WSAAsyncGetHostByName(1, kNameMessage, "localhost", buffer);
   }
