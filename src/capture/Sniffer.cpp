@@ -15,9 +15,7 @@ constexpr std::uint32_t kSocketMessage = 1025;
 constexpr int kBufferSize = 2000;
 constexpr int kInnerHeader = 36;
 
-std::int16_t WordAt(const platform::FrameBytes& bytes, int index) {
-  return modVBPcap::WordFromBytes(bytes[index], bytes[index + 1]);
-}
+using modVBPcap::WordAt;
 
 SniffedPacket::Ports PortsAt(const platform::FrameBytes& bytes, int index) {
   return {WordAt(bytes, index), WordAt(bytes, index + 2)};

@@ -53,7 +53,7 @@ void clsEthernet::Decode(const platform::FrameBytes& frame) {
   if (frame.UpperBound() <= kLastTooShortBound) return;
   DestinationMAC_.CopyFrom(frame, start_);
   SourceMAC_.CopyFrom(frame, ToInt16(start_ + 6));
-  TypeCode_ = modVBPcap::WordFromBytes(frame[12], frame[13]);
+  TypeCode_ = modVBPcap::WordAt(frame, 12);
   labelled_ = true;
   LastByte_ = 13;
   if (TypeCode_ > kLastLengthCode) return;

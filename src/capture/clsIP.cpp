@@ -18,20 +18,20 @@ std::uint32_t AddressAt(const platform::FrameBytes& frame, int index) {
 } // namespace
 
 Text clsIP::Decode(const platform::FrameBytes& frame) {
-  using modVBPcap::WordFromBytes;
+  using modVBPcap::WordAt;
   const int offset = frame[kProtocolIndex] == kGre ? kTunnelOffset : 0;
   Ver_ = frame[offset + 14] >> 4;
   IHL_ = frame[offset + 14] & 15;
-  TotalLength_ = WordFromBytes(frame[offset + 16], frame[offset + 17]);
+  TotalLength_ = WordAt(frame, offset + 16);
   // The positions themselves and not the bytes that stand there: so it has always been, and nothing depends
   // on it.
-  Identification_ =
-      WordFromBytes(static_cast<std::uint8_t>(offset + 18), static_cast<std::uint8_t>(offset + 19));
-  FragmentOffset_ = WordFromBytes(frame[offset + 20], frame[offset + 21]) & 0x1FFF;
+  Identification_ = modVBPcap::WordFromBytes(static_cast<std::uint8_t>(offset + 18),
+                                             static_cast<std::uint8_t>(offset + 19));
+  FragmentOffset_ = WordAt(frame, offset + 20) & 0x1FFF;
   TTL_ = frame[offset + 22];
   Protocol_ = frame[offset + 23];
   ResolveProtocolName();
-  HD_Cheksum_ = WordFromBytes(frame[offset + 24], frame[offset + 25]);
+  HD_Cheksum_ = WordAt(frame, offset + 24);
   SrcIP_ = AddressAt(frame, offset + 26);
   DestIP_ = AddressAt(frame, offset + 30);
   return {};

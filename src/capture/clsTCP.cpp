@@ -11,9 +11,7 @@ constexpr int kShortestTunnelBound = 94;
 constexpr std::array<const char16_t*, 6> kFlagNames{u"FIN;",  u"SYN;", u"RESET;",
                                                     u"PUSH;", u"ACK;", u"URGENT;"};
 
-std::int16_t WordAt(const platform::FrameBytes& frame, int index) {
-  return modVBPcap::WordFromBytes(frame[index], frame[index + 1]);
-}
+using modVBPcap::WordAt;
 
 std::int32_t LongAt(const platform::FrameBytes& frame, int index) {
   const std::int16_t high = WordAt(frame, index);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/capture/Capture.h"
+#include "runtime/ByteFields.h"
 #include "runtime/Text.h"
 
 /// Byte helpers of the frame decoders.
@@ -8,12 +9,17 @@ namespace quendra::capture::modVBPcap {
 
 /// high * 256 + low as a signed value: 0xFF, 0xFF gives -1.
 constexpr std::int16_t WordFromBytes(std::uint8_t high, std::uint8_t low) {
-  return static_cast<std::int16_t>(high << 8 | low);
+  return static_cast<std::int16_t>(Big16(std::array{high, low}, 0));
 }
 
 /// The same bytes in the opposite order.
 constexpr std::int16_t WordFromLowHigh(std::uint8_t low, std::uint8_t high) {
   return WordFromBytes(high, low);
+}
+
+/// The word at `index` of a frame, its high byte first; fault 9 beyond the frame.
+inline std::int16_t WordAt(const platform::FrameBytes& frame, int index) {
+  return WordFromBytes(frame[index], frame[index + 1]);
 }
 
 /// high * 65536 + low, both taken without a sign, as a 32-bit pattern.

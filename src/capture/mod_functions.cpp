@@ -1,5 +1,7 @@
 #include "capture/mod_functions.h"
 
+#include "runtime/ByteFields.h"
+
 #include <algorithm>
 #include <bit>
 
@@ -16,7 +18,7 @@ std::uint32_t ReadBytes(const platform::FrameBytes& bytes, std::int32_t index, s
   std::array<std::uint8_t, 4> copied{};
   for (std::int32_t i = 0; i < std::min(count, 4); ++i)
     copied[static_cast<std::size_t>(i)] = bytes[index + i];
-  return std::bit_cast<std::uint32_t>(copied);
+  return Little32(copied, 0);
 }
 
 Text HexRun(const platform::FrameBytes& bytes, std::int32_t first, std::int32_t countLessOne) {

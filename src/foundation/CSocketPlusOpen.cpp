@@ -2,8 +2,9 @@
 #include "foundation/SocketErrors.h"
 #include "foundation/SocketTexts.h"
 
+#include "runtime/ByteFields.h"
+
 #include <algorithm>
-#include <cstring>
 #include <new>
 
 namespace quendra::foundation {
@@ -27,12 +28,6 @@ constexpr std::uint32_t kNoAddress = 0xFFFFFFFF;
 constexpr std::uint32_t kLookUpRunning = 1;
 constexpr std::size_t kResolveBufferSize = 1024;
 constexpr std::int32_t kListenBacklog = 5;
-
-std::uint32_t WordAt(const ResolveBuffer& buffer, std::size_t offset) {
-  std::uint32_t word = 0;
-  std::memcpy(&word, buffer.data() + offset, sizeof word);
-  return word;
-}
 
 std::int32_t PortArgument(const Value& port, std::int32_t lowest, const char16_t* source) {
   const auto number = NumberIn(port);
@@ -176,10 +171,10 @@ void CSocketPlus::PostResolution(std::uint32_t handle, std::int32_t error) {
   module_.UnregisterResolve(handle);
   if (At(slot).State != sckResolvingHost) return;
   const auto buffer = std::exchange(At(slot).LookUpBuffer, nullptr);
-  if (error == 0 && (!buffer || WordAt(*buffer, 0) == 0)) error = platform::kHostNotFound;
+  if (error == 0 && (!buffer || Little32(*buffer, 0) == 0)) error = platform::kHostNotFound;
   if (error != 0) return ConnectToIP(slot, kLookUpRunning, error);
   At(slot).State = sckHostResolved;
-  ConnectToIP(slot, WordAt(*buffer, sizeof(std::uint32_t)), 0);
+  ConnectToIP(slot, Little32(*buffer, sizeof(std::uint32_t)), 0);
 }
 
 void CSocketPlus::ConnectToIP(Slot slot, std::uint32_t address, std::int32_t error) {

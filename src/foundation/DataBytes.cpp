@@ -1,21 +1,28 @@
 #include "foundation/DataBytes.h"
 
-#include <cstring>
+#include "runtime/ByteFields.h"
+
+#include <bit>
 
 namespace quendra::foundation {
 
 namespace {
 
+/// The pattern of a number as wide as the number.
+template <typename Number>
+using Pattern = std::conditional_t<
+    sizeof(Number) == 8, std::uint64_t,
+    std::conditional_t<sizeof(Number) == 4, std::uint32_t,
+                       std::conditional_t<sizeof(Number) == 2, std::uint16_t, std::uint8_t>>>;
+
 template <typename Number> ByteArray Raw(Number number) {
   ByteArray bytes(sizeof number);
-  std::memcpy(bytes.data(), &number, sizeof number);
+  PutLittleField(bytes, 0, std::bit_cast<Pattern<Number>>(number));
   return bytes;
 }
 
 template <typename Number> Number FromRaw(const ByteArray& bytes) {
-  Number number{};
-  std::memcpy(&number, bytes.data(), sizeof number);
-  return number;
+  return std::bit_cast<Number>(LittleField<Pattern<Number>>(bytes, 0));
 }
 
 struct ByteWriter {

@@ -1,5 +1,6 @@
 #include "monitor/mdlFileInfo.h"
 #include "platform/process/VersionInfo.h"
+#include "runtime/ByteFields.h"
 
 #include <algorithm>
 
@@ -28,9 +29,9 @@ constexpr std::array<VersionName, 8> kVersionNames{{
 /// Language before code page, each a 16-bit number with its low byte first; bytes that are missing count as
 /// 0.
 std::string TranslationText(const std::vector<std::uint8_t>& translation) {
-  std::array<std::uint32_t, 4> b{};
-  std::copy_n(translation.begin(), std::min(translation.size(), b.size()), b.begin());
-  const std::uint32_t number = (b[1] << 24) + (b[0] << 16) + (b[3] << 8) + b[2];
+  std::array<std::uint8_t, 4> bytes{};
+  std::copy_n(translation.begin(), std::min(translation.size(), bytes.size()), bytes.begin());
+  const std::uint32_t number = std::uint32_t{Little16(bytes, 0)} << 16 | Little16(bytes, 2);
   return ToCodePage(PaddedLeft(HexText(number), 8, u'0'));
 }
 

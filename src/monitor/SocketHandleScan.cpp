@@ -2,9 +2,8 @@
 
 #include "monitor/OwnedHandle.h"
 #include "platform/process/Handles.h"
+#include "runtime/ByteFields.h"
 #include "runtime/Integers.h"
-
-#include <cstring>
 
 namespace quendra::monitor {
 
@@ -29,12 +28,6 @@ constexpr std::size_t kQueryTypeOffset = 16;
 constexpr std::uint8_t kQueryAddressInfo = 3;
 constexpr std::size_t kPortOffset = 12;
 
-template <typename Number> Number NumberAt(const std::uint8_t* bytes) {
-  Number number{};
-  std::memcpy(&number, bytes, sizeof number);
-  return number;
-}
-
 Text Capitals(TextView text) {
   Text capitals(text);
   for (char16_t& unit : capitals)
@@ -57,16 +50,16 @@ std::vector<SocketHandleScan::HandleEntry> SocketHandleScan::AllHandles() {
     std::vector<std::uint8_t> buffer(kFirstRoom);
     // What fits in the first room is not looked at: a success here means a list of one handle at most.
     if (handles.NtQuerySystemInformation(kSystemHandles, buffer, returned) == 0) break;
-    const auto count = NumberAt<std::uint32_t>(buffer.data());
+    const auto count = Little32(buffer, 0);
     const std::int32_t room =
         ToInt32(std::int64_t{count} * std::int64_t{kEntryBytes} + std::int64_t{kCountBytes});
     buffer.assign(static_cast<std::size_t>(room), 0);
     status = handles.NtQuerySystemInformation(kSystemHandles, buffer, returned);
     entries.resize(count);
-    const std::uint8_t* bytes = buffer.data() + kCountBytes;
+    std::size_t at = kCountBytes;
     for (HandleEntry& entry : entries) {
-      entry = {NumberAt<std::uint32_t>(bytes), NumberAt<std::uint16_t>(bytes + kHandleOffset)};
-      bytes += kEntryBytes;
+      entry = {Little32(buffer, at), Little16(buffer, at + kHandleOffset)};
+      at += kEntryBytes;
     }
   } while (status == platform::Handles::kStatusInfoLengthMismatch);
   return entries;
@@ -97,9 +90,9 @@ std::optional<Text> SocketHandleScan::DeviceName(platform::Handle handle) {
   std::array<std::uint8_t, kNameRoom> buffer{};
   std::uint32_t returned = 0;
   const std::uint32_t status = machine_.handles.NtQueryObject(handle, kNameInformation, buffer, returned);
-  if (status != 0 || NumberAt<std::uint16_t>(buffer.data()) != kDeviceNameBytes) return std::nullopt;
+  if (status != 0 || Little16(buffer, 0) != kDeviceNameBytes) return std::nullopt;
   Text name(kDeviceNameBytes / sizeof(char16_t), u'\0');
-  std::memcpy(name.data(), buffer.data() + kNameOffset, kDeviceNameBytes);
+  for (std::size_t i = 0; i < name.size(); ++i) name[i] = Little16(buffer, kNameOffset + 2 * i);
   return Capitals(CutAtNul(TextView(name)));
 }
 
@@ -111,7 +104,7 @@ std::int32_t SocketHandleScan::QueryHandlePort(platform::Handle handle) {
   const std::uint32_t status =
       machine_.handles.NtDeviceIoControlFile(handle, event.Get(), kQueryInformation, input, output);
   if (status != 0) return 0;
-  return output[kPortOffset] << 8 | output[kPortOffset + 1];
+  return Big16(output, kPortOffset);
 }
 
 } // namespace quendra::monitor

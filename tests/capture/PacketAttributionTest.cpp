@@ -201,7 +201,7 @@ Bytes TunnelledOutgoing(std::size_t size) {
   TestFrame frame;
   frame.size = size;
   Bytes bytes = frame.BuildTunnelled();
-  PutWord(bytes, 34, 7);
+  PutBig16(bytes, 34, 7);
   return bytes;
 }
 

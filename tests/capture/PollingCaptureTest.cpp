@@ -60,7 +60,7 @@ TEST_F(PollingCapture, Frames_count_as_tunnelled_always) {
   tunnelled.size = 95;
   Bytes plain = Outgoing(999);
   plain.resize(95);
-  PutWord(plain, 74, 1025);
+  PutBig16(plain, 74, 1025);
   Poll({tunnelled.BuildTunnelled(), plain});
   EXPECT_EQ(Charged(), 2);
 }

@@ -62,7 +62,7 @@ TEST(SeedFrames, Cut_at_each_length_a_record_is_read_or_raises_fault_9_where_it_
   for (const auto& [name, seed] : seeds) {
     for (std::size_t length = 0; length <= seed.size(); ++length) {
       const Bytes record(seed.begin(), seed.begin() + static_cast<std::ptrdiff_t>(length));
-      const std::size_t headerLength = length < 18 ? 0 : record[16] + record[17] * 256u;
+      const std::size_t headerLength = length < 18 ? 0 : Little16(record, 16);
       const int expected = length < 18 || length < headerLength + 34 ? Fault::kSubscript : 0;
       EXPECT_EQ(FaultOf([&] {
                   std::int32_t index = mod_get_header::ReadCaptureHeader(FrameOf(record)).headerLength;

@@ -13,11 +13,11 @@ Bytes PacketOf(int protocol, const std::string& source, unsigned sourcePort, uns
                std::size_t portsAt = 20, unsigned totalLength = 1064, std::size_t size = 100) {
   Bytes packet(size);
   packet[0] = 0x45;
-  PutWord(packet, 2, totalLength);
+  PutBig16(packet, 2, totalLength);
   packet[9] = static_cast<std::uint8_t>(protocol);
   PutAddress(packet, 12, source);
-  PutWord(packet, portsAt, sourcePort);
-  PutWord(packet, portsAt + 2, destinationPort);
+  PutBig16(packet, portsAt, sourcePort);
+  PutBig16(packet, portsAt + 2, destinationPort);
   return packet;
 }
 
@@ -56,7 +56,7 @@ TEST(SniffedPackets, Any_other_protocol_takes_its_number_as_name) {
 
 Bytes TunnelledPacket(int innerProtocol) {
   Bytes packet = PacketOf(47, "1.1.1.1", 9, 9);
-  PutWord(packet, 38, 540);
+  PutBig16(packet, 38, 540);
   packet[45] = static_cast<std::uint8_t>(innerProtocol);
   PutAddress(packet, 48, kServer);
   return packet;
@@ -64,8 +64,8 @@ Bytes TunnelledPacket(int innerProtocol) {
 
 TEST(SniffedPackets, Behind_protocol_47_the_header_stands_36_bytes_further_on) {
   Bytes bytes = TunnelledPacket(6);
-  PutWord(bytes, 56, 80);
-  PutWord(bytes, 58, 1025);
+  PutBig16(bytes, 56, 80);
+  PutBig16(bytes, 58, 1025);
   const SniffedPacket packet = Read(bytes);
   EXPECT_TRUE(packet.tunnelled);
   EXPECT_EQ(packet.source, platform::simulated::AddressInMemory(kServer));
@@ -76,8 +76,8 @@ TEST(SniffedPackets, Behind_protocol_47_the_header_stands_36_bytes_further_on) {
 
 TEST(SniffedPackets, Protocol_47_in_a_tunnel_takes_its_ports_from_byte_28) {
   Bytes bytes = TunnelledPacket(47);
-  PutWord(bytes, 28, 5);
-  PutWord(bytes, 30, 6);
+  PutBig16(bytes, 28, 5);
+  PutBig16(bytes, 30, 6);
   const SniffedPacket packet = Read(bytes);
   EXPECT_EQ(packet.payloadSize, 520);
   EXPECT_EQ(packet.ports->source, 5);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/capture/Capture.h"
+#include "runtime/ByteFields.h"
 
 #include <cstdint>
 #include <cstdio>
@@ -13,11 +14,6 @@ using Bytes = std::vector<std::uint8_t>;
 
 inline platform::FrameBytes FrameOf(const Bytes& bytes) {
   return platform::FrameBytes(bytes.data(), static_cast<int>(bytes.size()));
-}
-
-inline void PutWord(Bytes& bytes, std::size_t index, unsigned value) {
-  bytes.at(index) = static_cast<std::uint8_t>(value >> 8);
-  bytes.at(index + 1) = static_cast<std::uint8_t>(value);
 }
 
 inline void PutAddress(Bytes& bytes, std::size_t index, const std::string& dotted) {
@@ -43,18 +39,18 @@ struct TestFrame {
   /// The packet's own bytes from `ip` on: an IPv4 header of 20 bytes and the ports.
   void PutPacket(Bytes& bytes, std::size_t ip) const {
     bytes.at(ip) = 0x45;
-    PutWord(bytes, ip + 2, totalLength);
+    PutBig16(bytes, ip + 2, totalLength);
     bytes.at(ip + 8) = 64;
     bytes.at(ip + 9) = static_cast<std::uint8_t>(protocol);
     PutAddress(bytes, ip + 12, source);
     PutAddress(bytes, ip + 16, destination);
-    PutWord(bytes, ip + 20, sourcePort);
-    PutWord(bytes, ip + 22, destinationPort);
+    PutBig16(bytes, ip + 20, sourcePort);
+    PutBig16(bytes, ip + 22, destinationPort);
   }
 
   Bytes Build() const {
     Bytes bytes(size);
-    PutWord(bytes, 12, type);
+    PutBig16(bytes, 12, type);
     PutPacket(bytes, 14);
     return bytes;
   }
@@ -62,7 +58,7 @@ struct TestFrame {
   /// In a PPTP tunnel, 40 bytes further on.
   Bytes BuildTunnelled() const {
     Bytes bytes(size);
-    PutWord(bytes, 12, type);
+    PutBig16(bytes, 12, type);
     bytes.at(14) = 0x45;
     bytes.at(23) = 47;
     PutPacket(bytes, 54);

@@ -11,7 +11,7 @@ namespace {
 Bytes LinkFrame(unsigned type, std::size_t size = 60, Bytes behind = {}) {
   Bytes frame(size);
   for (std::size_t i = 0; i < 12; ++i) frame[i] = static_cast<std::uint8_t>(0xA0 + i);
-  PutWord(frame, 12, type);
+  PutBig16(frame, 12, type);
   std::copy(behind.begin(), behind.end(), frame.begin() + 14);
   return frame;
 }

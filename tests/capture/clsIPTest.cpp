@@ -11,8 +11,8 @@ Bytes FullFrame() {
   TestFrame parts;
   parts.totalLength = 1500;
   Bytes frame = parts.Build();
-  PutWord(frame, 20, 0x6123);
-  PutWord(frame, 24, 0x0A0B);
+  PutBig16(frame, 20, 0x6123);
+  PutBig16(frame, 24, 0x0A0B);
   return frame;
 }
 
@@ -78,7 +78,7 @@ TEST(clsIP, The_header_length_plays_no_part) {
 TEST(clsIP, Identification_of_any_untunnelled_frame_is_4627) {
   clsIP ip;
   Bytes frame = FullFrame();
-  PutWord(frame, 18, 0xBEEF);
+  PutBig16(frame, 18, 0xBEEF);
   ip.Decode(FrameOf(frame));
   EXPECT_EQ(ip.Identification(), 4627);
 }
@@ -102,10 +102,10 @@ TEST(clsIP, A_total_length_of_32768_and_above_is_negative) {
 TEST(clsIP, The_checksum_is_hexadecimal_without_leading_zeros_and_without_a_sign) {
   clsIP ip;
   Bytes frame = FullFrame();
-  PutWord(frame, 24, 0xFFFE);
+  PutBig16(frame, 24, 0xFFFE);
   ip.Decode(FrameOf(frame));
   EXPECT_EQ(ip.HD_Cheksum(), u"FFFE");
-  PutWord(frame, 24, 0);
+  PutBig16(frame, 24, 0);
   ip.Decode(FrameOf(frame));
   EXPECT_EQ(ip.HD_Cheksum(), u"0");
 }
@@ -130,7 +130,7 @@ TEST(clsIP, Byte_23_of_47_reads_every_field_40_bytes_further_on) {
   parts.totalLength = 77;
   parts.destinationPort = parts.sourcePort = 0;
   Bytes frame(78);
-  PutWord(frame, 12, 0x0800);
+  PutBig16(frame, 12, 0x0800);
   frame[23] = 47;
   parts.PutPacket(frame, 54);
   frame.resize(74);
@@ -195,7 +195,7 @@ TEST(clsIP, A_fault_in_the_middle_leaves_new_fields_before_it_and_old_ones_behin
   parts.protocol = 17;
   parts.source = "1.2.3.4";
   Bytes frame = parts.Build();
-  PutWord(frame, 24, 0x1111);
+  PutBig16(frame, 24, 0x1111);
   frame.resize(25);
   EXPECT_EQ(FaultOf(ip, frame), Fault::kSubscript);
   EXPECT_EQ(ip.TotalLength(), 99);

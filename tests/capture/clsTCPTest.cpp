@@ -12,15 +12,15 @@ Bytes FullFrame() {
   parts.sourcePort = 443;
   parts.destinationPort = 50000;
   Bytes frame = parts.Build();
-  PutWord(frame, 38, 0xFFFE);
-  PutWord(frame, 40, 0x8001);
-  PutWord(frame, 42, 0x0001);
-  PutWord(frame, 44, 0xFFFF);
+  PutBig16(frame, 38, 0xFFFE);
+  PutBig16(frame, 40, 0x8001);
+  PutBig16(frame, 42, 0x0001);
+  PutBig16(frame, 44, 0xFFFF);
   frame[46] = 0x5F;
   frame[47] = 0x12;
-  PutWord(frame, 48, 0xFFFF);
-  PutWord(frame, 50, 0x1234);
-  PutWord(frame, 52, 0x0007);
+  PutBig16(frame, 48, 0xFFFF);
+  PutBig16(frame, 50, 0x1234);
+  PutBig16(frame, 52, 0x0007);
   return frame;
 }
 
@@ -112,8 +112,8 @@ Bytes TunnelledFrame(std::size_t size) {
   TestFrame parts;
   parts.size = size;
   Bytes frame = parts.BuildTunnelled();
-  PutWord(frame, 34, 7);
-  PutWord(frame, 36, 8);
+  PutBig16(frame, 34, 7);
+  PutBig16(frame, 36, 8);
   return frame;
 }
 
@@ -144,9 +144,9 @@ TEST(clsTCP, A_frame_of_54_bytes_is_read_whole_and_one_of_53_raises_fault_9) {
 TEST(clsTCP, A_fault_in_the_middle_leaves_new_fields_before_it_and_old_ones_behind) {
   clsTCP tcp = Decoded(FullFrame());
   Bytes frame = FullFrame();
-  PutWord(frame, 34, 99);
+  PutBig16(frame, 34, 99);
   frame[47] = 0x01;
-  PutWord(frame, 48, 5);
+  PutBig16(frame, 48, 5);
   frame.resize(51);
   EXPECT_THROW(tcp.Decode(FrameOf(frame), 0, false), Fault);
   EXPECT_EQ(tcp.srcPort(), u"99");

@@ -12,8 +12,8 @@ namespace {
 /// A record with a header of `headerLength` bytes and the frame behind it.
 Bytes RecordOf(const Bytes& frame, std::uint16_t headerLength) {
   Bytes record{0x78, 0x56, 0x34, 0x12, 0x40, 0xE2, 0x01, 0x00, 60, 0, 0, 0, 0xEA, 0x05, 0, 0};
-  record.push_back(static_cast<std::uint8_t>(headerLength));
-  record.push_back(static_cast<std::uint8_t>(headerLength >> 8));
+  record.resize(std::max<std::size_t>(headerLength, 18));
+  PutLittle16(record, 16, headerLength);
   record.resize(headerLength);
   record.insert(record.end(), frame.begin(), frame.end());
   return record;

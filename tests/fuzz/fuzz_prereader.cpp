@@ -2,6 +2,7 @@
 
 #include "capture/mod_get_header.h"
 #include "capture/mod_get_proto.h"
+#include "runtime/ByteFields.h"
 
 #include <algorithm>
 #include <cstdlib>
@@ -32,7 +33,7 @@ void ReadHostileRecord(const platform::FrameBytes& record) {
     ReadRecord(record);
   } catch (const Fault& fault) {
     Require(fault.number == Fault::kSubscript);
-    const int stated = record.UpperBound() < 17 ? 0 : record[16] + record[17] * 256;
+    const int stated = record.UpperBound() < 17 ? 0 : Little16({record.Data(), 18}, 16);
     Require(stated + 14 + 19 > record.UpperBound());
   }
 }

@@ -1,15 +1,15 @@
 #include "integration/FrameLedger.h"
 
+#include "runtime/ByteFields.h"
+
 #include <arpa/inet.h>
-#include <cstring>
 #include <pcap/pcap.h>
+#include <span>
 #include <stdexcept>
 
 namespace quendra::integration {
 
 namespace {
-
-unsigned WordAt(const unsigned char* bytes) { return bytes[0] * 256u + bytes[1]; }
 
 pcap_t* OpenCapture(const std::string& link) {
   char error[PCAP_ERRBUF_SIZE];
@@ -48,17 +48,16 @@ void FrameLedger::Take(unsigned char* ledger, const pcap_pkthdr* header, const u
 void FrameLedger::Enter(const pcap_pkthdr& header, const unsigned char* frame) {
   const std::lock_guard guard(lock_);
   ++frames_;
-  if (header.caplen < 38 || WordAt(frame + 12) != 0x0800) return;
+  const std::span bytes(frame, header.caplen);
+  if (header.caplen < 38 || Big16(bytes, 12) != 0x0800) return;
   udpFrames_ += frame[23] == 17;
   icmpFrames_ += frame[23] == 1;
   if (frame[23] != 6) return;
   ++tcpFrames_;
-  std::uint32_t source = 0;
-  std::memcpy(&source, frame + 26, sizeof source);
-  if (source == local_)
-    (*byPort_)[WordAt(frame + 34)].upload += WordAt(frame + 16);
+  if (Little32(bytes, 26) == local_)
+    (*byPort_)[Big16(bytes, 34)].upload += Big16(bytes, 16);
   else
-    EnterDownload(header, WordAt(frame + 36), WordAt(frame + 16));
+    EnterDownload(header, Big16(bytes, 36), Big16(bytes, 16));
 }
 
 void FrameLedger::EnterDownload(const pcap_pkthdr& header, unsigned port, unsigned bytes) {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "runtime/ByteFields.h"
+
 #include <algorithm>
 #include <arpa/inet.h>
 #include <cstdint>
@@ -17,24 +19,19 @@ namespace quendra::integration {
 
 using Bytes = std::vector<std::uint8_t>;
 
-inline void PutWord(Bytes& bytes, std::size_t index, unsigned value) {
-  bytes[index] = static_cast<std::uint8_t>(value >> 8);
-  bytes[index + 1] = static_cast<std::uint8_t>(value);
-}
-
 /// An IPv4 packet of `total` bytes with the two ports behind its header; the payload is zeros.
 inline Bytes Ipv4Packet(int protocol, const char* source, unsigned sourcePort, const char* target,
                         unsigned targetPort, std::size_t total = 40) {
   Bytes packet(total);
   packet[0] = 0x45;
-  PutWord(packet, 2, static_cast<unsigned>(total));
+  PutBig16(packet, 2, static_cast<unsigned>(total));
   packet[8] = 64;
   packet[9] = static_cast<std::uint8_t>(protocol);
   inet_pton(AF_INET, source, &packet[12]);
   inet_pton(AF_INET, target, &packet[16]);
   if (total >= 24) {
-    PutWord(packet, 20, sourcePort);
-    PutWord(packet, 22, targetPort);
+    PutBig16(packet, 20, sourcePort);
+    PutBig16(packet, 22, targetPort);
   }
   if (protocol == 6 && total >= 40) {
     packet[32] = 0x50;
@@ -53,7 +50,7 @@ inline Bytes Joined(const Bytes& front, const Bytes& back) {
 /// With an Ethernet header of made-up addresses.
 inline Bytes EthernetFrame(const Bytes& packet, unsigned type = 0x0800) {
   Bytes header = {2, 0, 0, 0, 0, 1, 2, 0, 0, 0, 0, 2, 0, 0};
-  PutWord(header, 12, type);
+  PutBig16(header, 12, type);
   return Joined(header, packet);
 }
 

@@ -44,10 +44,10 @@ struct OddHandles : platform::Handles {
                                          std::uint32_t&) override {
     const std::uint32_t status = TableStatuses.empty() ? 0 : TableStatuses.front();
     if (!TableStatuses.empty()) TableStatuses.erase(TableStatuses.begin());
-    platform::simulated::Put32(buffer, 0, Count);
+    PutLittle32(buffer, 0, Count);
     if (buffer.size() >= 20) {
-      platform::simulated::Put32(buffer, 4, 10);
-      platform::simulated::Put16(buffer, 10, 4);
+      PutLittle32(buffer, 4, 10);
+      PutLittle16(buffer, 10, 4);
     }
     return status;
   }
@@ -61,9 +61,9 @@ struct OddHandles : platform::Handles {
   std::uint32_t NtQueryObject(platform::Handle, std::uint32_t, std::span<std::uint8_t> buffer,
                               std::uint32_t&) override {
     nameRooms.push_back(buffer.size());
-    platform::simulated::Put16(buffer, 0, static_cast<std::uint16_t>(Name.size() * 2));
+    PutLittle16(buffer, 0, static_cast<std::uint16_t>(Name.size() * 2));
     for (std::size_t i = 0; i < Name.size() && 10 + 2 * i <= buffer.size(); ++i)
-      platform::simulated::Put16(buffer, 8 + 2 * i, Name[i]);
+      PutLittle16(buffer, 8 + 2 * i, Name[i]);
     return NameStatus;
   }
   platform::Handle CreateEventW(bool manualReset, bool initialState, const std::u16string& name) override {

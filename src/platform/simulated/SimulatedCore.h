@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/process/Processes.h"
+#include "runtime/ByteFields.h"
 
 #include <map>
 #include <string>
@@ -34,19 +35,6 @@ struct Core {
   std::uint32_t tickCount = 0x00100000;
   std::vector<std::string> calls;
 };
-
-inline void Put32(std::span<std::uint8_t> bytes, std::size_t at, std::uint32_t value) {
-  for (std::size_t i = 0; i < 4; ++i) bytes[at + i] = static_cast<std::uint8_t>(value >> 8 * i);
-}
-inline void Put16(std::span<std::uint8_t> bytes, std::size_t at, std::uint16_t value) {
-  bytes[at] = static_cast<std::uint8_t>(value);
-  bytes[at + 1] = static_cast<std::uint8_t>(value >> 8);
-}
-inline std::uint32_t Get32(std::span<const std::uint8_t> bytes, std::size_t at) {
-  std::uint32_t value = 0;
-  for (std::size_t i = 0; i < 4; ++i) value |= static_cast<std::uint32_t>(bytes[at + i]) << 8 * i;
-  return value;
-}
 
 /// A text as the system takes it: what stands behind a NUL isn't there.
 inline std::string CutText(const std::string& text) { return text.substr(0, text.find('\0')); }

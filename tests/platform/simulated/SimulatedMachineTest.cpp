@@ -178,12 +178,12 @@ TEST_F(NativeHandlesTest, A_buffer_too_small_gets_the_count_and_the_mismatch) {
   Bytes buffer(20);
 
   EXPECT_EQ(operations.handles.NtQuerySystemInformation(16, buffer, returned), 0xC0000004U);
-  EXPECT_EQ(Get32(buffer, 0), 2U);
+  EXPECT_EQ(Little32(buffer, 0), 2U);
   EXPECT_EQ(returned, 36U);
 
   buffer.assign(36, 0);
   EXPECT_EQ(operations.handles.NtQuerySystemInformation(16, buffer, returned), 0U);
-  EXPECT_EQ(Get32(buffer, 4 + 16), 100U);
+  EXPECT_EQ(Little32(buffer, 4 + 16), 100U);
   EXPECT_EQ(buffer[4 + 16 + 6], 12);
 }
 
@@ -192,9 +192,9 @@ TEST_F(NativeHandlesTest, Handles_may_appear_between_two_queries) {
   Bytes buffer(20);
 
   EXPECT_EQ(operations.handles.NtQuerySystemInformation(16, buffer, returned), 0U);
-  EXPECT_EQ(Get32(buffer, 0), 0U);
+  EXPECT_EQ(Little32(buffer, 0), 0U);
   EXPECT_EQ(operations.handles.NtQuerySystemInformation(16, buffer, returned), 0xC0000004U);
-  EXPECT_EQ(Get32(buffer, 0), 2U);
+  EXPECT_EQ(Little32(buffer, 0), 2U);
 }
 
 TEST_F(NativeHandlesTest, A_name_of_11_characters_just_fits_into_32_bytes) {
@@ -327,10 +327,10 @@ TEST_F(SimulatedCaptureTest, The_newest_record_has_a_header_in_host_order_before
 
   control->ReadBuffer(buffer);
 
-  EXPECT_EQ(Get32(buffer, 0), 12U);
-  EXPECT_EQ(Get32(buffer, 4), 345000U);
-  EXPECT_EQ(Get32(buffer, 8), 70U);
-  EXPECT_EQ(Get32(buffer, 12), 1500U);
+  EXPECT_EQ(Little32(buffer, 0), 12U);
+  EXPECT_EQ(Little32(buffer, 4), 345000U);
+  EXPECT_EQ(Little32(buffer, 8), 70U);
+  EXPECT_EQ(Little32(buffer, 12), 1500U);
   EXPECT_EQ(buffer[16], 20);
   EXPECT_EQ(buffer[20], 2);
   EXPECT_EQ(buffer[89], 2);

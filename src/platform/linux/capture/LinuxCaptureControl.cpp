@@ -1,9 +1,9 @@
 #include "platform/linux/capture/LinuxCaptureControl.h"
 
+#include "runtime/ByteFields.h"
 #include "runtime/Text.h"
 
 #include <algorithm>
-#include <cstring>
 
 namespace quendra::platform::linux_ {
 
@@ -16,10 +16,12 @@ std::string AdapterNameOf(const std::string& name) { return std::string(CutAtNul
 std::array<std::uint8_t, kRecordHeader> RecordHeaderOf(const PcapRecord* record) {
   std::array<std::uint8_t, kRecordHeader> header{};
   if (record != nullptr) {
-    const std::uint32_t words[4] = {record->seconds, record->microseconds, record->captured, record->wire};
-    std::memcpy(header.data(), words, sizeof words);
+    PutLittle32(header, 0, record->seconds);
+    PutLittle32(header, 4, record->microseconds);
+    PutLittle32(header, 8, record->captured);
+    PutLittle32(header, 12, record->wire);
   }
-  std::memcpy(header.data() + 16, &kRecordHeader, sizeof kRecordHeader);
+  PutLittle16(header, 16, kRecordHeader);
   return header;
 }
 

@@ -1,5 +1,7 @@
 #include "platform/linux/capture/PcapFrameShaper.h"
 
+#include "runtime/ByteFields.h"
+
 #include <algorithm>
 #include <cstring>
 #include <pcap/dlt.h>
@@ -15,8 +17,9 @@ constexpr std::uint16_t kTypeIpv4 = 0x0800;
 constexpr std::uint16_t kTypeIpv6 = 0x86DD;
 constexpr std::uint16_t kTypePpp = 0x880B;
 
-std::uint16_t WordAt(std::span<const std::uint8_t> bytes, std::size_t index) {
-  return index + 1 < bytes.size() ? static_cast<std::uint16_t>(bytes[index] << 8 | bytes[index + 1]) : 0;
+/// 0 beyond the packet.
+std::uint16_t WordAt(std::span<const std::uint8_t> packet, std::size_t index) {
+  return index + 1 < packet.size() ? Big16(packet, index) : 0;
 }
 
 std::uint16_t TypeByVersion(std::span<const std::uint8_t> packet) {
@@ -61,8 +64,7 @@ void FillOther(PcapRecord& record, LinkForm form, std::span<const std::uint8_t> 
   const std::size_t length =
       std::min<std::size_t>(packet.size() - skipped, PcapRecord::kRoom - kEthernetHeader);
   std::memset(record.bytes.data(), 0, 12);
-  record.bytes[12] = static_cast<std::uint8_t>(payload.type >> 8);
-  record.bytes[13] = static_cast<std::uint8_t>(payload.type);
+  PutBig16(record.bytes, 12, payload.type);
   const auto payloadBytes = packet.subspan(skipped, length);
   std::copy(payloadBytes.begin(), payloadBytes.end(), record.bytes.begin() + kEthernetHeader);
   record.captured = static_cast<std::uint32_t>(kEthernetHeader + length);
@@ -76,15 +78,14 @@ std::uint32_t OversizedTotal(const PcapRecord& record) {
   const auto& bytes = record.bytes;
   if (bytes[12] != 0x08 || bytes[13] != 0x00 || bytes[14] >> 4 != 4 || bytes[23] != 6) return 0;
   const std::uint32_t present = record.wire - kEthernetHeader;
-  const std::uint32_t told = static_cast<std::uint32_t>(bytes[16] << 8 | bytes[17]);
+  const std::uint32_t told = Big16(bytes, 16);
   // A packet beyond 64 KB has no room for its length in the header, which reads 0 then.
   if (told == 0 && present > 0xFFFF) return present;
   return told > kLargestTotal && told <= present ? told : 0;
 }
 
 void SetTotalLength(PcapRecord& record, std::uint32_t total) {
-  record.bytes[16] = static_cast<std::uint8_t>(total >> 8);
-  record.bytes[17] = static_cast<std::uint8_t>(total);
+  PutBig16(record.bytes, 16, static_cast<std::uint16_t>(total));
   record.wire = kEthernetHeader + total;
 }
 

@@ -74,11 +74,11 @@ void SimulatedCapture::Control::ReadBuffer(std::span<std::uint8_t> bytes) {
   const Frame& newest = capture_->newest_;
   const std::size_t headerLength = std::max<std::size_t>(capture_->RecordHeaderLength, 18);
   std::vector<std::uint8_t> record(headerLength);
-  Put32(record, 0, newest.tick / 1000);
-  Put32(record, 4, newest.tick % 1000 * 1000);
-  Put32(record, 8, static_cast<std::uint32_t>(newest.bytes.size()));
-  Put32(record, 12, newest.wireLength);
-  Put16(record, 16, static_cast<std::uint16_t>(headerLength));
+  PutLittle32(record, 0, newest.tick / 1000);
+  PutLittle32(record, 4, newest.tick % 1000 * 1000);
+  PutLittle32(record, 8, static_cast<std::uint32_t>(newest.bytes.size()));
+  PutLittle32(record, 12, newest.wireLength);
+  PutLittle16(record, 16, static_cast<std::uint16_t>(headerLength));
   record.insert(record.end(), newest.bytes.begin(), newest.bytes.end());
   std::copy_n(record.begin(), std::min(record.size(), bytes.size()), bytes.begin());
 }

@@ -19,15 +19,15 @@ std::uint32_t SimulatedIpHelper::AllocateAndGetTcpExTableFromStack(TcpTable& tab
   if (TableError != 0) return TableError;
   ++TablesFetched;
   std::vector<std::uint8_t> bytes(4 + kEntrySize * Connections.size());
-  Put32(bytes, 0, static_cast<std::uint32_t>(Connections.size()));
+  PutLittle32(bytes, 0, static_cast<std::uint32_t>(Connections.size()));
   std::size_t at = 4;
   for (const Connection& connection : Connections) {
-    Put32(bytes, at, connection.state);
-    Put32(bytes, at + 4, AddressInMemory(connection.localAddress));
-    Put32(bytes, at + 8, PortInMemory(connection.localPort));
-    Put32(bytes, at + 12, AddressInMemory(connection.remoteAddress));
-    Put32(bytes, at + 16, PortInMemory(connection.remotePort));
-    Put32(bytes, at + 20, connection.owner);
+    PutLittle32(bytes, at, connection.state);
+    PutLittle32(bytes, at + 4, AddressInMemory(connection.localAddress));
+    PutLittle32(bytes, at + 8, PortInMemory(connection.localPort));
+    PutLittle32(bytes, at + 12, AddressInMemory(connection.remoteAddress));
+    PutLittle32(bytes, at + 16, PortInMemory(connection.remotePort));
+    PutLittle32(bytes, at + 20, connection.owner);
     at += kEntrySize;
   }
   table = std::make_shared<const std::vector<std::uint8_t>>(std::move(bytes));

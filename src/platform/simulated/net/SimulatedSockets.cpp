@@ -507,8 +507,8 @@ void SimulatedSockets::Resolved(std::uint32_t lookUp) {
     error = hostNames_.LastError();
   if (error == 0) {
     const std::size_t count = std::min(addresses->size(), asked.buffer.size() / 4 - 1);
-    Put32(asked.buffer, 0, static_cast<std::uint32_t>(count));
-    for (std::size_t i = 0; i < count; ++i) Put32(asked.buffer, 4 + 4 * i, (*addresses)[i]);
+    PutLittle32(asked.buffer, 0, static_cast<std::uint32_t>(count));
+    for (std::size_t i = 0; i < count; ++i) PutLittle32(asked.buffer, 4 + 4 * i, (*addresses)[i]);
   }
   if (loop_) loop_->PostMessage(asked.window, asked.message, lookUp, static_cast<std::uint32_t>(error) << 16);
 }

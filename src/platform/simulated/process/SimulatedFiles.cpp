@@ -41,8 +41,8 @@ bool SimulatedVersionInfo::GetFileVersionInfoA(const std::string& path, std::spa
   const auto found = indexOf_.find(CutText(path));
   if (found == indexOf_.end() || unreadable_.contains(found->first) || buffer.size() < kBlockSize)
     return false;
-  Put32(buffer, 0, kBlockMark);
-  Put32(buffer, 4, found->second);
+  PutLittle32(buffer, 0, kBlockMark);
+  PutLittle32(buffer, 4, found->second);
   return true;
 }
 
@@ -50,9 +50,9 @@ std::optional<std::vector<std::uint8_t>>
 SimulatedVersionInfo::VerQueryValueA(std::span<const std::uint8_t> block, const std::string& subBlockText) {
   const std::string subBlock = CutText(subBlockText);
   Queries.push_back(subBlock);
-  if (block.size() < kBlockSize || Get32(block, 0) != kBlockMark || Get32(block, 4) >= blocks_.size())
+  if (block.size() < kBlockSize || Little32(block, 0) != kBlockMark || Little32(block, 4) >= blocks_.size())
     return {};
-  const Block& found = blocks_[Get32(block, 4)];
+  const Block& found = blocks_[Little32(block, 4)];
   if (subBlock == "\\VarFileInfo\\Translation") {
     if (found.translation.empty()) return {};
     return found.translation;

@@ -29,16 +29,16 @@ std::uint32_t SimulatedHandles::NtQuerySystemInformation(std::uint32_t informati
   }
   const std::size_t needed = 4 + kEntrySize * handles.size();
   returnedLength = static_cast<std::uint32_t>(needed);
-  if (buffer.size() >= 4) Put32(buffer, 0, static_cast<std::uint32_t>(handles.size()));
+  if (buffer.size() >= 4) PutLittle32(buffer, 0, static_cast<std::uint32_t>(handles.size()));
   if (buffer.size() < needed) return kStatusInfoLengthMismatch;
   for (std::size_t i = 0; i < handles.size(); ++i) {
     const auto entry = buffer.subspan(4 + kEntrySize * i, kEntrySize);
     std::fill(entry.begin(), entry.end(), std::uint8_t{0});
-    Put32(entry, 0, handles[i].pid);
+    PutLittle32(entry, 0, handles[i].pid);
     entry[4] = 28; // a file object
-    Put16(entry, 6, handles[i].handle);
-    Put32(entry, 8, 0x81000000U + static_cast<std::uint32_t>(i) * 0x40U);
-    Put32(entry, 12, 0x0012019F);
+    PutLittle16(entry, 6, handles[i].handle);
+    PutLittle32(entry, 8, 0x81000000U + static_cast<std::uint32_t>(i) * 0x40U);
+    PutLittle32(entry, 12, 0x0012019F);
   }
   return 0;
 }
@@ -71,10 +71,11 @@ std::uint32_t SimulatedHandles::NtQueryObject(Handle handle, std::uint32_t infor
   returnedLength = static_cast<std::uint32_t>(needed);
   if (buffer.size() < needed) return kStatusInfoLengthMismatch;
   std::fill(buffer.begin(), buffer.end(), std::uint8_t{0});
-  Put16(buffer, 0, static_cast<std::uint16_t>(bytes));
-  Put16(buffer, 2, static_cast<std::uint16_t>(needed - 8));
-  Put32(buffer, 4, entry->deviceName.empty() ? 0 : 8);
-  for (std::size_t i = 0; i < entry->deviceName.size(); ++i) Put16(buffer, 8 + 2 * i, entry->deviceName[i]);
+  PutLittle16(buffer, 0, static_cast<std::uint16_t>(bytes));
+  PutLittle16(buffer, 2, static_cast<std::uint16_t>(needed - 8));
+  PutLittle32(buffer, 4, entry->deviceName.empty() ? 0 : 8);
+  for (std::size_t i = 0; i < entry->deviceName.size(); ++i)
+    PutLittle16(buffer, 8 + 2 * i, entry->deviceName[i]);
   return 0;
 }
 
@@ -89,11 +90,10 @@ std::uint32_t SimulatedHandles::NtDeviceIoControlFile(Handle handle, Handle, std
   const SystemHandle* entry = Duplicated(handle);
   if (!entry) return kStatusInvalidHandle;
   if (controlCode != kQueryInformation) return kStatusNotImplemented;
-  if (input.size() != 24 || output.size() != 52 || Get32(input, 16) != kQueryAddressInfo)
+  if (input.size() != 24 || output.size() != 52 || Little32(input, 16) != kQueryAddressInfo)
     return kStatusInvalidParameter;
   if (entry->driverStatus != 0) return entry->driverStatus;
-  output[12] = static_cast<std::uint8_t>(entry->port >> 8);
-  output[13] = static_cast<std::uint8_t>(entry->port);
+  PutBig16(output, 12, entry->port);
   return 0;
 }
 

@@ -37,9 +37,9 @@ struct Record {
 
   explicit Record(CaptureControl& control) {
     control.ReadBuffer(bytes);
-    std::memcpy(&captured, &bytes[8], 4);
-    std::memcpy(&wire, &bytes[12], 4);
-    std::memcpy(&headerLength, &bytes[16], 2);
+    captured = Little32(bytes, 8);
+    wire = Little32(bytes, 12);
+    headerLength = Little16(bytes, 16);
   }
 };
 
@@ -128,7 +128,7 @@ TEST_F(LinuxCaptureEventsTest, Behind_frames_that_were_left_the_buffer_holds_the
   WaitUntil([&] { return capture->Counters().received == 904; }, "all frames");
   EXPECT_EQ(events, 2);
   const Record record(*control);
-  EXPECT_EQ(record.bytes[18 + 34] * 256 + record.bytes[18 + 35], 4711);
+  EXPECT_EQ(Big16(record.bytes, 18 + 34), 4711);
 }
 
 TEST_F(LinuxCaptureEventsTest, The_newest_record_stays_when_its_frame_has_been_taken) {

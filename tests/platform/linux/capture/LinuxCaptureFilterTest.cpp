@@ -7,7 +7,6 @@ using integration::Bytes;
 using integration::EthernetFrame;
 using integration::Ipv4Packet;
 using integration::Joined;
-using integration::PutWord;
 using integration::RawLink;
 using integration::RunCommand;
 using integration::TcpFrame;
@@ -76,11 +75,11 @@ TEST_F(LinuxCaptureFilterTest, TCP_and_tunnels_are_delivered_from_between_other_
 TEST_F(LinuxCaptureFilterTest, The_fragments_of_a_TCP_packet_are_delivered_all) {
   constexpr unsigned kMore = 0x2000;
   Bytes first = EthernetFrame(PacketOf(6));
-  PutWord(first, 20, kMore);
+  PutBig16(first, 20, kMore);
   Bytes middle = first;
-  PutWord(middle, 20, kMore | 100);
+  PutBig16(middle, 20, kMore | 100);
   Bytes last = first;
-  PutWord(last, 20, 200);
+  PutBig16(last, 20, 200);
   EXPECT_EQ(Delivered({first, middle, last}), (std::vector<Bytes>{first, middle, last}));
 }
 

@@ -50,6 +50,6 @@ class LinuxCaptureFixture : public testing::Test {
 };
 
 /// The source port of a TCP or UDP frame.
-inline unsigned SourcePort(const integration::Bytes& frame) { return frame[34] * 256u + frame[35]; }
+inline unsigned SourcePort(const integration::Bytes& frame) { return Big16(frame, 34); }
 
 } // namespace quendra::platform::linux_

@@ -195,7 +195,7 @@ TEST_F(LinuxCaptureTest, Packets_of_a_tunnel_get_an_Ethernet_header) {
   WaitUntil([&] { return events > 0; }, "the packet");
   const auto frame = NextFrame();
   ASSERT_TRUE(frame);
-  EXPECT_EQ((*frame)[12] * 256 + (*frame)[13], 0x0800);
+  EXPECT_EQ(Big16(*frame, 12), 0x0800);
   EXPECT_EQ(Bytes(frame->begin() + 14, frame->end()), packet);
 }
 
@@ -206,7 +206,7 @@ TEST_F(LinuxCaptureTest, A_packet_of_64_KB_is_delivered_in_frames_that_add_up) {
   WaitUntil([&] { return events > 0; }, "the packet");
   int sum = 0;
   while (const auto frame = NextFrame()) {
-    const int total = (*frame)[16] * 256 + (*frame)[17];
+    const int total = Big16(*frame, 16);
     EXPECT_LE(total, 32767);
     EXPECT_EQ(SourcePort(*frame), 1025u);
     sum += total;

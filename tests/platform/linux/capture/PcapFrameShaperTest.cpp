@@ -11,7 +11,6 @@ using integration::Bytes;
 using integration::EthernetFrame;
 using integration::Ipv4Packet;
 using integration::Joined;
-using integration::PutWord;
 using integration::TcpFrame;
 
 namespace {
@@ -29,8 +28,7 @@ class PcapFrameShaperTest : public testing::Test {
   /// The total lengths of all frames that wait.
   std::vector<unsigned> TotalLengths() {
     std::vector<unsigned> lengths;
-    for (Bytes frame = Next(); !frame.empty(); frame = Next())
-      lengths.push_back(frame[16] * 256u + frame[17]);
+    for (Bytes frame = Next(); !frame.empty(); frame = Next()) lengths.push_back(Big16(frame, 16));
     return lengths;
   }
 
@@ -40,7 +38,7 @@ class PcapFrameShaperTest : public testing::Test {
 
 Bytes TruncatedTcp(unsigned total) {
   Bytes frame = TcpFrame(1025, 80, 100);
-  PutWord(frame, 16, total);
+  PutBig16(frame, 16, total);
   return frame;
 }
 
@@ -116,9 +114,9 @@ TEST_F(PcapFrameShaperTest, Headers_of_other_links_give_way_to_an_Ethernet_heade
   const Bytes packet = Ipv4Packet(6, "1.2.3.4", 1025, "5.6.7.8", 80, 60);
   const Bytes expected = Joined({0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 8, 0}, packet);
   Bytes cooked(16);
-  PutWord(cooked, 14, 0x0800);
+  PutBig16(cooked, 14, 0x0800);
   Bytes cooked2(20);
-  PutWord(cooked2, 0, 0x0800);
+  PutBig16(cooked2, 0, 0x0800);
   const std::pair<LinkForm, Bytes> links[] = {
       {LinkForm::Family, {2, 0, 0, 0}},  {LinkForm::LinuxCooked, cooked},
       {LinkForm::LinuxCooked2, cooked2}, {LinkForm::Ppp, {0xFF, 0x03, 0x00, 0x21}},
@@ -135,9 +133,9 @@ TEST_F(PcapFrameShaperTest, Headers_of_other_links_give_way_to_an_Ethernet_heade
 TEST_F(PcapFrameShaperTest, A_long_packet_shows_as_many_bytes_whatever_the_header_of_its_link) {
   const Bytes packet = Ipv4Packet(6, "1.2.3.4", 1025, "5.6.7.8", 80, 200);
   Bytes cooked(16);
-  PutWord(cooked, 14, 0x0800);
+  PutBig16(cooked, 14, 0x0800);
   Bytes cooked2(20);
-  PutWord(cooked2, 0, 0x0800);
+  PutBig16(cooked2, 0, 0x0800);
   const std::pair<LinkForm, Bytes> links[] = {
       {LinkForm::Ethernet, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 8, 0}},
       {LinkForm::RawIp, {}},
@@ -227,14 +225,14 @@ TEST_F(PcapFrameShaperTest, Long_packets_of_other_protocols_stay_one_frame) {
   udp[23] = 17;
   Deliver(udp, 14 + 60000);
   Bytes six = TruncatedTcp(60000);
-  PutWord(six, 12, 0x86DD);
+  PutBig16(six, 12, 0x86DD);
   Deliver(six, 14 + 60000);
   EXPECT_EQ(TotalLengths(), (std::vector<unsigned>{60000, 60000}));
 }
 
 TEST_F(PcapFrameShaperTest, A_long_packet_of_a_link_without_Ethernet_is_split_too) {
   Bytes packet = Ipv4Packet(6, "1.2.3.4", 1025, "5.6.7.8", 80, 100);
-  PutWord(packet, 2, 40000);
+  PutBig16(packet, 2, 40000);
   shaper.SetForm(LinkForm::RawIp);
   Deliver(packet, 40000);
   EXPECT_EQ(TotalLengths(), (std::vector<unsigned>{32767, 7233}));

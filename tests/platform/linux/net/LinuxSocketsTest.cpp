@@ -1,5 +1,6 @@
 #include "platform/linux/net/LinuxSocketsFixture.h"
 #include "platform/linux/net/SocketErrorNumbers.h"
+#include "runtime/ByteFields.h"
 
 #include <netdb.h>
 
@@ -328,10 +329,8 @@ TEST_F(LinuxSocketsTest, A_name_is_found_and_its_addresses_stand_in_the_buffer) 
   ASSERT_NE(lookUp, 0u);
   ASSERT_TRUE(Until([&] { return !names.empty(); }));
   EXPECT_EQ(names, (std::vector<Seen>{{lookUp, 0, 0}}));
-  std::uint32_t words[2] = {};
-  std::memcpy(words, buffer.data(), sizeof words);
-  EXPECT_GE(words[0], 1u);
-  EXPECT_EQ(words[1], htonl(INADDR_LOOPBACK));
+  EXPECT_GE(Little32(buffer, 0), 1u);
+  EXPECT_EQ(Big32(buffer, 4), INADDR_LOOPBACK);
 }
 
 TEST_F(LinuxSocketsTest, A_name_that_no_host_can_have_is_not_found) {
