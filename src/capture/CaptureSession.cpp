@@ -101,11 +101,11 @@ void CaptureSession::AddDescription(const platform::AdapterInfo& info) {
 }
 
 bool CaptureSession::CarriesKnownAddress(const platform::AdapterInfo& info) {
-  std::uint32_t address = 0;
+  platform::Ipv4Address address;
   std::uint32_t unread = 0;
   Control().AdapterAddress(TextOf(info.AdapterName), address, unread);
-  if (address == 0) return false;
-  const Text text = mod_functions::IpFromLong(address);
+  if (address.IsAny()) return false;
+  const Text text = address.AsText();
   return text == fields_.LocalAddressLast || text == fields_.GatewayAddress ||
          text == fields_.LocalAddressPrevious;
 }

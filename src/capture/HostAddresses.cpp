@@ -1,6 +1,5 @@
 #include "capture/HostAddresses.h"
 
-#include "capture/mod_functions.h"
 #include "platform/net/HostNames.h"
 #include "platform/net/IpHelper.h"
 
@@ -13,7 +12,7 @@ Text HostAddresses::LocalHostAddress(bool last) const {
   if (!addresses) return {};
   const std::size_t fromEnd = last ? 1 : 2;
   if (addresses->size() < fromEnd) return {};
-  return mod_functions::IpFromLong((*addresses)[addresses->size() - fromEnd]);
+  return (*addresses)[addresses->size() - fromEnd].AsText();
 }
 
 Text HostAddresses::GatewayAddress() const {

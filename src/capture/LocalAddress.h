@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/net/Ipv4Address.h"
 #include "runtime/Text.h"
 
 #include <optional>
@@ -10,17 +11,20 @@ namespace quendra::capture {
 /// comparing numbers gives the same answer, as a decoded address reads as its canonical text only.
 class LocalAddress {
  public:
-  /// `address` counts without the blanks at its ends; `decoded` is as it lies in memory.
-  bool Equals(const Text& address, std::uint32_t decoded) {
+  /// `address` counts without the blanks at its ends.
+  bool Equals(const Text& address, platform::Ipv4Address decoded) {
     if (address != text_) Read(address);
     return number_ == decoded;
   }
 
  private:
-  void Read(const Text& address);
+  void Read(const Text& address) {
+    text_ = address;
+    number_ = platform::Ipv4Address::FromText(Trimmed(address));
+  }
 
   Text text_;
-  std::optional<std::uint32_t> number_; ///< nothing for a text that no decoded address reads as
+  std::optional<platform::Ipv4Address> number_; ///< nothing for a text that no decoded address reads as
 };
 
 } // namespace quendra::capture

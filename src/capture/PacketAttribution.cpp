@@ -114,7 +114,7 @@ void PacketAttribution::AttributePolledFrame(const platform::FrameBytes& frame, 
 }
 
 bool PacketAttribution::IsOutgoing(const clsIP& ip) {
-  const std::uint32_t source = *ip.SourceAddress();
+  const platform::Ipv4Address source = *ip.SourceAddress();
   return lastAddress_.Equals(capture_.LocalAddressLast, source) ||
          previousAddress_.Equals(capture_.LocalAddressPrevious, source);
 }

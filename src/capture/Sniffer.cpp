@@ -28,7 +28,7 @@ SniffedPacket ReadSniffedPacket(std::span<const std::uint8_t, 2000> buffer) {
   SniffedPacket packet;
   packet.tunnelled = bytes[9] == kGre;
   const int header = packet.tunnelled ? kInnerHeader : 0;
-  packet.source = mod_functions::ReadBytes(bytes, header + 12, 4);
+  packet.source = platform::Ipv4Address::FromMemory(mod_functions::ReadBytes(bytes, header + 12, 4));
   const int protocol = bytes[header + 9];
   int headerSize = 20;
   switch (protocol) {
@@ -76,7 +76,7 @@ void Sniffer::Charge(const SniffedPacket& packet) {
 }
 
 bool Sniffer::IsOutgoing(const SniffedPacket& packet) const {
-  const Text source = mod_functions::IpFromLong(packet.source);
+  const Text source = packet.source.AsText();
   return source == Trimmed(capture_.LocalAddressLast) || source == Trimmed(capture_.LocalAddressPrevious) ||
          source == Trimmed(capture_.GatewayAddress);
 }

@@ -16,7 +16,7 @@ namespace quendra::capture {
 struct SniffedPacket {
   Text protocolName;
   std::int32_t payloadSize = 0; ///< the packet's length without the headers that its protocol counts
-  std::uint32_t source = 0;     ///< as it lies in memory
+  platform::Ipv4Address source;
   bool tunnelled = false;
   struct Ports {
     std::int16_t source = 0;

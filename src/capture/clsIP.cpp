@@ -2,17 +2,15 @@
 
 #include "capture/Protocols.h"
 #include "capture/modVBPcap.h"
-#include "capture/mod_functions.h"
-
-#include <bit>
+#include "runtime/ByteFields.h"
 
 namespace quendra::capture {
 
 namespace {
 
-std::uint32_t AddressAt(const platform::FrameBytes& frame, int index) {
-  return std::bit_cast<std::uint32_t>(
-      std::array<std::uint8_t, 4>{frame[index], frame[index + 1], frame[index + 2], frame[index + 3]});
+platform::Ipv4Address AddressAt(const platform::FrameBytes& frame, int index) {
+  const std::array bytes{frame[index], frame[index + 1], frame[index + 2], frame[index + 3]};
+  return platform::Ipv4Address::FromMemory(Little32(bytes, 0));
 }
 
 } // namespace
@@ -50,8 +48,8 @@ Text clsIP::HD_Cheksum() const {
   return HD_Cheksum_ ? HexText(static_cast<std::uint16_t>(*HD_Cheksum_)) : Text{};
 }
 
-Text clsIP::AddressText(const std::optional<std::uint32_t>& address) {
-  return address ? mod_functions::IpFromLong(*address) : Text{};
+Text clsIP::AddressText(const std::optional<platform::Ipv4Address>& address) {
+  return address ? address->AsText() : Text{};
 }
 
 } // namespace quendra::capture

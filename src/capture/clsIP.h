@@ -29,11 +29,11 @@ class clsIP {
   Text Decode(const platform::FrameBytes& frame);
   Text sProtocol() const { return sProtocol_; }
 
-  /// What SrcIP reads, as the number that lies in memory; nothing before the first frame.
-  const std::optional<std::uint32_t>& SourceAddress() const { return SrcIP_; }
+  /// What SrcIP reads; nothing before the first frame.
+  const std::optional<platform::Ipv4Address>& SourceAddress() const { return SrcIP_; }
 
  private:
-  static Text AddressText(const std::optional<std::uint32_t>& address);
+  static Text AddressText(const std::optional<platform::Ipv4Address>& address);
   void ResolveProtocolName();
 
   std::uint8_t Ver_ = 0;
@@ -45,8 +45,8 @@ class clsIP {
   std::int16_t Protocol_ = 0;
   const char16_t* sProtocol_ = u"";
   std::optional<std::int16_t> HD_Cheksum_;
-  std::optional<std::uint32_t> SrcIP_;
-  std::optional<std::uint32_t> DestIP_;
+  std::optional<platform::Ipv4Address> SrcIP_;
+  std::optional<platform::Ipv4Address> DestIP_;
 };
 
 } // namespace quendra::capture

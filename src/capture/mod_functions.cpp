@@ -3,16 +3,10 @@
 #include "runtime/ByteFields.h"
 
 #include <algorithm>
-#include <bit>
 
 namespace quendra::capture::mod_functions {
 
-Text IpFromLong(std::uint32_t value) {
-  const auto bytes = std::bit_cast<std::array<std::uint8_t, 4>>(value);
-  Text text = DecimalText(bytes[0]);
-  for (int i = 1; i < 4; ++i) text += u"." + DecimalText(bytes[static_cast<std::size_t>(i)]);
-  return text;
-}
+Text IpFromLong(std::uint32_t value) { return platform::Ipv4Address::FromMemory(value).AsText(); }
 
 std::uint32_t ReadBytes(const platform::FrameBytes& bytes, std::int32_t index, std::int32_t count) {
   std::array<std::uint8_t, 4> copied{};

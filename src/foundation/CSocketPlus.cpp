@@ -104,7 +104,7 @@ Text CSocketPlus::LocalIP(const Value& index) {
   if (record.State == sckConnected) return record.LocalIP;
   const auto addresses = module_.Names().gethostbyname(ToCodePage(LocalHostName()));
   if (!addresses) throw SystemError(module_.Names().LastError(), u"CSocketPlus.GetLocalIP");
-  return DottedAddress(addresses->front());
+  return addresses->front().AsText();
 }
 
 std::int32_t CSocketPlus::BytesReceived(const Value& index) { return AmountWaiting(GetSocketIndex(index)); }

@@ -89,10 +89,10 @@ class CSocketPlus {
   bool SocketExists(Slot slot);
   void ProcessOptions(Slot slot);
   bool BindInternal(Slot slot, const Value& port = {}, const Value& address = {});
-  std::uint32_t ResolveBlocking(const Text& host, std::int32_t& error);
-  std::uint32_t ResolveIfHostname(Slot slot, const Text& host);
+  platform::Ipv4Address ResolveBlocking(const Text& host, std::int32_t& error);
+  platform::Ipv4Address ResolveIfHostname(Slot slot, const Text& host);
   void PostResolution(std::uint32_t handle, std::int32_t error);
-  void ConnectToIP(Slot slot, std::uint32_t address, std::int32_t error);
+  void ConnectToIP(Slot slot, platform::Ipv4Address address, std::int32_t error);
   void StoreLocalAddress(Slot slot);
   void StorePeerAddress(Slot slot);
 

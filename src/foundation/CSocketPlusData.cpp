@@ -62,7 +62,7 @@ void CSocketPlus::SendBufferedData(Slot slot) {
 void CSocketPlus::SendBufferedDataUDP(Slot slot) {
   constexpr auto kSource = u"CSocketPlus.SendBufferedDataUDP";
   std::int32_t error = 0;
-  const std::uint32_t address = ResolveBlocking(At(slot).RemoteHost, error);
+  const platform::Ipv4Address address = ResolveBlocking(At(slot).RemoteHost, error);
   const ByteArray datagram = At(slot).SendBuffer.Take(At(slot).SendBuffer.Size());
   if (error == platform::kFamilyNotSupported) throw SystemError(error, kSource);
   if (error != 0) throw Fault(kInvalidArgumentFault, u"Invalid argument", kSource);
@@ -155,7 +155,7 @@ ByteArray CSocketPlus::TakeBytes(Slot slot, std::size_t count, bool peek) {
     throw SystemError(module_.Library().WSAGetLastError(), u"CSocketPlus.RecvData");
   bytes.resize(static_cast<std::size_t>(read));
   record.RemotePort = from.port;
-  record.RemoteHostIP = DottedAddress(from.address);
+  record.RemoteHostIP = from.address.AsText();
   record.RemoteHost.clear();
   return bytes;
 }

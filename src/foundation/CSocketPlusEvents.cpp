@@ -92,7 +92,7 @@ void CSocketPlus::OfferConnection(Slot slot, platform::SocketHandle accepted) {
   platform::SocketAddress peer;
   module_.Library().getpeername(accepted, peer);
   At(slot).RemotePort = peer.port;
-  At(slot).RemoteHostIP = DottedAddress(peer.address);
+  At(slot).RemoteHostIP = peer.address.AsText();
   At(slot).RemoteHost.clear();
   const Value index = At(slot).Index;
   Events.ConnectionRequest(index, accepted);

@@ -23,9 +23,8 @@ constexpr std::int32_t kSendBufferOption = 0x1001;
 constexpr std::int32_t kReceiveBufferOption = 0x1002;
 constexpr std::int32_t kMaxMessageSize = 0x2003;
 
-constexpr std::uint32_t kNoAddress = 0xFFFFFFFF;
 /// In place of an address: the look-up is under way. An address of this very value is taken for it too.
-constexpr std::uint32_t kLookUpRunning = 1;
+constexpr auto kLookUpRunning = platform::Ipv4Address::FromMemory(1);
 constexpr std::size_t kResolveBufferSize = 1024;
 constexpr std::int32_t kListenBacklog = 5;
 
@@ -51,7 +50,7 @@ void CSocketPlus::Connect(const Value& index, const Value& remoteHost, const Val
     At(slot).State = sckOpen;
     return;
   }
-  const std::uint32_t address = ResolveIfHostname(slot, At(slot).RemoteHost);
+  const platform::Ipv4Address address = ResolveIfHostname(slot, At(slot).RemoteHost);
   if (address != kLookUpRunning) ConnectToIP(slot, address, 0);
 }
 
@@ -129,21 +128,21 @@ bool CSocketPlus::BindInternal(Slot slot, const Value& port, const Value& addres
   return true;
 }
 
-std::uint32_t CSocketPlus::ResolveBlocking(const Text& host, std::int32_t& error) {
+platform::Ipv4Address CSocketPlus::ResolveBlocking(const Text& host, std::int32_t& error) {
   error = 0;
   const std::string name = LibraryName(host);
-  const std::uint32_t address = platform::Sockets::inet_addr(name);
-  if (address != kNoAddress) return address;
+  const platform::Ipv4Address address = platform::Sockets::inet_addr(name);
+  if (address != platform::kNoAddress) return address;
   const auto addresses = module_.Names().gethostbyname(name);
   if (addresses) return addresses->front();
   error = module_.Names().LastError();
-  return kNoAddress;
+  return platform::kNoAddress;
 }
 
-std::uint32_t CSocketPlus::ResolveIfHostname(Slot slot, const Text& host) {
+platform::Ipv4Address CSocketPlus::ResolveIfHostname(Slot slot, const Text& host) {
   constexpr auto kSource = u"CSocketPlus.ResolveIfHostname";
-  const std::uint32_t address = platform::Sockets::inet_addr(LibraryName(host));
-  if (address != kNoAddress) return address;
+  const platform::Ipv4Address address = platform::Sockets::inet_addr(LibraryName(host));
+  if (address != platform::kNoAddress) return address;
   At(slot).State = sckResolvingHost;
   try {
     At(slot).LookUpBuffer = std::make_unique<ResolveBuffer>(kResolveBufferSize);
@@ -174,10 +173,10 @@ void CSocketPlus::PostResolution(std::uint32_t handle, std::int32_t error) {
   if (error == 0 && (!buffer || Little32(*buffer, 0) == 0)) error = platform::kHostNotFound;
   if (error != 0) return ConnectToIP(slot, kLookUpRunning, error);
   At(slot).State = sckHostResolved;
-  ConnectToIP(slot, Little32(*buffer, sizeof(std::uint32_t)), 0);
+  ConnectToIP(slot, platform::Ipv4Address::FromMemory(Little32(*buffer, sizeof(std::uint32_t))), 0);
 }
 
-void CSocketPlus::ConnectToIP(Slot slot, std::uint32_t address, std::int32_t error) {
+void CSocketPlus::ConnectToIP(Slot slot, platform::Ipv4Address address, std::int32_t error) {
   constexpr auto kSource = u"CSocketPlus.ConnectToIP";
   if (error != 0) return Fail(slot, error, kSource);
   At(slot).State = sckConnecting;
@@ -193,14 +192,14 @@ void CSocketPlus::StoreLocalAddress(Slot slot) {
   platform::SocketAddress local;
   module_.Library().getsockname(At(slot).SocketHandle, local);
   At(slot).LocalPortBind = local.port;
-  At(slot).LocalIP = DottedAddress(local.address);
+  At(slot).LocalIP = local.address.AsText();
 }
 
 void CSocketPlus::StorePeerAddress(Slot slot) {
   platform::SocketAddress peer;
   module_.Library().getpeername(At(slot).SocketHandle, peer);
   At(slot).RemotePort = peer.port;
-  At(slot).RemoteHostIP = DottedAddress(peer.address);
+  At(slot).RemoteHostIP = peer.address.AsText();
   At(slot).RemoteHost.clear();
 }
 

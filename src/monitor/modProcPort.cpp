@@ -2,6 +2,7 @@
 
 #include "monitor/PortsCells.h"
 #include "monitor/ProcessRow.h"
+#include "platform/net/Ipv4Address.h"
 
 #include <array>
 
@@ -75,9 +76,7 @@ void modProcPort::NextEntry() {
 }
 
 Text modProcPort::IpAddressText(std::uint32_t address) {
-  Text text = DecimalText(address & 0xFF);
-  for (int shift = 8; shift < 32; shift += 8) text += u"." + DecimalText(address >> shift & 0xFF);
-  return text;
+  return platform::Ipv4Address::FromMemory(address).AsText();
 }
 
 Text modProcPort::StateName(std::uint32_t state) {

@@ -75,7 +75,7 @@ TEST_F(CaptureSessionTest, The_adapters_name_goes_to_the_control_in_all_its_255_
     void SetChannelSize(std::int32_t, std::int32_t&) override {}
     void ReleaseChannel(std::int32_t&) override {}
     void CloseChannel(std::int32_t&) override {}
-    void AdapterAddress(const std::string&, std::uint32_t&, std::uint32_t&) override {}
+    void AdapterAddress(const std::string&, platform::Ipv4Address&, std::uint32_t&) override {}
     void StartEvents(std::int32_t&) override {}
     void StopEvents(std::int32_t&) override {}
     void ReadBuffer(std::span<std::uint8_t>) override {}

@@ -9,7 +9,9 @@
 namespace quendra::capture {
 namespace {
 
-std::uint32_t InMemory(std::array<std::uint8_t, 4> bytes) { return std::bit_cast<std::uint32_t>(bytes); }
+platform::Ipv4Address InMemory(std::array<std::uint8_t, 4> bytes) {
+  return platform::Ipv4Address::FromMemory(std::bit_cast<std::uint32_t>(bytes));
+}
 
 TEST(LocalAddress, Equals_the_address_that_reads_as_its_text) {
   LocalAddress local;
@@ -58,9 +60,10 @@ TEST(LocalAddress, Answers_as_a_comparison_of_texts_does) {
   const Text addresses[] = {u"0.0.0.0", u"255.255.255.255", u"10.0.0.138",
                             u"1.2.3.4", u" 1.2.3.4",        u"1.2.3.04"};
   for (const Text& address : addresses)
-    for (const std::uint32_t decoded :
+    for (const platform::Ipv4Address decoded :
          {InMemory({0, 0, 0, 0}), InMemory({255, 255, 255, 255}), InMemory({1, 2, 3, 4})})
-      EXPECT_EQ(local.Equals(address, decoded), Trimmed(address) == mod_functions::IpFromLong(decoded));
+      EXPECT_EQ(local.Equals(address, decoded),
+                Trimmed(address) == mod_functions::IpFromLong(decoded.InMemory()));
 }
 
 } // namespace

@@ -68,7 +68,7 @@ TEST(SniffedPackets, Behind_protocol_47_the_header_stands_36_bytes_further_on) {
   PutBig16(bytes, 58, 1025);
   const SniffedPacket packet = Read(bytes);
   EXPECT_TRUE(packet.tunnelled);
-  EXPECT_EQ(packet.source, platform::simulated::AddressInMemory(kServer));
+  EXPECT_EQ(packet.source, platform::simulated::AddressOf(kServer));
   EXPECT_EQ(packet.payloadSize, 500);
   EXPECT_EQ(packet.ports->source, 80);
   EXPECT_EQ(packet.ports->destination, 1025);

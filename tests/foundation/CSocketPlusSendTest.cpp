@@ -117,7 +117,7 @@ TEST_F(SocketSends, A_datagram_goes_to_a_name_by_the_blocking_resolver) {
   Object->SetRemoteHost(1, u"dns");
   Object->SendData(1, Text(u"q"));
   EXPECT_EQ(Net().Count("WSAAsyncGetHostByName"), 0);
-  EXPECT_EQ(Net().Datagrams.at(0).to.address, platform::simulated::AddressInMemory("10.1.1.53"));
+  EXPECT_EQ(Net().Datagrams.at(0).to.address, platform::simulated::AddressOf("10.1.1.53"));
 }
 
 TEST_F(SocketSends, An_echoed_datagram_comes_back) {

@@ -65,7 +65,7 @@ class SimulatedBackend : public Backend {
   SocketAddress Outside() override {
     // As on loopback: a sender that is faster than its reader has to wait now and then.
     server_.TakeAtMost(100'000);
-    return {simulated::AddressInMemory("10.1.1.1"), 80};
+    return {simulated::AddressOf("10.1.1.1"), 80};
   }
   std::unique_ptr<FarEnd> TakeConnection() override {
     if (taken_ == server_.Connections.size()) return nullptr;
@@ -145,7 +145,7 @@ class LinuxBackend : public Backend {
   SocketAddress Outside() override {
     const std::uint16_t port = Listen();
     Check(fcntl(sockets_.back(), F_SETFL, O_NONBLOCK));
-    return {htonl(INADDR_LOOPBACK), port};
+    return {Ipv4Address::FromHost(INADDR_LOOPBACK), port};
   }
   std::unique_ptr<FarEnd> TakeConnection() override {
     const int taken = accept4(sockets_.back(), nullptr, nullptr, SOCK_CLOEXEC);

@@ -267,7 +267,7 @@ TEST_P(BehaviourTest, The_own_name_has_addresses_and_the_first_is_the_loopback) 
 
   ASSERT_TRUE(addresses);
   ASSERT_FALSE(addresses->empty());
-  EXPECT_EQ(addresses->front(), kLoopbackInMemory);
+  EXPECT_EQ(addresses->front().InMemory(), kLoopbackInMemory);
 }
 
 TEST_P(BehaviourTest, A_question_for_a_name_that_fails_has_its_own_number_which_socket_calls_leave_alone) {
@@ -438,7 +438,7 @@ TEST_P(BehaviourTest, A_control_without_an_adapter_answers_every_call) {
   int events = 0;
   control->PacketReceived = [&] { ++events; };
   std::int32_t result = -1;
-  std::uint32_t address = 1;
+  auto address = Ipv4Address::FromHost(1);
   std::uint32_t second = 1;
   std::array<std::uint8_t, 64> buffer{};
 
@@ -456,7 +456,7 @@ TEST_P(BehaviourTest, A_control_without_an_adapter_answers_every_call) {
   control->ReleaseChannel(result);
   control->CloseChannel(result);
 
-  EXPECT_EQ(address, 0U);
+  EXPECT_EQ(address, Ipv4Address());
   EXPECT_EQ(events, 0);
   // A record header that states no bytes of a frame, and none behind it.
   EXPECT_TRUE(

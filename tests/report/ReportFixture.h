@@ -65,7 +65,7 @@ class ReportTest : public testing::Test {
 
   /// The server by name; a build may name it by its address.
   platform::simulated::SimulatedServer& Server() {
-    const bool dotted = platform::Sockets::inet_addr(host) != 0xFFFFFFFF;
+    const bool dotted = platform::Sockets::inet_addr(host) != platform::kNoAddress;
     return machine.sockets.Listen(dotted ? host : kServerAddress, 80);
   }
   /// The same server by address, where the load comes from.

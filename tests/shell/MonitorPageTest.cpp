@@ -27,7 +27,7 @@ class Recorder : public forms::ListViewObserver, public platform::HostNames, pub
     Note("addresses");
     return machine_.hostNames.gethostname();
   }
-  std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) override {
+  std::optional<std::vector<platform::Ipv4Address>> gethostbyname(const std::string& name) override {
     return machine_.hostNames.gethostbyname(name);
   }
   std::int32_t LastError() override { return machine_.hostNames.LastError(); }

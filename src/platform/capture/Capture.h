@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/net/Ipv4Address.h"
 #include "runtime/Fault.h"
 
 #include <array>
@@ -87,8 +88,8 @@ class CaptureControl {
   virtual void SetChannelSize(std::int32_t size, std::int32_t& result) = 0;
   virtual void ReleaseChannel(std::int32_t& result) = 0;
   virtual void CloseChannel(std::int32_t& result) = 0;
-  /// The adapter's address as it lies in memory (network order), 0 for none.
-  virtual void AdapterAddress(const std::string& adapterName, std::uint32_t& address,
+  /// The adapter's address, 0.0.0.0 for none.
+  virtual void AdapterAddress(const std::string& adapterName, Ipv4Address& address,
                               std::uint32_t& second) = 0;
   virtual void StartEvents(std::int32_t& result) = 0;
   virtual void StopEvents(std::int32_t& result) = 0;

@@ -1,6 +1,7 @@
 #pragma once
 
-#include <cstdint>
+#include "platform/net/Ipv4Address.h"
+
 #include <optional>
 #include <string>
 #include <vector>
@@ -15,9 +16,8 @@ class HostNames {
 
   /// Nothing on failure.
   virtual std::optional<std::string> gethostname() = 0;
-  /// The name's IPv4 addresses, at least one, in the system's order, each as it lies in memory (network
-  /// order); nothing on failure.
-  virtual std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) = 0;
+  /// The name's IPv4 addresses, at least one, in the system's order; nothing on failure.
+  virtual std::optional<std::vector<Ipv4Address>> gethostbyname(const std::string& name) = 0;
   /// Why the last of these questions failed, as the socket library numbers it; 0 when it was answered.
   virtual std::int32_t LastError() = 0;
 };

@@ -1,12 +1,8 @@
 #include "platform/net/Sockets.h"
 
-#include <cstring>
-
 namespace quendra::platform {
 
 namespace {
-
-constexpr std::uint32_t kNoAddress = 0xFFFFFFFF;
 
 /// One part in decimal, octal (leading 0) or hexadecimal (leading 0x), as the library reads them; -1 when it
 /// is none.
@@ -35,7 +31,7 @@ std::int64_t TakePart(std::string_view& text) {
 
 } // namespace
 
-std::uint32_t Sockets::inet_addr(const std::string& dotted) {
+Ipv4Address Sockets::inet_addr(const std::string& dotted) {
   std::string_view text = dotted;
   std::uint32_t address = 0;
   for (int part = 0; part < 4; ++part) {
@@ -45,13 +41,7 @@ std::uint32_t Sockets::inet_addr(const std::string& dotted) {
     const int bits = 8 * (4 - part);
     if (value > (last ? (std::int64_t{1} << bits) - 1 : 255)) return kNoAddress;
     address |= static_cast<std::uint32_t>(last ? value : value << (bits - 8));
-    if (last) {
-      const std::uint8_t bytes[4] = {
-          static_cast<std::uint8_t>(address >> 24), static_cast<std::uint8_t>(address >> 16),
-          static_cast<std::uint8_t>(address >> 8), static_cast<std::uint8_t>(address)};
-      std::memcpy(&address, bytes, sizeof address);
-      return address;
-    }
+    if (last) return Ipv4Address::FromHost(address);
     if (text.front() != '.') return kNoAddress;
     text.remove_prefix(1);
   }

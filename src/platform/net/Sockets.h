@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/net/Ipv4Address.h"
+
 #include <cstdint>
 #include <span>
 #include <string>
@@ -9,6 +11,8 @@ namespace quendra::platform {
 using SocketHandle = std::uint32_t;
 inline constexpr SocketHandle kNoSocket = 0xFFFFFFFF;
 inline constexpr std::int32_t kSocketError = -1;
+/// What is no address; as an address it is 255.255.255.255.
+inline constexpr Ipv4Address kNoAddress = Ipv4Address::FromMemory(0xFFFFFFFF);
 
 /// Events of WSAAsyncSelect, as its mask and its messages number them.
 enum SocketEvent : std::int32_t { kFdRead = 1, kFdWrite = 2, kFdAccept = 8, kFdConnect = 16, kFdClose = 32 };
@@ -25,9 +29,9 @@ enum SocketErrorNumber : std::int32_t {
   kHostNotFound = 11001,
 };
 
-/// An IPv4 address as it lies in memory (network order) and a port in host order.
+/// An address and a port in host order.
 struct SocketAddress {
-  std::uint32_t address = 0;
+  Ipv4Address address;
   std::uint16_t port = 0;
   friend bool operator==(const SocketAddress&, const SocketAddress&) = default;
 };
@@ -105,8 +109,9 @@ class Sockets {
   virtual bool WSAIsBlocking() = 0;
   virtual std::int32_t WSACancelBlockingCall() = 0;
 
-  /// The address of a dotted text as it lies in memory, 0xFFFFFFFF for any other text.
-  static std::uint32_t inet_addr(const std::string& text);
+  /// The address of a dotted text, kNoAddress for any other text. The library's own rules: one to four parts,
+  /// the last of which fills what is left, each in decimal, octal (leading 0) or hexadecimal (leading 0x).
+  static Ipv4Address inet_addr(const std::string& text);
 };
 
 } // namespace quendra::platform

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/net/Ipv4Address.h"
 #include "platform/process/Processes.h"
 #include "runtime/ByteFields.h"
 
@@ -39,7 +40,9 @@ struct Core {
 /// A text as the system takes it: what stands behind a NUL isn't there.
 inline std::string CutText(const std::string& text) { return text.substr(0, text.find('\0')); }
 
-/// A dotted text as an address lies in memory: the first part in the low byte. 0 for a text that is none.
-std::uint32_t AddressInMemory(const std::string& dotted);
+/// The address of a dotted text; 0.0.0.0 for a text that is none.
+inline Ipv4Address AddressOf(const std::string& dotted) {
+  return Ipv4Address::FromText(dotted).value_or(Ipv4Address());
+}
 
 } // namespace quendra::platform::simulated

@@ -268,8 +268,8 @@ TEST_F(SimulatedMachineTest, Deleted_connections_are_kept) {
 
 TEST_F(SimulatedMachineTest, A_text_that_is_no_address_is_zero) {
   for (const char* text : {"", "1.2.3", "1.2.3.256", "a.b.c.d", "1,2,3,4"})
-    EXPECT_EQ(AddressInMemory(text), 0U) << text;
-  EXPECT_EQ(AddressInMemory("1.2.3.4"), 0x04030201U);
+    EXPECT_EQ(AddressOf(text), Ipv4Address()) << text;
+  EXPECT_EQ(AddressOf("1.2.3.4").InMemory(), 0x04030201U);
 }
 
 TEST_F(SimulatedMachineTest, Host_names_fail_when_told_to) {
@@ -449,7 +449,7 @@ TEST(SimulatedMachineLife, A_control_may_outlive_its_machine) {
     control = machine.Operations().captureControls.Create();
   }
   std::int32_t result = 0;
-  std::uint32_t address = 1;
+  auto address = Ipv4Address::FromHost(1);
   std::uint32_t second = 1;
   Bytes buffer(30);
 
@@ -457,7 +457,7 @@ TEST(SimulatedMachineLife, A_control_may_outlive_its_machine) {
   control->ReadBuffer(buffer);
   control->AdapterAddress("x", address, second);
 
-  EXPECT_EQ(address, 0U);
+  EXPECT_EQ(address, Ipv4Address());
 }
 
 // The rest.

@@ -32,7 +32,7 @@ class SimulatedSocketsTest : public testing::Test {
   }
   SocketHandle Connected() {
     const SocketHandle socket = NewSocket();
-    net.connect(socket, {AddressInMemory("10.1.1.1"), 80});
+    net.connect(socket, {AddressOf("10.1.1.1"), 80});
     desktop.RunUntilIdle();
     seen.clear();
     return socket;
@@ -57,7 +57,7 @@ class SimulatedSocketsTest : public testing::Test {
 
 TEST_F(SimulatedSocketsTest, A_connection_is_told_as_FD_CONNECT_then_FD_WRITE) {
   const SocketHandle socket = NewSocket();
-  EXPECT_EQ(net.connect(socket, {AddressInMemory("10.1.1.1"), 80}), kSocketError);
+  EXPECT_EQ(net.connect(socket, {AddressOf("10.1.1.1"), 80}), kSocketError);
   EXPECT_EQ(net.WSAGetLastError(), kWouldBlock);
   desktop.RunUntilIdle();
   EXPECT_EQ(seen, (Lines{Line(socket, 16), Line(socket, 2)}));
@@ -68,11 +68,11 @@ TEST_F(SimulatedSocketsTest, A_server_refuses_with_the_number_told_or_stays_sile
   const SocketHandle first = Connected();
   server.Refuse(10065);
   const SocketHandle second = NewSocket();
-  net.connect(second, {AddressInMemory("10.1.1.1"), 80});
+  net.connect(second, {AddressOf("10.1.1.1"), 80});
   desktop.RunUntilIdle();
   EXPECT_EQ(seen, Lines{Line(second, 16, 10065)});
   server.StaySilent();
-  net.connect(first, {AddressInMemory("10.1.1.1"), 80});
+  net.connect(first, {AddressOf("10.1.1.1"), 80});
   desktop.RunUntilIdle();
   EXPECT_EQ(seen.size(), 1u);
 }
@@ -140,7 +140,7 @@ TEST_F(SimulatedSocketsTest, An_operation_told_to_fail_does_so_as_often_as_told)
 }
 
 TEST_F(SimulatedSocketsTest, An_address_that_is_not_the_machines_own_can_not_be_bound) {
-  EXPECT_EQ(net.bind(NewSocket(), {AddressInMemory("10.1.1.1"), 0}), kSocketError);
+  EXPECT_EQ(net.bind(NewSocket(), {AddressOf("10.1.1.1"), 0}), kSocketError);
   EXPECT_EQ(net.WSAGetLastError(), kAddressNotAvailable);
 }
 
@@ -190,7 +190,7 @@ TEST(SimulatedSocketsWithoutALoop, Work_that_waits_in_the_loop_outlives_the_mach
     SimulatedMachine machine(desktop);
     machine.sockets.WSAStartup(257);
     const SocketHandle socket = machine.sockets.socket(2, 1, 6);
-    machine.sockets.connect(socket, {AddressInMemory("127.0.0.1"), 80});
+    machine.sockets.connect(socket, {AddressOf("127.0.0.1"), 80});
   }
   desktop.RunUntilIdle();
   EXPECT_FALSE(desktop.Ended);

@@ -136,16 +136,16 @@ std::vector<CaptureAdapter> ListCaptureAdapters(const PcapLibrary& library) {
   return adapters;
 }
 
-std::uint32_t AddressOfAdapter(const std::string& name) {
+Ipv4Address AddressOfAdapter(const std::string& name) {
   ifaddrs* addresses = nullptr;
-  if (getifaddrs(&addresses) != 0) return 0;
+  if (getifaddrs(&addresses) != 0) return {};
   const std::unique_ptr<ifaddrs, decltype(&freeifaddrs)> owner(addresses, &freeifaddrs);
   for (const ifaddrs* entry = addresses; entry != nullptr; entry = entry->ifa_next) {
     if (entry->ifa_addr == nullptr || entry->ifa_addr->sa_family != AF_INET || name != entry->ifa_name)
       continue;
-    return reinterpret_cast<const sockaddr_in*>(entry->ifa_addr)->sin_addr.s_addr;
+    return Ipv4Address::FromMemory(reinterpret_cast<const sockaddr_in*>(entry->ifa_addr)->sin_addr.s_addr);
   }
-  return 0;
+  return {};
 }
 
 unsigned NumberOfAdapterThatIsUp(const std::string& name) {

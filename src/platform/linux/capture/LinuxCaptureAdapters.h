@@ -1,8 +1,8 @@
 #pragma once
 
 #include "platform/linux/capture/PcapLibrary.h"
+#include "platform/net/Ipv4Address.h"
 
-#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -19,8 +19,8 @@ struct CaptureAdapter {
 /// means. When none is up loopback stands there alone.
 std::vector<CaptureAdapter> ListCaptureAdapters(const PcapLibrary& library);
 
-/// The interface's first IPv4 address as it lies in memory (network order), 0 for none.
-std::uint32_t AddressOfAdapter(const std::string& name);
+/// The interface's first IPv4 address, 0.0.0.0 for none.
+Ipv4Address AddressOfAdapter(const std::string& name);
 
 /// The kernel's number for the interface as long as it is up, otherwise 0. One that is made again under its
 /// name has another number.

@@ -52,7 +52,7 @@ void LinuxCaptureControl::CloseChannel(std::int32_t& result) {
   channelOpen_ = false;
 }
 
-void LinuxCaptureControl::AdapterAddress(const std::string& adapterName, std::uint32_t& address,
+void LinuxCaptureControl::AdapterAddress(const std::string& adapterName, Ipv4Address& address,
                                          std::uint32_t& second) {
   address = AddressOfAdapter(AdapterNameOf(adapterName));
   second = 0;

@@ -16,7 +16,7 @@ class LinuxCaptureControl : public CaptureControl {
   void SetChannelSize(std::int32_t size, std::int32_t& result) override;
   void ReleaseChannel(std::int32_t& result) override;
   void CloseChannel(std::int32_t& result) override;
-  void AdapterAddress(const std::string& adapterName, std::uint32_t& address, std::uint32_t& second) override;
+  void AdapterAddress(const std::string& adapterName, Ipv4Address& address, std::uint32_t& second) override;
   void StartEvents(std::int32_t& result) override;
   void StopEvents(std::int32_t& result) override;
   void ReadBuffer(std::span<std::uint8_t> bytes) override;

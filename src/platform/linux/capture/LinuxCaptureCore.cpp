@@ -158,12 +158,12 @@ void LinuxCaptureCore::TakeUpLink() {
   CloseSession();
   OpenSession();
   if (wasGone && gone_) return;
-  awaitsAddress_ = !gone_ && AddressOfAdapter(CurrentName()) == 0;
+  awaitsAddress_ = !gone_ && AddressOfAdapter(CurrentName()).IsAny();
   OnAdapterChanged();
 }
 
 void LinuxCaptureCore::AwaitAddress() {
-  if (!awaitsAddress_ || AddressOfAdapter(CurrentName()) == 0) return;
+  if (!awaitsAddress_ || AddressOfAdapter(CurrentName()).IsAny()) return;
   awaitsAddress_ = false;
   OnAdapterChanged();
 }

@@ -26,7 +26,8 @@ NameAnswer LookUpName(const std::string& name) {
   if (answer.error != 0) return answer;
   const std::unique_ptr<addrinfo, void (*)(addrinfo*)> owner(first, ::freeaddrinfo);
   for (const addrinfo* entry = first; entry != nullptr; entry = entry->ai_next)
-    answer.addresses.push_back(reinterpret_cast<const sockaddr_in*>(entry->ai_addr)->sin_addr.s_addr);
+    answer.addresses.push_back(
+        Ipv4Address::FromMemory(reinterpret_cast<const sockaddr_in*>(entry->ai_addr)->sin_addr.s_addr));
   return answer;
 }
 
@@ -37,7 +38,7 @@ std::optional<std::string> LinuxHostNames::gethostname() {
   return std::string(name.data());
 }
 
-std::optional<std::vector<std::uint32_t>> LinuxHostNames::gethostbyname(const std::string& name) {
+std::optional<std::vector<Ipv4Address>> LinuxHostNames::gethostbyname(const std::string& name) {
   const auto own = gethostname();
   const bool isOwn = name.empty() || (own && ::strcasecmp(name.c_str(), own->c_str()) == 0);
   NameAnswer answer =

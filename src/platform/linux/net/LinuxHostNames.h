@@ -8,7 +8,7 @@ namespace quendra::platform::linux_ {
 /// What a name server says: addresses, or an error number of the socket library.
 struct NameAnswer {
   std::int32_t error = 0;
-  std::vector<std::uint32_t> addresses;
+  std::vector<Ipv4Address> addresses;
 };
 /// May wait for a name server; callable from any thread.
 NameAnswer LookUpName(const std::string& name);
@@ -21,7 +21,7 @@ class LinuxHostNames : public HostNames {
   explicit LinuxHostNames(const ProcFolder& folder) : folder_(folder) {}
 
   std::optional<std::string> gethostname() override;
-  std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) override;
+  std::optional<std::vector<Ipv4Address>> gethostbyname(const std::string& name) override;
   std::int32_t LastError() override { return lastError_; }
 
  private:

@@ -52,8 +52,8 @@ std::uint32_t LinuxIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& adapter
   for (const auto& interface : interfaces) {
     AdapterRecord& adapter = adapters.emplace_back();
     adapter.name = adapter.description = interface.name;
-    std::ranges::transform(interface.addresses, std::back_inserter(adapter.addresses), DottedText);
-    std::ranges::transform(interface.gateways, std::back_inserter(adapter.gateways), DottedText);
+    std::ranges::transform(interface.addresses, std::back_inserter(adapter.addresses), &Ipv4Address::AsAscii);
+    std::ranges::transform(interface.gateways, std::back_inserter(adapter.gateways), &Ipv4Address::AsAscii);
   }
   return 0;
 }

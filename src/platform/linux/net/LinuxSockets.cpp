@@ -1,6 +1,7 @@
 #include "platform/linux/net/LinuxSockets.h"
 
 #include "platform/linux/net/SocketErrorNumbers.h"
+#include "runtime/ByteFields.h"
 
 #include <netinet/in.h>
 #include <sys/ioctl.h>
@@ -8,7 +9,6 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <cstring>
 
 namespace quendra::platform::linux_ {
 
@@ -25,13 +25,13 @@ constexpr std::int32_t kPeek = 2;
 sockaddr_in SystemAddress(const SocketAddress& address) {
   sockaddr_in system{};
   system.sin_family = AF_INET;
-  system.sin_addr.s_addr = address.address;
+  system.sin_addr.s_addr = address.address.InMemory();
   system.sin_port = htons(address.port);
   return system;
 }
 
 SocketAddress LibraryAddress(const sockaddr_in& system) {
-  return {system.sin_addr.s_addr, ntohs(system.sin_port)};
+  return {Ipv4Address::FromMemory(system.sin_addr.s_addr), ntohs(system.sin_port)};
 }
 
 /// This system's name for an option of the library's socket level; -1 for one that it lacks.
@@ -142,7 +142,7 @@ std::int32_t LinuxSockets::connect(SocketHandle socket, const SocketAddress& pee
   SocketEntry* entry = Entry(socket);
   if (!entry) return kSocketError;
   // This system takes address 0 for its own host; to the library neither is a place to connect to.
-  if (peer.address == 0 || peer.port == 0) return Fail(kAddressNotAvailable);
+  if (peer.address.IsAny() || peer.port == 0) return Fail(kAddressNotAvailable);
   const sockaddr_in address = SystemAddress(peer);
   const int descriptor = entry->descriptor.Number();
   const int result = ::connect(descriptor, reinterpret_cast<const sockaddr*>(&address), sizeof address);
@@ -280,11 +280,10 @@ std::uint32_t LinuxSockets::WSAAsyncGetHostByName(std::uint32_t window, std::uin
   *handle = lookUps_.Start(
       name, [this, handle, window, message, buffer](std::int32_t error, const auto& addresses) {
         const std::size_t room = buffer.size() / sizeof(std::uint32_t);
-        const auto count = static_cast<std::uint32_t>(room == 0 ? 0 : std::min(addresses.size(), room - 1));
-        if (error == 0 && room > 0) {
-          std::memcpy(buffer.data(), &count, sizeof count);
-          std::memcpy(buffer.data() + sizeof count, addresses.data(), count * sizeof(std::uint32_t));
-        }
+        const std::size_t count = room == 0 ? 0 : std::min(addresses.size(), room - 1);
+        if (error == 0 && room > 0) PutLittle32(buffer, 0, static_cast<std::uint32_t>(count));
+        for (std::size_t i = 0; error == 0 && i < count; ++i)
+          PutLittle32(buffer, 4 + 4 * i, addresses[i].InMemory());
         loop_.PostMessage(window, message, *handle, static_cast<std::uint32_t>(error) << 16);
       });
   if (*handle == 0) Fail(kNoBufferSpace);

@@ -16,8 +16,8 @@ class NameLookUps {
  public:
   static constexpr int kMostThreads = 16;
 
-  /// The addresses (network order as they lie in memory) or an error number of the socket library.
-  using Done = std::function<void(std::int32_t error, const std::vector<std::uint32_t>& addresses)>;
+  /// The addresses or an error number of the socket library.
+  using Done = std::function<void(std::int32_t error, const std::vector<Ipv4Address>& addresses)>;
 
   NameLookUps(EventLoop& loop, HostNames& hostNames);
   /// Look-ups under way end without a word.

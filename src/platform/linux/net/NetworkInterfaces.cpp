@@ -2,7 +2,6 @@
 
 #include "platform/linux/system/Files.h"
 
-#include <arpa/inet.h>
 #include <ifaddrs.h>
 #include <net/if.h>
 #include <netinet/in.h>
@@ -37,7 +36,8 @@ std::optional<DefaultRoute> ParseRoute(const std::string& line) {
   const auto metric = Number(columns[6], 10), mask = Number(columns[7], 16);
   if (destination != 0u || mask != 0u || !gateway || !flags || !metric) return {};
   if ((*flags & kRouteUp) == 0 || (*flags & kRouteRejects) != 0) return {};
-  return DefaultRoute{columns[0], (*flags & kRouteHasGateway) != 0 ? *gateway : 0, *metric};
+  return DefaultRoute{columns[0], Ipv4Address::FromMemory((*flags & kRouteHasGateway) != 0 ? *gateway : 0),
+                      *metric};
 }
 
 NetworkInterface& InterfaceNamed(std::vector<NetworkInterface>& interfaces, const std::string& name) {
@@ -59,7 +59,8 @@ void AddAddresses(std::vector<NetworkInterface>& interfaces) {
     const std::string_view label(entry->ifa_name);
     NetworkInterface& interface = InterfaceNamed(interfaces, std::string(label.substr(0, label.find(':'))));
     interface.isLoopback = (entry->ifa_flags & IFF_LOOPBACK) != 0;
-    interface.addresses.push_back(reinterpret_cast<const sockaddr_in*>(entry->ifa_addr)->sin_addr.s_addr);
+    interface.addresses.push_back(
+        Ipv4Address::FromMemory(reinterpret_cast<const sockaddr_in*>(entry->ifa_addr)->sin_addr.s_addr));
   }
 }
 
@@ -84,12 +85,12 @@ std::vector<NetworkInterface> ReadNetworkInterfaces(const ProcFolder& folder) {
     if (found == interfaces.end()) continue;
     if (!found->hasDefaultRoute) found->metric = route.metric;
     found->hasDefaultRoute = true;
-    if (route.gateway != 0) found->gateways.push_back(route.gateway);
+    if (!route.gateway.IsAny()) found->gateways.push_back(route.gateway);
   }
   return interfaces;
 }
 
-std::vector<std::uint32_t> HostAddressOrder(std::vector<NetworkInterface> interfaces) {
+std::vector<Ipv4Address> HostAddressOrder(std::vector<NetworkInterface> interfaces) {
   const auto rank = [](const NetworkInterface& interface) {
     if (interface.isLoopback) return std::uint64_t{0};
     if (!interface.hasDefaultRoute) return std::uint64_t{1};
@@ -97,15 +98,10 @@ std::vector<std::uint32_t> HostAddressOrder(std::vector<NetworkInterface> interf
   };
   std::stable_sort(interfaces.begin(), interfaces.end(),
                    [&](const auto& left, const auto& right) { return rank(left) < rank(right); });
-  std::vector<std::uint32_t> addresses;
+  std::vector<Ipv4Address> addresses;
   for (const auto& interface : interfaces)
     addresses.insert(addresses.end(), interface.addresses.rbegin(), interface.addresses.rend());
   return addresses;
-}
-
-std::string DottedText(std::uint32_t address) {
-  char text[INET_ADDRSTRLEN];
-  return ::inet_ntop(AF_INET, &address, text, sizeof text);
 }
 
 } // namespace quendra::platform::linux_

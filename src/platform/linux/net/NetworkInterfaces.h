@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/linux/process/ProcFolder.h"
+#include "platform/net/Ipv4Address.h"
 
 #include <cstdint>
 #include <string>
@@ -9,20 +10,20 @@
 
 namespace quendra::platform::linux_ {
 
-/// An interface that is up and has IPv4 addresses. Addresses are as they lie in memory (network order).
+/// An interface that is up and has IPv4 addresses.
 struct NetworkInterface {
   std::string name;
   bool isLoopback = false;
   bool hasDefaultRoute = false;
-  std::vector<std::uint32_t> addresses; ///< the main one first
-  std::vector<std::uint32_t> gateways;  ///< of default routes, the preferred one first
-  std::uint32_t metric = 0;             ///< of the preferred default route
+  std::vector<Ipv4Address> addresses; ///< the main one first
+  std::vector<Ipv4Address> gateways;  ///< of default routes, the preferred one first
+  std::uint32_t metric = 0;           ///< of the preferred default route
 };
 
 /// A default route as the kernel lists it.
 struct DefaultRoute {
   std::string interface;
-  std::uint32_t gateway = 0; ///< 0 for a route without one
+  Ipv4Address gateway; ///< 0.0.0.0 for a route without one
   std::uint32_t metric = 0;
 };
 
@@ -35,9 +36,6 @@ std::vector<NetworkInterface> ReadNetworkInterfaces(const ProcFolder& folder);
 
 /// Loopback first, the interface that the preferred default route uses last; an interface's main address last
 /// of its own.
-std::vector<std::uint32_t> HostAddressOrder(std::vector<NetworkInterface> interfaces);
-
-/// Dotted text of an address as it lies in memory.
-std::string DottedText(std::uint32_t address);
+std::vector<Ipv4Address> HostAddressOrder(std::vector<NetworkInterface> interfaces);
 
 } // namespace quendra::platform::linux_

@@ -25,7 +25,7 @@ class SimulatedCapture::Control : public CaptureControl {
   }
   void ReleaseChannel(std::int32_t& result) override { Step("ReleaseChannel", result); }
   void CloseChannel(std::int32_t& result) override { Step("CloseChannel", result); }
-  void AdapterAddress(const std::string& adapterName, std::uint32_t& address, std::uint32_t& second) override;
+  void AdapterAddress(const std::string& adapterName, Ipv4Address& address, std::uint32_t& second) override;
   void StartEvents(std::int32_t& result) override {
     Step("StartEvents", result);
     started = true;
@@ -55,16 +55,17 @@ class SimulatedCapture::Control : public CaptureControl {
   SimulatedCapture* capture_;
 };
 
-void SimulatedCapture::Control::AdapterAddress(const std::string& adapterName, std::uint32_t& address,
+void SimulatedCapture::Control::AdapterAddress(const std::string& adapterName, Ipv4Address& address,
                                                std::uint32_t& second) {
   const std::string name(CutAtNul(adapterName));
   Say("AdapterAddress " + name);
-  address = second = 0;
+  address = {};
+  second = 0;
   if (!capture_) return;
   const auto& adapters = capture_->Adapters;
   const auto found = std::find_if(adapters.begin(), adapters.end(),
                                   [&](const CaptureAdapter& adapter) { return adapter.name == name; });
-  if (found != adapters.end()) address = AddressInMemory(found->address);
+  if (found != adapters.end()) address = AddressOf(found->address);
 }
 
 void SimulatedCapture::Control::ReadBuffer(std::span<std::uint8_t> bytes) {

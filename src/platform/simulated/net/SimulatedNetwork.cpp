@@ -23,9 +23,9 @@ std::uint32_t SimulatedIpHelper::AllocateAndGetTcpExTableFromStack(TcpTable& tab
   std::size_t at = 4;
   for (const Connection& connection : Connections) {
     PutLittle32(bytes, at, connection.state);
-    PutLittle32(bytes, at + 4, AddressInMemory(connection.localAddress));
+    PutLittle32(bytes, at + 4, AddressOf(connection.localAddress).InMemory());
     PutLittle32(bytes, at + 8, PortInMemory(connection.localPort));
-    PutLittle32(bytes, at + 12, AddressInMemory(connection.remoteAddress));
+    PutLittle32(bytes, at + 12, AddressOf(connection.remoteAddress).InMemory());
     PutLittle32(bytes, at + 16, PortInMemory(connection.remotePort));
     PutLittle32(bytes, at + 20, connection.owner);
     at += kEntrySize;
@@ -56,13 +56,13 @@ std::optional<std::string> SimulatedHostNames::gethostname() {
   return Name;
 }
 
-std::optional<std::vector<std::uint32_t>> SimulatedHostNames::gethostbyname(const std::string& name) {
+std::optional<std::vector<Ipv4Address>> SimulatedHostNames::gethostbyname(const std::string& name) {
   const auto other = others_.find(CutText(name));
   const bool isKnown = !FailAddresses && (other != others_.end() || CutText(name) == Name);
-  std::vector<std::uint32_t> addresses;
+  std::vector<Ipv4Address> addresses;
   if (isKnown)
     for (const auto& address : other == others_.end() ? Addresses : other->second)
-      addresses.push_back(AddressInMemory(address));
+      addresses.push_back(AddressOf(address));
   lastError_ = addresses.empty() ? Error : 0;
   if (addresses.empty()) return {};
   return addresses;

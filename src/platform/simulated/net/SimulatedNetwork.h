@@ -95,7 +95,7 @@ class SimulatedHostNames : public HostNames {
   std::int32_t Error = 11001;
 
   std::optional<std::string> gethostname() override;
-  std::optional<std::vector<std::uint32_t>> gethostbyname(const std::string& name) override;
+  std::optional<std::vector<Ipv4Address>> gethostbyname(const std::string& name) override;
   std::int32_t LastError() override { return lastError_; }
 
  private:

@@ -29,7 +29,7 @@ std::string TextOf(std::span<const std::uint8_t> bytes) { return std::string(byt
 // The script.
 
 SimulatedServer& SimulatedSockets::Listen(const std::string& host, std::uint16_t port) {
-  return servers_[{AddressInMemory(host), port}];
+  return servers_[{AddressOf(host), port}];
 }
 
 std::shared_ptr<SimulatedPeer> SimulatedSockets::Dial(std::uint16_t port, const std::string& from,
@@ -160,16 +160,15 @@ std::uint16_t SimulatedSockets::FreePort() {
   return lastPort_;
 }
 
-bool SimulatedSockets::IsOwn(std::uint32_t address) const {
-  if (address == 0 || (address & 0xFF) == 127) return true;
+bool SimulatedSockets::IsOwn(Ipv4Address address) const {
+  if (address.IsAny() || address.IsLoopback()) return true;
   return std::any_of(hostNames_.Addresses.begin(), hostNames_.Addresses.end(),
-                     [&](const std::string& own) { return AddressInMemory(own) == address; });
+                     [&](const std::string& own) { return AddressOf(own) == address; });
 }
 
-std::uint32_t SimulatedSockets::OwnAddressTowards(std::uint32_t address) const {
+Ipv4Address SimulatedSockets::OwnAddressTowards(Ipv4Address address) const {
   if (IsOwn(address)) return address;
-  return hostNames_.Addresses.empty() ? AddressInMemory("10.0.0.7")
-                                      : AddressInMemory(hostNames_.Addresses.back());
+  return hostNames_.Addresses.empty() ? AddressOf("10.0.0.7") : AddressOf(hostNames_.Addresses.back());
 }
 
 std::int32_t SimulatedSockets::bind(SocketHandle socket, const SocketAddress& local) {
@@ -230,11 +229,11 @@ std::int32_t SimulatedSockets::connect(SocketHandle socket, const SocketAddress&
   if (!end) return kSocketError;
   if (end->stage == SocketEnd::Stage::Connecting) return Refused(10037);
   if (end->stage == SocketEnd::Stage::Connected) return Refused(10056);
-  if (peer.address == 0 || peer.port == 0) return Refused(kAddressNotAvailable);
+  if (peer.address.IsAny() || peer.port == 0) return Refused(kAddressNotAvailable);
   end->stage = SocketEnd::Stage::Connecting;
   end->remote = peer;
   if (end->local.port == 0) end->local.port = FreePort();
-  if (end->local.address == 0) end->local.address = OwnAddressTowards(peer.address);
+  if (end->local.address.IsAny()) end->local.address = OwnAddressTowards(peer.address);
   Later([this, end] { Answered(end); });
   return Refused(kWouldBlock);
 }
@@ -508,7 +507,7 @@ void SimulatedSockets::Resolved(std::uint32_t lookUp) {
   if (error == 0) {
     const std::size_t count = std::min(addresses->size(), asked.buffer.size() / 4 - 1);
     PutLittle32(asked.buffer, 0, static_cast<std::uint32_t>(count));
-    for (std::size_t i = 0; i < count; ++i) PutLittle32(asked.buffer, 4 + 4 * i, (*addresses)[i]);
+    for (std::size_t i = 0; i < count; ++i) PutLittle32(asked.buffer, 4 + 4 * i, (*addresses)[i].InMemory());
   }
   if (loop_) loop_->PostMessage(asked.window, asked.message, lookUp, static_cast<std::uint32_t>(error) << 16);
 }

@@ -119,17 +119,15 @@ class SimulatedSockets : public Sockets {
     std::span<std::uint8_t> buffer;
   };
 
-  static SocketAddress At(const std::string& host, std::uint16_t port) {
-    return {AddressInMemory(host), port};
-  }
+  static SocketAddress At(const std::string& host, std::uint16_t port) { return {AddressOf(host), port}; }
   std::int32_t Refused(std::int32_t error);
   /// True when a call of this name is scripted to fail; the last error is set then.
   bool Scripted(const std::string& operation);
   End Find(SocketHandle socket);
   SocketHandle Give(const End& end);
   std::uint16_t FreePort();
-  bool IsOwn(std::uint32_t address) const;
-  std::uint32_t OwnAddressTowards(std::uint32_t address) const;
+  bool IsOwn(Ipv4Address address) const;
+  Ipv4Address OwnAddressTowards(Ipv4Address address) const;
   End Listener(std::uint16_t port);
   void Announce(SocketEnd& end, SocketEvent event, std::int32_t error = 0);
   void Update(SocketEnd& end);
@@ -147,7 +145,7 @@ class SimulatedSockets : public Sockets {
   std::map<SocketHandle, End> sockets_;
   SocketHandle lastSocket_ = 0x400;
   std::uint16_t lastPort_ = 1024;
-  std::map<std::pair<std::uint32_t, std::uint16_t>, SimulatedServer> servers_;
+  std::map<std::pair<Ipv4Address, std::uint16_t>, SimulatedServer> servers_;
   std::vector<std::weak_ptr<ScriptedPeer>> scripted_;
   std::vector<SocketAddress> echoes_;
   std::map<std::string, std::int32_t> failingNames_;

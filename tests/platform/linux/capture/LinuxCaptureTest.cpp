@@ -86,16 +86,16 @@ TEST_F(LinuxCaptureTest, An_index_that_the_library_lacks_leaves_the_record_as_it
 
 TEST_F(LinuxCaptureTest, A_control_gives_the_address_of_any_adapter) {
   control = capture->Create();
-  std::uint32_t address = 1;
+  auto address = Ipv4Address::FromHost(1);
   std::uint32_t second = 1;
   std::string name = "qv0";
   name.resize(255, '\0');
   control->AdapterAddress(name, address, second);
-  EXPECT_EQ(address, inet_addr("10.9.0.1"));
+  EXPECT_EQ(address.AsAscii(), "10.9.0.1");
   control->AdapterAddress("qv1", address, second);
-  EXPECT_EQ(address, 0u);
+  EXPECT_TRUE(address.IsAny());
   control->AdapterAddress("nothing", address, second);
-  EXPECT_EQ(address, 0u);
+  EXPECT_TRUE(address.IsAny());
 }
 
 TEST_F(LinuxCaptureTest, Without_an_interface_that_is_up_a_session_delivers_nothing) {
@@ -336,10 +336,10 @@ TEST_F(LinuxCaptureTest, Without_rights_the_adapters_are_listed_and_a_session_de
     CaptureHeader header{};
     if (capture->vpCapture(frame, header) >= 0 || frame.UpperBound() != 59) _exit(13);
     if (DescriptionOf(InfoOf(0)) != "Virtual Ethernet (qv1)") _exit(14);
-    std::uint32_t address = 0;
+    Ipv4Address address;
     std::uint32_t second = 0;
     control->AdapterAddress("qv0", address, second);
-    _exit(address == inet_addr("10.9.0.1") ? 0 : 15);
+    _exit(address.AsAscii() == "10.9.0.1" ? 0 : 15);
   }
   int status = 0;
   ASSERT_EQ(waitpid(child, &status, 0), child);

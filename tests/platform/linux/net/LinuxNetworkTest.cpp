@@ -262,11 +262,11 @@ TEST(LinuxRoutes, Default_routes_are_read_with_gateway_and_metric_the_preferred_
                          "ppp0\t00000000\t00000000\t0001\t0\t0\t700\t00000000\t0\t0\t0\n");
   ASSERT_EQ(routes.size(), 3u);
   EXPECT_EQ(routes[0].interface, "eth0");
-  EXPECT_EQ(DottedText(routes[0].gateway), "10.0.0.1");
+  EXPECT_EQ(routes[0].gateway.AsAscii(), "10.0.0.1");
   EXPECT_EQ(routes[1].interface, "wlan0");
-  EXPECT_EQ(DottedText(routes[1].gateway), "192.168.1.1");
+  EXPECT_EQ(routes[1].gateway.AsAscii(), "192.168.1.1");
   EXPECT_EQ(routes[2].interface, "ppp0");
-  EXPECT_EQ(routes[2].gateway, 0u);
+  EXPECT_EQ(routes[2].gateway, Ipv4Address());
 }
 
 TEST(LinuxRoutes, Routes_that_are_down_or_reject_and_lines_that_are_no_routes_are_left_out) {
@@ -280,11 +280,13 @@ TEST(LinuxRoutes, Routes_that_are_down_or_reject_and_lines_that_are_no_routes_ar
 }
 
 TEST(LinuxHostAddresses, Loopback_comes_first_and_the_main_address_of_the_default_routes_interface_last) {
-  NetworkInterface lo{"lo", true, false, {1}, {}, 0};
-  NetworkInterface wired{"eth0", false, true, {20, 21}, {2}, 100};
-  NetworkInterface wireless{"wlan0", false, true, {30}, {3}, 600};
-  NetworkInterface bridge{"br0", false, false, {40}, {}, 0};
-  EXPECT_EQ(HostAddressOrder({wired, wireless, lo, bridge}), (std::vector<std::uint32_t>{1, 40, 30, 21, 20}));
+  const auto at = Ipv4Address::FromHost;
+  NetworkInterface lo{"lo", true, false, {at(1)}, {}, 0};
+  NetworkInterface wired{"eth0", false, true, {at(20), at(21)}, {at(2)}, 100};
+  NetworkInterface wireless{"wlan0", false, true, {at(30)}, {at(3)}, 600};
+  NetworkInterface bridge{"br0", false, false, {at(40)}, {}, 0};
+  EXPECT_EQ(HostAddressOrder({wired, wireless, lo, bridge}),
+            (std::vector<Ipv4Address>{at(1), at(40), at(30), at(21), at(20)}));
 }
 
 struct LinuxNetwork : testing::Test {
@@ -309,9 +311,8 @@ struct LinuxNetwork : testing::Test {
   }
   std::vector<std::string> OwnAddresses() {
     std::vector<std::string> texts;
-    for (const auto address :
-         names.gethostbyname(*names.gethostname()).value_or(std::vector<std::uint32_t>{}))
-      texts.push_back(DottedText(address));
+    for (const auto address : names.gethostbyname(*names.gethostname()).value_or(std::vector<Ipv4Address>{}))
+      texts.push_back(address.AsAscii());
     return texts;
   }
 };
@@ -340,7 +341,7 @@ TEST_F(LinuxNetwork, The_own_name_is_compared_without_regard_to_case_and_an_empt
 
 TEST_F(LinuxNetwork, Another_name_is_looked_up) {
   RunCommand("ip link set lo up");
-  EXPECT_EQ(names.gethostbyname("127.0.0.9"), (std::vector<std::uint32_t>{htonl(0x7F000009)}));
+  EXPECT_EQ(names.gethostbyname("127.0.0.9"), (std::vector<Ipv4Address>{Ipv4Address::FromHost(0x7F000009)}));
   EXPECT_FALSE(names.gethostbyname("no.such.host.invalid"));
 }
 

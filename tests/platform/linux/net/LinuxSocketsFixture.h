@@ -41,7 +41,7 @@ class LinuxSocketsTest : public testing::Test {
                              }));
     sockets.WSAStartup(257);
   }
-  static SocketAddress At(std::uint16_t port) { return {htonl(INADDR_LOOPBACK), port}; }
+  static SocketAddress At(std::uint16_t port) { return {Ipv4Address::FromHost(INADDR_LOOPBACK), port}; }
 
   SocketHandle NewSocket(std::int32_t type = 1) { return sockets.socket(2, type, type == 1 ? 6 : 17); }
   void Select(SocketHandle socket, std::int32_t events = kAllEvents) {

@@ -93,7 +93,7 @@ TEST_F(LinuxSocketsTest, A_refused_connection_is_told_as_FD_CONNECT_with_10061) 
 
 TEST_F(LinuxSocketsTest, Neither_address_0_nor_port_0_can_be_connected_to) {
   const SocketHandle socket = NewSocket();
-  EXPECT_EQ(sockets.connect(socket, {0, 80}), kSocketError);
+  EXPECT_EQ(sockets.connect(socket, {{}, 80}), kSocketError);
   EXPECT_EQ(LastError(), kAddressNotAvailable);
   EXPECT_EQ(sockets.connect(socket, At(0)), kSocketError);
   EXPECT_EQ(LastError(), kAddressNotAvailable);
