@@ -14,9 +14,6 @@ namespace {
 
 constexpr std::uint32_t kRefreshInterval = 1000;
 
-/// What a round finds when the library has put nothing there.
-constexpr std::array<std::uint8_t, 60> kBlankFrame{};
-
 } // namespace
 
 PacketAttribution::PacketAttribution(const platform::Machine& machine, forms::Desktop& desktop,
@@ -63,7 +60,7 @@ void PacketAttribution::Drain(bool tunnelled) {
     RefreshWhenDue();
     // The bytes of this round are gone with the next call; a call that delivers nothing must not show them
     // again.
-    frame = platform::FrameBytes(kBlankFrame.data(), static_cast<int>(kBlankFrame.size()));
+    frame = platform::FrameBytes::Blank();
   }
 }
 

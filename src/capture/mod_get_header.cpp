@@ -23,12 +23,14 @@ Text EthernetHeader::Destination() const { return HexOf(destination); }
 Text EthernetHeader::Type() const { return HexOf(type); }
 
 CaptureRecordHeader ReadCaptureHeader(const platform::FrameBytes& record) {
+  namespace capture_record = platform::capture_record;
   CaptureRecordHeader header;
-  header.seconds = mod_functions::ReadBytes(record, 0, 4);
-  header.microseconds = mod_functions::ReadBytes(record, 4, 4);
-  header.capturedLength = mod_functions::ReadBytes(record, 8, 4);
-  header.lengthOnWire = mod_functions::ReadBytes(record, 12, 4);
-  header.headerLength = static_cast<std::uint16_t>(mod_functions::ReadBytes(record, 16, 2));
+  header.seconds = mod_functions::ReadBytes(record, capture_record::kSeconds, 4);
+  header.microseconds = mod_functions::ReadBytes(record, capture_record::kMicroseconds, 4);
+  header.capturedLength = mod_functions::ReadBytes(record, capture_record::kCapturedLength, 4);
+  header.lengthOnWire = mod_functions::ReadBytes(record, capture_record::kLengthOnWire, 4);
+  header.headerLength =
+      static_cast<std::uint16_t>(mod_functions::ReadBytes(record, capture_record::kHeaderLength, 2));
   return header;
 }
 

@@ -51,10 +51,9 @@ void CSocketPlus::Release() {
 
 std::int32_t CSocketPlus::WndProc(forms::WindowHandle, std::uint32_t message, std::uint32_t wParam,
                                   std::uint32_t lParam) {
-  const auto high = static_cast<std::int32_t>(lParam >> 16);
-  if (message == modSocketPlus::kResolveMessage) PostResolution(wParam, high);
-  if (message == modSocketPlus::kSocketMessage)
-    PostSocket(wParam, static_cast<std::int32_t>(lParam & 0xFFFF), high);
+  const std::int32_t error = platform::ErrorOfMessage(lParam);
+  if (message == modSocketPlus::kResolveMessage) PostResolution(wParam, error);
+  if (message == modSocketPlus::kSocketMessage) PostSocket(wParam, platform::EventOfMessage(lParam), error);
   return 0;
 }
 

@@ -9,11 +9,6 @@
 
 namespace quendra::foundation {
 
-namespace {
-constexpr std::uint32_t kBytesWaiting = 0x4004667F;
-constexpr std::int32_t kPeek = 2;
-} // namespace
-
 void CSocketPlus::SendData(const Value& index, const Value& data) {
   constexpr auto kSource = u"CSocketPlus.SendData";
   const Slot slot = GetSocketIndex(index);
@@ -86,7 +81,8 @@ std::int32_t CSocketPlus::AmountWaiting(Slot slot) {
   if (record.Protocol == sckTCPProtocol)
     return ::quendra::ToInt32(static_cast<std::int64_t>(record.RecvBuffer.Size()));
   std::uint32_t amount = 0;
-  if (module_.Library().ioctlsocket(record.SocketHandle, kBytesWaiting, amount) == platform::kSocketError)
+  if (module_.Library().ioctlsocket(record.SocketHandle, platform::kBytesWaiting, amount) ==
+      platform::kSocketError)
     return 0;
   return static_cast<std::int32_t>(amount);
 }
@@ -150,7 +146,8 @@ ByteArray CSocketPlus::TakeBytes(Slot slot, std::size_t count, bool peek) {
   }
   ByteArray bytes(count);
   platform::SocketAddress from;
-  const std::int32_t read = module_.Library().recvfrom(record.SocketHandle, bytes, peek ? kPeek : 0, from);
+  const std::int32_t read =
+      module_.Library().recvfrom(record.SocketHandle, bytes, peek ? platform::kPeek : 0, from);
   if (read == platform::kSocketError)
     throw SystemError(module_.Library().WSAGetLastError(), u"CSocketPlus.RecvData");
   bytes.resize(static_cast<std::size_t>(read));

@@ -2,6 +2,7 @@
 #include "foundation/SocketErrors.h"
 #include "foundation/SocketTexts.h"
 
+#include "platform/net/IpProtocols.h"
 #include "runtime/ByteFields.h"
 
 #include <algorithm>
@@ -10,18 +11,6 @@
 namespace quendra::foundation {
 
 namespace {
-
-constexpr std::int32_t kInternetFamily = 2;
-constexpr std::int32_t kStream = 1;
-constexpr std::int32_t kDatagram = 2;
-constexpr std::int32_t kTcp = 6;
-constexpr std::int32_t kUdp = 17;
-
-constexpr std::int32_t kSocketLevel = 0xFFFF;
-constexpr std::int32_t kBroadcast = 0x20;
-constexpr std::int32_t kSendBufferOption = 0x1001;
-constexpr std::int32_t kReceiveBufferOption = 0x1002;
-constexpr std::int32_t kMaxMessageSize = 0x2003;
 
 /// In place of an address: the look-up is under way. An address of this very value is taken for it too.
 constexpr auto kLookUpRunning = platform::Ipv4Address::FromMemory(1);
@@ -74,8 +63,9 @@ void CSocketPlus::Listen(const Value& index) {
 bool CSocketPlus::SocketExists(Slot slot) {
   if (At(slot).SocketHandle != platform::kNoSocket) return true;
   const bool tcp = At(slot).Protocol == sckTCPProtocol;
-  const platform::SocketHandle socket =
-      module_.Library().socket(kInternetFamily, tcp ? kStream : kDatagram, tcp ? kTcp : kUdp);
+  const platform::SocketHandle socket = module_.Library().socket(
+      platform::kInternetFamily, tcp ? platform::kStreamSocket : platform::kDatagramSocket,
+      tcp ? platform::kTcp : platform::kUdp);
   if (socket == platform::kNoSocket) {
     Fail(slot, module_.Library().WSAGetLastError(), u"CSocketPlus.SocketExists");
     return false;
@@ -90,16 +80,17 @@ void CSocketPlus::ProcessOptions(Slot slot) {
   platform::Sockets& library = module_.Library();
   SocketRecord& record = At(slot);
   const auto read = [&](std::int32_t option, std::int32_t& value) {
-    if (library.getsockopt(record.SocketHandle, kSocketLevel, option, value) == platform::kSocketError)
+    if (library.getsockopt(record.SocketHandle, platform::kSocketLevel, option, value) ==
+        platform::kSocketError)
       throw SystemError(library.WSAGetLastError(), u"CSocketPlus.ProcessOptions");
   };
   if (record.Protocol == sckUDPProtocol) {
-    library.setsockopt(record.SocketHandle, kSocketLevel, kBroadcast, 1);
-    read(kMaxMessageSize, record.RecvBufferSize);
+    library.setsockopt(record.SocketHandle, platform::kSocketLevel, platform::kBroadcastOption, 1);
+    read(platform::kMaxMessageSizeOption, record.RecvBufferSize);
     record.SendBufferSize = record.RecvBufferSize;
   } else {
-    read(kReceiveBufferOption, record.RecvBufferSize);
-    read(kSendBufferOption, record.SendBufferSize);
+    read(platform::kReceiveBufferOption, record.RecvBufferSize);
+    read(platform::kSendBufferOption, record.SendBufferSize);
   }
 }
 

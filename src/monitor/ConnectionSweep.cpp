@@ -1,13 +1,12 @@
 #include "monitor/modProcPort.h"
 #include "runtime/Settings.h"
 
-#include <cstring>
+#include <array>
 
 namespace quendra::monitor {
 
 namespace {
 
-constexpr std::uint32_t kDeleteState = 12;
 constexpr std::uint32_t kFileTransferPort = 21;
 
 } // namespace
@@ -46,10 +45,11 @@ void modProcPort::DeleteConnection(std::uint32_t localAddress, std::uint32_t loc
     SystemPidsLoaded = kTrue16;
   }
   desktop_.DoEvents();
-  const std::array<std::uint32_t, 5> fields{kDeleteState, localAddress, localPort, remoteAddress, remotePort};
-  std::array<std::uint8_t, 20> record{};
-  std::memcpy(record.data(), fields.data(), record.size());
-  machine_.ipHelper.SetTcpEntry(record);
+  const platform::TcpTableEntry entry{platform::kTcpDelete, localAddress, localPort,
+                                      remoteAddress,        remotePort,   0};
+  std::array<std::uint8_t, platform::TcpTableEntry::kBytes> record{};
+  entry.WriteTo(record, 0);
+  machine_.ipHelper.SetTcpEntry(std::span(record).first<platform::TcpTableEntry::kBytesWithoutOwner>());
 }
 
 } // namespace quendra::monitor

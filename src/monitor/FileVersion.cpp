@@ -52,9 +52,9 @@ FileVersionInfo mdlFileInfo::ReadFileVersionInfo(const Text& path) {
   if (size <= 0) return info;
   std::vector<std::uint8_t> block(static_cast<std::size_t>(size));
   if (!versions.GetFileVersionInfoA(file, block)) return info;
-  const auto translation = versions.VerQueryValueA(block, "\\VarFileInfo\\Translation");
+  const auto translation = versions.VerQueryValueA(block, std::string(versions.kTranslation));
   if (!translation) return info;
-  const std::string section = "\\StringFileInfo\\" + TranslationText(*translation) + "\\";
+  const std::string section = std::string(versions.kTexts) + TranslationText(*translation) + "\\";
   for (const VersionName& version : kVersionNames)
     info.*version.field = ValueText(versions.VerQueryValueA(block, section + version.name));
   return info;

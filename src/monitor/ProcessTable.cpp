@@ -5,6 +5,7 @@
 #include "monitor/PortsByOwner.h"
 #include "monitor/ProcessRow.h"
 #include "monitor/ProcessRowAdder.h"
+#include "platform/process/Tokens.h"
 #include "platform/system/System.h"
 
 namespace quendra::monitor {
@@ -13,7 +14,6 @@ namespace {
 
 constexpr std::int32_t kSocketHandleVersion = 2000;
 constexpr std::int32_t kTcpOwnerVersion = 2002;
-constexpr std::uint32_t kEnabled = 2;
 
 } // namespace
 
@@ -69,7 +69,8 @@ TrafficSums ProcessTable::WalkSnapshot(platform::Handle snapshot, double seconds
 }
 
 PortsByOwner ProcessTable::PortsOfAllProcesses() {
-  if (!SeDebugEnabled) SeDebugEnabled = fileInfo_.EnablePrivilege(u"SeDebugPrivilege", kEnabled);
+  if (!SeDebugEnabled)
+    SeDebugEnabled = fileInfo_.EnablePrivilege(u"SeDebugPrivilege", platform::Tokens::kEnabled);
   PortsByOwner ports;
   const bool scanned = procPort_.ScanSocketHandles();
   if (!scanned || !SeDebugEnabled) return ports;

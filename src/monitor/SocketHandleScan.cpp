@@ -9,24 +9,13 @@ namespace quendra::monitor {
 
 namespace {
 
-constexpr std::uint32_t kSystemHandles = 16;
-constexpr std::size_t kFirstRoom = 20;
-constexpr std::size_t kCountBytes = 4;
-constexpr std::size_t kEntryBytes = 16;
-constexpr std::size_t kHandleOffset = 6;
+using platform::Handles;
 
+constexpr std::size_t kFirstRoom = 20;
 constexpr std::uint32_t kMayDuplicate = 0x40;
 constexpr std::uint32_t kDuplicateAccess = 0x101F0000;
-
-constexpr std::uint32_t kNameInformation = 1;
 constexpr std::size_t kNameRoom = 32;
-constexpr std::size_t kNameOffset = 8;
 constexpr std::uint16_t kDeviceNameBytes = 22;
-
-constexpr std::uint32_t kQueryInformation = 0x210012;
-constexpr std::size_t kQueryTypeOffset = 16;
-constexpr std::uint8_t kQueryAddressInfo = 3;
-constexpr std::size_t kPortOffset = 12;
 
 Text Capitals(TextView text) {
   Text capitals(text);
@@ -42,26 +31,27 @@ void SocketHandleScan::Run(std::vector<PortOwner>& owners) {
 }
 
 std::vector<SocketHandleScan::HandleEntry> SocketHandleScan::AllHandles() {
-  platform::Handles& handles = machine_.handles;
+  Handles& handles = machine_.handles;
   std::vector<HandleEntry> entries;
   std::uint32_t status = 0;
   do {
     std::uint32_t returned = 0;
     std::vector<std::uint8_t> buffer(kFirstRoom);
     // What fits in the first room is not looked at: a success here means a list of one handle at most.
-    if (handles.NtQuerySystemInformation(kSystemHandles, buffer, returned) == 0) break;
+    if (handles.NtQuerySystemInformation(Handles::kHandleTable, buffer, returned) == 0) break;
     const auto count = Little32(buffer, 0);
-    const std::int32_t room =
-        ToInt32(std::int64_t{count} * std::int64_t{kEntryBytes} + std::int64_t{kCountBytes});
+    const std::int32_t room = ToInt32(std::int64_t{count} * std::int64_t{Handles::kRecordBytes} +
+                                      std::int64_t{Handles::kCountBytes});
     buffer.assign(static_cast<std::size_t>(room), 0);
-    status = handles.NtQuerySystemInformation(kSystemHandles, buffer, returned);
+    status = handles.NtQuerySystemInformation(Handles::kHandleTable, buffer, returned);
     entries.resize(count);
-    std::size_t at = kCountBytes;
+    std::size_t at = Handles::kCountBytes;
     for (HandleEntry& entry : entries) {
-      entry = {Little32(buffer, at), Little16(buffer, at + kHandleOffset)};
-      at += kEntryBytes;
+      entry = {Little32(buffer, at + Handles::kProcessIdOffset),
+               Little16(buffer, at + Handles::kHandleOffset)};
+      at += Handles::kRecordBytes;
     }
-  } while (status == platform::Handles::kStatusInfoLengthMismatch);
+  } while (status == Handles::kStatusInfoLengthMismatch);
   return entries;
 }
 
@@ -72,8 +62,7 @@ void SocketHandleScan::Examine(const HandleEntry& entry, std::vector<PortOwner>&
   if (opened == platform::kInvalidHandle) return;
   const OwnedHandle process(processes, opened);
   platform::Handle copy = platform::kNoHandle;
-  // The pseudo handle of the own process is the invalid handle's value.
-  if (!machine_.handles.DuplicateHandle(process.Get(), entry.handle, platform::kInvalidHandle, copy,
+  if (!machine_.handles.DuplicateHandle(process.Get(), entry.handle, platform::kOwnProcess, copy,
                                         kDuplicateAccess, false, 0))
     return;
   const OwnedHandle duplicate(processes, copy);
@@ -89,22 +78,22 @@ void SocketHandleScan::Examine(const HandleEntry& entry, std::vector<PortOwner>&
 std::optional<Text> SocketHandleScan::DeviceName(platform::Handle handle) {
   std::array<std::uint8_t, kNameRoom> buffer{};
   std::uint32_t returned = 0;
-  const std::uint32_t status = machine_.handles.NtQueryObject(handle, kNameInformation, buffer, returned);
+  const std::uint32_t status = machine_.handles.NtQueryObject(handle, Handles::kObjectName, buffer, returned);
   if (status != 0 || Little16(buffer, 0) != kDeviceNameBytes) return std::nullopt;
   Text name(kDeviceNameBytes / sizeof(char16_t), u'\0');
-  for (std::size_t i = 0; i < name.size(); ++i) name[i] = Little16(buffer, kNameOffset + 2 * i);
+  for (std::size_t i = 0; i < name.size(); ++i) name[i] = Little16(buffer, Handles::kNameOffset + 2 * i);
   return Capitals(CutAtNul(TextView(name)));
 }
 
 std::int32_t SocketHandleScan::QueryHandlePort(platform::Handle handle) {
-  std::array<std::uint8_t, 24> input{};
-  std::array<std::uint8_t, 52> output{};
-  input[kQueryTypeOffset] = kQueryAddressInfo;
+  std::array<std::uint8_t, Handles::kQueryBytes> input{};
+  std::array<std::uint8_t, Handles::kAnswerBytes> output{};
+  input[Handles::kQueryTypeOffset] = Handles::kQueryAddressInfo;
   const OwnedHandle event(machine_.processes, machine_.handles.CreateEventW(true, false, u"0"));
   const std::uint32_t status =
-      machine_.handles.NtDeviceIoControlFile(handle, event.Get(), kQueryInformation, input, output);
+      machine_.handles.NtDeviceIoControlFile(handle, event.Get(), Handles::kQueryInformation, input, output);
   if (status != 0) return 0;
-  return Big16(output, kPortOffset);
+  return Big16(output, Handles::kPortOffset);
 }
 
 } // namespace quendra::monitor

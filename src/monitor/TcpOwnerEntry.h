@@ -4,21 +4,12 @@
 
 namespace quendra::monitor {
 
-inline constexpr std::int32_t kTcpEntryBytes = 24;
-
 /// One entry of the table of TCP connections with their owners, its fields as they lie in memory.
-struct TcpOwnerEntry {
-  std::uint32_t state = 0;
-  std::uint32_t localAddress = 0;
-  std::uint32_t localPort = 0;
-  std::uint32_t remoteAddress = 0;
-  std::uint32_t remotePort = 0;
-  std::uint32_t owner = 0;
-
+struct TcpOwnerEntry : platform::TcpTableEntry {
   /// True for an entry that stands for no connection and no listening port.
   bool IsBlank() const { return remoteAddress == 0 && remotePort == 0 && localPort == 0; }
   /// The local port as a number from 0 to 65535.
-  std::uint32_t LocalPortNumber() const { return (localPort & 0xFF) << 8 | (localPort >> 8 & 0xFF); }
+  std::uint32_t LocalPortNumber() const { return platform::PortOfMemory(localPort); }
 };
 
 /// How many whole entries the table holds, whatever its count claims beyond that.

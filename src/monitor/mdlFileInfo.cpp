@@ -13,7 +13,6 @@ namespace {
 constexpr std::uint32_t kAdjustAndQuery = 40;
 constexpr std::uint32_t kQueryAndRead = 1040;
 constexpr std::size_t kModuleTableBytes = 200;
-constexpr std::size_t kPathRoom = 260;
 constexpr std::uint32_t kStatedPathSize = 500;
 
 constexpr std::array<TextView, 5> kSystemNames{u"system", u"smss.exe", u"winlogon.exe", u"csrss.exe",
@@ -23,7 +22,7 @@ constexpr std::array<TextView, 5> kSystemNames{u"system", u"smss.exe", u"winlogo
 Text FirstModulePath(platform::Processes& processes, platform::Handle process) {
   std::array<std::uint32_t, kModuleTableBytes / sizeof(std::uint32_t)> modules{};
   if (!processes.EnumProcessModules(process, modules)) return {};
-  std::string path(kPathRoom, ' ');
+  std::string path(platform::kPathRoom, ' ');
   const std::uint32_t length = processes.GetModuleFileNameExA(process, modules[0], path, kStatedPathSize);
   return FromCodePage(std::string_view(path).substr(0, length));
 }

@@ -3,6 +3,7 @@
 #include "forms/Desktop.h"
 #include "platform/Machine.h"
 #include "platform/process/Processes.h"
+#include "platform/process/Tokens.h"
 #include "runtime/Integers.h"
 
 #include <array>
@@ -29,7 +30,7 @@ class mdlFileInfo {
       : machine_(machine), desktop_(desktop) {}
 
   /// True when no step left an error. A step that left one says so in a message box.
-  Boolean16 EnablePrivilege(TextView name, std::uint32_t attributes = 2);
+  Boolean16 EnablePrivilege(TextView name, std::uint32_t attributes = platform::Tokens::kEnabled);
   /// The path of the process's first module, empty when it can't be had.
   Text ModulePathOf(std::uint32_t processId);
   /// The same with "SYSTEM" in place of an empty path.

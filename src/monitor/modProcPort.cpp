@@ -71,7 +71,7 @@ void modProcPort::ReadEntry() {
 }
 
 void modProcPort::NextEntry() {
-  walkOffset_ += kTcpEntryBytes;
+  walkOffset_ += static_cast<std::int32_t>(TcpOwnerEntry::kBytes);
   desktop_.DoEvents();
 }
 

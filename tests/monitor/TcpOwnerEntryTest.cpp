@@ -2,8 +2,6 @@
 
 #include <gtest/gtest.h>
 
-#include <cstring>
-
 namespace quendra::monitor {
 
 namespace {
@@ -11,8 +9,8 @@ namespace {
 platform::IpHelper::TcpTable TableOf(std::uint32_t count, const std::vector<std::uint32_t>& fields,
                                      std::size_t extraBytes = 0) {
   std::vector<std::uint8_t> bytes(4 + fields.size() * 4 + extraBytes, 0xAA);
-  std::memcpy(bytes.data(), &count, 4);
-  if (!fields.empty()) std::memcpy(bytes.data() + 4, fields.data(), fields.size() * 4);
+  PutLittle32(bytes, 0, count);
+  for (std::size_t i = 0; i < fields.size(); ++i) PutLittle32(bytes, 4 + 4 * i, fields[i]);
   return std::make_shared<const std::vector<std::uint8_t>>(std::move(bytes));
 }
 

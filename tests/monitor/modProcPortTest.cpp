@@ -232,8 +232,8 @@ struct RawTcpPorts : MonitorFixture {
   }
   void PutTable(std::uint32_t count, const std::vector<TcpOwnerEntry>& entries, std::size_t extra = 0) {
     tables.Bytes.assign(4 + entries.size() * 24 + extra, 0xAA);
-    std::memcpy(tables.Bytes.data(), &count, 4);
-    if (!entries.empty()) std::memcpy(tables.Bytes.data() + 4, entries.data(), entries.size() * 24);
+    PutLittle32(tables.Bytes, 0, count);
+    for (std::size_t i = 0; i < entries.size(); ++i) entries[i].WriteTo(tables.Bytes, 4 + 24 * i);
   }
 };
 

@@ -40,31 +40,21 @@ struct BehaviourTest : testing::TestWithParam<Kind> {
     return entries;
   }
 
-  struct Connection {
-    std::uint32_t state, localAddress, localPort, remoteAddress, remotePort, owner;
-  };
+  using Connection = TcpTableEntry;
   std::vector<Connection> OwnerTable() {
     IpHelper::TcpTable table;
     EXPECT_EQ(machine.ipHelper.AllocateAndGetTcpExTableFromStack(table), 0U);
-    const auto word = [&](std::size_t at) {
-      std::uint32_t value = 0;
-      for (std::size_t i = 0; i < 4; ++i) value |= static_cast<std::uint32_t>(table->at(at + i)) << 8 * i;
-      return value;
-    };
-    const std::size_t count = word(0);
+    const std::size_t count = Little32(*table, 0);
     EXPECT_EQ(table->size(), 4 + 24 * count);
     std::vector<Connection> connections;
     for (std::size_t at = 4; at + 24 <= table->size(); at += 24)
-      connections.push_back(
-          {word(at), word(at + 4), word(at + 8), word(at + 12), word(at + 16), word(at + 20)});
+      connections.push_back(Connection::ReadFrom(*table, at));
     return connections;
-  }
-  static std::uint32_t InMemory(std::uint16_t port) {
-    return static_cast<std::uint32_t>(port >> 8) | (port & 0xFFU) << 8;
   }
   std::optional<Connection> Find(std::uint16_t localPort, std::uint16_t remotePort) {
     for (const Connection& connection : OwnerTable())
-      if (connection.localPort == InMemory(localPort) && connection.remotePort == InMemory(remotePort))
+      if (connection.localPort == PortInMemory(localPort) &&
+          connection.remotePort == PortInMemory(remotePort))
         return connection;
     return {};
   }
@@ -287,7 +277,7 @@ TEST_P(BehaviourTest, Adapters_are_asked_for_in_two_phases) {
   const auto first = machine.ipHelper.GetAdaptersInfo(adapters, size);
   if (first == IpHelper::kErrorBufferOverflow) {
     EXPECT_GT(size, 0U);
-    EXPECT_EQ(size % 640, 0U);
+    EXPECT_EQ(size % IpHelper::kAdapterBytes, 0U);
     EXPECT_TRUE(adapters.empty());
   } else {
     // A machine without adapters has nothing to make room for.
@@ -297,7 +287,7 @@ TEST_P(BehaviourTest, Adapters_are_asked_for_in_two_phases) {
 
   EXPECT_EQ(machine.ipHelper.GetAdaptersInfo(adapters, size), 0U);
 
-  EXPECT_EQ(adapters.size(), size / 640);
+  EXPECT_EQ(adapters.size(), size / IpHelper::kAdapterBytes);
   for (const AdapterRecord& adapter : adapters) EXPECT_FALSE(adapter.name.empty());
 }
 
@@ -355,7 +345,9 @@ TEST_P(BehaviourTest, Handles_that_are_none_have_no_duplicate_no_name_and_no_por
       machine.handles.DuplicateHandle(kNoHandle, 8, kInvalidHandle, duplicate, 0x101F0000, false, 0));
   EXPECT_EQ(duplicate, kNoHandle);
   EXPECT_NE(machine.handles.NtQueryObject(kNoHandle, 1, name, returned), 0U);
-  EXPECT_NE(machine.handles.NtDeviceIoControlFile(kNoHandle, kNoHandle, 0x210012, input, output), 0U);
+  EXPECT_NE(
+      machine.handles.NtDeviceIoControlFile(kNoHandle, kNoHandle, Handles::kQueryInformation, input, output),
+      0U);
 }
 
 // System.

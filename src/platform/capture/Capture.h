@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/capture/CaptureNumbers.h"
 #include "platform/net/Ipv4Address.h"
 #include "runtime/Fault.h"
 
@@ -28,6 +29,9 @@ class FrameBytes {
   }
   /// The bytes without a check, for those that have tested the bound.
   const std::uint8_t* Data() const { return bytes_; }
+
+  /// What a call for a frame gives when none waits.
+  static FrameBytes Blank() { return {kBlankFrame.data(), static_cast<int>(kBlankFrame.size())}; }
 
  private:
   static constexpr std::uint8_t kFresh[2] = {0, 0};
@@ -93,9 +97,8 @@ class CaptureControl {
                               std::uint32_t& second) = 0;
   virtual void StartEvents(std::int32_t& result) = 0;
   virtual void StopEvents(std::int32_t& result) = 0;
-  /// Writes the newest capture record over the start of `bytes`: a header in host order (seconds,
-  /// microseconds, captured length, length on the wire, 32 bits each, and a 16-bit header length), padding up
-  /// to that header length, the frame. Before the first record it is a header with zero lengths of the frame.
+  /// Writes the newest capture record over the start of `bytes`: its header (CaptureRecordHeader), padding up
+  /// to the header length, the frame. Before the first record it is a header with zero lengths of the frame.
   virtual void ReadBuffer(std::span<std::uint8_t> bytes) = 0;
   virtual void SetValueA(std::int32_t value) = 0;
   virtual void SetValueB(std::int32_t value) = 0;

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/net/TcpTable.h"
+
 #include <cstdint>
 #include <memory>
 #include <span>
@@ -23,17 +25,19 @@ class IpHelper {
 
   using TcpTable = std::shared_ptr<const std::vector<std::uint8_t>>;
 
+  /// What GetAdaptersInfo needs for one adapter.
+  static constexpr std::uint32_t kAdapterBytes = 640;
   static constexpr std::uint32_t kErrorBufferOverflow = 111;
   static constexpr std::uint32_t kErrorNotSupported = 50;
 
-  /// The IPv4 TCP connections with their owners: a 32-bit count in host order, then 24 bytes an entry: state,
-  /// local address, local port, remote address, remote port, owner. Addresses and ports (low 16 bits) are in
-  /// network order as they lie in memory. 0 on success; on failure `table` stays as it was.
+  /// The IPv4 TCP connections with their owners: a 32-bit count in host order, then the entries
+  /// (TcpTableEntry). 0 on success; on failure `table` stays as it was.
   virtual std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) = 0;
-  /// 20 bytes: state 12, local address, local port, remote address, remote port. 0 on success.
-  virtual std::uint32_t SetTcpEntry(std::span<const std::uint8_t, 20> record) = 0;
-  /// `size` counts bytes of room, 640 an adapter. With less room than needed it gives kErrorBufferOverflow
-  /// and puts the needed size in `size`; otherwise it gives 0 and fills `adapters`.
+  /// A TcpTableEntry without its owner, with the state kTcpDelete. 0 on success.
+  virtual std::uint32_t
+  SetTcpEntry(std::span<const std::uint8_t, TcpTableEntry::kBytesWithoutOwner> record) = 0;
+  /// `size` counts bytes of room, kAdapterBytes an adapter. With less room than needed it gives
+  /// kErrorBufferOverflow and puts the needed size in `size`; otherwise it gives 0 and fills `adapters`.
   virtual std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) = 0;
 };
 

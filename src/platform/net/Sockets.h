@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/net/Ipv4Address.h"
+#include "platform/net/SocketNumbers.h"
 
 #include <cstdint>
 #include <span>
@@ -10,24 +11,8 @@ namespace quendra::platform {
 
 using SocketHandle = std::uint32_t;
 inline constexpr SocketHandle kNoSocket = 0xFFFFFFFF;
-inline constexpr std::int32_t kSocketError = -1;
 /// What is no address; as an address it is 255.255.255.255.
 inline constexpr Ipv4Address kNoAddress = Ipv4Address::FromMemory(0xFFFFFFFF);
-
-/// Events of WSAAsyncSelect, as its mask and its messages number them.
-enum SocketEvent : std::int32_t { kFdRead = 1, kFdWrite = 2, kFdAccept = 8, kFdConnect = 16, kFdClose = 32 };
-
-/// Error numbers that the program's logic or its backends name; the others pass through.
-enum SocketErrorNumber : std::int32_t {
-  kInvalidArgument = 10022,
-  kWouldBlock = 10035,
-  kNotASocket = 10038,
-  kMessageTooLong = 10040,
-  kFamilyNotSupported = 10047,
-  kAddressNotAvailable = 10049,
-  kNetworkDown = 10091,
-  kHostNotFound = 11001,
-};
 
 /// An address and a port in host order.
 struct SocketAddress {
@@ -50,9 +35,9 @@ class Sockets {
   virtual ~Sockets() = default;
 
   /// 0, or the reason itself. `version` is the minor version in the high byte and the major one in the low.
-  virtual std::int32_t WSAStartup(std::uint16_t /*version*/) { return kNetworkDown; }
+  virtual std::int32_t WSAStartup(std::uint16_t /*version*/) { return kSubsystemUnavailable; }
   virtual std::int32_t WSACleanup() = 0;
-  virtual std::int32_t WSAGetLastError() { return kNetworkDown; }
+  virtual std::int32_t WSAGetLastError() { return kSubsystemUnavailable; }
 
   virtual SocketHandle socket(std::int32_t /*family*/, std::int32_t /*type*/, std::int32_t /*protocol*/) {
     return kNoSocket;
@@ -72,7 +57,7 @@ class Sockets {
                                   std::int32_t /*value*/) {
     return kSocketError;
   }
-  /// Command 0x4004667F (FIONREAD): the bytes of the stream, or of the next datagram, that wait.
+  /// Command kBytesWaiting: the bytes of the stream, or of the next datagram, that wait.
   virtual std::int32_t ioctlsocket(SocketHandle, std::uint32_t /*command*/, std::uint32_t& /*value*/) {
     return kSocketError;
   }
@@ -85,7 +70,7 @@ class Sockets {
                               const SocketAddress&) {
     return kSocketError;
   }
-  /// The number of bytes read, 0 at the end of the stream. Flag 2 peeks.
+  /// The number of bytes read, 0 at the end of the stream. kPeek leaves them there.
   virtual std::int32_t recv(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags) = 0;
   /// A datagram longer than the buffer fills it and fails with kMessageTooLong.
   virtual std::int32_t recvfrom(SocketHandle, std::span<std::uint8_t> /*buffer*/, std::int32_t /*flags*/,

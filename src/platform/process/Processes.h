@@ -11,6 +11,10 @@ namespace quendra::platform {
 using Handle = std::uint32_t;
 inline constexpr Handle kNoHandle = 0;
 inline constexpr Handle kInvalidHandle = 0xFFFFFFFF;
+/// Stands for the own process wherever a process's handle is asked for: the invalid handle's value.
+inline constexpr Handle kOwnProcess = kInvalidHandle;
+/// The room that the system's file names and paths may take, with their NUL.
+inline constexpr std::size_t kPathRoom = 260;
 
 /// The process list and opened processes, with the system's last error.
 class Processes {
@@ -22,7 +26,7 @@ class Processes {
   struct Entry {
     std::uint32_t processId = 0;
     std::uint32_t parentProcessId = 0;
-    std::array<char, 260> exeFile{};
+    std::array<char, kPathRoom> exeFile{};
   };
 
   static constexpr std::uint32_t kSnapProcess = 2;

@@ -1,6 +1,5 @@
 #include "platform/linux/capture/LinuxCaptureControl.h"
 
-#include "runtime/ByteFields.h"
 #include "runtime/Text.h"
 
 #include <algorithm>
@@ -9,20 +8,11 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-constexpr std::uint16_t kRecordHeader = 18;
-
 std::string AdapterNameOf(const std::string& name) { return std::string(CutAtNul(std::string_view(name))); }
 
-std::array<std::uint8_t, kRecordHeader> RecordHeaderOf(const PcapRecord* record) {
-  std::array<std::uint8_t, kRecordHeader> header{};
-  if (record != nullptr) {
-    PutLittle32(header, 0, record->seconds);
-    PutLittle32(header, 4, record->microseconds);
-    PutLittle32(header, 8, record->captured);
-    PutLittle32(header, 12, record->wire);
-  }
-  PutLittle16(header, 16, kRecordHeader);
-  return header;
+CaptureRecordHeader HeaderOf(const PcapRecord* record) {
+  if (record == nullptr) return {};
+  return {record->seconds, record->microseconds, record->captured, record->wire};
 }
 
 } // namespace
@@ -70,7 +60,7 @@ void LinuxCaptureControl::StopEvents(std::int32_t& result) {
 
 void LinuxCaptureControl::ReadBuffer(std::span<std::uint8_t> bytes) {
   const PcapRecord* record = core_->Newest();
-  const auto header = RecordHeaderOf(record);
+  const auto header = HeaderOf(record).Bytes();
   const std::size_t headerRoom = std::min<std::size_t>(header.size(), bytes.size());
   std::copy_n(header.begin(), headerRoom, bytes.begin());
   if (record == nullptr || bytes.size() <= header.size()) return;

@@ -7,7 +7,6 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-constexpr std::uint8_t kBlankFrame[60] = {};
 /// How many adapters may come while the program runs: the indexes are counted once, but a page lists its
 /// adapters at each opening. Until they come, their indexes repeat the last adapter, as a second mention adds
 /// nothing to a list.
@@ -169,7 +168,7 @@ void LinuxCaptureCore::AwaitAddress() {
 }
 
 std::int32_t LinuxCaptureCore::Capture(FrameBytes& frame, CaptureHeader& header) {
-  frame = FrameBytes(kBlankFrame, sizeof kBlankFrame);
+  frame = FrameBytes::Blank();
   if (queue_.Empty()) {
     if (!HasSession()) return -1;
     queue_.Rewind();

@@ -1,5 +1,7 @@
 #include "platform/linux/capture/PcapFrameShaper.h"
 
+#include "platform/capture/CaptureNumbers.h"
+#include "platform/net/IpProtocols.h"
 #include "runtime/ByteFields.h"
 
 #include <algorithm>
@@ -10,12 +12,12 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-constexpr std::uint32_t kEthernetHeader = 14;
-constexpr std::uint32_t kShortestFrame = 60;
+constexpr std::uint32_t kEthernetHeader = kEthernetHeaderBytes;
+constexpr std::uint32_t kShortestFrame = kShortestFrameBytes;
 constexpr std::uint32_t kLargestTotal = 32767;
-constexpr std::uint16_t kTypeIpv4 = 0x0800;
-constexpr std::uint16_t kTypeIpv6 = 0x86DD;
-constexpr std::uint16_t kTypePpp = 0x880B;
+constexpr std::uint16_t kTypeIpv4 = kIpv4Frame;
+constexpr std::uint16_t kTypeIpv6 = kIpv6Frame;
+constexpr std::uint16_t kTypePpp = kPppFrame;
 
 /// 0 beyond the packet.
 std::uint16_t WordAt(std::span<const std::uint8_t> packet, std::size_t index) {
@@ -76,7 +78,7 @@ void FillOther(PcapRecord& record, LinkForm form, std::span<const std::uint8_t> 
 /// doesn't have is a lie of the sender and stays one frame too.
 std::uint32_t OversizedTotal(const PcapRecord& record) {
   const auto& bytes = record.bytes;
-  if (bytes[12] != 0x08 || bytes[13] != 0x00 || bytes[14] >> 4 != 4 || bytes[23] != 6) return 0;
+  if (Big16(bytes, 12) != kIpv4Frame || bytes[14] >> 4 != 4 || bytes[23] != kTcp) return 0;
   const std::uint32_t present = record.wire - kEthernetHeader;
   const std::uint32_t told = Big16(bytes, 16);
   // A packet beyond 64 KB has no room for its length in the header, which reads 0 then.

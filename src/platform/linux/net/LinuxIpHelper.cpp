@@ -3,15 +3,8 @@
 #include "platform/linux/net/NetworkInterfaces.h"
 
 #include <algorithm>
-#include <cstring>
 
 namespace quendra::platform::linux_ {
-
-namespace {
-
-constexpr std::size_t kAdapterBytes = 640;
-
-} // namespace
 
 LinuxIpHelper::LinuxIpHelper(const ProcFolder& folder, SocketOwners::Rights rights, Clock clock)
     : folder_(folder), owners_(folder, rights, std::move(clock)) {}
@@ -20,15 +13,15 @@ std::uint32_t LinuxIpHelper::AllocateAndGetTcpExTableFromStack(TcpTable& table) 
   if (!diagnostics_.Read(sockets_)) return kErrorNotSupported;
   owners_.Update(sockets_);
 
-  const auto count = static_cast<std::uint32_t>(sockets_.size());
-  auto bytes = std::make_shared<std::vector<std::uint8_t>>(4 + 24 * sockets_.size());
-  std::memcpy(bytes->data(), &count, 4);
-  std::uint8_t* to = bytes->data() + 4;
+  auto bytes = std::make_shared<std::vector<std::uint8_t>>(TcpTableEntry::kFirst +
+                                                           TcpTableEntry::kBytes * sockets_.size());
+  PutLittle32(*bytes, 0, static_cast<std::uint32_t>(sockets_.size()));
+  std::size_t at = TcpTableEntry::kFirst;
   for (const TcpSocket& socket : sockets_) {
-    const std::uint32_t entry[6] = {socket.state,         socket.localAddress, socket.localPort,
-                                    socket.remoteAddress, socket.remotePort,   owners_.OwnerOf(socket.node)};
-    std::memcpy(to, entry, sizeof entry);
-    to += sizeof entry;
+    const TcpTableEntry entry{socket.state,         socket.localAddress, socket.localPort,
+                              socket.remoteAddress, socket.remotePort,   owners_.OwnerOf(socket.node)};
+    entry.WriteTo(*bytes, at);
+    at += TcpTableEntry::kBytes;
   }
   table = std::move(bytes);
   return 0;

@@ -14,14 +14,6 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-constexpr std::int32_t kNotStarted = 10093;
-constexpr std::int32_t kNoBufferSpace = 10055;
-constexpr std::int32_t kSocketLevel = 0xFFFF;
-constexpr std::int32_t kMaxMessageSizeOption = 0x2003;
-constexpr std::int32_t kLargestDatagram = 65507;
-constexpr std::uint32_t kBytesWaiting = 0x4004667F;
-constexpr std::int32_t kPeek = 2;
-
 sockaddr_in SystemAddress(const SocketAddress& address) {
   sockaddr_in system{};
   system.sin_family = AF_INET;
@@ -37,10 +29,10 @@ SocketAddress LibraryAddress(const sockaddr_in& system) {
 /// This system's name for an option of the library's socket level; -1 for one that it lacks.
 int SystemOption(std::int32_t option) {
   switch (option) {
-  case 0x0004: return SO_REUSEADDR;
-  case 0x0020: return SO_BROADCAST;
-  case 0x1001: return SO_SNDBUF;
-  case 0x1002: return SO_RCVBUF;
+  case kReuseAddressOption: return SO_REUSEADDR;
+  case kBroadcastOption: return SO_BROADCAST;
+  case kSendBufferOption: return SO_SNDBUF;
+  case kReceiveBufferOption: return SO_RCVBUF;
   default: return -1;
   }
 }
@@ -284,7 +276,7 @@ std::uint32_t LinuxSockets::WSAAsyncGetHostByName(std::uint32_t window, std::uin
         if (error == 0 && room > 0) PutLittle32(buffer, 0, static_cast<std::uint32_t>(count));
         for (std::size_t i = 0; error == 0 && i < count; ++i)
           PutLittle32(buffer, 4 + 4 * i, addresses[i].InMemory());
-        loop_.PostMessage(window, message, *handle, static_cast<std::uint32_t>(error) << 16);
+        loop_.PostMessage(window, message, *handle, SocketMessageWord(0, error));
       });
   if (*handle == 0) Fail(kNoBufferSpace);
   return *handle;

@@ -114,8 +114,7 @@ void SocketNotifier::Announce(SocketHandle socket, SocketEntry& entry, SocketEve
                               std::int32_t error) {
   if ((entry.mask & entry.enabled & event) == 0) return;
   entry.enabled &= ~event;
-  loop_.PostMessage(entry.window, entry.message, socket,
-                    static_cast<std::uint32_t>(event) | static_cast<std::uint32_t>(error) << 16);
+  loop_.PostMessage(entry.window, entry.message, socket, SocketMessageWord(event, error));
 }
 
 void SocketNotifier::Serve() {

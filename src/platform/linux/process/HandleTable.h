@@ -3,6 +3,7 @@
 #include "platform/linux/process/ProcessList.h"
 #include "platform/linux/system/Descriptor.h"
 #include "platform/process/Processes.h"
+#include "platform/process/SystemErrors.h"
 
 #include <map>
 #include <variant>
@@ -43,22 +44,6 @@ class HandleTable {
  private:
   Handle next_ = 0;
   std::map<Handle, Object> objects_;
-};
-
-/// Stands for the own process wherever a process's handle is asked for.
-inline constexpr Handle kOwnProcess = 0xFFFFFFFF;
-
-/// The system's error numbers.
-enum Error : std::uint32_t {
-  kNoError = 0,
-  kAccessDenied = 5,
-  kErrorInvalidHandle = 6,
-  kNoMoreFiles = 18,
-  kInvalidParameter = 87,
-  kModuleNotFound = 126,
-  kPartialCopy = 299,
-  kNotAllAssigned = 1300,
-  kNoSuchPrivilege = 1313,
 };
 
 } // namespace quendra::platform::linux_

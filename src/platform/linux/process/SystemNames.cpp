@@ -1,12 +1,13 @@
 #include "platform/linux/process/SystemNames.h"
 
+#include "platform/process/Processes.h"
+
 namespace quendra::platform::linux_ {
 
 namespace {
 
 constexpr std::size_t kReadableLength = 255;
 constexpr std::string_view kNumberMark = "//";
-constexpr std::size_t kPathRoom = 260;
 
 bool IsControl(char16_t unit) {
   return unit < 0x20 || (unit >= 0x7F && unit < 0xA0) || unit == 0x2028 || unit == 0x2029;

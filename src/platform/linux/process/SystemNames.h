@@ -22,7 +22,7 @@ class SystemPaths {
  public:
   /// The path in the code page, at most `limit` bytes. One that the code page can't hold, or that doesn't
   /// fit, gets "//", a number of its own and what there is room for; no file's own path begins like that. Who
-  /// has less room than the system's paths may take, 260 bytes, asks for the start of a path and gets it.
+  /// has less room than the system's paths may take (kPathRoom) asks for the start of a path and gets it.
   std::string ToSystem(const std::string& rawPath, std::size_t limit = std::string::npos);
   /// The file's own path; empty for a number that is forgotten.
   std::string ToRaw(const std::string& systemPath) const;

@@ -57,7 +57,7 @@ std::optional<std::vector<std::uint8_t>> LinuxVersionInfo::VerQueryValueA(std::s
   rest.remove_prefix(kMark.size());
   const std::string_view query = CutAtNul(std::string_view(subBlock));
   // Hebrew and code page 1255, each a 16-bit number with the low byte first.
-  if (SameName(query, "\\VarFileInfo\\Translation")) return std::vector<std::uint8_t>{0x0D, 0x04, 0xE7, 0x04};
+  if (SameName(query, kTranslation)) return std::vector<std::uint8_t>{0x0D, 0x04, 0xE7, 0x04};
   if (!SameName(query.substr(0, kStrings.size()), kStrings)) return {};
   const std::string_view name = query.substr(kStrings.size());
   while (!rest.empty()) {

@@ -73,13 +73,13 @@ void SimulatedCapture::Control::ReadBuffer(std::span<std::uint8_t> bytes) {
   ++capture_->ReadBufferCalls;
   if (capture_->RecordFrameCalls) Say("ReadBuffer");
   const Frame& newest = capture_->newest_;
-  const std::size_t headerLength = std::max<std::size_t>(capture_->RecordHeaderLength, 18);
-  std::vector<std::uint8_t> record(headerLength);
-  PutLittle32(record, 0, newest.tick / 1000);
-  PutLittle32(record, 4, newest.tick % 1000 * 1000);
-  PutLittle32(record, 8, static_cast<std::uint32_t>(newest.bytes.size()));
-  PutLittle32(record, 12, newest.wireLength);
-  PutLittle16(record, 16, static_cast<std::uint16_t>(headerLength));
+  const auto headerLength = std::max<std::uint16_t>(capture_->RecordHeaderLength, capture_record::kBytes);
+  const CaptureRecordHeader header{newest.tick / 1000, newest.tick % 1000 * 1000,
+                                   static_cast<std::uint32_t>(newest.bytes.size()), newest.wireLength,
+                                   headerLength};
+  const auto told = header.Bytes();
+  std::vector<std::uint8_t> record(told.begin(), told.end());
+  record.resize(headerLength);
   record.insert(record.end(), newest.bytes.begin(), newest.bytes.end());
   std::copy_n(record.begin(), std::min(record.size(), bytes.size()), bytes.begin());
 }
@@ -168,10 +168,9 @@ void SimulatedCapture::vpBegin(std::int32_t value) {
 }
 
 std::int32_t SimulatedCapture::vpCapture(FrameBytes& frame, CaptureHeader& header) {
-  static constexpr std::array<std::uint8_t, 60> kBlankFrame{};
   ++CaptureCalls;
   if (RecordFrameCalls) Record("vpCapture");
-  frame = FrameBytes(kBlankFrame.data(), static_cast<int>(kBlankFrame.size()));
+  frame = FrameBytes::Blank();
   if (waiting_.empty()) return IsGone() ? -1 : 0;
   if (waiting_.front().failure != 0) {
     const std::int32_t failure = waiting_.front().failure;

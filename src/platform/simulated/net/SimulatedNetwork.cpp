@@ -4,31 +4,21 @@
 
 namespace quendra::platform::simulated {
 
-namespace {
-
-constexpr std::uint32_t kEntrySize = 24;
-constexpr std::uint32_t kAdapterSize = 640;
-
-std::uint32_t PortInMemory(std::uint16_t port) {
-  return static_cast<std::uint32_t>(port >> 8) | static_cast<std::uint32_t>(port & 0xFF) << 8;
-}
-
-} // namespace
-
 std::uint32_t SimulatedIpHelper::AllocateAndGetTcpExTableFromStack(TcpTable& table) {
   if (TableError != 0) return TableError;
   ++TablesFetched;
-  std::vector<std::uint8_t> bytes(4 + kEntrySize * Connections.size());
+  std::vector<std::uint8_t> bytes(TcpTableEntry::kFirst + TcpTableEntry::kBytes * Connections.size());
   PutLittle32(bytes, 0, static_cast<std::uint32_t>(Connections.size()));
-  std::size_t at = 4;
+  std::size_t at = TcpTableEntry::kFirst;
   for (const Connection& connection : Connections) {
-    PutLittle32(bytes, at, connection.state);
-    PutLittle32(bytes, at + 4, AddressOf(connection.localAddress).InMemory());
-    PutLittle32(bytes, at + 8, PortInMemory(connection.localPort));
-    PutLittle32(bytes, at + 12, AddressOf(connection.remoteAddress).InMemory());
-    PutLittle32(bytes, at + 16, PortInMemory(connection.remotePort));
-    PutLittle32(bytes, at + 20, connection.owner);
-    at += kEntrySize;
+    const TcpTableEntry entry{connection.state,
+                              AddressOf(connection.localAddress).InMemory(),
+                              PortInMemory(connection.localPort),
+                              AddressOf(connection.remoteAddress).InMemory(),
+                              PortInMemory(connection.remotePort),
+                              connection.owner};
+    entry.WriteTo(bytes, at);
+    at += TcpTableEntry::kBytes;
   }
   table = std::make_shared<const std::vector<std::uint8_t>>(std::move(bytes));
   return 0;
@@ -41,7 +31,7 @@ std::uint32_t SimulatedIpHelper::SetTcpEntry(std::span<const std::uint8_t, 20> r
 
 std::uint32_t SimulatedIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) {
   if (AdaptersError != 0) return AdaptersError;
-  const auto needed = static_cast<std::uint32_t>(kAdapterSize * Adapters.size());
+  const auto needed = static_cast<std::uint32_t>(kAdapterBytes * Adapters.size());
   if (size < needed) {
     size = needed;
     return kErrorBufferOverflow;

@@ -2,6 +2,7 @@
 
 #include "platform/net/HostNames.h"
 #include "platform/net/IpHelper.h"
+#include "platform/net/SocketNumbers.h"
 #include "platform/process/Handles.h"
 #include "platform/simulated/SimulatedCore.h"
 
@@ -54,7 +55,7 @@ class SimulatedHandles : public Handles {
 
 /// A TCP connection: addresses are dotted texts, ports plain numbers.
 struct Connection {
-  std::uint32_t state = 5;
+  std::uint32_t state = kTcpEstablished;
   std::string localAddress{};
   std::uint16_t localPort = 0;
   std::string remoteAddress = "0.0.0.0";
@@ -92,7 +93,7 @@ class SimulatedHostNames : public HostNames {
   bool FailName = false;
   bool FailAddresses = false;
   /// What a question fails with.
-  std::int32_t Error = 11001;
+  std::int32_t Error = kHostNotFound;
 
   std::optional<std::string> gethostname() override;
   std::optional<std::vector<Ipv4Address>> gethostbyname(const std::string& name) override;

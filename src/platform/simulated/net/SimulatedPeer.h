@@ -59,7 +59,7 @@ class SimulatedPeer : public std::enable_shared_from_this<SimulatedPeer> {
   void Send(const std::string& bytes);
   /// An orderly end, behind what was sent.
   void Close();
-  /// An end by force: the program reads what arrived before, then sees error 10054.
+  /// An end by force: the program reads what arrived before, then sees kConnectionReset.
   void Reset();
   /// Takes at most this many bytes, then none until the loop's next round.
   void TakeAtMost(std::size_t bytes);

@@ -13,7 +13,7 @@ void SimulatedPeer::Close() {
 }
 
 void SimulatedPeer::Reset() {
-  if (const auto near = near_.lock()) sockets_.EndOf(*near, 10054);
+  if (const auto near = near_.lock()) sockets_.EndOf(*near, kConnectionReset);
 }
 
 void SimulatedPeer::TakeAtMost(std::size_t bytes) {

@@ -9,7 +9,7 @@ namespace quendra::platform::simulated {
 class SimulatedServer {
  public:
   /// From now on connections end with this error.
-  SimulatedServer& Refuse(std::int32_t error = 10061);
+  SimulatedServer& Refuse(std::int32_t error = kConnectionRefused);
   /// From now on nobody answers those who connect.
   SimulatedServer& StaySilent();
 

@@ -3,24 +3,10 @@
 #include "platform/simulated/net/SimulatedNetwork.h"
 
 #include <algorithm>
-#include <cstring>
 
 namespace quendra::platform::simulated {
 
 namespace {
-
-constexpr std::int32_t kNotStarted = 10093;
-constexpr std::int32_t kNotSupported = 10045;
-constexpr std::int32_t kAddressInUse = 10048;
-constexpr std::int32_t kNotConnected = 10057;
-constexpr std::int32_t kReset = 10054;
-constexpr std::int32_t kRefused = 10061;
-constexpr std::int32_t kTimedOut = 10060;
-constexpr std::int32_t kBadOption = 10042;
-constexpr std::int32_t kDatagramType = 2;
-constexpr std::size_t kLargestDatagram = 65507;
-constexpr std::int32_t kPeek = 2;
-constexpr std::uint32_t kBytesWaiting = 0x4004667F;
 
 std::string TextOf(std::span<const std::uint8_t> bytes) { return std::string(bytes.begin(), bytes.end()); }
 
@@ -131,7 +117,7 @@ SocketHandle SimulatedSockets::socket(std::int32_t, std::int32_t type, std::int3
   if (Scripted("socket")) return kNoSocket;
   if (started_ == 0) return static_cast<SocketHandle>(Refused(kNotStarted));
   const auto end = std::make_shared<SocketEnd>();
-  if (type == kDatagramType) end->stage = SocketEnd::Stage::Datagram;
+  if (type == kDatagramSocket) end->stage = SocketEnd::Stage::Datagram;
   return Give(end);
 }
 
@@ -142,10 +128,10 @@ std::int32_t SimulatedSockets::closesocket(SocketHandle socket) {
   if (!end) return loop_ ? kSocketError : 0;
   sockets_.erase(socket);
   if (end->peer) end->peer->Ended = true;
-  if (const End partner = end->partner.lock()) EndOf(*partner, end->arrived.empty() ? 0 : kReset);
+  if (const End partner = end->partner.lock()) EndOf(*partner, end->arrived.empty() ? 0 : kConnectionReset);
   for (const End& waiting : end->backlog) {
     if (waiting->peer) waiting->peer->Ended = true;
-    if (const End partner = waiting->partner.lock()) EndOf(*partner, kReset);
+    if (const End partner = waiting->partner.lock()) EndOf(*partner, kConnectionReset);
   }
   return 0;
 }
@@ -190,7 +176,7 @@ std::int32_t SimulatedSockets::listen(SocketHandle socket, std::int32_t backlog)
   if (Scripted("listen")) return kSocketError;
   const End end = Find(socket);
   if (!end) return kSocketError;
-  if (end->stage == SocketEnd::Stage::Datagram) return Refused(kNotSupported);
+  if (end->stage == SocketEnd::Stage::Datagram) return Refused(kOperationNotSupported);
   end->stage = SocketEnd::Stage::Listening;
   end->backlogSize = static_cast<std::size_t>(std::max(backlog, 1));
   Update(*end);
@@ -227,8 +213,8 @@ std::int32_t SimulatedSockets::connect(SocketHandle socket, const SocketAddress&
   if (Scripted("connect")) return kSocketError;
   const End end = Find(socket);
   if (!end) return kSocketError;
-  if (end->stage == SocketEnd::Stage::Connecting) return Refused(10037);
-  if (end->stage == SocketEnd::Stage::Connected) return Refused(10056);
+  if (end->stage == SocketEnd::Stage::Connecting) return Refused(kAlreadyInProgress);
+  if (end->stage == SocketEnd::Stage::Connected) return Refused(kAlreadyConnected);
   if (peer.address.IsAny() || peer.port == 0) return Refused(kAddressNotAvailable);
   end->stage = SocketEnd::Stage::Connecting;
   end->remote = peer;
@@ -245,9 +231,11 @@ void SimulatedSockets::Answered(const End& end) {
     Announce(*end, kFdConnect, error);
   };
   if (const End listener = IsOwn(end->remote.address) ? Listener(end->remote.port) : nullptr)
-    return listener->backlog.size() < listener->backlogSize ? Meet(end, listener) : refuse(kRefused);
+    return listener->backlog.size() < listener->backlogSize ? Meet(end, listener)
+                                                            : refuse(kConnectionRefused);
   const auto found = servers_.find({end->remote.address, end->remote.port});
-  if (found == servers_.end()) return refuse(IsOwn(end->remote.address) ? kRefused : kTimedOut);
+  if (found == servers_.end())
+    return refuse(IsOwn(end->remote.address) ? kConnectionRefused : kConnectionTimedOut);
   SimulatedServer& server = found->second;
   if (server.manner_ == SimulatedServer::Manner::Silent) return;
   if (server.manner_ == SimulatedServer::Manner::Refuses) return refuse(server.refusal_);
@@ -295,10 +283,10 @@ std::int32_t SimulatedSockets::getsockopt(SocketHandle socket, std::int32_t, std
                                           std::int32_t& value) {
   if (Scripted("getsockopt") || !Find(socket)) return kSocketError;
   switch (option) {
-  case 0x1001: value = SendBufferSize; return 0;
-  case 0x1002: value = ReceiveBufferSize; return 0;
-  case 0x2003: value = static_cast<std::int32_t>(kLargestDatagram); return 0;
-  default: return Refused(kBadOption);
+  case kSendBufferOption: value = SendBufferSize; return 0;
+  case kReceiveBufferOption: value = ReceiveBufferSize; return 0;
+  case kMaxMessageSizeOption: value = kLargestDatagram; return 0;
+  default: return Refused(kBadProtocolOption);
   }
 }
 
@@ -362,7 +350,7 @@ std::int32_t SimulatedSockets::sendto(SocketHandle socket, std::span<const std::
   if (Scripted("sendto")) return kSocketError;
   const End end = Find(socket);
   if (!end) return kSocketError;
-  if (bytes.size() > kLargestDatagram) return Refused(kMessageTooLong);
+  if (bytes.size() > std::size_t{kLargestDatagram}) return Refused(kMessageTooLong);
   if (end->local.port == 0) end->local.port = FreePort();
   Datagrams.push_back({TextOf(bytes), peer});
   if (std::find(echoes_.begin(), echoes_.end(), peer) != echoes_.end()) {
@@ -445,9 +433,7 @@ void SimulatedSockets::EndOf(SocketEnd& end, std::int32_t error) {
 void SimulatedSockets::Announce(SocketEnd& end, SocketEvent event, std::int32_t error) {
   if (end.handle == kNoSocket || (end.mask & end.enabled & event) == 0) return;
   end.enabled &= ~event;
-  if (loop_)
-    loop_->PostMessage(end.window, end.message, end.handle,
-                       static_cast<std::uint32_t>(event) | static_cast<std::uint32_t>(error) << 16);
+  if (loop_) loop_->PostMessage(end.window, end.message, end.handle, SocketMessageWord(event, error));
 }
 
 void SimulatedSockets::Update(SocketEnd& end) {
@@ -509,7 +495,7 @@ void SimulatedSockets::Resolved(std::uint32_t lookUp) {
     PutLittle32(asked.buffer, 0, static_cast<std::uint32_t>(count));
     for (std::size_t i = 0; i < count; ++i) PutLittle32(asked.buffer, 4 + 4 * i, (*addresses)[i].InMemory());
   }
-  if (loop_) loop_->PostMessage(asked.window, asked.message, lookUp, static_cast<std::uint32_t>(error) << 16);
+  if (loop_) loop_->PostMessage(asked.window, asked.message, lookUp, SocketMessageWord(0, error));
 }
 
 std::int32_t SimulatedSockets::WSACancelAsyncRequest(std::uint32_t lookUp) {

@@ -44,9 +44,9 @@ class SimulatedSockets : public Sockets {
   };
   std::vector<SentDatagram> Datagrams;
 
-  // Names, beside those that the host names know: 11001 for any other.
+  // Names, beside those that the host names know: kHostNotFound for any other.
 
-  void FailName(const std::string& name, std::int32_t error = 11001) { failingNames_[name] = error; }
+  void FailName(const std::string& name, std::int32_t error = kHostNotFound) { failingNames_[name] = error; }
   void NeverAnswer(const std::string& name) { silentNames_.push_back(name); }
   int LookUpsUnderWay() const { return static_cast<int>(lookUps_.size()); }
 

@@ -53,11 +53,11 @@ SimulatedVersionInfo::VerQueryValueA(std::span<const std::uint8_t> block, const 
   if (block.size() < kBlockSize || Little32(block, 0) != kBlockMark || Little32(block, 4) >= blocks_.size())
     return {};
   const Block& found = blocks_[Little32(block, 4)];
-  if (subBlock == "\\VarFileInfo\\Translation") {
+  if (subBlock == kTranslation) {
     if (found.translation.empty()) return {};
     return found.translation;
   }
-  const std::string prefix = "\\StringFileInfo\\" + found.table + "\\";
+  const std::string prefix = std::string(kTexts) + found.table + "\\";
   if (!subBlock.starts_with(prefix)) return {};
   const auto text = found.texts.find(subBlock.substr(prefix.size()));
   if (text == found.texts.end()) return {};

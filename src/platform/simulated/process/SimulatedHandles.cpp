@@ -4,19 +4,6 @@
 
 namespace quendra::platform::simulated {
 
-namespace {
-
-constexpr std::uint32_t kStatusInvalidHandle = 0xC0000008;
-constexpr std::uint32_t kStatusInvalidParameter = 0xC000000D;
-constexpr std::uint32_t kStatusInvalidInfoClass = 0xC0000003;
-constexpr std::uint32_t kHandleTable = 16;
-constexpr std::uint32_t kEntrySize = 16;
-constexpr std::uint32_t kObjectName = 1;
-constexpr std::uint32_t kQueryInformation = 0x210012;
-constexpr std::uint32_t kQueryAddressInfo = 3;
-
-} // namespace
-
 std::uint32_t SimulatedHandles::NtQuerySystemInformation(std::uint32_t informationClass,
                                                          std::span<std::uint8_t> buffer,
                                                          std::uint32_t& returnedLength) {
@@ -27,16 +14,16 @@ std::uint32_t SimulatedHandles::NtQuerySystemInformation(std::uint32_t informati
     for (auto& handle : appearing_.front()) handles_.push_back(std::move(handle));
     appearing_.pop_front();
   }
-  const std::size_t needed = 4 + kEntrySize * handles.size();
+  const std::size_t needed = kCountBytes + kRecordBytes * handles.size();
   returnedLength = static_cast<std::uint32_t>(needed);
-  if (buffer.size() >= 4) PutLittle32(buffer, 0, static_cast<std::uint32_t>(handles.size()));
+  if (buffer.size() >= kCountBytes) PutLittle32(buffer, 0, static_cast<std::uint32_t>(handles.size()));
   if (buffer.size() < needed) return kStatusInfoLengthMismatch;
   for (std::size_t i = 0; i < handles.size(); ++i) {
-    const auto entry = buffer.subspan(4 + kEntrySize * i, kEntrySize);
+    const auto entry = buffer.subspan(kCountBytes + kRecordBytes * i, kRecordBytes);
     std::fill(entry.begin(), entry.end(), std::uint8_t{0});
-    PutLittle32(entry, 0, handles[i].pid);
-    entry[4] = 28; // a file object
-    PutLittle16(entry, 6, handles[i].handle);
+    PutLittle32(entry, kProcessIdOffset, handles[i].pid);
+    entry[kTypeOffset] = 28; // a file object
+    PutLittle16(entry, kHandleOffset, handles[i].handle);
     PutLittle32(entry, 8, 0x81000000U + static_cast<std::uint32_t>(i) * 0x40U);
     PutLittle32(entry, 12, 0x0012019F);
   }
@@ -67,15 +54,15 @@ std::uint32_t SimulatedHandles::NtQueryObject(Handle handle, std::uint32_t infor
   if (!entry) return kStatusInvalidHandle;
   if (informationClass != kObjectName) return kStatusInvalidInfoClass;
   const std::size_t bytes = entry->deviceName.size() * 2;
-  const std::size_t needed = entry->deviceName.empty() ? 8 : 8 + bytes + 2;
+  const std::size_t needed = entry->deviceName.empty() ? kNameOffset : kNameOffset + bytes + 2;
   returnedLength = static_cast<std::uint32_t>(needed);
   if (buffer.size() < needed) return kStatusInfoLengthMismatch;
   std::fill(buffer.begin(), buffer.end(), std::uint8_t{0});
   PutLittle16(buffer, 0, static_cast<std::uint16_t>(bytes));
-  PutLittle16(buffer, 2, static_cast<std::uint16_t>(needed - 8));
-  PutLittle32(buffer, 4, entry->deviceName.empty() ? 0 : 8);
+  PutLittle16(buffer, 2, static_cast<std::uint16_t>(needed - kNameOffset));
+  PutLittle32(buffer, 4, entry->deviceName.empty() ? 0 : kNameOffset);
   for (std::size_t i = 0; i < entry->deviceName.size(); ++i)
-    PutLittle16(buffer, 8 + 2 * i, entry->deviceName[i]);
+    PutLittle16(buffer, kNameOffset + 2 * i, entry->deviceName[i]);
   return 0;
 }
 
@@ -90,10 +77,11 @@ std::uint32_t SimulatedHandles::NtDeviceIoControlFile(Handle handle, Handle, std
   const SystemHandle* entry = Duplicated(handle);
   if (!entry) return kStatusInvalidHandle;
   if (controlCode != kQueryInformation) return kStatusNotImplemented;
-  if (input.size() != 24 || output.size() != 52 || Little32(input, 16) != kQueryAddressInfo)
+  if (input.size() != kQueryBytes || output.size() != kAnswerBytes ||
+      Little32(input, kQueryTypeOffset) != kQueryAddressInfo)
     return kStatusInvalidParameter;
   if (entry->driverStatus != 0) return entry->driverStatus;
-  PutBig16(output, 12, entry->port);
+  PutBig16(output, kPortOffset, entry->port);
   return 0;
 }
 

@@ -1,14 +1,13 @@
 #include "platform/simulated/process/SimulatedProcesses.h"
 
+#include "platform/process/SystemErrors.h"
+
 #include <algorithm>
 
 namespace quendra::platform::simulated {
 
 namespace {
 
-constexpr std::uint32_t kErrorAccessDenied = 5;
-constexpr std::uint32_t kErrorInvalidHandle = 6;
-constexpr std::uint32_t kErrorInvalidParameter = 87;
 constexpr std::uint32_t kExecutableModule = 0x00400000;
 
 } // namespace
@@ -49,19 +48,19 @@ Handle SimulatedProcesses::OpenProcess(std::uint32_t access, bool, std::uint32_t
   OpenCalls.push_back({processId, access});
   core_.lastError = 0;
   if (const auto failing = failingOpens_.find(processId); failing != failingOpens_.end()) {
-    core_.lastError = kErrorAccessDenied;
+    core_.lastError = kAccessDenied;
     return failing->second;
   }
   const bool known = std::any_of(processes_.begin(), processes_.end(),
                                  [&](const Process& process) { return process.id == processId; });
   if (known && processId != 0) return core_.Open(Core::Kind::Process, processId);
-  core_.lastError = kErrorInvalidParameter;
+  core_.lastError = kInvalidParameter;
   return kNoHandle;
 }
 
 bool SimulatedProcesses::CloseHandle(Handle handle) {
   snapshots_.erase(handle);
-  if (handle == kInvalidHandle) return true;
+  if (handle == kOwnProcess) return true;
   if (core_.opened.erase(handle) == 1) return true;
   ++VainCloses;
   core_.lastError = kErrorInvalidHandle;
@@ -78,7 +77,7 @@ const Process* SimulatedProcesses::Opened(Handle handle) const {
 
 bool SimulatedProcesses::EnumProcessModules(Handle handle, std::span<std::uint32_t> modules) {
   const Process* process = Opened(handle);
-  core_.lastError = process && !process->path.empty() ? 0 : kErrorInvalidHandle;
+  core_.lastError = process && !process->path.empty() ? kNoError : kErrorInvalidHandle;
   if (core_.lastError != 0) return false;
   if (!modules.empty()) modules.front() = kExecutableModule;
   return true;
@@ -88,7 +87,7 @@ std::uint32_t SimulatedProcesses::GetModuleFileNameExA(Handle handle, std::uint3
                                                        std::uint32_t size) {
   const Process* process = Opened(handle);
   core_.lastError =
-      process && !process->path.empty() && module == kExecutableModule ? 0 : kErrorInvalidHandle;
+      process && !process->path.empty() && module == kExecutableModule ? kNoError : kErrorInvalidHandle;
   if (core_.lastError != 0) return 0;
   const std::size_t length = std::min({process->path.size(), path.size(), static_cast<std::size_t>(size)});
   path.replace(0, length, process->path, 0, length);

@@ -46,7 +46,7 @@ class SimulatedProcesses : public Processes {
   bool Process32First(Handle snapshot, Entry& entry) override;
   bool Process32Next(Handle snapshot, Entry& entry) override;
   Handle OpenProcess(std::uint32_t access, bool inherit, std::uint32_t processId) override;
-  Handle GetCurrentProcess() override { return kInvalidHandle; }
+  Handle GetCurrentProcess() override { return kOwnProcess; }
   bool CloseHandle(Handle handle) override;
   bool EnumProcessModules(Handle process, std::span<std::uint32_t> modules) override;
   std::uint32_t GetModuleFileNameExA(Handle process, std::uint32_t module, std::string& path,

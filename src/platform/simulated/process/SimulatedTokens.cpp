@@ -1,15 +1,10 @@
 #include "platform/simulated/process/SimulatedProcesses.h"
 
+#include "platform/process/SystemErrors.h"
+
 #include <algorithm>
 
 namespace quendra::platform::simulated {
-
-namespace {
-
-constexpr std::uint32_t kErrorInvalidHandle = 6;
-constexpr std::uint32_t kErrorNotAllAssigned = 1300;
-
-} // namespace
 
 bool SimulatedTokens::Answer(std::uint32_t error) {
   core_.lastError = error;
@@ -18,8 +13,7 @@ bool SimulatedTokens::Answer(std::uint32_t error) {
 
 bool SimulatedTokens::OpenProcessToken(Handle process, std::uint32_t, Handle& token) {
   if (OpenProcessTokenError != 0) return Answer(OpenProcessTokenError);
-  if (process != kInvalidHandle && !core_.Find(process, Core::Kind::Process))
-    return Answer(kErrorInvalidHandle);
+  if (process != kOwnProcess && !core_.Find(process, Core::Kind::Process)) return Answer(kErrorInvalidHandle);
   token = core_.Open(Core::Kind::Token);
   return Answer(0);
 }
@@ -36,7 +30,7 @@ bool SimulatedTokens::AdjustTokenPrivileges(Handle token, bool, std::uint64_t lu
                                             std::span<std::uint8_t, 16>) {
   if (!core_.Find(token, Core::Kind::Token)) return Answer(kErrorInvalidHandle);
   if (AdjustTokenPrivilegesError != 0)
-    return Answer(AdjustTokenPrivilegesError) || AdjustTokenPrivilegesError == kErrorNotAllAssigned;
+    return Answer(AdjustTokenPrivilegesError) || AdjustTokenPrivilegesError == kNotAllAssigned;
   const std::string name = luid >= 1 && luid <= privileges_.size() ? privileges_[luid - 1] : "?";
   Adjusted.push_back(name + " " + std::to_string(attributes));
   return Answer(0);

@@ -21,9 +21,7 @@ namespace {
 using integration::NetworkNamespace;
 using integration::RunCommand;
 
-struct Entry {
-  std::uint32_t state, localAddress, localPort, remoteAddress, remotePort, owner;
-};
+using Entry = TcpTableEntry;
 
 /// The table in a namespace of the test's own where that can be made, else on this machine's loopback.
 struct LinuxIpHelperTest : testing::Test {
@@ -41,11 +39,10 @@ struct LinuxIpHelperTest : testing::Test {
   std::vector<Entry> Table() {
     IpHelper::TcpTable table;
     EXPECT_EQ(helper.AllocateAndGetTcpExTableFromStack(table), 0u);
-    std::uint32_t count = 0;
-    std::memcpy(&count, table->data(), 4);
-    EXPECT_EQ(table->size(), 4 + 24 * std::size_t{count});
-    std::vector<Entry> entries(count);
-    if (count > 0) std::memcpy(entries.data(), table->data() + 4, 24 * std::size_t{count});
+    const std::size_t count = Little32(*table, 0);
+    EXPECT_EQ(table->size(), 4 + 24 * count);
+    std::vector<Entry> entries;
+    for (std::size_t i = 0; i < count; ++i) entries.push_back(Entry::ReadFrom(*table, 4 + 24 * i));
     return entries;
   }
   /// The entry with this state and local port; all zero when there is none.
@@ -348,7 +345,7 @@ TEST_F(LinuxNetwork, Another_name_is_looked_up) {
 TEST_F(LinuxNetwork, Adapters_are_listed_with_addresses_and_gateways_the_preferred_way_out_first) {
   Lay();
   std::vector<AdapterRecord> adapters;
-  std::uint32_t size = 10 * 640;
+  std::uint32_t size = 10 * IpHelper::kAdapterBytes;
   ASSERT_EQ(helper.GetAdaptersInfo(adapters, size), 0u);
   ASSERT_EQ(adapters.size(), 2u);
   EXPECT_EQ(adapters[0].name, "qd1");
@@ -360,9 +357,9 @@ TEST_F(LinuxNetwork, Adapters_are_listed_with_addresses_and_gateways_the_preferr
 TEST_F(LinuxNetwork, A_list_of_adapters_in_too_little_room_fails_with_the_room_needed) {
   Lay();
   std::vector<AdapterRecord> adapters;
-  std::uint32_t size = 2 * 640 - 1;
+  std::uint32_t size = 2 * IpHelper::kAdapterBytes - 1;
   EXPECT_EQ(helper.GetAdaptersInfo(adapters, size), IpHelper::kErrorBufferOverflow);
-  EXPECT_EQ(size, 2u * 640);
+  EXPECT_EQ(size, 2u * IpHelper::kAdapterBytes);
   EXPECT_TRUE(adapters.empty());
   EXPECT_EQ(helper.GetAdaptersInfo(adapters, size), 0u);
   EXPECT_EQ(adapters.size(), 2u);
