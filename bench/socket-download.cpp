@@ -15,7 +15,6 @@
 #include <cstring>
 
 using namespace quendra;
-using foundation::Value;
 
 namespace {
 
@@ -35,31 +34,31 @@ struct Download {
 
   void Listen() {
     auto& events = sockets.Events;
-    events.Connect = [this](const Value& index) {
+    events.Connect = [this](const Variant& index) {
       sockets.SendData(index, Text(u"GET / HTTP/1.1\r\nHost: localhost\r\nConnection: Close\r\n\r\n"));
     };
-    events.DataArrival = [this](const Value& index, std::int32_t) {
+    events.DataArrival = [this](const Variant& index, std::int32_t) {
       if (!take) return;
-      Value data;
+      Variant data;
       sockets.GetData(index, data);
-      bytes += static_cast<long long>(std::get<foundation::ByteArray>(data).size());
+      bytes += static_cast<long long>(data.Find<ByteArray>()->size());
     };
-    events.CloseSck = [this](const Value& index) {
+    events.CloseSck = [this](const Variant& index) {
       if (!take) bytes += sockets.BytesReceived(index);
       Close(index);
     };
-    events.Error = [this](const Value& index, auto&&...) {
+    events.Error = [this](const Variant& index, auto&&...) {
       ++failed;
       Close(index);
     };
   }
 
-  void Close(Value index) {
+  void Close(Variant index) {
     sockets.CloseSck(index);
     --open;
   }
 
-  void Start(int count, const Value& port) {
+  void Start(int count, const Variant& port) {
     for (open = 0; open < count; ++open) sockets.Connect(sockets.ArrayAdd(), Text(u"127.0.0.1"), port);
   }
 };

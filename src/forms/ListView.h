@@ -42,7 +42,7 @@ class ListRow {
 
   struct Cell {
     Text text;
-    Variant tag;
+    Variant tag = Text();
     Colour colour = kBlack;
     bool bold = false;
   };

@@ -57,9 +57,9 @@ std::int32_t CSocketPlus::WndProc(forms::WindowHandle, std::uint32_t message, st
   return 0;
 }
 
-std::int32_t CSocketPlus::RemotePort(const Value& index) { return At(GetSocketIndex(index)).RemotePort; }
+std::int32_t CSocketPlus::RemotePort(const Variant& index) { return At(GetSocketIndex(index)).RemotePort; }
 
-void CSocketPlus::SetRemotePort(const Value& index, std::int32_t port) {
+void CSocketPlus::SetRemotePort(const Variant& index, std::int32_t port) {
   constexpr auto kSource = u"CSocketPlus.RemotePort";
   SocketRecord& record = At(GetSocketIndex(index));
   if (record.Protocol == sckTCPProtocol && record.State != sckClosed)
@@ -67,30 +67,30 @@ void CSocketPlus::SetRemotePort(const Value& index, std::int32_t port) {
   record.RemotePort = CheckedPort(port, kSource);
 }
 
-Text CSocketPlus::RemoteHost(const Value& index) { return At(GetSocketIndex(index)).RemoteHost; }
+Text CSocketPlus::RemoteHost(const Variant& index) { return At(GetSocketIndex(index)).RemoteHost; }
 
-void CSocketPlus::SetRemoteHost(const Value& index, const Text& host) {
+void CSocketPlus::SetRemoteHost(const Variant& index, const Text& host) {
   SocketRecord& record = At(GetSocketIndex(index));
   if (record.Protocol == sckTCPProtocol && record.State != sckClosed)
     throw Misuse(kInvalidAtCurrentState, u"CSocketPlus.RemoteHost");
   record.RemoteHost = host;
 }
 
-Text CSocketPlus::RemoteHostIP(const Value& index) { return At(GetSocketIndex(index)).RemoteHostIP; }
+Text CSocketPlus::RemoteHostIP(const Variant& index) { return At(GetSocketIndex(index)).RemoteHostIP; }
 
-std::int32_t CSocketPlus::LocalPort(const Value& index) {
+std::int32_t CSocketPlus::LocalPort(const Variant& index) {
   const SocketRecord& record = At(GetSocketIndex(index));
   return record.LocalPortBind != 0 ? record.LocalPortBind : record.LocalPort;
 }
 
-void CSocketPlus::SetLocalPort(const Value& index, std::int32_t port) {
+void CSocketPlus::SetLocalPort(const Variant& index, std::int32_t port) {
   constexpr auto kSource = u"CSocketPlus.LocalPort";
   SocketRecord& record = At(GetSocketIndex(index));
   if (record.State != sckClosed) throw Misuse(kInvalidAtCurrentState, kSource);
   record.LocalPort = CheckedPort(port, kSource);
 }
 
-SocketState CSocketPlus::State(const Value& index) { return At(GetSocketIndex(index)).State; }
+SocketState CSocketPlus::State(const Variant& index) { return At(GetSocketIndex(index)).State; }
 
 Text CSocketPlus::LocalHostName() {
   const auto name = module_.Names().gethostname();
@@ -98,7 +98,7 @@ Text CSocketPlus::LocalHostName() {
   return FromCodePage(CutAtNul(std::string_view(*name).substr(0, 256)));
 }
 
-Text CSocketPlus::LocalIP(const Value& index) {
+Text CSocketPlus::LocalIP(const Variant& index) {
   const SocketRecord& record = At(GetSocketIndex(index));
   if (record.State == sckConnected) return record.LocalIP;
   const auto addresses = module_.Names().gethostbyname(ToCodePage(LocalHostName()));
@@ -106,25 +106,25 @@ Text CSocketPlus::LocalIP(const Value& index) {
   return addresses->front().AsText();
 }
 
-std::int32_t CSocketPlus::BytesReceived(const Value& index) { return AmountWaiting(GetSocketIndex(index)); }
+std::int32_t CSocketPlus::BytesReceived(const Variant& index) { return AmountWaiting(GetSocketIndex(index)); }
 
-std::int32_t CSocketPlus::SocketHandle(const Value& index) {
+std::int32_t CSocketPlus::SocketHandle(const Variant& index) {
   return static_cast<std::int32_t>(At(GetSocketIndex(index)).SocketHandle);
 }
 
-Text CSocketPlus::Tag(const Value& index) { return At(GetSocketIndex(index)).Tag; }
+Text CSocketPlus::Tag(const Variant& index) { return At(GetSocketIndex(index)).Tag; }
 
-void CSocketPlus::SetTag(const Value& index, const Text& tag) { At(GetSocketIndex(index)).Tag = tag; }
+void CSocketPlus::SetTag(const Variant& index, const Text& tag) { At(GetSocketIndex(index)).Tag = tag; }
 
-SocketProtocol CSocketPlus::Protocol(const Value& index) { return At(GetSocketIndex(index)).Protocol; }
+SocketProtocol CSocketPlus::Protocol(const Variant& index) { return At(GetSocketIndex(index)).Protocol; }
 
-void CSocketPlus::SetProtocol(const Value& index, SocketProtocol protocol) {
+void CSocketPlus::SetProtocol(const Variant& index, SocketProtocol protocol) {
   SocketRecord& record = At(GetSocketIndex(index));
   if (record.State != sckClosed) throw Misuse(kInvalidAtCurrentState, u"CSocketPlus.Protocol");
   record.Protocol = protocol;
 }
 
-void CSocketPlus::CloseSck(const Value& index) { CloseSlot(GetSocketIndex(index)); }
+void CSocketPlus::CloseSck(const Variant& index) { CloseSlot(GetSocketIndex(index)); }
 
 void CSocketPlus::CloseSlot(Slot slot) {
   At(slot).State = sckClosing;
@@ -162,7 +162,7 @@ void CSocketPlus::DestroySocket(Slot slot) {
 
 void CSocketPlus::Fail(Slot slot, std::int32_t number, const char16_t* source) {
   At(slot).State = sckError;
-  const Value index = At(slot).Index;
+  const Variant index = At(slot).Index;
   const Text description = SystemErrorText(number);
   modSocketPlus& module = module_; // the handler may end this object
   bool cancelDisplay = true;

@@ -25,51 +25,53 @@ class CSocketPlus {
   std::int32_t WndProc(forms::WindowHandle window, std::uint32_t message, std::uint32_t wParam,
                        std::uint32_t lParam);
 
-  std::int32_t RemotePort(const Value& index);
+  std::int32_t RemotePort(const Variant& index);
   /// Refused with fault 40020 by a TCP socket that is not closed.
-  void SetRemotePort(const Value& index, std::int32_t port);
-  Text RemoteHost(const Value& index);
-  void SetRemoteHost(const Value& index, const Text& host);
-  Text RemoteHostIP(const Value& index);
+  void SetRemotePort(const Variant& index, std::int32_t port);
+  Text RemoteHost(const Variant& index);
+  void SetRemoteHost(const Variant& index, const Text& host);
+  Text RemoteHostIP(const Variant& index);
   /// The port that is bound, else the port asked for.
-  std::int32_t LocalPort(const Value& index);
-  void SetLocalPort(const Value& index, std::int32_t port);
-  SocketState State(const Value& index);
+  std::int32_t LocalPort(const Variant& index);
+  void SetLocalPort(const Variant& index, std::int32_t port);
+  SocketState State(const Variant& index);
   Text LocalHostName();
-  Text LocalIP(const Value& index);
-  std::int32_t BytesReceived(const Value& index);
-  std::int32_t SocketHandle(const Value& index);
-  Text Tag(const Value& index);
-  void SetTag(const Value& index, const Text& tag);
-  SocketProtocol Protocol(const Value& index);
-  void SetProtocol(const Value& index, SocketProtocol protocol);
+  Text LocalIP(const Variant& index);
+  std::int32_t BytesReceived(const Variant& index);
+  std::int32_t SocketHandle(const Variant& index);
+  Text Tag(const Variant& index);
+  void SetTag(const Variant& index, const Text& tag);
+  SocketProtocol Protocol(const Variant& index);
+  void SetProtocol(const Variant& index, SocketProtocol protocol);
 
-  void Accept(const Value& index, platform::SocketHandle requestID);
+  void Accept(const Variant& index, platform::SocketHandle requestID);
   /// Gives the index; without one it is the lowest number from 1 that is free.
-  Value ArrayAdd(const Value& index = {});
-  Value ArrayRemove(const Value& index);
-  bool ArrayIndexInUse(const Value& index) const;
+  Variant ArrayAdd(const Variant& index = {});
+  Variant ArrayRemove(const Variant& index);
+  bool ArrayIndexInUse(const Variant& index) const;
   std::int32_t ArrayCount() const;
-  void Bind(const Value& index, const Value& localPort = {}, const Value& localIP = {});
-  void CloseSck(const Value& index);
-  void Connect(const Value& index, const Value& remoteHost = {}, const Value& remotePort = {});
-  void GetData(const Value& index, Value& data, DataKind kind = DataKind::None, const Value& maxLength = {});
-  void Listen(const Value& index);
-  void PeekData(const Value& index, Value& data, DataKind kind = DataKind::None, const Value& maxLength = {});
-  void SendData(const Value& index, const Value& data);
+  void Bind(const Variant& index, const Variant& localPort = {}, const Variant& localIP = {});
+  void CloseSck(const Variant& index);
+  void Connect(const Variant& index, const Variant& remoteHost = {}, const Variant& remotePort = {});
+  void GetData(const Variant& index, Variant& data, DataKind kind = DataKind::None,
+               const Variant& maxLength = {});
+  void Listen(const Variant& index);
+  void PeekData(const Variant& index, Variant& data, DataKind kind = DataKind::None,
+                const Variant& maxLength = {});
+  void SendData(const Variant& index, const Variant& data);
 
   /// The events; each has the index first. In Error follow number, description, Scode, source, help file,
   /// help context and CancelDisplay, which a handler sets to false to have the class show the error in a box.
   struct EventTable {
-    forms::Event<const Value&> CloseSck;
-    forms::Event<const Value&> Connect;
-    forms::Event<const Value&, platform::SocketHandle> ConnectionRequest;
-    forms::Event<const Value&, std::int32_t> DataArrival;
-    forms::Event<const Value&, std::int16_t, const Text&, std::int32_t, const Text&, const Text&,
+    forms::Event<const Variant&> CloseSck;
+    forms::Event<const Variant&> Connect;
+    forms::Event<const Variant&, platform::SocketHandle> ConnectionRequest;
+    forms::Event<const Variant&, std::int32_t> DataArrival;
+    forms::Event<const Variant&, std::int16_t, const Text&, std::int32_t, const Text&, const Text&,
                  std::int32_t, bool&>
         Error;
-    forms::Event<const Value&> SendComplete;
-    forms::Event<const Value&, std::int32_t, std::int32_t> SendProgress;
+    forms::Event<const Variant&> SendComplete;
+    forms::Event<const Variant&, std::int32_t, std::int32_t> SendProgress;
   } Events;
 
  private:
@@ -78,7 +80,7 @@ class CSocketPlus {
   using Life = std::weak_ptr<const int>;
 
   // The array of sockets.
-  Slot GetSocketIndex(const Value& index) const;
+  Slot GetSocketIndex(const Variant& index) const;
   Slot GetFreeSocketIndex();
   void CleanSocketArray(Slot slot);
   SocketRecord& At(Slot slot) { return records_[slot]; }
@@ -88,7 +90,7 @@ class CSocketPlus {
   // Opening.
   bool SocketExists(Slot slot);
   void ProcessOptions(Slot slot);
-  bool BindInternal(Slot slot, const Value& port = {}, const Value& address = {});
+  bool BindInternal(Slot slot, const Variant& port = {}, const Variant& address = {});
   platform::Ipv4Address ResolveBlocking(const Text& host, std::int32_t& error);
   platform::Ipv4Address ResolveIfHostname(Slot slot, const Text& host);
   void PostResolution(std::uint32_t handle, std::int32_t error);
@@ -110,9 +112,9 @@ class CSocketPlus {
   void SendBufferedData(Slot slot);
   void SendBufferedDataUDP(Slot slot);
   std::int32_t RecvDataToBuffer(Slot slot);
-  void TakeData(const Value& index, Value& data, DataKind kind, const Value& maxLength, bool peek,
+  void TakeData(const Variant& index, Variant& data, DataKind kind, const Variant& maxLength, bool peek,
                 const char16_t* source);
-  void RecvData(Slot slot, Value& data, DataKind kind, std::int32_t maxLength, bool bounded, bool peek);
+  void RecvData(Slot slot, Variant& data, DataKind kind, std::int32_t maxLength, bool bounded, bool peek);
   ByteArray TakeBytes(Slot slot, std::size_t count, bool peek);
   std::int32_t AmountWaiting(Slot slot);
 

@@ -9,9 +9,9 @@ namespace quendra::foundation {
 namespace {
 
 /// An integer index as one number, whatever its width; nothing for any other type.
-std::optional<std::int32_t> NumericIndex(const Value& index) {
-  if (const auto* number = std::get_if<std::int16_t>(&index)) return *number;
-  if (const auto* number = std::get_if<std::int32_t>(&index)) return *number;
+std::optional<std::int32_t> NumericIndex(const Variant& index) {
+  if (const auto* number = index.Find<std::int16_t>()) return *number;
+  if (const auto* number = index.Find<std::int32_t>()) return *number;
   return std::nullopt;
 }
 
@@ -26,10 +26,10 @@ template <typename Map, typename Key> std::optional<std::size_t> SlotIn(const Ma
 
 } // namespace
 
-CSocketPlus::Slot CSocketPlus::GetSocketIndex(const Value& index) const {
+CSocketPlus::Slot CSocketPlus::GetSocketIndex(const Variant& index) const {
   constexpr auto kSource = u"CSocketPlus.GetSocketIndex";
   std::optional<Slot> slot;
-  if (const Text* text = std::get_if<Text>(&index)) {
+  if (const Text* text = index.Find<Text>()) {
     slot = SlotIn(slotsByStringIndex_, *text);
   } else if (const auto number = NumericIndex(index)) {
     slot = SlotIn(slotsByNumericIndex_, *number);
@@ -40,17 +40,17 @@ CSocketPlus::Slot CSocketPlus::GetSocketIndex(const Value& index) const {
   return *slot;
 }
 
-Value CSocketPlus::ArrayAdd(const Value& index) {
+Variant CSocketPlus::ArrayAdd(const Variant& index) {
   const Slot slot = GetFreeSocketIndex();
   At(slot).SocketHandle = platform::kNoSocket;
   At(slot).ResolveRequests.clear();
   At(slot).Index = index;
   bool added = false;
-  if (const Text* text = std::get_if<Text>(&index)) {
+  if (const Text* text = index.Find<Text>()) {
     added = slotsByStringIndex_.emplace(*text, slot).second;
   } else if (const auto number = NumericIndex(index)) {
     added = slotsByNumericIndex_.emplace(*number, slot).second;
-  } else if (IsEmpty(index)) {
+  } else if (index.IsMissing()) {
     std::int32_t free = 1;
     while (slotsByNumericIndex_.contains(free)) ++free;
     added = slotsByNumericIndex_.emplace(free, slot).second;
@@ -65,11 +65,11 @@ Value CSocketPlus::ArrayAdd(const Value& index) {
   return At(slot).Index;
 }
 
-Value CSocketPlus::ArrayRemove(const Value& index) {
-  Value removed = index; // the caller's may lie in the record
+Variant CSocketPlus::ArrayRemove(const Variant& index) {
+  Variant removed = index; // the caller's may lie in the record
   const Slot slot = GetSocketIndex(removed);
   CloseSlot(slot);
-  if (const Text* text = std::get_if<Text>(&removed)) {
+  if (const Text* text = removed.Find<Text>()) {
     slotsByStringIndex_.erase(*text);
   } else if (const auto number = NumericIndex(removed)) {
     slotsByNumericIndex_.erase(*number);
@@ -80,8 +80,8 @@ Value CSocketPlus::ArrayRemove(const Value& index) {
   return removed;
 }
 
-bool CSocketPlus::ArrayIndexInUse(const Value& index) const {
-  if (const Text* text = std::get_if<Text>(&index)) return slotsByStringIndex_.contains(*text);
+bool CSocketPlus::ArrayIndexInUse(const Variant& index) const {
+  if (const Text* text = index.Find<Text>()) return slotsByStringIndex_.contains(*text);
   if (const auto number = NumericIndex(index)) return slotsByNumericIndex_.contains(*number);
   throw Misuse(kUnsupportedIndexType, u"CSocketPlus.ArrayIndexInUse");
 }

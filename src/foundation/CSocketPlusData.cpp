@@ -9,7 +9,7 @@
 
 namespace quendra::foundation {
 
-void CSocketPlus::SendData(const Value& index, const Value& data) {
+void CSocketPlus::SendData(const Variant& index, const Variant& data) {
   constexpr auto kSource = u"CSocketPlus.SendData";
   const Slot slot = GetSocketIndex(index);
   const bool udp = At(slot).Protocol == sckUDPProtocol;
@@ -31,7 +31,7 @@ void CSocketPlus::SendData(const Value& index, const Value& data) {
 void CSocketPlus::SendBufferedData(Slot slot) {
   const Life life = life_;
   const platform::SocketHandle socket = At(slot).SocketHandle;
-  const Value index = At(slot).Index;
+  const Variant index = At(slot).Index;
   std::int64_t total = 0;
   while (StillHolds(life, slot, socket) && !At(slot).SendBuffer.IsEmpty()) {
     ByteQueue& buffer = At(slot).SendBuffer;
@@ -87,16 +87,16 @@ std::int32_t CSocketPlus::AmountWaiting(Slot slot) {
   return static_cast<std::int32_t>(amount);
 }
 
-void CSocketPlus::GetData(const Value& index, Value& data, DataKind kind, const Value& maxLength) {
+void CSocketPlus::GetData(const Variant& index, Variant& data, DataKind kind, const Variant& maxLength) {
   TakeData(index, data, kind, maxLength, false, u"CSocketPlus.GetData");
 }
 
-void CSocketPlus::PeekData(const Value& index, Value& data, DataKind kind, const Value& maxLength) {
+void CSocketPlus::PeekData(const Variant& index, Variant& data, DataKind kind, const Variant& maxLength) {
   TakeData(index, data, kind, maxLength, true, u"CSocketPlus.PeekData");
 }
 
-void CSocketPlus::TakeData(const Value& index, Value& data, DataKind kind, const Value& maxLength, bool peek,
-                           const char16_t* source) {
+void CSocketPlus::TakeData(const Variant& index, Variant& data, DataKind kind, const Variant& maxLength,
+                           bool peek, const char16_t* source) {
   const Slot slot = GetSocketIndex(index);
   if (At(slot).Protocol == sckUDPProtocol) {
     if (At(slot).State != sckOpen) throw Misuse(kWrongProtocolOrState, source);
@@ -105,19 +105,19 @@ void CSocketPlus::TakeData(const Value& index, Value& data, DataKind kind, const
     throw Misuse(kWrongProtocolOrState, source);
   }
   std::int32_t most = 0;
-  if (!IsEmpty(maxLength)) {
-    const auto number = NumberIn(maxLength);
+  if (!maxLength.IsMissing()) {
+    const auto number = maxLength.NumberIfAny();
     if (number && *number < 0) throw Misuse(kInvalidArgumentFault, source);
-    most = number ? ToInt32(maxLength) : AmountWaiting(slot);
+    most = number ? maxLength.AsInt32() : AmountWaiting(slot);
   }
-  RecvData(slot, data, kind, most, !IsEmpty(maxLength), peek);
+  RecvData(slot, data, kind, most, !maxLength.IsMissing(), peek);
 }
 
-void CSocketPlus::RecvData(Slot slot, Value& data, DataKind kind, std::int32_t maxLength, bool bounded,
+void CSocketPlus::RecvData(Slot slot, Variant& data, DataKind kind, std::int32_t maxLength, bool bounded,
                            bool peek) {
   constexpr auto kSource = u"CSocketPlus.RecvData";
   const auto waiting = static_cast<std::size_t>(AmountWaiting(slot));
-  const DataKind own = KindOf(data);
+  const DataKind own = data.Kind();
   const DataKind asked = own != DataKind::None ? own : kind != DataKind::None ? kind : DataKind::ByteArray;
   if (asked == DataKind::Other) throw Misuse(kUnsupportedType, kSource);
   if (const std::size_t size = SizeOf(asked)) {

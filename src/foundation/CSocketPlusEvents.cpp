@@ -35,7 +35,7 @@ void CSocketPlus::OnRead(Slot slot) {
     return;
   }
   if (At(slot).State != sckConnected || RecvDataToBuffer(slot) <= 0) return;
-  const Value index = At(slot).Index;
+  const Variant index = At(slot).Index;
   Events.DataArrival(index, ::quendra::ToInt32(static_cast<std::int64_t>(At(slot).RecvBuffer.Size())));
 }
 
@@ -44,7 +44,7 @@ void CSocketPlus::OnReadUDP(Slot slot) {
   const platform::SocketHandle socket = At(slot).SocketHandle;
   const std::int32_t waiting = AmountWaiting(slot);
   if (waiting > 0) {
-    const Value index = At(slot).Index;
+    const Variant index = At(slot).Index;
     Events.DataArrival(index, waiting);
   }
   if (!StillHolds(life, slot, socket)) return;
@@ -58,14 +58,14 @@ void CSocketPlus::OnConnect(Slot slot) {
   StoreLocalAddress(slot);
   StorePeerAddress(slot);
   At(slot).State = sckConnected;
-  const Value index = At(slot).Index;
+  const Variant index = At(slot).Index;
   Events.Connect(index);
 }
 
 void CSocketPlus::OnClose(Slot slot) {
   if (At(slot).State != sckConnected) return;
   At(slot).State = sckClosing;
-  const Value index = At(slot).Index;
+  const Variant index = At(slot).Index;
   Events.CloseSck(index);
 }
 
@@ -94,7 +94,7 @@ void CSocketPlus::OfferConnection(Slot slot, platform::SocketHandle accepted) {
   At(slot).RemotePort = peer.port;
   At(slot).RemoteHostIP = peer.address.AsText();
   At(slot).RemoteHost.clear();
-  const Value index = At(slot).Index;
+  const Variant index = At(slot).Index;
   Events.ConnectionRequest(index, accepted);
   if (!StillHolds(life, slot, listener) || At(slot).State != sckListening) return;
   At(slot).RemotePort = port;
@@ -102,7 +102,7 @@ void CSocketPlus::OfferConnection(Slot slot, platform::SocketHandle accepted) {
   At(slot).RemoteHost = host;
 }
 
-void CSocketPlus::Accept(const Value& index, platform::SocketHandle requestID) {
+void CSocketPlus::Accept(const Variant& index, platform::SocketHandle requestID) {
   const Slot slot = GetSocketIndex(index);
   if (At(slot).State != sckClosed) throw Misuse(kInvalidAtCurrentState, u"CSocketPlus.Accept");
   At(slot).SocketHandle = requestID;
@@ -125,23 +125,23 @@ void CSocketPlus::Accept(const Value& index, platform::SocketHandle requestID) {
 
 void CSocketPlus::TakePending(Slot slot, platform::SocketHandle requestID) {
   const Life life = life_;
-  const Value pendingIndex = Text(u"Temporal_Socket");
+  const Variant pendingIndex = Text(u"Temporal_Socket");
   const auto held = module_.GetAcceptClass(requestID);
   CSocketPlus& pending = *held;
   StoreLocalAddress(slot);
   StorePeerAddress(slot);
   At(slot).State = sckConnected;
   if (pending.BytesReceived(pendingIndex) > 0) {
-    Value data;
+    Variant data;
     pending.GetData(pendingIndex, data, DataKind::ByteArray);
-    At(slot).RecvBuffer.Append(std::get<ByteArray>(data));
+    At(slot).RecvBuffer.Append(*data.Find<ByteArray>());
   }
   const bool peerClosed = pending.State(pendingIndex) == sckClosing;
   slotsBySocket_[requestID] = slot;
   module_.ChangeSocketOwner(requestID, this);
   module_.UnregisterAccept(requestID);
 
-  const Value index = At(slot).Index;
+  const Variant index = At(slot).Index;
   if (!At(slot).RecvBuffer.IsEmpty())
     Events.DataArrival(index, ::quendra::ToInt32(static_cast<std::int64_t>(At(slot).RecvBuffer.Size())));
   if (!peerClosed || !StillHolds(life, slot, requestID)) return;

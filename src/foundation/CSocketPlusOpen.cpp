@@ -17,22 +17,22 @@ constexpr auto kLookUpRunning = platform::Ipv4Address::FromMemory(1);
 constexpr std::size_t kResolveBufferSize = 1024;
 constexpr std::int32_t kListenBacklog = 5;
 
-std::int32_t PortArgument(const Value& port, std::int32_t lowest, const char16_t* source) {
-  const auto number = NumberIn(port);
+std::int32_t PortArgument(const Variant& port, std::int32_t lowest, const char16_t* source) {
+  const auto number = port.NumberIfAny();
   if (!number) throw Misuse(kUnsupportedType, source);
   if (!(*number >= lowest && *number <= 65535)) throw Misuse(kInvalidArgumentFault, source);
-  return ToInt32(port);
+  return port.AsInt32();
 }
 
 } // namespace
 
-void CSocketPlus::Connect(const Value& index, const Value& remoteHost, const Value& remotePort) {
+void CSocketPlus::Connect(const Variant& index, const Variant& remoteHost, const Variant& remotePort) {
   constexpr auto kSource = u"CSocketPlus.Connect";
   const Slot slot = GetSocketIndex(index);
   if (At(slot).State != sckClosed) throw Misuse(kInvalidAtCurrentState, kSource);
-  const bool isNull = std::holds_alternative<Null>(remoteHost);
-  if (!IsEmpty(remoteHost)) At(slot).RemoteHost = isNull ? Text{} : ToText(remoteHost);
-  if (!IsEmpty(remotePort)) At(slot).RemotePort = PortArgument(remotePort, 1, kSource);
+  const bool isNull = remoteHost.Is<Null>();
+  if (!remoteHost.IsMissing()) At(slot).RemoteHost = isNull ? Text{} : remoteHost.AsText();
+  if (!remotePort.IsMissing()) At(slot).RemotePort = PortArgument(remotePort, 1, kSource);
   if (!SocketExists(slot)) return;
   if (!BindInternal(slot)) return;
   if (At(slot).Protocol == sckUDPProtocol) {
@@ -43,13 +43,13 @@ void CSocketPlus::Connect(const Value& index, const Value& remoteHost, const Val
   if (address != kLookUpRunning) ConnectToIP(slot, address, 0);
 }
 
-void CSocketPlus::Bind(const Value& index, const Value& localPort, const Value& localIP) {
+void CSocketPlus::Bind(const Variant& index, const Variant& localPort, const Variant& localIP) {
   const Slot slot = GetSocketIndex(index);
   if (At(slot).State != sckClosed) throw Misuse(kInvalidAtCurrentState, u"CSocketPlus.Bind");
   if (BindInternal(slot, localPort, localIP)) At(slot).State = sckOpen;
 }
 
-void CSocketPlus::Listen(const Value& index) {
+void CSocketPlus::Listen(const Variant& index) {
   constexpr auto kSource = u"CSocketPlus.Listen";
   const Slot slot = GetSocketIndex(index);
   if (At(slot).State != sckClosed && At(slot).State != sckOpen) throw Misuse(kInvalidAtCurrentState, kSource);
@@ -94,11 +94,11 @@ void CSocketPlus::ProcessOptions(Slot slot) {
   }
 }
 
-bool CSocketPlus::BindInternal(Slot slot, const Value& port, const Value& address) {
+bool CSocketPlus::BindInternal(Slot slot, const Variant& port, const Variant& address) {
   constexpr auto kSource = u"CSocketPlus.BindInternal";
   if (At(slot).State == sckOpen) return true;
-  const std::int32_t wanted = IsEmpty(port) ? At(slot).LocalPort : PortArgument(port, 0, kSource);
-  const Text host = IsEmpty(address) ? Text{} : ToText(address);
+  const std::int32_t wanted = port.IsMissing() ? At(slot).LocalPort : PortArgument(port, 0, kSource);
+  const Text host = address.IsMissing() ? Text{} : address.AsText();
   platform::SocketAddress local;
   local.port = static_cast<std::uint16_t>(wanted);
   if (!host.empty()) {

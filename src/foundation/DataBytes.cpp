@@ -41,7 +41,7 @@ struct ByteWriter {
 
 } // namespace
 
-std::optional<ByteArray> BytesOf(const Value& value) { return std::visit(ByteWriter{}, value); }
+std::optional<ByteArray> BytesOf(const Variant& value) { return value.Visit(ByteWriter{}); }
 
 std::size_t SizeOf(DataKind kind) {
   switch (kind) {
@@ -57,7 +57,7 @@ std::size_t SizeOf(DataKind kind) {
   }
 }
 
-Value ValueOf(DataKind kind, ByteArray bytes) {
+Variant ValueOf(DataKind kind, ByteArray bytes) {
   switch (kind) {
   case DataKind::Byte: return bytes[0];
   case DataKind::Boolean: return FromRaw<std::int16_t>(bytes) != 0;

@@ -1,7 +1,8 @@
 #pragma once
 
-#include "foundation/Value.h"
+#include "foundation/ByteQueue.h"
 #include "platform/net/Sockets.h"
+#include "runtime/Variant.h"
 
 #include <map>
 #include <memory>
@@ -45,7 +46,7 @@ struct SocketRecord {
   std::int32_t SendBufferSize = 0;
   std::int32_t RecvBufferSize = 0;
   std::vector<std::uint32_t> ResolveRequests; ///< look-up handles under way
-  Value Index;
+  Variant Index;
 
   /// What a slot is set to before it waits in the free list: its ports are -1 then, where a new slot's are 0.
   static SocketRecord Freed() {

@@ -46,8 +46,8 @@ void ProcessRowAdder::AddCells(forms::ListRow& row, const Text& name, const Text
   row.AddCell(name, path);
   row.AddCell(class_, Tick());
   row.AddCell(std::move(ports), Tick());
-  for (int cell = kUploadCell; cell <= kOverallCell; ++cell) row.AddCell(u"0", 0);
-  for (int cell = kPreviousUploadCell; cell <= kPreviousDownloadCell; ++cell) row.AddCell({}, 0);
+  for (int cell = kUploadCell; cell <= kOverallCell; ++cell) row.AddCell(u"0", 0.0);
+  for (int cell = kPreviousUploadCell; cell <= kPreviousDownloadCell; ++cell) row.AddCell({}, 0.0);
 }
 
 std::int32_t ProcessRowAdder::Tick() const {

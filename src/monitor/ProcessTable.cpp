@@ -46,7 +46,7 @@ double ProcessTable::SecondsSinceLastRefresh() const {
 
 void ProcessTable::ClearMarks() {
   for (int i = 1; i <= page_.main_ListView1.Count(); ++i)
-    page_.main_ListView1.Row(i).CellTag(kApplicationCell) = {};
+    page_.main_ListView1.Row(i).CellTag(kApplicationCell) = Text();
 }
 
 TrafficSums ProcessTable::WalkSnapshot(platform::Handle snapshot, double seconds) {

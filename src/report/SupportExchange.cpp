@@ -5,8 +5,6 @@
 
 namespace quendra::report {
 
-using foundation::Value;
-
 namespace {
 
 constexpr std::int16_t kProcsPage = 1;
@@ -21,9 +19,9 @@ constexpr const char16_t* kHebrewTitle = u"זלמר בינלאומי@נט";
 constexpr const char16_t* kDefaultTitle = u"Quendra";
 
 /// 0, which no socket has, for an index that is no number.
-std::int32_t NumberOfIndex(const Value& index) {
-  if (const auto* number = std::get_if<std::int16_t>(&index)) return *number;
-  const auto* number = std::get_if<std::int32_t>(&index);
+std::int32_t NumberOfIndex(const Variant& index) {
+  if (const auto* number = index.Find<std::int16_t>()) return *number;
+  const auto* number = index.Find<std::int32_t>();
   return number ? *number : 0;
 }
 
@@ -128,9 +126,9 @@ void SupportExchange::OfferReport() {
 }
 
 Text SupportExchange::TakeText(Index index) {
-  Value data = Text();
+  Variant data = Text();
   OpenSockets().GetData(index, data);
-  return std::get<Text>(std::move(data));
+  return std::move(*data.Find<Text>());
 }
 
 void SupportExchange::NumberArrived() {

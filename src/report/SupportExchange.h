@@ -34,7 +34,7 @@ class SupportExchange {
   Text ReportReply; ///< what has come of the reply to the report
 
  private:
-  using Index = const foundation::Value&;
+  using Index = const Variant&;
 
   void main_spSockets_Connect(Index index);
   void main_spSockets_DataArrival(Index index);

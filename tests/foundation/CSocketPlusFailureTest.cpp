@@ -226,7 +226,7 @@ TEST_F(SocketFailures, A_datagram_that_can_not_be_read_is_raised_from_RecvData) 
   Object->Bind(1);
   Net().SendDatagram("10.1.1.1", 53, static_cast<std::uint16_t>(Object->LocalPort(1)), "answer");
   Net().Fail("recvfrom", 10052);
-  Value data;
+  Variant data;
   EXPECT_EQ(FaultText([&] { Object->GetData(1, data); }),
             "10052 Network dropped connection on reset. [CSocketPlus.RecvData]");
 }
@@ -318,7 +318,7 @@ TEST_F(SocketFailures, Error_numbers_are_cut_to_16_bits_and_unknown_ones_have_th
   Connect(1);
   std::int16_t number = 0;
   Text description;
-  Object->Events.Error = [&](const Value&, std::int16_t n, const Text& d, auto&&...) {
+  Object->Events.Error = [&](const Variant&, std::int16_t n, const Text& d, auto&&...) {
     number = n;
     description = d;
   };
@@ -331,11 +331,11 @@ TEST_F(SocketFailures, Error_numbers_are_cut_to_16_bits_and_unknown_ones_have_th
 TEST_F(SocketFailures, Error_comes_with_empty_help_a_code_of_0_and_CancelDisplay_set) {
   Add(1);
   bool asked = false;
-  Object->Events.Error = [&](const Value& index, std::int16_t number, const Text& description,
+  Object->Events.Error = [&](const Variant& index, std::int16_t number, const Text& description,
                              std::int32_t code, const Text& source, const Text& helpFile,
                              std::int32_t helpContext, bool& cancelDisplay) {
     asked = true;
-    EXPECT_EQ(index, Value(1));
+    EXPECT_EQ(index, Variant(1));
     EXPECT_EQ(number, 10061);
     EXPECT_EQ(description, u"Connection refused.");
     EXPECT_EQ(code, 0);
@@ -353,7 +353,7 @@ TEST_F(SocketFailures, Error_comes_with_empty_help_a_code_of_0_and_CancelDisplay
 
 TEST_F(SocketFailures, A_handler_that_clears_CancelDisplay_has_the_error_shown_with_its_source_as_title) {
   Add(1);
-  Object->Events.Error = [](const Value&, std::int16_t, const Text&, std::int32_t, const Text&, const Text&,
+  Object->Events.Error = [](const Variant&, std::int16_t, const Text&, std::int32_t, const Text&, const Text&,
                             std::int32_t, bool& cancelDisplay) { cancelDisplay = false; };
   Server.Refuse();
   Object->Connect(1, Text(u"10.1.1.1"), 80);

@@ -22,17 +22,17 @@ TEST_F(SocketIndexes, A_16_bit_and_a_32_bit_number_are_the_same_index) {
 }
 
 TEST_F(SocketIndexes, ArrayAdd_gives_the_index_back) {
-  EXPECT_EQ(Object->ArrayAdd(Text(u"mail")), Value(Text(u"mail")));
-  EXPECT_EQ(Object->ArrayAdd(-5), Value(-5));
+  EXPECT_EQ(Object->ArrayAdd(Text(u"mail")), Variant(Text(u"mail")));
+  EXPECT_EQ(Object->ArrayAdd(-5), Variant(-5));
 }
 
 TEST_F(SocketIndexes, ArrayAdd_without_an_index_takes_the_lowest_free_number_from_1) {
   Object->ArrayAdd(2);
   Object->ArrayAdd(Text(u"1"));
-  EXPECT_EQ(Object->ArrayAdd(), Value(1));
-  EXPECT_EQ(Object->ArrayAdd(), Value(3));
+  EXPECT_EQ(Object->ArrayAdd(), Variant(1));
+  EXPECT_EQ(Object->ArrayAdd(), Variant(3));
   Object->ArrayRemove(1);
-  EXPECT_EQ(Object->ArrayAdd(), Value(1));
+  EXPECT_EQ(Object->ArrayAdd(), Variant(1));
 }
 
 TEST_F(SocketIndexes, ArrayAdd_of_an_index_in_use_raises_457_and_the_count_stays) {
@@ -63,8 +63,8 @@ TEST_F(SocketIndexes, ArrayAdd_of_an_index_in_use_leaves_the_grown_array_behind)
 }
 
 TEST_F(SocketIndexes, ArrayAdd_of_another_type_raises_40027) {
-  for (const Value& index : {Value(Null()), Value(true), Value(std::uint8_t{1}), Value(1.0), Value(Date{1}),
-                             Value(Currency{1}), Value(BytesFrom("1"))})
+  for (const Variant& index : {Variant(Null()), Variant(true), Variant(std::uint8_t{1}), Variant(1.0),
+                               Variant(Date{1}), Variant(Currency{1}), Variant(BytesFrom("1"))})
     EXPECT_EQ(FaultText([&] { Object->ArrayAdd(index); }),
               "40027 Unsupported index type. [CSocketPlus.ArrayAdd]");
   EXPECT_EQ(Object->ArrayCount(), 0);
@@ -101,7 +101,7 @@ TEST_F(SocketIndexes, ArrayRemove_of_another_type_fails_at_the_search_for_its_sl
 
 TEST_F(SocketIndexes, ArrayRemove_closes_the_socket_and_gives_the_index_back) {
   Connect(1);
-  EXPECT_EQ(Object->ArrayRemove(1), Value(1));
+  EXPECT_EQ(Object->ArrayRemove(1), Variant(1));
   EXPECT_TRUE(Peer().Ended);
   EXPECT_FALSE(Object->ArrayIndexInUse(1));
   EXPECT_EQ(Object->ArrayCount(), 0);

@@ -21,14 +21,14 @@ TEST_F(SocketMisuses, SendData_needs_a_connection) {
 
 TEST_F(SocketMisuses, GetData_and_PeekData_need_a_connection) {
   Add(1);
-  Value data;
+  Variant data;
   EXPECT_EQ(FaultText([&] { Object->GetData(1, data); }), kWrongState + "[CSocketPlus.GetData]");
   EXPECT_EQ(FaultText([&] { Object->PeekData(1, data); }), kWrongState + "[CSocketPlus.PeekData]");
 }
 
 TEST_F(SocketMisuses, GetData_and_PeekData_of_datagrams_need_an_open_socket) {
   Add(1, sckUDPProtocol);
-  Value data;
+  Variant data;
   EXPECT_EQ(FaultText([&] { Object->GetData(1, data); }), kWrongState + "[CSocketPlus.GetData]");
   EXPECT_EQ(FaultText([&] { Object->PeekData(1, data); }), kWrongState + "[CSocketPlus.PeekData]");
 }
@@ -66,8 +66,8 @@ TEST_F(SocketMisuses, LocalPort_takes_0_to_65535) {
 
 TEST_F(SocketMisuses, Connect_takes_ports_1_to_65535_of_any_numeric_type) {
   Add(1);
-  for (const Value& port :
-       {Value(0), Value(-1), Value(65536), Value(1e12), Value(65535.5), Value(Text(u"0"))})
+  for (const Variant& port :
+       {Variant(0), Variant(-1), Variant(65536), Variant(1e12), Variant(65535.5), Variant(Text(u"0"))})
     EXPECT_EQ(FaultText([&] { Object->Connect(1, Text(u"10.1.1.1"), port); }),
               kOutOfRange + "[CSocketPlus.Connect]");
   Object->Connect(1, Text(u"10.1.1.1"), Text(u" 80 "));
@@ -92,7 +92,7 @@ TEST_F(SocketMisuses, Bind_takes_ports_0_to_65535) {
 
 TEST_F(SocketMisuses, A_maximum_below_0_is_out_of_range) {
   Connect(1);
-  Value data;
+  Variant data;
   EXPECT_EQ(FaultText([&] { Object->GetData(1, data, DataKind::None, -1); }),
             kOutOfRange + "[CSocketPlus.GetData]");
   EXPECT_EQ(FaultText([&] { Object->PeekData(1, data, DataKind::None, -1.0); }),
@@ -129,7 +129,8 @@ TEST_F(SocketMisuses, A_datagram_to_a_host_of_another_family_raises_that_error_i
 
 TEST_F(SocketMisuses, Connect_refuses_a_port_that_is_not_numeric) {
   Add(1);
-  for (const Value& port : {Value(Text(u"http")), Value(Null()), Value(BytesFrom("80")), Value(Date{80})})
+  for (const Variant& port :
+       {Variant(Text(u"http")), Variant(Null()), Variant(BytesFrom("80")), Variant(Date{80})})
     EXPECT_EQ(FaultText([&] { Object->Connect(1, Text(u"10.1.1.1"), port); }),
               kUnsupported + "[CSocketPlus.Connect]");
 }
@@ -141,13 +142,13 @@ TEST_F(SocketMisuses, Bind_refuses_a_port_that_is_not_numeric) {
 
 TEST_F(SocketMisuses, SendData_refuses_values_that_have_no_bytes) {
   Connect(1);
-  for (const Value& data : {Value(), Value(Null())})
+  for (const Variant& data : {Variant(), Variant(Null())})
     EXPECT_EQ(FaultText([&] { Object->SendData(1, data); }), kUnsupported + "[CSocketPlus.SendData]");
 }
 
 TEST_F(SocketMisuses, GetData_refuses_types_that_no_data_is_read_into) {
   Connect(1);
-  Value data = Null();
+  Variant data = Null();
   EXPECT_EQ(FaultText([&] { Object->GetData(1, data); }), kUnsupported + "[CSocketPlus.RecvData]");
   data = {};
   EXPECT_EQ(FaultText([&] { Object->PeekData(1, data, DataKind::Other); }),
@@ -242,41 +243,42 @@ TEST_F(SocketMisuses, A_maximum_that_is_not_numeric_takes_what_waits) {
   Connect(1);
   Peer().Send("abc");
   Settle();
-  Value data = Text();
+  Variant data = Text();
   Object->GetData(1, data, DataKind::None, Text(u"all"));
-  EXPECT_EQ(data, Value(Text(u"abc")));
+  EXPECT_EQ(data, Variant(Text(u"abc")));
 }
 
 TEST_F(SocketMisuses, A_maximum_of_0_empties_the_data_and_leaves_the_stream) {
   Connect(1);
   Peer().Send("abc");
   Settle();
-  Value data = Text(u"before");
+  Variant data = Text(u"before");
   Object->GetData(1, data, DataKind::None, 0);
-  EXPECT_EQ(data, Value(Text()));
+  EXPECT_EQ(data, Variant(Text()));
   EXPECT_EQ(Object->BytesReceived(1), 3);
 }
 
 TEST_F(SocketMisuses, GetData_with_nothing_waiting_empties_texts_and_bytes) {
   Connect(1);
-  Value data = Text(u"before");
+  Variant data = Text(u"before");
   Object->GetData(1, data);
-  EXPECT_EQ(data, Value(Text()));
+  EXPECT_EQ(data, Variant(Text()));
   data = {};
   Object->GetData(1, data);
-  EXPECT_EQ(data, Value(ByteArray()));
+  EXPECT_EQ(data, Variant(ByteArray()));
 }
 
 TEST_F(SocketMisuses, The_variables_own_type_goes_before_the_type_asked_for) {
   Connect(1);
   Peer().Send("ab");
   Settle();
-  Value data = std::uint8_t{0};
+  Variant data = std::uint8_t{0};
   Object->GetData(1, data, DataKind::String);
-  EXPECT_EQ(data, Value(std::uint8_t{'a'}));
+  EXPECT_EQ(data, Variant(std::uint8_t{'a'}));
+  EXPECT_EQ(data.Kind(), DataKind::Byte);
   data = {};
   Object->GetData(1, data, DataKind::String);
-  EXPECT_EQ(data, Value(Text(u"b")));
+  EXPECT_EQ(data, Variant(Text(u"b")));
 }
 
 TEST_F(SocketMisuses, Bytes_received_of_a_socket_that_was_never_opened_are_0) {

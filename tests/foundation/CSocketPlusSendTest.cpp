@@ -58,7 +58,7 @@ TEST_F(SocketSends, FD_WRITE_with_nothing_to_send_does_nothing) {
 TEST_F(SocketSends, A_handler_of_SendProgress_that_sends_more_has_it_sent_before_the_completion) {
   Connect(1);
   int left = 2;
-  Object->Events.SendProgress = [&](const Value& index, std::int32_t, std::int32_t) {
+  Object->Events.SendProgress = [&](const Variant& index, std::int32_t, std::int32_t) {
     Object.Events.push_back("progress");
     if (left-- > 0) Object->SendData(index, Text(u"more"));
   };
@@ -70,7 +70,7 @@ TEST_F(SocketSends, A_handler_of_SendProgress_that_sends_more_has_it_sent_before
 
 TEST_F(SocketSends, A_handler_of_SendProgress_that_closes_the_socket_still_gets_SendComplete) {
   Connect(1);
-  Object->Events.SendProgress = [&](const Value& index, std::int32_t, std::int32_t) {
+  Object->Events.SendProgress = [&](const Variant& index, std::int32_t, std::int32_t) {
     Object->CloseSck(index);
   };
   Object->SendData(1, Text(u"data"));
@@ -81,7 +81,7 @@ TEST_F(SocketSends, A_handler_of_SendProgress_that_closes_and_connects_again_sen
   Server.TakeAtMost(2);
   Connect(1);
   bool again = false;
-  Object->Events.SendProgress = [&](const Value& index, std::int32_t, std::int32_t) {
+  Object->Events.SendProgress = [&](const Variant& index, std::int32_t, std::int32_t) {
     if (std::exchange(again, true)) return;
     Object->CloseSck(index);
     Object->Connect(index, Text(u"10.1.1.1"), 80);
@@ -126,7 +126,7 @@ TEST_F(SocketSends, An_echoed_datagram_comes_back) {
   Object->SetRemoteHost(1, u"10.1.1.1");
   Object->SetRemotePort(1, 7);
   std::string taken;
-  Object->Events.DataArrival = [&](const Value& index, std::int32_t) { taken = Object.Take(index); };
+  Object->Events.DataArrival = [&](const Variant& index, std::int32_t) { taken = Object.Take(index); };
   Object->SendData(1, Text(u"echo"));
   Settle();
   EXPECT_EQ(taken, "echo");
@@ -200,7 +200,7 @@ TEST_F(SocketSends, A_connection_that_was_reset_before_it_is_taken_is_connected_
   Add(2);
   Object->Bind(1, 2000);
   Object->Listen(1);
-  Object->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  Object->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     Net().Count("accept");
     Settle();
     Object->Accept(2, request);

@@ -108,7 +108,7 @@ TEST_P(ConnectionSuite, Data_left_in_the_buffer_arrives_with_a_growing_total) {
 TEST_P(ConnectionSuite, Data_taken_in_its_event_arrives_piece_by_piece) {
   std::vector<std::string> pieces;
   const auto far = Connected();
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
     pieces.push_back(program.Take(index));
   };
   far->Send("abc");
@@ -122,7 +122,7 @@ TEST_P(ConnectionSuite, A_reply_that_is_longer_than_the_buffer_of_a_read_comes_i
   const auto far = Connected();
   int arrivals = 0;
   std::string taken;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
     ++arrivals;
     taken += program.Take(index);
   };
@@ -153,18 +153,18 @@ TEST_P(ConnectionSuite, A_maximum_takes_so_much_and_leaves_the_rest) {
   const auto far = Connected();
   far->Send("abcdef");
   ASSERT_TRUE(program.Until("DataArrival 1 6"));
-  Value data = Text();
+  Variant data = Text();
   program->PeekData(1, data, DataKind::None, 2);
-  EXPECT_EQ(data, Value(Text(u"ab")));
+  EXPECT_EQ(data, Variant(Text(u"ab")));
   program->GetData(1, data, DataKind::None, 4);
-  EXPECT_EQ(data, Value(Text(u"abcd")));
+  EXPECT_EQ(data, Variant(Text(u"abcd")));
   program->GetData(1, data, DataKind::None, 40);
-  EXPECT_EQ(data, Value(Text(u"ef")));
+  EXPECT_EQ(data, Variant(Text(u"ef")));
 }
 
 TEST_P(ConnectionSuite, Every_kind_of_element_goes_out_and_comes_back) {
   const auto far = Connected();
-  const std::vector<std::pair<Value, std::string>> elements = {
+  const std::vector<std::pair<Variant, std::string>> elements = {
       {std::uint8_t{200}, std::string("\xC8")},
       {std::int16_t{-2}, std::string("\xFE\xFF")},
       {std::int32_t{66051}, std::string("\x03\x02\x01\0", 4)},
@@ -184,9 +184,10 @@ TEST_P(ConnectionSuite, Every_kind_of_element_goes_out_and_comes_back) {
   far->Send(all);
   ASSERT_TRUE(program.Until("DataArrival 1 " + std::to_string(all.size())));
   for (const auto& [value, bytes] : elements) {
-    Value data;
-    program->GetData(1, data, KindOf(value), static_cast<std::int32_t>(bytes.size()));
+    Variant data;
+    program->GetData(1, data, value.Kind(), static_cast<std::int32_t>(bytes.size()));
     EXPECT_EQ(data, value);
+    EXPECT_EQ(data.Kind(), value.Kind());
   }
   EXPECT_EQ(program->BytesReceived(1), 0);
 }
@@ -195,9 +196,10 @@ TEST_P(ConnectionSuite, A_fixed_element_with_too_few_bytes_waiting_changes_nothi
   const auto far = Connected();
   far->Send("abc");
   ASSERT_TRUE(program.Until("DataArrival 1 3"));
-  Value data = std::int32_t{7};
+  Variant data = std::int32_t{7};
   program->GetData(1, data);
-  EXPECT_EQ(data, Value(std::int32_t{7}));
+  EXPECT_EQ(data, Variant(std::int32_t{7}));
+  EXPECT_EQ(data.Kind(), DataKind::Long);
   EXPECT_EQ(program->BytesReceived(1), 3);
 }
 

@@ -1,4 +1,5 @@
 #include "foundation/DataBytes.h"
+#include "foundation/ByteQueue.h"
 
 #include "runtime/Fault.h"
 
@@ -21,8 +22,8 @@ TEST(DataBytes, Each_kind_has_its_size) {
 }
 
 TEST(DataBytes, Any_boolean_but_0_reads_as_true_and_true_goes_out_as_minus_1) {
-  EXPECT_EQ(ValueOf(DataKind::Boolean, {0, 1}), Value(true));
-  EXPECT_EQ(ValueOf(DataKind::Boolean, {0, 0}), Value(false));
+  EXPECT_EQ(ValueOf(DataKind::Boolean, {0, 1}), Variant(true));
+  EXPECT_EQ(ValueOf(DataKind::Boolean, {0, 0}), Variant(false));
   EXPECT_EQ(BytesOf(true), (ByteArray{0xFF, 0xFF}));
   EXPECT_EQ(BytesOf(false), (ByteArray{0, 0}));
 }
@@ -33,30 +34,30 @@ TEST(DataBytes, Empty_and_null_values_have_no_bytes) {
 }
 
 TEST(Values, Numbers_booleans_and_texts_of_numbers_are_numeric) {
-  EXPECT_EQ(NumberIn(true), -1);
-  EXPECT_EQ(NumberIn(Value()), 0);
-  EXPECT_EQ(NumberIn(Text(u" 1e2 ")), 100);
-  EXPECT_EQ(NumberIn(Currency{15000}), 1.5);
-  EXPECT_EQ(NumberIn(std::uint8_t{255}), 255);
-  EXPECT_FALSE(NumberIn(Text(u"1x")));
-  EXPECT_FALSE(NumberIn(Null()));
-  EXPECT_FALSE(NumberIn(Date{1}));
-  EXPECT_FALSE(NumberIn(ByteArray{1}));
+  EXPECT_EQ(Variant(true).NumberIfAny(), -1);
+  EXPECT_EQ(Variant(Variant()).NumberIfAny(), 0);
+  EXPECT_EQ(Variant(Text(u" 1e2 ")).NumberIfAny(), 100);
+  EXPECT_EQ(Variant(Currency{15000}).NumberIfAny(), 1.5);
+  EXPECT_EQ(Variant(std::uint8_t{255}).NumberIfAny(), 255);
+  EXPECT_FALSE(Variant(Text(u"1x")).NumberIfAny());
+  EXPECT_FALSE(Variant(Null()).NumberIfAny());
+  EXPECT_FALSE(Variant(Date{1}).NumberIfAny());
+  EXPECT_FALSE(Variant(ByteArray{1}).NumberIfAny());
 }
 
 TEST(Values, A_number_is_rounded_to_32_bits_or_raises_what_is_wrong_with_it) {
-  EXPECT_EQ(ToInt32(2.5), 2);
-  EXPECT_THROW(ToInt32(1e12), Fault);
-  EXPECT_THROW(ToInt32(Text(u"x")), Fault);
+  EXPECT_EQ(Variant(2.5).AsInt32(), 2);
+  EXPECT_THROW(Variant(1e12).AsInt32(), Fault);
+  EXPECT_THROW(Variant(Text(u"x")).AsInt32(), Fault);
 }
 
 TEST(Values, Each_value_but_bytes_and_null_has_a_text) {
-  EXPECT_EQ(ToText(Text(u"a")), u"a");
-  EXPECT_EQ(ToText({}), u"");
-  EXPECT_EQ(ToText(true), u"True");
-  EXPECT_EQ(ToText(1.5), u"1.5");
-  EXPECT_THROW(ToText(Null()), Fault);
-  EXPECT_THROW(ToText(ByteArray()), Fault);
+  EXPECT_EQ(Variant(Text(u"a")).AsText(), u"a");
+  EXPECT_EQ(Variant().AsText(), u"");
+  EXPECT_EQ(Variant(true).AsText(), u"True");
+  EXPECT_EQ(Variant(1.5).AsText(), u"1.5");
+  EXPECT_THROW(Variant(Null()).AsText(), Fault);
+  EXPECT_THROW(Variant(ByteArray()).AsText(), Fault);
 }
 
 TEST(ByteQueues, Bytes_leave_in_the_order_in_which_they_came) {

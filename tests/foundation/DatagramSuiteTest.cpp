@@ -44,7 +44,7 @@ TEST_P(DatagramSuite, A_datagram_that_is_taken_leaves_its_sender_in_the_remote_f
   Open();
   program->SetRemoteHost(1, u"old");
   std::string taken;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t total) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t total) {
     EXPECT_EQ(total, 4);
     EXPECT_EQ(program->BytesReceived(index), 4);
     taken = program.Take(index);
@@ -58,17 +58,17 @@ TEST_P(DatagramSuite, A_datagram_that_is_taken_leaves_its_sender_in_the_remote_f
 
 TEST_P(DatagramSuite, A_peek_leaves_the_datagram) {
   Open();
-  std::vector<Value> seen;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+  std::vector<Variant> seen;
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
     for (const bool peek : {true, false}) {
-      Value data = Text();
+      Variant data = Text();
       peek ? program->PeekData(index, data) : program->GetData(index, data);
       seen.push_back(data);
     }
   };
   far->SendTo(program->LocalPort(1), "look");
   ASSERT_TRUE(world->Until([&] { return !seen.empty(); }));
-  EXPECT_EQ(seen, (std::vector<Value>{Text(u"look"), Text(u"look")}));
+  EXPECT_EQ(seen, (std::vector<Variant>{Text(u"look"), Text(u"look")}));
 }
 
 TEST_P(DatagramSuite, A_datagram_that_the_handler_leaves_is_dropped) {
@@ -83,7 +83,7 @@ TEST_P(DatagramSuite, A_datagram_that_the_handler_leaves_is_dropped) {
 TEST_P(DatagramSuite, A_datagram_behind_one_that_was_taken_is_dropped_with_its_event) {
   Open();
   std::vector<std::string> taken;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
     taken.push_back(program.Take(index));
   };
   far->SendTo(program->LocalPort(1), "first");
@@ -105,8 +105,8 @@ TEST_P(DatagramSuite, A_maximum_below_the_datagrams_length_raises_10040_and_the_
   Open();
   int fault = 0;
   std::int32_t left = -1;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
-    Value data;
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
+    Variant data;
     fault = FaultOf([&] { program->GetData(index, data, DataKind::ByteArray, 3); });
     left = program->BytesReceived(index);
   };
@@ -120,8 +120,8 @@ TEST_P(DatagramSuite, A_maximum_of_0_empties_the_data_drops_the_datagram_and_rai
   Open();
   int fault = 0;
   std::int32_t left = -1;
-  Value data = Text(u"before");
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+  Variant data = Text(u"before");
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
     fault = FaultOf([&] { program->PeekData(index, data, DataKind::None, 0); });
     left = program->BytesReceived(index);
   };
@@ -129,14 +129,14 @@ TEST_P(DatagramSuite, A_maximum_of_0_empties_the_data_drops_the_datagram_and_rai
   ASSERT_TRUE(world->Until([&] { return fault != 0; }));
   EXPECT_EQ(fault, 10040);
   EXPECT_EQ(left, 0);
-  EXPECT_EQ(data, Value(Text()));
+  EXPECT_EQ(data, Variant(Text()));
 }
 
 TEST_P(DatagramSuite, GetData_with_nothing_waiting_leaves_the_variable_alone) {
   Open();
-  Value data = Text(u"before");
+  Variant data = Text(u"before");
   program->GetData(1, data, DataKind::None, 0);
-  EXPECT_EQ(data, Value(Text(u"before")));
+  EXPECT_EQ(data, Variant(Text(u"before")));
 }
 
 TEST_P(DatagramSuite, A_datagram_above_the_largest_raises_Error_10040_and_keeps_nothing_to_send) {
@@ -162,9 +162,9 @@ TEST_P(DatagramSuite, Two_sockets_of_the_program_talk_over_datagrams) {
   program->SetRemoteHost(2, u"127.0.0.1");
   program->SetRemotePort(2, program->LocalPort(1));
   std::string taken;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
     taken = program.Take(index);
-    if (index == Value(1)) {
+    if (index == Variant(1)) {
       program->SetRemoteHost(1, u"127.0.0.1");
       program->SendData(1, Text(u"answer"));
     }

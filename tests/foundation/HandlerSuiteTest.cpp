@@ -8,7 +8,7 @@ class HandlerSuite : public SocketSuite {};
 QUENDRA_OVER_BOTH_NETWORKS(HandlerSuite);
 
 TEST_P(HandlerSuite, A_handler_may_remove_its_own_index_in_each_event) {
-  const auto remove = [&](const Value& index) { program->ArrayRemove(index); };
+  const auto remove = [&](const Variant& index) { program->ArrayRemove(index); };
   program->Events.Connect = remove;
   program->ArrayAdd(1);
   program->Connect(1, Text(u"127.0.0.1"), server->Port());
@@ -17,7 +17,7 @@ TEST_P(HandlerSuite, A_handler_may_remove_its_own_index_in_each_event) {
   program.Record(*program);
 
   const auto far = Connected(2);
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) { remove(index); };
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) { remove(index); };
   far->Send("data");
   ASSERT_TRUE(world->Until([&] { return program->ArrayCount() == 0; }));
 
@@ -27,17 +27,17 @@ TEST_P(HandlerSuite, A_handler_may_remove_its_own_index_in_each_event) {
   ASSERT_TRUE(world->Until([&] { return program->ArrayCount() == 0; }));
 
   const auto taking = Connected(4);
-  program->Events.SendProgress = [&](const Value& index, std::int32_t, std::int32_t) { remove(index); };
+  program->Events.SendProgress = [&](const Variant& index, std::int32_t, std::int32_t) { remove(index); };
   program->SendData(4, Text(u"data"));
   EXPECT_EQ(program->ArrayCount(), 0);
 
-  program->Events.Error = [&](const Value& index, auto&&...) { remove(index); };
+  program->Events.Error = [&](const Variant& index, auto&&...) { remove(index); };
   program->ArrayAdd(5);
   program->Connect(5, Text(u"127.0.0.1"), world->ClosedPort());
   ASSERT_TRUE(world->Until([&] { return program->ArrayCount() == 0; }));
 
   const std::int32_t port = Listening(6);
-  program->Events.ConnectionRequest = [&](const Value& index, platform::SocketHandle) { remove(index); };
+  program->Events.ConnectionRequest = [&](const Variant& index, platform::SocketHandle) { remove(index); };
   const auto dialler = world->Dial(port);
   ASSERT_TRUE(world->Until([&] { return program->ArrayCount() == 0 && dialler->Ended(); }));
   EXPECT_FALSE(world->Desktop.Ended);
@@ -47,7 +47,7 @@ TEST_P(HandlerSuite, A_handler_may_remove_its_own_index_in_each_event) {
 TEST_P(HandlerSuite, A_handler_may_end_the_object_in_DataArrival) {
   const auto far = Connected();
   bool ended = false;
-  program->Events.DataArrival = [&](const Value&, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant&, std::int32_t) {
     program.End();
     ended = true;
   };
@@ -62,7 +62,7 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_Connect_and_in_CloseSck) {
   bool ended = false;
   {
     const auto far = Connected();
-    program->Events.CloseSck = [&](const Value&) {
+    program->Events.CloseSck = [&](const Variant&) {
       program.End();
       ended = true;
     };
@@ -71,7 +71,7 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_Connect_and_in_CloseSck) {
   }
   Program second(*world);
   ended = false;
-  second->Events.Connect = [&](const Value&) {
+  second->Events.Connect = [&](const Variant&) {
     second.End();
     ended = true;
   };
@@ -84,7 +84,7 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_Connect_and_in_CloseSck) {
 
 TEST_P(HandlerSuite, A_handler_may_end_the_object_in_SendProgress) {
   const auto far = Connected();
-  program->Events.SendProgress = [&](const Value&, std::int32_t, std::int32_t) { program.End(); };
+  program->Events.SendProgress = [&](const Variant&, std::int32_t, std::int32_t) { program.End(); };
   program->SendData(1, Text(u"data"));
   EXPECT_EQ(program.module.SocketClassCount(), 0);
   EXPECT_FALSE(program.Saw("SendComplete 1"));
@@ -92,8 +92,8 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_SendProgress) {
 
 TEST_P(HandlerSuite, A_handler_may_end_the_object_in_Error_even_if_it_asks_for_the_box) {
   bool ended = false;
-  program->Events.Error = [&](const Value&, std::int16_t, const Text&, std::int32_t, const Text&, const Text&,
-                              std::int32_t, bool& cancelDisplay) {
+  program->Events.Error = [&](const Variant&, std::int16_t, const Text&, std::int32_t, const Text&,
+                              const Text&, std::int32_t, bool& cancelDisplay) {
     cancelDisplay = false;
     program.End();
     ended = true;
@@ -108,7 +108,7 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_Error_even_if_it_asks_for_t
 TEST_P(HandlerSuite, A_handler_may_end_the_object_in_ConnectionRequest) {
   const std::int32_t port = Listening(1);
   bool ended = false;
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle) {
     program.End();
     ended = true;
   };
@@ -122,11 +122,11 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_while_it_takes_a_connection) {
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);
   bool ended = false;
-  program->Events.DataArrival = [&](const Value&, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant&, std::int32_t) {
     program.End();
     ended = true;
   };
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     const auto pending = program.module.GetAcceptClass(request);
     world->Until([&] { return pending->BytesReceived(Text(u"Temporal_Socket")) == 3; });
     program->Accept(2, request);

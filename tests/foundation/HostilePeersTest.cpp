@@ -94,11 +94,11 @@ void SendHundredMegabytes(int connection) {
 TEST_F(HostilePeers, A_reply_of_100_MB_is_taken_by_a_handler_to_the_last_byte) {
   const std::int32_t port = Serve(SendHundredMegabytes);
   std::size_t taken = 0;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t total) {
-    Value data;
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t total) {
+    Variant data;
     program->GetData(index, data);
-    EXPECT_EQ(std::get<ByteArray>(data).size(), static_cast<std::size_t>(total));
-    taken += std::get<ByteArray>(data).size();
+    EXPECT_EQ(data.Find<ByteArray>()->size(), static_cast<std::size_t>(total));
+    taken += data.Find<ByteArray>()->size();
   };
   ConnectTo(port);
   ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
@@ -107,7 +107,7 @@ TEST_F(HostilePeers, A_reply_of_100_MB_is_taken_by_a_handler_to_the_last_byte) {
 
 TEST_F(HostilePeers, A_reply_of_100_MB_that_nobody_takes_waits_whole) {
   const std::int32_t port = Serve(SendHundredMegabytes);
-  program->Events.DataArrival = [](const Value&, std::int32_t) {};
+  program->Events.DataArrival = [](const Variant&, std::int32_t) {};
   ConnectTo(port);
   ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
   EXPECT_EQ(program->BytesReceived(1), static_cast<std::int32_t>(kHundredMegabytes));
@@ -120,7 +120,7 @@ TEST_F(HostilePeers, Ten_thousand_tiny_pieces_all_arrive_in_order) {
     for (int i = 0; i < 10'000; ++i) SendAll(connection, std::to_string(i % 10));
   });
   std::string taken;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) { taken += program.Take(index); };
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) { taken += program.Take(index); };
   ConnectTo(port);
   ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
   ASSERT_EQ(taken.size(), 10'000u);
@@ -146,7 +146,7 @@ TEST_F(HostilePeers, A_reset_while_the_program_sends_is_an_Error) {
     const linger forced{1, 0};
     setsockopt(connection, SOL_SOCKET, SO_LINGER, &forced, sizeof forced);
   });
-  program->Events.Connect = [&](const Value& index) { program->SendData(index, ByteArray(50'000'000)); };
+  program->Events.Connect = [&](const Variant& index) { program->SendData(index, ByteArray(50'000'000)); };
   ConnectTo(port);
   ASSERT_TRUE(Until([&] { return program->State(1) == sckError; }));
   EXPECT_TRUE(program.Events.back().starts_with("Error 1 10054 ")) << program.Events.back();
@@ -169,7 +169,7 @@ TEST_F(HostilePeers, A_peer_that_stops_sending_gets_only_what_was_under_way) {
     for (ssize_t count; (count = recv(connection, buffer.data(), buffer.size(), 0)) > 0;) total += count;
     received = total;
   });
-  program->Events.Connect = [&](const Value& index) { program->SendData(index, ByteArray(kSent)); };
+  program->Events.Connect = [&](const Variant& index) { program->SendData(index, ByteArray(kSent)); };
   ConnectTo(port);
   ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
   closing = true;
@@ -184,10 +184,10 @@ TEST_F(HostilePeers, Nul_bytes_in_any_number_are_data_like_any_other) {
   const std::int32_t port = Serve([](int connection) { SendAll(connection, std::string(100'000, '\0')); });
   ConnectTo(port);
   Text taken;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
-    Value data = Text();
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
+    Variant data = Text();
     program->GetData(index, data);
-    taken += std::get<Text>(data);
+    taken += *data.Find<Text>();
   };
   ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
   EXPECT_EQ(taken, Text(100'000, u'\0'));
@@ -202,7 +202,7 @@ TEST_F(HostilePeers, Urgent_bytes_cost_no_data_and_do_not_hide_the_end) {
     SendAll(connection, "last.");
   });
   std::string taken;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) { taken += program.Take(index); };
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) { taken += program.Take(index); };
   ConnectTo(port);
   ASSERT_TRUE(Until([&] { return program.Saw("CloseSck 1"); }));
   std::erase(taken, '!'); // the kernel keeps the latest aside and takes those before it for data
@@ -275,8 +275,8 @@ TEST_F(HostilePeers, A_flood_of_500_connections_that_are_all_taken_are_500_socke
   program->ArrayAdd(Text(u"listener"));
   program->Listen(Text(u"listener"));
   const std::int32_t port = program->LocalPort(Text(u"listener"));
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
-    const Value index = program->ArrayAdd();
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
+    const Variant index = program->ArrayAdd();
     program->Accept(index, request);
     program->SendData(index, Text(u"!"));
   };
@@ -298,8 +298,8 @@ TEST_F(HostilePeers, A_flood_of_500_connections_that_are_all_taken_are_500_socke
   });
   int closed = 0;
   int arrived = 0;
-  program->Events.CloseSck = [&](const Value&) { ++closed; };
-  program->Events.DataArrival = [&](const Value&, std::int32_t) { ++arrived; };
+  program->Events.CloseSck = [&](const Variant&) { ++closed; };
+  program->Events.DataArrival = [&](const Variant&, std::int32_t) { ++arrived; };
   ASSERT_TRUE(Until([&] { return closed == 500; })) << closed;
   EXPECT_EQ(arrived, 500);
   EXPECT_EQ(program->ArrayCount(), 501);
@@ -311,11 +311,11 @@ TEST_F(HostilePeers, A_thousand_sockets_of_one_object_connect_and_each_gets_its_
   program->Listen(0);
   const std::int32_t port = program->LocalPort(0);
   const auto server = std::make_unique<CSocketPlus>(program.module);
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     server->Accept(server->ArrayAdd(), request);
   };
-  server->Events.DataArrival = [&](const Value& index, std::int32_t) {
-    Value data;
+  server->Events.DataArrival = [&](const Variant& index, std::int32_t) {
+    Variant data;
     server->GetData(index, data);
     server->SendData(index, data);
   };
@@ -326,11 +326,11 @@ TEST_F(HostilePeers, A_thousand_sockets_of_one_object_connect_and_each_gets_its_
     program->ArrayAdd(++next);
     program->Connect(next, Text(u"127.0.0.1"), port);
   };
-  program->Events.Connect = [&](const Value& index) {
-    program->SendData(index, ToText(index));
+  program->Events.Connect = [&](const Variant& index) {
+    program->SendData(index, index.AsText());
     start();
   };
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
     if (program.Take(index) == NameOf(index)) ++answered;
   };
   for (int i = 0; i < 4; ++i) start();
@@ -344,7 +344,7 @@ TEST_F(HostilePeers, A_thousand_exchanges_leave_no_descriptor_and_no_entry_behin
   program->ArrayAdd(0);
   program->Listen(0);
   const std::int32_t port = program->LocalPort(0);
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     program->Accept(program->ArrayAdd(2), request);
     program->SendData(2, Text(u"answer"));
     program->ArrayRemove(2);

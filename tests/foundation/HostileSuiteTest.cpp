@@ -7,12 +7,12 @@ namespace {
 class HostileSuite : public SocketSuite {
  protected:
   using Events = std::vector<std::string>;
-  void OpenDatagrams(const Value& index) {
+  void OpenDatagrams(const Variant& index) {
     program->ArrayAdd(index);
     program->SetProtocol(index, sckUDPProtocol);
     program->Bind(index);
   }
-  void ConnectAgain(const Value& index) {
+  void ConnectAgain(const Variant& index) {
     program->CloseSck(index);
     program->Connect(index, Text(u"127.0.0.1"), server->Port());
   }
@@ -29,30 +29,32 @@ QUENDRA_OVER_BOTH_NETWORKS(HostileSuite);
 
 TEST_P(HostileSuite, A_handler_may_close_and_connect_again_in_each_event) {
   const auto first = Connected();
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) { ConnectAgain(index); };
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) { ConnectAgain(index); };
   first->Send("data");
   const auto second = NextConnection();
   ASSERT_TRUE(UntilState(1, sckConnected));
   EXPECT_EQ(program->BytesReceived(1), 0);
 
-  program->Events.CloseSck = [&](const Value& index) { ConnectAgain(index); };
+  program->Events.CloseSck = [&](const Variant& index) { ConnectAgain(index); };
   second->Close();
   const auto third = NextConnection();
   ASSERT_TRUE(UntilState(1, sckConnected));
 
-  program->Events.Error = [&](const Value& index, auto&&...) { ConnectAgain(index); };
+  program->Events.Error = [&](const Variant& index, auto&&...) { ConnectAgain(index); };
   third->Reset();
   const auto fourth = NextConnection();
   ASSERT_TRUE(UntilState(1, sckConnected));
 
-  program->Events.SendProgress = [&](const Value& index, std::int32_t, std::int32_t) { ConnectAgain(index); };
+  program->Events.SendProgress = [&](const Variant& index, std::int32_t, std::int32_t) {
+    ConnectAgain(index);
+  };
   program->SendData(1, Text(u"data"));
   EXPECT_EQ(program->State(1), sckConnecting);
   const auto fifth = NextConnection();
   ASSERT_TRUE(UntilState(1, sckConnected));
 
   program.Record(*program);
-  program->Events.SendComplete = [&](const Value& index) { ConnectAgain(index); };
+  program->Events.SendComplete = [&](const Variant& index) { ConnectAgain(index); };
   program->SendData(1, Text(u"data"));
   const auto sixth = NextConnection();
   ASSERT_TRUE(UntilState(1, sckConnected));
@@ -62,7 +64,7 @@ TEST_P(HostileSuite, A_handler_may_close_and_connect_again_in_each_event) {
 }
 
 TEST_P(HostileSuite, A_handler_may_remove_its_index_and_add_it_again_in_each_event) {
-  const auto again = [&](const Value& index, auto&&...) {
+  const auto again = [&](const Variant& index, auto&&...) {
     program->ArrayAdd(program->ArrayRemove(index));
     program->SetLocalPort(index, 0);
   };
@@ -92,12 +94,12 @@ TEST_P(HostileSuite, A_handler_may_remove_its_index_and_add_it_again_in_each_eve
 TEST_P(HostileSuite, A_handler_may_remove_the_index_that_takes_a_connection_in_the_events_of_Accept) {
   const std::int32_t port = Listening(1);
   bool closed = false;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) { program->ArrayRemove(index); };
-  program->Events.CloseSck = [&](const Value& index) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) { program->ArrayRemove(index); };
+  program->Events.CloseSck = [&](const Variant& index) {
     program->ArrayRemove(index);
     closed = true;
   };
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     const auto pending = program.module.GetAcceptClass(request);
     ASSERT_TRUE(world->Until([&] { return pending->State(Text(u"Temporal_Socket")) == sckClosing; }));
     program->ArrayAdd(2);
@@ -119,8 +121,8 @@ TEST_P(HostileSuite, A_handler_may_remove_the_index_that_takes_a_connection_in_t
 TEST_P(HostileSuite, Events_that_come_while_a_handler_waits_are_raised_inside_it) {
   const auto far = Connected();
   std::string order;
-  program->Events.CloseSck = [&](const Value&) { order += "c"; };
-  program->Events.DataArrival = [&](const Value&, std::int32_t total) {
+  program->Events.CloseSck = [&](const Variant&) { order += "c"; };
+  program->Events.DataArrival = [&](const Variant&, std::int32_t total) {
     order += "(" + std::to_string(total);
     if (total == 3) {
       far->Send("de");
@@ -136,8 +138,8 @@ TEST_P(HostileSuite, Events_that_come_while_a_handler_waits_are_raised_inside_it
 
 TEST_P(HostileSuite, A_fault_in_a_handler_leaves_the_object_whole) {
   const auto far = Connected();
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
-    Value data;
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
+    Variant data;
     program->GetData(index, data, DataKind::ByteArray, -1);
   };
   const auto socket = static_cast<std::uint32_t>(program->SocketHandle(1));
@@ -222,7 +224,7 @@ TEST_P(HostileSuite, Empty_and_largest_datagrams_in_turn_all_pass) {
   OpenDatagrams(1);
   const auto far = world->OpenDatagrams();
   std::vector<std::size_t> sizes;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t total) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t total) {
     EXPECT_EQ(total, 65507);
     sizes.push_back(program.Take(index).size());
   };
@@ -239,7 +241,7 @@ TEST_P(HostileSuite, A_flood_of_datagrams_raises_an_event_for_every_other_and_le
   OpenDatagrams(1);
   const auto far = world->OpenDatagrams();
   int arrived = 0;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t total) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t total) {
     ++arrived;
     EXPECT_EQ(program.Take(index).size(), static_cast<std::size_t>(total));
   };
@@ -253,13 +255,13 @@ TEST_P(HostileSuite, A_flood_of_datagrams_raises_an_event_for_every_other_and_le
 
 TEST_P(HostileSuite, A_handler_may_remove_close_and_end_a_datagram_socket_in_DataArrival) {
   const auto far = world->OpenDatagrams();
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) { program->ArrayRemove(index); };
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) { program->ArrayRemove(index); };
   OpenDatagrams(1);
   far->SendTo(program->LocalPort(1), "one");
   far->SendTo(program->LocalPort(1), "two");
   ASSERT_TRUE(world->Until([&] { return program->ArrayCount() == 0; }));
 
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) {
     program->CloseSck(index);
     program->Bind(index);
   };
@@ -271,7 +273,7 @@ TEST_P(HostileSuite, A_handler_may_remove_close_and_end_a_datagram_socket_in_Dat
   EXPECT_EQ(program->State(2), sckOpen);
 
   bool ended = false;
-  program->Events.DataArrival = [&](const Value&, std::int32_t) {
+  program->Events.DataArrival = [&](const Variant&, std::int32_t) {
     program.End();
     ended = true;
   };
@@ -294,13 +296,13 @@ TEST_P(HostileSuite, Changing_an_open_datagram_socket_to_TCP_is_refused_and_its_
 TEST_P(HostileSuite, A_text_and_a_number_of_the_same_digits_are_two_sockets_with_events_of_their_own) {
   const auto number = Connected(std::int16_t{1});
   const auto text = Connected(Text(u"1"));
-  std::vector<Value> arrived;
-  program->Events.DataArrival = [&](const Value& index, std::int32_t) { arrived.push_back(index); };
+  std::vector<Variant> arrived;
+  program->Events.DataArrival = [&](const Variant& index, std::int32_t) { arrived.push_back(index); };
   text->Send("x");
   ASSERT_TRUE(world->Until([&] { return arrived.size() == 1; }));
   number->Send("y");
   ASSERT_TRUE(world->Until([&] { return arrived.size() == 2; }));
-  EXPECT_EQ(arrived, (std::vector<Value>{Text(u"1"), std::int16_t{1}}));
+  EXPECT_EQ(arrived, (std::vector<Variant>{Text(u"1"), std::int16_t{1}}));
   EXPECT_EQ(program.Take(std::int32_t{1}), "y");
   program->ArrayRemove(std::int32_t{1});
   EXPECT_EQ(program.Take(Text(u"1")), "x");

@@ -19,7 +19,7 @@ TEST_P(ListenSuite, A_connection_that_nobody_takes_is_closed) {
 TEST_P(ListenSuite, A_connection_taken_by_another_index_is_connected_and_talks) {
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     program->Accept(2, request);
   };
   const auto far = world->Dial(port);
@@ -38,7 +38,7 @@ TEST_P(ListenSuite, The_listener_tells_its_peer_while_the_request_is_raised_and_
   program->SetTag(1, u"tag");
   Text address;
   std::int32_t remotePort = 0;
-  program->Events.ConnectionRequest = [&](const Value& index, platform::SocketHandle) {
+  program->Events.ConnectionRequest = [&](const Variant& index, platform::SocketHandle) {
     address = program->RemoteHostIP(index);
     remotePort = program->RemotePort(index);
   };
@@ -51,7 +51,7 @@ TEST_P(ListenSuite, The_listener_tells_its_peer_while_the_request_is_raised_and_
 
 TEST_P(ListenSuite, The_listener_itself_may_be_closed_and_take_the_connection) {
   const std::int32_t port = Listening(1);
-  program->Events.ConnectionRequest = [&](const Value& index, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant& index, platform::SocketHandle request) {
     program->CloseSck(index);
     program->Accept(index, request);
   };
@@ -65,7 +65,7 @@ TEST_P(ListenSuite, The_listener_itself_may_be_closed_and_take_the_connection) {
 TEST_P(ListenSuite, Data_that_comes_before_Accept_waits_in_the_pending_list) {
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     ASSERT_TRUE(world->Until([&] {
       return program.module.GetAcceptClass(request)->BytesReceived(Text(u"Temporal_Socket")) == 5;
     }));
@@ -82,7 +82,7 @@ TEST_P(ListenSuite, Data_that_comes_before_Accept_waits_in_the_pending_list) {
 TEST_P(ListenSuite, A_peer_that_closes_before_Accept_is_told_behind_its_data) {
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     ASSERT_TRUE(world->Until([&] {
       return program.module.GetAcceptClass(request)->State(Text(u"Temporal_Socket")) == sckClosing;
     }));
@@ -99,7 +99,7 @@ TEST_P(ListenSuite, A_peer_that_closes_before_Accept_is_told_behind_its_data) {
 TEST_P(ListenSuite, A_peer_that_closes_before_it_is_looked_at_is_told_all_the_same) {
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     program->Accept(2, request);
   };
   world->Dial(port)->Close();
@@ -110,7 +110,7 @@ TEST_P(ListenSuite, A_peer_that_resets_before_it_is_looked_at_is_offered_with_it
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);
   Text address;
-  program->Events.ConnectionRequest = [&](const Value& index, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant& index, platform::SocketHandle request) {
     address = program->RemoteHostIP(index);
     program->Accept(2, request);
   };
@@ -128,7 +128,7 @@ TEST_P(ListenSuite, A_peer_that_resets_before_it_is_looked_at_is_offered_with_it
 TEST_P(ListenSuite, A_reset_that_only_the_pending_list_saw_is_told_by_the_next_send) {
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     ASSERT_TRUE(world->Until(
         [&] { return program.module.GetAcceptClass(request)->State(Text(u"Temporal_Socket")) == sckError; }));
     program->Accept(2, request);
@@ -148,7 +148,7 @@ TEST_P(ListenSuite, A_socket_of_the_program_connects_to_another_of_it) {
   const std::int32_t port = Listening(1);
   program->ArrayAdd(2);
   program->ArrayAdd(3);
-  program->Events.ConnectionRequest = [&](const Value&, platform::SocketHandle request) {
+  program->Events.ConnectionRequest = [&](const Variant&, platform::SocketHandle request) {
     program->Accept(2, request);
   };
   program->Connect(3, Text(u"127.0.0.1"), port);

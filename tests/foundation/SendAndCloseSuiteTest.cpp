@@ -29,7 +29,7 @@ TEST_P(SendAndCloseSuite, Big_data_goes_out_in_parts_whose_progress_adds_up) {
   const auto far = Connected();
   std::int64_t reported = 0;
   std::vector<std::int32_t> left;
-  program->Events.SendProgress = [&](const Value&, std::int32_t sent, std::int32_t remaining) {
+  program->Events.SendProgress = [&](const Variant&, std::int32_t sent, std::int32_t remaining) {
     reported += sent;
     left.push_back(remaining);
   };

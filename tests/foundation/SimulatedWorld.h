@@ -31,8 +31,8 @@ class SimulatedWorld : public World {
 /// One object on a simulated machine with a server at 10.1.1.1, port 80, that accepts and stays silent.
 class SocketTest : public testing::Test {
  protected:
-  void Add(const Value& index, SocketProtocol protocol = sckTCPProtocol);
-  void Connect(const Value& index);
+  void Add(const Variant& index, SocketProtocol protocol = sckTCPProtocol);
+  void Connect(const Variant& index);
   platform::simulated::SimulatedSockets& Net() { return World.Machine.sockets; }
   platform::simulated::SimulatedPeer& Peer() { return *Server.Connections.back(); }
   void Settle() { World.Settle(); }

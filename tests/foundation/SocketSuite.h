@@ -15,7 +15,7 @@ namespace quendra::foundation {
 class SocketSuite : public testing::TestWithParam<MakeWorld> {
  protected:
   /// An index that is connected, and the far end of its connection.
-  std::unique_ptr<FarEnd> Connected(const Value& index = 1) {
+  std::unique_ptr<FarEnd> Connected(const Variant& index = 1) {
     program->ArrayAdd(index);
     program->Connect(index, Text(u"127.0.0.1"), server->Port());
     if (!program.Until("Connect " + NameOf(index))) throw std::runtime_error("no connection");
@@ -25,7 +25,7 @@ class SocketSuite : public testing::TestWithParam<MakeWorld> {
     return far;
   }
   /// An index that listens; its port.
-  std::int32_t Listening(const Value& index) {
+  std::int32_t Listening(const Variant& index) {
     program->ArrayAdd(index);
     program->Listen(index);
     return program->LocalPort(index);
@@ -41,7 +41,7 @@ class SocketSuite : public testing::TestWithParam<MakeWorld> {
   bool UntilReceived(FarEnd& far, const std::string& bytes) {
     return world->Until([&] { return far.Received() == bytes; });
   }
-  bool UntilState(const Value& index, SocketState state) {
+  bool UntilState(const Variant& index, SocketState state) {
     return world->Until([&] { return program->State(index) == state; });
   }
 

@@ -14,12 +14,12 @@ std::string FaultText(const std::function<void()>& work) {
   return {};
 }
 
-void SocketTest::Add(const Value& index, SocketProtocol protocol) {
+void SocketTest::Add(const Variant& index, SocketProtocol protocol) {
   Object->ArrayAdd(index);
   Object->SetProtocol(index, protocol);
 }
 
-void SocketTest::Connect(const Value& index) {
+void SocketTest::Connect(const Variant& index) {
   Add(index);
   Object->Connect(index, Text(u"10.1.1.1"), 80);
   Settle();

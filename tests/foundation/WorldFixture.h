@@ -83,7 +83,7 @@ class Program {
     return world_.Until([&] { return Saw(event); });
   }
   /// Takes what waits at an index as bytes of text.
-  std::string Take(const Value& index);
+  std::string Take(const Variant& index);
 
  private:
   World& world_;
@@ -98,7 +98,7 @@ class Program {
 
 /// What a fault says: "40020 description [source]"; empty without one.
 std::string FaultText(const std::function<void()>& work);
-std::string NameOf(const Value& index);
+std::string NameOf(const Variant& index);
 ByteArray BytesFrom(const std::string& text);
 
 } // namespace quendra::foundation

@@ -19,7 +19,7 @@ class StubbornWindows : public forms::MessageWindows {
 class SocketModule : public testing::Test {
  protected:
   std::unique_ptr<CSocketPlus> NewObject() { return std::make_unique<CSocketPlus>(Module); }
-  static void Open(CSocketPlus& object, const Value& index) {
+  static void Open(CSocketPlus& object, const Variant& index) {
     object.ArrayAdd(index);
     object.Bind(index);
   }

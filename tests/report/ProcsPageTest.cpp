@@ -130,7 +130,7 @@ TEST_F(ProcsPage, Its_error_is_shown_under_the_providers_title) {
 }
 
 /// Sockets that the page never makes.
-class OtherIndexes : public ReportTest, public testing::WithParamInterface<foundation::Value> {};
+class OtherIndexes : public ReportTest, public testing::WithParamInterface<Variant> {};
 
 TEST_P(OtherIndexes, Are_ignored_by_each_handler) {
   Server();
@@ -166,9 +166,8 @@ TEST_P(OtherIndexes, Have_errors_that_nobody_shows) {
 }
 
 INSTANTIATE_TEST_SUITE_P(OutsideOneToFour, OtherIndexes,
-                         testing::Values(foundation::Value(std::int16_t{0}),
-                                         foundation::Value(std::int16_t{5}),
-                                         foundation::Value(std::int16_t{-1}), foundation::Value(Text(u"2"))));
+                         testing::Values(Variant(std::int16_t{0}), Variant(std::int16_t{5}),
+                                         Variant(std::int16_t{-1}), Variant(Text(u"2"))));
 
 } // namespace
 } // namespace quendra::report

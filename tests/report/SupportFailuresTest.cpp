@@ -21,7 +21,7 @@ TEST_F(SupportFailures, A_refused_connection_shows_the_error_without_the_provide
 TEST_F(SupportFailures, A_handler_that_leaves_the_display_to_the_socket_class_gets_its_plain_box) {
   Server().Refuse();
   OpenPage();
-  program.supportExchange.Sockets()->Events.Error = [](const foundation::Value&, std::int16_t, const Text&,
+  program.supportExchange.Sockets()->Events.Error = [](const Variant&, std::int16_t, const Text&,
                                                        std::int32_t, const Text&, const Text&, std::int32_t,
                                                        bool& cancelDisplay) { cancelDisplay = false; };
 
@@ -34,7 +34,7 @@ TEST_F(SupportFailures, A_handler_that_leaves_the_display_to_the_socket_class_ge
 TEST_F(SupportFailures, The_page_may_be_left_while_the_socket_class_shows_its_box) {
   Server().Refuse();
   OpenPage();
-  program.supportExchange.Sockets()->Events.Error = [](const foundation::Value&, std::int16_t, const Text&,
+  program.supportExchange.Sockets()->Events.Error = [](const Variant&, std::int16_t, const Text&,
                                                        std::int32_t, const Text&, const Text&, std::int32_t,
                                                        bool& cancelDisplay) { cancelDisplay = false; };
   desktop.WhileBoxStands.push_back([&] { LeavePage(); });

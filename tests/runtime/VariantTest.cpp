@@ -45,6 +45,51 @@ TEST(Variant, Only_a_number_can_be_added_to_in_place) {
   EXPECT_EQ(text.NumberInPlace(), nullptr);
 }
 
+TEST(Variant, Nothing_at_all_is_not_the_empty_text) {
+  EXPECT_TRUE(Variant().IsMissing());
+  EXPECT_FALSE(Variant(u"").IsMissing());
+  EXPECT_TRUE(Variant(u"").IsEmpty());
+  EXPECT_FALSE(Variant() == Variant(u""));
+  EXPECT_FALSE(Variant() == Variant(0));
+}
+
+TEST(Variant, A_value_is_of_the_kind_that_it_was_made_from) {
+  const std::pair<Variant, DataKind> kinds[] = {
+      {Variant(), DataKind::None},
+      {Null(), DataKind::Other},
+      {true, DataKind::Boolean},
+      {std::uint8_t{1}, DataKind::Byte},
+      {std::int16_t{1}, DataKind::Integer},
+      {std::int32_t{1}, DataKind::Long},
+      {1.0F, DataKind::Single},
+      {1.0, DataKind::Double},
+      {std::uint32_t{1}, DataKind::Double},
+      {Currency{1}, DataKind::Currency},
+      {Date{1}, DataKind::Date},
+      {u"1", DataKind::String},
+      {ByteArray{1}, DataKind::ByteArray},
+  };
+  for (const auto& [value, kind] : kinds) EXPECT_EQ(value.Kind(), kind);
+}
+
+TEST(Variant, Numbers_of_any_width_are_the_same_and_other_kinds_differ) {
+  EXPECT_EQ(Variant(std::uint8_t{5}), Variant(5));
+  EXPECT_EQ(Variant(std::int16_t{5}), Variant(5.0F));
+  EXPECT_FALSE(Variant(5) == Variant(5.5));
+  EXPECT_FALSE(Variant(true) == Variant(-1));
+  EXPECT_FALSE(Variant(Date{1}) == Variant(1));
+  EXPECT_FALSE(Variant(ByteArray{1}) == Variant(ByteArray{2}));
+}
+
+TEST(Variant, What_is_not_numeric_is_a_type_mismatch_as_a_number) {
+  for (const Variant& value : {Variant(Null()), Variant(Date{1}), Variant(ByteArray{1})}) {
+    EXPECT_THROW((void)value.Number(), Fault);
+    EXPECT_THROW((void)value.AsInt32(), Fault);
+  }
+  EXPECT_EQ(Variant(true).Number(), -1);
+  EXPECT_EQ(Variant(std::int16_t{-7}).Number(), -7);
+}
+
 TEST(Variant, A_number_and_its_text_are_not_the_same) {
   EXPECT_EQ(Variant(1.0), Variant(1));
   EXPECT_FALSE(Variant(1.0) == Variant(u"1"));

@@ -45,9 +45,9 @@ class LiveReportTest : public testing::Test {
     ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[0]));
     // The body as it was built: nothing runs between its building and this.
     auto& connected = program->supportExchange.Sockets()->Events.Connect;
-    connected = [this, handler = connected](const foundation::Value& index) {
+    connected = [this, handler = connected](const Variant& index) {
       handler(index);
-      if (index == foundation::Value(std::int16_t{3}))
+      if (index == Variant(std::int16_t{3}))
         bodySent =
             ToCodePage(ReportBody(program->supportExchange.ReportNumber, program->frmMenu.main_ListView1));
     };

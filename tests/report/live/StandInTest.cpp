@@ -20,7 +20,7 @@ class StandIn : public LiveReportTest {
   void WhenLoaded(std::int32_t bytes, std::function<void()> action) {
     loaded = false;
     auto& arrival = program->supportExchange.Sockets()->Events.DataArrival;
-    arrival = [this, bytes, action = std::move(action), handler = arrival](const foundation::Value& index,
+    arrival = [this, bytes, action = std::move(action), handler = arrival](const Variant& index,
                                                                            std::int32_t total) {
       handler(index, total);
       if (loaded || total < bytes) return;
