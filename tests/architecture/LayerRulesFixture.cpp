@@ -23,8 +23,9 @@ Names With(Names names, const Names& more) {
 /// What each folder may include beside itself. Arrows go down; those that go sideways are all here.
 const std::map<std::string, Names>& Allowed() {
   static const Names subsystems{"monitor", "capture", "report", "diagnostics", "provisioning", "mail"};
-  static const Names backends{"forms/qt",       "forms/win32",      "forms/headless",
-                              "platform/linux", "platform/windows", "platform/simulated"};
+  static const Names backends{
+      "forms/qt",         "forms/win32",        "forms/headless",      "platform/linux",
+      "platform/windows", "platform/simulated", "platform/unavailable"};
   static const Names belowShell = With(subsystems, kBelowSubsystems);
   static const std::map<std::string, Names> allowed{
       {"runtime", {}},
@@ -42,9 +43,11 @@ const std::map<std::string, Names>& Allowed() {
       {"forms/qt", {"forms", "runtime"}},
       {"forms/win32", {"forms", "runtime"}},
       {"forms/headless", {"forms", "runtime"}},
-      {"platform/linux", {"platform", "runtime"}},
-      {"platform/windows", {"platform", "runtime"}},
+      // What a system lacks is answered by the backend that lacks everything.
+      {"platform/linux", {"platform", "platform/unavailable", "runtime"}},
+      {"platform/windows", {"platform", "platform/unavailable", "runtime"}},
       {"platform/simulated", {"platform", "runtime"}},
+      {"platform/unavailable", {"platform", "runtime"}},
   };
   return allowed;
 }

@@ -33,6 +33,7 @@ TEST(LayerRules, An_include_that_goes_down_is_allowed) {
       {"forms/headless/HeadlessLoop.cpp", "#include <poll.h>"},
       {"platform/linux/capture/LinuxCapture.cpp", "#include <pcap/pcap.h>"},
       {"platform/windows/WindowsMachine.cpp", "#include <windows.h>"},
+      {"platform/linux/LinuxMachine.cpp", "#include \"platform/unavailable/UnavailableHandles.h\""},
       {"runtime/Text.cpp", "  #  include <string>  // why"},
   };
   for (const Case& row : cases) EXPECT_TRUE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
@@ -66,6 +67,8 @@ TEST(LayerRules, A_backend_that_is_named_outside_app_is_found) {
       {"platform/Machine.h", "#include \"platform/linux/LinuxMachine.h\""},
       {"forms/headless/HeadlessDesktop.h", "#include \"forms/qt/QtDesktop.h\""},
       {"platform/simulated/SimulatedMachine.h", "#include \"platform/linux/LinuxMachine.h\""},
+      {"platform/Machine.h", "#include \"platform/unavailable/UnavailableMachine.h\""},
+      {"platform/unavailable/UnavailableMachine.h", "#include \"platform/linux/LinuxMachine.h\""},
   };
   for (const Case& row : cases) EXPECT_FALSE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
 }

@@ -6,11 +6,11 @@
 #include "platform/linux/net/LinuxSockets.h"
 #include "platform/linux/process/LinuxProcesses.h"
 #include "platform/linux/process/LinuxTokens.h"
-#include "platform/linux/process/NotAvailable.h"
 #include "platform/linux/programs/LinuxIcons.h"
 #include "platform/linux/programs/LinuxVersionInfo.h"
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
+#include "platform/unavailable/UnavailableHandles.h"
 
 namespace quendra::platform::linux_ {
 
@@ -25,7 +25,7 @@ struct LinuxMachine::Parts {
   IconTheme iconTheme{UserFolders::OfEnvironment()};
 
   LinuxCapture capture;
-  LinuxHandles handles;
+  unavailable::UnavailableHandles handles; // this system has no list of all handles
   LinuxHostNames hostNames{folder};
   LinuxIcons icons{desktopIndex, iconTheme, paths};
   LinuxIpHelper ipHelper{folder, {MayTraceEveryProcess(), ::geteuid()}};

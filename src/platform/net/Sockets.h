@@ -22,7 +22,7 @@ struct SocketAddress {
 };
 
 /// Winsock 1.1 with its notification by window messages. Numbers that fail give kSocketError (or kNoSocket)
-/// and leave the reason for WSAGetLastError. A machine without a network answers as these defaults do.
+/// and leave the reason for WSAGetLastError.
 ///
 /// WSAAsyncSelect makes the socket non-blocking and announces each event of the mask as the message, with the
 /// socket as wParam, the event in the low and an error number in the high word of lParam. An event is
@@ -35,61 +35,44 @@ class Sockets {
   virtual ~Sockets() = default;
 
   /// 0, or the reason itself. `version` is the minor version in the high byte and the major one in the low.
-  virtual std::int32_t WSAStartup(std::uint16_t /*version*/) { return kSubsystemUnavailable; }
+  virtual std::int32_t WSAStartup(std::uint16_t version) = 0;
   virtual std::int32_t WSACleanup() = 0;
-  virtual std::int32_t WSAGetLastError() { return kSubsystemUnavailable; }
+  virtual std::int32_t WSAGetLastError() = 0;
 
-  virtual SocketHandle socket(std::int32_t /*family*/, std::int32_t /*type*/, std::int32_t /*protocol*/) {
-    return kNoSocket;
-  }
+  virtual SocketHandle socket(std::int32_t family, std::int32_t type, std::int32_t protocol) = 0;
   virtual std::int32_t closesocket(SocketHandle socket) = 0;
-  virtual std::int32_t bind(SocketHandle, const SocketAddress&) { return kSocketError; }
-  virtual std::int32_t listen(SocketHandle, std::int32_t /*backlog*/) { return kSocketError; }
-  virtual SocketHandle accept(SocketHandle) { return kNoSocket; }
-  virtual std::int32_t connect(SocketHandle, const SocketAddress&) { return kSocketError; }
-  virtual std::int32_t getsockname(SocketHandle, SocketAddress&) { return kSocketError; }
-  virtual std::int32_t getpeername(SocketHandle, SocketAddress&) { return kSocketError; }
-  virtual std::int32_t getsockopt(SocketHandle, std::int32_t /*level*/, std::int32_t /*option*/,
-                                  std::int32_t& /*value*/) {
-    return kSocketError;
-  }
-  virtual std::int32_t setsockopt(SocketHandle, std::int32_t /*level*/, std::int32_t /*option*/,
-                                  std::int32_t /*value*/) {
-    return kSocketError;
-  }
+  virtual std::int32_t bind(SocketHandle, const SocketAddress&) = 0;
+  virtual std::int32_t listen(SocketHandle, std::int32_t backlog) = 0;
+  virtual SocketHandle accept(SocketHandle) = 0;
+  virtual std::int32_t connect(SocketHandle, const SocketAddress&) = 0;
+  virtual std::int32_t getsockname(SocketHandle, SocketAddress&) = 0;
+  virtual std::int32_t getpeername(SocketHandle, SocketAddress&) = 0;
+  virtual std::int32_t getsockopt(SocketHandle, std::int32_t level, std::int32_t option,
+                                  std::int32_t& value) = 0;
+  virtual std::int32_t setsockopt(SocketHandle, std::int32_t level, std::int32_t option,
+                                  std::int32_t value) = 0;
   /// Command kBytesWaiting: the bytes of the stream, or of the next datagram, that wait.
-  virtual std::int32_t ioctlsocket(SocketHandle, std::uint32_t /*command*/, std::uint32_t& /*value*/) {
-    return kSocketError;
-  }
+  virtual std::int32_t ioctlsocket(SocketHandle, std::uint32_t command, std::uint32_t& value) = 0;
 
   /// The number of bytes taken by the system.
-  virtual std::int32_t send(SocketHandle, std::span<const std::uint8_t> /*bytes*/, std::int32_t /*flags*/) {
-    return kSocketError;
-  }
-  virtual std::int32_t sendto(SocketHandle, std::span<const std::uint8_t> /*bytes*/, std::int32_t /*flags*/,
-                              const SocketAddress&) {
-    return kSocketError;
-  }
+  virtual std::int32_t send(SocketHandle, std::span<const std::uint8_t> bytes, std::int32_t flags) = 0;
+  virtual std::int32_t sendto(SocketHandle, std::span<const std::uint8_t> bytes, std::int32_t flags,
+                              const SocketAddress&) = 0;
   /// The number of bytes read, 0 at the end of the stream. kPeek leaves them there.
   virtual std::int32_t recv(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags) = 0;
   /// A datagram longer than the buffer fills it and fails with kMessageTooLong.
-  virtual std::int32_t recvfrom(SocketHandle, std::span<std::uint8_t> /*buffer*/, std::int32_t /*flags*/,
-                                SocketAddress& /*from*/) {
-    return kSocketError;
-  }
+  virtual std::int32_t recvfrom(SocketHandle, std::span<std::uint8_t> buffer, std::int32_t flags,
+                                SocketAddress& from) = 0;
 
   virtual std::int32_t WSAAsyncSelect(SocketHandle socket, std::uint32_t window, std::uint32_t message,
                                       std::int32_t events) = 0;
   /// Starts a look-up and gives its handle, 0 on failure. When it ends the window gets the message with the
   /// handle as wParam and an error number in the high word of lParam; without an error `buffer` starts with
   /// the count of the name's addresses (32 bits, host order) and the addresses as they lie in memory.
-  virtual std::uint32_t WSAAsyncGetHostByName(std::uint32_t /*window*/, std::uint32_t /*message*/,
-                                              const std::string& /*name*/,
-                                              std::span<std::uint8_t> /*buffer*/) {
-    return 0;
-  }
+  virtual std::uint32_t WSAAsyncGetHostByName(std::uint32_t window, std::uint32_t message,
+                                              const std::string& name, std::span<std::uint8_t> buffer) = 0;
   /// 0 when the look-up was under way: its message will not come and its buffer is not touched any more.
-  virtual std::int32_t WSACancelAsyncRequest(std::uint32_t /*lookUp*/) { return kSocketError; }
+  virtual std::int32_t WSACancelAsyncRequest(std::uint32_t lookUp) = 0;
 
   virtual bool WSAIsBlocking() = 0;
   virtual std::int32_t WSACancelBlockingCall() = 0;

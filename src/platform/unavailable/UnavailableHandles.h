@@ -2,10 +2,12 @@
 
 #include "platform/process/Handles.h"
 
-namespace quendra::platform::linux_ {
+#include <array>
 
-/// This system has no list of all handles: every call fails as an operation that doesn't exist.
-class LinuxHandles : public Handles {
+namespace quendra::platform::unavailable {
+
+/// A system without a list of all handles: every call fails as an operation that doesn't exist.
+class UnavailableHandles : public Handles {
  public:
   std::uint32_t NtQuerySystemInformation(std::uint32_t, std::span<std::uint8_t>,
                                          std::uint32_t& returned) override {
@@ -27,4 +29,4 @@ class LinuxHandles : public Handles {
   }
 };
 
-} // namespace quendra::platform::linux_
+} // namespace quendra::platform::unavailable

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "platform/Machine.h"
+#include "platform/unavailable/UnavailableCaptureControls.h"
+#include "platform/unavailable/UnavailableCaptureLibrary.h"
+#include "platform/unavailable/UnavailableHandles.h"
+#include "platform/unavailable/UnavailableHostNames.h"
+#include "platform/unavailable/UnavailableIcons.h"
+#include "platform/unavailable/UnavailableIpHelper.h"
+#include "platform/unavailable/UnavailableProcesses.h"
+#include "platform/unavailable/UnavailableShellStart.h"
+#include "platform/unavailable/UnavailableSockets.h"
+#include "platform/unavailable/UnavailableSystem.h"
+#include "platform/unavailable/UnavailableTokens.h"
+#include "platform/unavailable/UnavailableVersionInfo.h"
+
+namespace quendra::platform::unavailable {
+
+/// A machine that lacks every family of operations. A new system starts from it and replaces one family after
+/// the other.
+class UnavailableMachine {
+ public:
+  UnavailableMachine() = default;
+  UnavailableMachine(const UnavailableMachine&) = delete;
+
+  Machine Operations() {
+    return {captureControls, captureLibrary, handles, hostNames, icons,  ipHelper,
+            processes,       shellStart,     sockets, system,    tokens, versionInfo};
+  }
+
+  UnavailableCaptureControls captureControls;
+  UnavailableCaptureLibrary captureLibrary;
+  UnavailableHandles handles;
+  UnavailableHostNames hostNames;
+  UnavailableIcons icons;
+  UnavailableIpHelper ipHelper;
+  UnavailableProcesses processes;
+  UnavailableShellStart shellStart;
+  UnavailableSockets sockets;
+  UnavailableSystem system;
+  UnavailableTokens tokens;
+  UnavailableVersionInfo versionInfo;
+};
+
+} // namespace quendra::platform::unavailable

@@ -1,0 +1,116 @@
+#include "platform/unavailable/UnavailableMachine.h"
+
+#include "capture/CaptureState.h"
+#include "shell/ProgramFixture.h"
+
+namespace quendra::shell {
+namespace {
+
+const Text kNoVersion = u"  Error Getting OS Information";
+
+/// A whole program on a machine that lacks everything, save what a test puts in.
+class UnavailableMachineTest : public testing::Test {
+ protected:
+  void ComeHome(const platform::Machine& operations) {
+    program.emplace(operations, desktop);
+    program->Start();
+    ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));
+    ASSERT_TRUE(program->frmMenu.Visible());
+  }
+  void ClickEntry(std::size_t entry) { ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[entry])); }
+  std::vector<Text> BoxTitles() const {
+    std::vector<Text> titles;
+    for (const auto& box : desktop.Boxes) titles.push_back(box.title);
+    return titles;
+  }
+  /// The machine with sockets of another.
+  platform::Machine WithSockets(platform::Sockets& sockets) {
+    const platform::Machine all = machine.Operations();
+    return {all.captureControls, all.captureLibrary, all.handles, all.hostNames, all.icons,  all.ipHelper,
+            all.processes,       all.shellStart,     sockets,     all.system,    all.tokens, all.versionInfo};
+  }
+
+  platform::unavailable::UnavailableMachine machine;
+  platform::simulated::SimulatedMachine other;
+  forms::HeadlessDesktop desktop;
+  std::optional<app::Program> program;
+};
+
+TEST_F(UnavailableMachineTest, The_main_window_comes_up_and_says_that_the_version_is_not_known) {
+  ComeHome(machine.Operations());
+  EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
+  EXPECT_FALSE(desktop.Ended);
+}
+
+TEST_F(UnavailableMachineTest, Pages_that_ask_nothing_of_the_machine_open_and_close) {
+  ComeHome(machine.Operations());
+  ClickEntry(1);
+  EXPECT_TRUE(program->frmMenu.frameSurfProb.Visible());
+  ClickEntry(2);
+  EXPECT_TRUE(program->frmMenu.frameFirstConnection.Visible());
+  desktop.CloseBox(program->frmMenu);
+  EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
+  EXPECT_EQ(desktop.EndStatus, 0);
+}
+
+TEST_F(UnavailableMachineTest, The_monitor_page_ends_the_program_with_the_run_times_message_for_the_network) {
+  ComeHome(machine.Operations());
+  ClickEntry(0);
+  EXPECT_TRUE(desktop.Ended);
+  EXPECT_EQ(desktop.EndStatus, 1);
+  ASSERT_EQ(desktop.Boxes.size(), 2u);
+  EXPECT_EQ(desktop.Boxes[1].text, u"Run-time error '10091':\n\nNetwork subsystem is unavailable.");
+}
+
+TEST_F(UnavailableMachineTest,
+       With_a_network_alone_the_monitor_page_shows_an_empty_table_and_why_nothing_is_captured) {
+  ComeHome(WithSockets(other.sockets));
+  ClickEntry(0);
+  EXPECT_FALSE(desktop.Ended);
+  EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
+  EXPECT_TRUE(program->frmMenu.frameMain.Visible());
+  EXPECT_EQ(program->frmMenu.main_ListView1.Count(), 0);
+  EXPECT_EQ(program->frmMenu.main_cmbAdapters.ListCount(), 0);
+  EXPECT_EQ(program->frmMenu.main_lblCaptureState.Caption(),
+            capture::CaptureStateText(platform::CaptureLibrary::Availability::NoLibrary));
+}
+
+TEST_F(UnavailableMachineTest, With_a_network_alone_the_pages_follow_each_other_and_the_timers_go_on) {
+  ComeHome(WithSockets(other.sockets));
+  for (const std::size_t entry : {0, 1, 2, 0, 2, 1, 0}) {
+    ClickEntry(entry);
+    desktop.Advance(5000);
+  }
+  EXPECT_TRUE(program->frmMenu.frameMain.Visible());
+  EXPECT_FALSE(desktop.Ended);
+  EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
+}
+
+TEST_F(UnavailableMachineTest, Each_family_answers_that_it_is_not_there) {
+  const platform::Machine all = machine.Operations();
+  platform::IpHelper::TcpTable table;
+  platform::FrameBytes frame;
+  platform::CaptureHeader header{};
+  std::int32_t result = 0;
+  const auto control = all.captureControls.Create();
+  control->BindAdapter("eth0", result);
+
+  EXPECT_EQ(result, -1);
+  EXPECT_EQ(all.captureLibrary.VBPcapInit(), -1);
+  EXPECT_LT(all.captureLibrary.vpCapture(frame, header), 0);
+  EXPECT_EQ(frame.UpperBound(), 59);
+  EXPECT_EQ(all.processes.CreateToolhelp32Snapshot(2, 0), platform::kInvalidHandle);
+  EXPECT_NE(all.processes.GetLastError(), 0u);
+  EXPECT_EQ(all.ipHelper.AllocateAndGetTcpExTableFromStack(table), platform::IpHelper::kErrorNotSupported);
+  EXPECT_EQ(table, nullptr);
+  EXPECT_FALSE(all.hostNames.gethostname());
+  EXPECT_EQ(all.hostNames.LastError(), platform::kSubsystemUnavailable);
+  EXPECT_EQ(all.sockets.WSAStartup(257), platform::kSubsystemUnavailable);
+  EXPECT_EQ(all.sockets.socket(2, 1, 6), platform::kNoSocket);
+  EXPECT_EQ(all.icons.ExtractIconExA("C:\\a.exe", 0), platform::kNoHandle);
+  EXPECT_EQ(all.versionInfo.GetFileVersionInfoSizeA("C:\\a.exe"), 0u);
+  EXPECT_FALSE(all.shellStart.Shell("a.exe", 1));
+}
+
+} // namespace
+} // namespace quendra::shell
