@@ -53,16 +53,16 @@ SniffedPacket ReadSniffedPacket(std::span<const std::uint8_t, 2000> buffer) {
   return packet;
 }
 
-void Sniffer::iSubCls_Antes(std::int32_t&, std::int32_t&, std::uint32_t, std::uint32_t, std::uint32_t,
+void Sniffer::iSubCls_Antes(std::int32_t&, std::int32_t&, WindowHandle, std::uint32_t, std::uint32_t,
                             std::uint32_t) {}
 
-void Sniffer::iSubCls_Despues(std::int32_t&, std::uint32_t, std::uint32_t, std::uint32_t wParam,
+void Sniffer::iSubCls_Despues(std::int32_t&, WindowHandle, std::uint32_t, std::uint32_t wParam,
                               std::uint32_t lParam) {
   if (lParam != kReadable) return;
   std::int32_t received = kBufferSize;
   while (received == kBufferSize) {
     std::array<std::uint8_t, kBufferSize> buffer{};
-    received = machine_.sockets.recv(wParam, buffer, 0);
+    received = machine_.sockets.recv(platform::SocketHandle(wParam), buffer, 0);
     if (received > 0) Charge(ReadSniffedPacket(buffer));
   }
 }

@@ -38,15 +38,15 @@ class Sniffer {
 
   bool Active = false;
   std::array<platform::SocketHandle, 2> Sockets{};
-  std::uint32_t Window = 0;
+  WindowHandle Window;
   /// Releases the window's subclass; dropped behind the teardown.
   std::function<void()> UnSubclass;
 
   /// Before the window's own procedure: does nothing.
-  void iSubCls_Antes(std::int32_t& bHandled, std::int32_t& lReturn, std::uint32_t hWnd, std::uint32_t uMsg,
+  void iSubCls_Antes(std::int32_t& bHandled, std::int32_t& lReturn, WindowHandle hWnd, std::uint32_t uMsg,
                      std::uint32_t wParam, std::uint32_t lParam);
   /// Behind it: reads the socket `wParam` to its end when `lParam` tells that it can be read.
-  void iSubCls_Despues(std::int32_t& lReturn, std::uint32_t hWnd, std::uint32_t uMsg, std::uint32_t wParam,
+  void iSubCls_Despues(std::int32_t& lReturn, WindowHandle hWnd, std::uint32_t uMsg, std::uint32_t wParam,
                        std::uint32_t lParam);
   /// Does nothing unless Active.
   void Teardown();

@@ -26,8 +26,9 @@ enum BoxFlags : int {
   kHebrewBox = kRightAligned | kRightToLeft,
 };
 
-using RegionHandle = std::uint32_t;
-using CursorHandle = std::uint32_t;
+using RegionHandle = OpaqueHandle<struct RegionKind>;
+using CursorHandle = OpaqueHandle<struct CursorKind>;
+inline constexpr CursorHandle kNoCursor;
 
 /// What the program's logic sees of the desktop that shows its forms. One thread.
 class Desktop {
@@ -60,7 +61,7 @@ class Desktop {
 
   // Mouse, window shape and messages.
 
-  /// Handle of a system cursor, 0 when there is none. 32649 is the hand.
+  /// Handle of a system cursor, kNoCursor when there is none. 32649 is the hand.
   virtual CursorHandle LoadCursor(int id) = 0;
   virtual void SetCursor(CursorHandle cursor) = 0;
   virtual WindowHandle HandleOf(Form& form) = 0;

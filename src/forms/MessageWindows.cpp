@@ -6,8 +6,9 @@ namespace quendra::forms {
 
 WindowHandle MessageWindows::Create() {
   using Procedure = WindowProcedure::element_type;
-  procedures_[++last_] = std::make_shared<Procedure>([](auto...) { return 0; });
-  return last_;
+  const WindowHandle window(++last_);
+  procedures_[window] = std::make_shared<Procedure>([](auto...) { return 0; });
+  return window;
 }
 
 bool MessageWindows::Destroy(WindowHandle window) { return procedures_.erase(window) > 0; }

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "runtime/OpaqueHandle.h"
+
 #include <cstdint>
 #include <functional>
 #include <map>
@@ -8,7 +10,8 @@
 
 namespace quendra::forms {
 
-using WindowHandle = std::uint32_t;
+using quendra::kNoWindow;
+using quendra::WindowHandle;
 
 /// What answers the messages that reach a window: window, message, wParam, lParam.
 using WindowProcedure = std::shared_ptr<
@@ -19,7 +22,7 @@ class MessageWindows {
  public:
   virtual ~MessageWindows() = default;
 
-  /// The new window's handle, 0 on failure. Its procedure answers 0 to everything.
+  /// The new window's handle, kNoWindow on failure. Its procedure answers 0 to everything.
   virtual WindowHandle Create();
   /// False for a handle that is no window.
   virtual bool Destroy(WindowHandle window);
@@ -34,7 +37,7 @@ class MessageWindows {
 
  private:
   std::map<WindowHandle, WindowProcedure> procedures_;
-  WindowHandle last_ = 0x40000;
+  std::uint32_t last_ = 0x40000;
 };
 
 } // namespace quendra::forms

@@ -52,8 +52,9 @@ void CSocketPlus::Release() {
 std::int32_t CSocketPlus::WndProc(forms::WindowHandle, std::uint32_t message, std::uint32_t wParam,
                                   std::uint32_t lParam) {
   const std::int32_t error = platform::ErrorOfMessage(lParam);
-  if (message == modSocketPlus::kResolveMessage) PostResolution(wParam, error);
-  if (message == modSocketPlus::kSocketMessage) PostSocket(wParam, platform::EventOfMessage(lParam), error);
+  if (message == modSocketPlus::kResolveMessage) PostResolution(platform::LookUpHandle(wParam), error);
+  if (message == modSocketPlus::kSocketMessage)
+    PostSocket(platform::SocketHandle(wParam), platform::EventOfMessage(lParam), error);
   return 0;
 }
 
@@ -109,7 +110,7 @@ Text CSocketPlus::LocalIP(const Variant& index) {
 std::int32_t CSocketPlus::BytesReceived(const Variant& index) { return AmountWaiting(GetSocketIndex(index)); }
 
 std::int32_t CSocketPlus::SocketHandle(const Variant& index) {
-  return static_cast<std::int32_t>(At(GetSocketIndex(index)).SocketHandle);
+  return static_cast<std::int32_t>(At(GetSocketIndex(index)).SocketHandle.Value());
 }
 
 Text CSocketPlus::Tag(const Variant& index) { return At(GetSocketIndex(index)).Tag; }
@@ -140,7 +141,7 @@ void CSocketPlus::CloseSlot(Slot slot) {
 }
 
 void CSocketPlus::CancelResolves(Slot slot) {
-  for (const std::uint32_t handle : std::exchange(At(slot).ResolveRequests, {})) {
+  for (const platform::LookUpHandle handle : std::exchange(At(slot).ResolveRequests, {})) {
     module_.Library().WSACancelAsyncRequest(handle);
     module_.UnregisterResolve(handle);
     slotsByResolve_.erase(handle);

@@ -93,7 +93,7 @@ class CSocketPlus {
   bool BindInternal(Slot slot, const Variant& port = {}, const Variant& address = {});
   platform::Ipv4Address ResolveBlocking(const Text& host, std::int32_t& error);
   platform::Ipv4Address ResolveIfHostname(Slot slot, const Text& host);
-  void PostResolution(std::uint32_t handle, std::int32_t error);
+  void PostResolution(platform::LookUpHandle handle, std::int32_t error);
   void ConnectToIP(Slot slot, platform::Ipv4Address address, std::int32_t error);
   void StoreLocalAddress(Slot slot);
   void StorePeerAddress(Slot slot);
@@ -131,7 +131,7 @@ class CSocketPlus {
   std::unordered_map<Text, Slot> slotsByStringIndex_;
   std::unordered_map<std::int32_t, Slot> slotsByNumericIndex_;
   std::unordered_map<platform::SocketHandle, Slot> slotsBySocket_;
-  std::unordered_map<std::uint32_t, Slot> slotsByResolve_;
+  std::unordered_map<platform::LookUpHandle, Slot> slotsByResolve_;
   bool acceptClass_ = false;
   bool released_ = false;
   std::shared_ptr<const int> life_ = std::make_shared<const int>(0);

@@ -141,8 +141,8 @@ platform::Ipv4Address CSocketPlus::ResolveIfHostname(Slot slot, const Text& host
     At(slot).State = sckError;
     throw Fault(Fault::kOutOfMemory, u"Out of memory", kSource);
   }
-  const std::uint32_t handle = module_.StartResolve(host, *At(slot).LookUpBuffer, this);
-  if (handle != 0) {
+  const platform::LookUpHandle handle = module_.StartResolve(host, *At(slot).LookUpBuffer, this);
+  if (handle != platform::kNoLookUp) {
     At(slot).ResolveRequests.push_back(handle);
     slotsByResolve_[handle] = slot;
   } else {
@@ -152,7 +152,7 @@ platform::Ipv4Address CSocketPlus::ResolveIfHostname(Slot slot, const Text& host
   return kLookUpRunning;
 }
 
-void CSocketPlus::PostResolution(std::uint32_t handle, std::int32_t error) {
+void CSocketPlus::PostResolution(platform::LookUpHandle handle, std::int32_t error) {
   const auto found = slotsByResolve_.find(handle);
   if (found == slotsByResolve_.end()) return;
   const Slot slot = found->second;

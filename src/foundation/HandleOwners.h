@@ -1,5 +1,6 @@
 #pragma once
 
+#include <algorithm>
 #include <cstdint>
 #include <vector>
 
@@ -9,26 +10,51 @@ class CSocketPlus;
 
 /// A pair of parallel arrays from 1: handles and the objects that own them. Grows and never shrinks while the
 /// dispatcher lives; an entry that was freed holds -1 and nothing, and takes the next pair.
-class HandleOwners {
+template <typename Handle> class HandleOwners {
  public:
-  static constexpr std::uint32_t kFree = 0xFFFFFFFF;
+  static constexpr Handle kFree{0xFFFFFFFF};
 
   /// Does nothing for a handle that is there already.
-  void Add(std::uint32_t handle, CSocketPlus* owner);
-  void Remove(std::uint32_t handle);
-  void ChangeOwner(std::uint32_t handle, CSocketPlus* owner);
+  void Add(Handle handle, CSocketPlus* owner) {
+    for (Entry& entry : entries_) {
+      if (entry.handle == handle) return;
+      if (entry.handle != kFree) continue;
+      entry = {handle, owner};
+      return;
+    }
+    entries_.push_back({handle, owner});
+  }
+  void Remove(Handle handle) {
+    if (Entry* found = Find(handle)) *found = {};
+  }
+  void ChangeOwner(Handle handle, CSocketPlus* owner) {
+    if (Entry* found = Find(handle)) found->owner = owner;
+  }
   /// nullptr for a handle that is not there.
-  CSocketPlus* OwnerOf(std::uint32_t handle) const;
-  std::vector<std::uint32_t> HandlesOf(const CSocketPlus* owner) const;
+  CSocketPlus* OwnerOf(Handle handle) const {
+    const auto found = std::find_if(entries_.begin(), entries_.end(),
+                                    [&](const Entry& entry) { return entry.handle == handle; });
+    return handle == kFree || found == entries_.end() ? nullptr : found->owner;
+  }
+  std::vector<Handle> HandlesOf(const CSocketPlus* owner) const {
+    std::vector<Handle> handles;
+    for (const Entry& entry : entries_)
+      if (entry.handle != kFree && entry.owner == owner) handles.push_back(entry.handle);
+    return handles;
+  }
   int Count() const { return static_cast<int>(entries_.size()); }
   void Clear() { entries_.clear(); }
 
  private:
   struct Entry {
-    std::uint32_t handle = kFree;
+    Handle handle = kFree;
     CSocketPlus* owner = nullptr;
   };
-  std::vector<Entry>::iterator Find(std::uint32_t handle);
+  Entry* Find(Handle handle) {
+    for (Entry& entry : entries_)
+      if (entry.handle == handle) return &entry;
+    return nullptr;
+  }
 
   std::vector<Entry> entries_;
 };

@@ -45,7 +45,7 @@ struct SocketRecord {
   ByteQueue RecvBuffer;
   std::int32_t SendBufferSize = 0;
   std::int32_t RecvBufferSize = 0;
-  std::vector<std::uint32_t> ResolveRequests; ///< look-up handles under way
+  std::vector<platform::LookUpHandle> ResolveRequests; ///< look-up handles under way
   Variant Index;
 
   /// What a slot is set to before it waits in the free list: its ports are -1 then, where a new slot's are 0.

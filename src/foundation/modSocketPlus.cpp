@@ -64,19 +64,19 @@ void modSocketPlus::UnregisterSocket(platform::SocketHandle socket) {
 }
 
 void modSocketPlus::ForgetOwner(const CSocketPlus* owner) {
-  for (const std::uint32_t handle : resolves_.HandlesOf(owner)) UnregisterResolve(handle);
-  for (const std::uint32_t handle : socketOwners_.HandlesOf(owner)) UnregisterSocket(handle);
+  for (const platform::LookUpHandle handle : resolves_.HandlesOf(owner)) UnregisterResolve(handle);
+  for (const platform::SocketHandle handle : socketOwners_.HandlesOf(owner)) UnregisterSocket(handle);
 }
 
 bool modSocketPlus::IsSocketRegistered(platform::SocketHandle socket) const {
   return registeredSockets_ && registeredSockets_->contains(socket);
 }
 
-std::uint32_t modSocketPlus::StartResolve(const Text& name, std::span<std::uint8_t> buffer,
-                                          CSocketPlus* owner) {
-  const std::uint32_t handle =
+platform::LookUpHandle modSocketPlus::StartResolve(const Text& name, std::span<std::uint8_t> buffer,
+                                                   CSocketPlus* owner) {
+  const platform::LookUpHandle handle =
       sockets_.WSAAsyncGetHostByName(socketWindow_, kResolveMessage, LibraryName(name), buffer);
-  if (handle != 0) RegisterResolve(handle, owner);
+  if (handle != platform::kNoLookUp) RegisterResolve(handle, owner);
   return handle;
 }
 
@@ -103,7 +103,7 @@ std::shared_ptr<CSocketPlus> modSocketPlus::GetAcceptClass(platform::SocketHandl
 
 void modSocketPlus::CreateWinsockMessageWindow() {
   socketWindow_ = windows_.Create();
-  if (socketWindow_ != 0) return;
+  if (socketWindow_ != forms::kNoWindow) return;
   registeredSockets_.reset();
   throw Fault(Fault::kOutOfMemory, u"Out of memory", u"modSocketPlus.RegisterSocket");
 }
@@ -111,11 +111,11 @@ void modSocketPlus::CreateWinsockMessageWindow() {
 void modSocketPlus::DestroyWinsockMessageWindow() {
   if (!windows_.Destroy(socketWindow_))
     throw Fault(Fault::kOutOfMemory, u"Out of memory", u"modSocketPlus.DestroyWinsockMessageWindow");
-  socketWindow_ = 0;
+  socketWindow_ = forms::kNoWindow;
 }
 
 void modSocketPlus::AttachDispatcher() {
-  if (subclassedWindow_ != 0) return;
+  if (subclassedWindow_ != forms::kNoWindow) return;
   const auto previous = windows_.Procedure(socketWindow_);
   subclassedWindow_ = socketWindow_;
   previousWindowProc_ = previous;
@@ -124,17 +124,19 @@ void modSocketPlus::AttachDispatcher() {
                                       [this, previous](forms::WindowHandle window, std::uint32_t message,
                                                        std::uint32_t wParam, std::uint32_t lParam) {
                                         CSocketPlus* owner = nullptr;
-                                        if (message == kResolveMessage) owner = resolves_.OwnerOf(wParam);
-                                        if (message == kSocketMessage) owner = socketOwners_.OwnerOf(wParam);
+                                        if (message == kResolveMessage)
+                                          owner = resolves_.OwnerOf(platform::LookUpHandle(wParam));
+                                        if (message == kSocketMessage)
+                                          owner = socketOwners_.OwnerOf(platform::SocketHandle(wParam));
                                         return owner ? owner->WndProc(window, message, wParam, lParam)
                                                      : (*previous)(window, message, wParam, lParam);
                                       }));
 }
 
 void modSocketPlus::DetachDispatcher() {
-  if (subclassedWindow_ == 0) return;
+  if (subclassedWindow_ == forms::kNoWindow) return;
   windows_.Replace(subclassedWindow_, previousWindowProc_);
-  subclassedWindow_ = 0;
+  subclassedWindow_ = forms::kNoWindow;
   previousWindowProc_ = nullptr;
 }
 

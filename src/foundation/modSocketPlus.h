@@ -38,10 +38,10 @@ class modSocketPlus {
   /// What is still registered for an object that ends.
   void ForgetOwner(const CSocketPlus* owner);
   bool IsSocketRegistered(platform::SocketHandle socket) const;
-  void RegisterResolve(std::uint32_t handle, CSocketPlus* owner) { resolves_.Add(handle, owner); }
-  void UnregisterResolve(std::uint32_t handle) { resolves_.Remove(handle); }
-  /// The look-up's handle, 0 on failure.
-  std::uint32_t StartResolve(const Text& name, std::span<std::uint8_t> buffer, CSocketPlus* owner);
+  void RegisterResolve(platform::LookUpHandle handle, CSocketPlus* owner) { resolves_.Add(handle, owner); }
+  void UnregisterResolve(platform::LookUpHandle handle) { resolves_.Remove(handle); }
+  /// The look-up's handle, kNoLookUp on failure.
+  platform::LookUpHandle StartResolve(const Text& name, std::span<std::uint8_t> buffer, CSocketPlus* owner);
   void ChangeSocketOwner(platform::SocketHandle socket, CSocketPlus* owner) {
     socketOwners_.ChangeOwner(socket, owner);
   }
@@ -77,12 +77,12 @@ class modSocketPlus {
   forms::MessageWindows& windows_;
   std::int32_t socketClassCount_ = 0;
   bool winsockStarted_ = false;
-  forms::WindowHandle socketWindow_ = 0;
+  forms::WindowHandle socketWindow_;
   std::optional<std::set<platform::SocketHandle>> registeredSockets_;
   std::map<platform::SocketHandle, std::shared_ptr<CSocketPlus>> pendingAccepts_;
-  HandleOwners resolves_;
-  HandleOwners socketOwners_;
-  forms::WindowHandle subclassedWindow_ = 0;
+  HandleOwners<platform::LookUpHandle> resolves_;
+  HandleOwners<platform::SocketHandle> socketOwners_;
+  forms::WindowHandle subclassedWindow_;
   forms::WindowProcedure previousWindowProc_;
 };
 

@@ -62,8 +62,8 @@ void SocketHandleScan::Examine(const HandleEntry& entry, std::vector<PortOwner>&
   if (opened == platform::kInvalidHandle) return;
   const OwnedHandle process(processes, opened);
   platform::Handle copy = platform::kNoHandle;
-  if (!machine_.handles.DuplicateHandle(process.Get(), entry.handle, platform::kOwnProcess, copy,
-                                        kDuplicateAccess, false, 0))
+  if (!machine_.handles.DuplicateHandle(process.Get(), platform::Handle(entry.handle), platform::kOwnProcess,
+                                        copy, kDuplicateAccess, false, 0))
     return;
   const OwnedHandle duplicate(processes, copy);
   const std::optional<Text> name = DeviceName(duplicate.Get());

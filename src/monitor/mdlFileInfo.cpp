@@ -20,7 +20,7 @@ constexpr std::array<TextView, 5> kSystemNames{u"system", u"smss.exe", u"winlogo
 
 /// Needs a text with room for `kPathRoom` characters, fewer than the size that it states.
 Text FirstModulePath(platform::Processes& processes, platform::Handle process) {
-  std::array<std::uint32_t, kModuleTableBytes / sizeof(std::uint32_t)> modules{};
+  std::array<platform::ModuleHandle, kModuleTableBytes / sizeof(platform::ModuleHandle)> modules{};
   if (!processes.EnumProcessModules(process, modules)) return {};
   std::string path(platform::kPathRoom, ' ');
   const std::uint32_t length = processes.GetModuleFileNameExA(process, modules[0], path, kStatedPathSize);

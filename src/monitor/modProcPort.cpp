@@ -29,7 +29,7 @@ bool modProcPort::ScanSocketHandles() {
   return true;
 }
 
-std::int32_t modProcPort::QueryHandlePort(std::uint32_t handle) {
+std::int32_t modProcPort::QueryHandlePort(platform::Handle handle) {
   return SocketHandleScan(machine_).QueryHandlePort(handle);
 }
 

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "runtime/OpaqueHandle.h"
+
 #include <cstdint>
 #include <functional>
 #include <memory>
@@ -22,7 +24,7 @@ class EventLoop {
   virtual void Post(std::function<void()> work) = 0;
   /// Puts a window message behind what is posted already: window, message, wParam, lParam. May be called from
   /// any thread. A loop without windows loses it, as one for a window that has gone is lost.
-  virtual void PostMessage(std::uint32_t /*window*/, std::uint32_t /*message*/, std::uint32_t /*wParam*/,
+  virtual void PostMessage(WindowHandle /*window*/, std::uint32_t /*message*/, std::uint32_t /*wParam*/,
                            std::uint32_t /*lParam*/) {}
   [[nodiscard]] virtual std::unique_ptr<Subscription> StartTimer(int milliseconds,
                                                                  std::function<void()> tick) = 0;

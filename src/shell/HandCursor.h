@@ -12,7 +12,7 @@ class HandCursor {
   void Load() { handle_ = desktop_.LoadCursor(kHand); }
   /// Nothing where the system has no such cursor.
   void Show() const {
-    if (handle_ > 0) desktop_.SetCursor(handle_);
+    if (handle_ != forms::kNoCursor) desktop_.SetCursor(handle_);
   }
   forms::CursorHandle Handle() const { return handle_; }
 
@@ -20,7 +20,7 @@ class HandCursor {
   static constexpr int kHand = 32649;
 
   forms::Desktop& desktop_;
-  forms::CursorHandle handle_ = 0;
+  forms::CursorHandle handle_;
 };
 
 } // namespace quendra::shell

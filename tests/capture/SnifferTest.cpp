@@ -5,7 +5,7 @@
 namespace quendra::capture {
 namespace {
 
-constexpr platform::SocketHandle kSocket = 77;
+constexpr platform::SocketHandle kSocket{77};
 constexpr std::uint32_t kReadable = 1;
 
 /// An IPv4 packet of `size` bytes as a raw socket gives it; the ports stand at `portsAt`.
@@ -89,13 +89,13 @@ TEST(SniffedPackets, An_empty_packet_is_no_fault) { EXPECT_EQ(Read({}).payloadSi
 struct SnifferTest : CaptureProgram {
   SnifferTest() {
     session.ReadLocalAddresses();
-    sniffer.Sockets = {7, 8};
-    sniffer.Window = 9;
+    sniffer.Sockets = {platform::SocketHandle(7), platform::SocketHandle(8)};
+    sniffer.Window = WindowHandle(9);
     AddRow(1, u".1025.");
   }
   void Sniff() {
     std::int32_t result = 0;
-    sniffer.iSubCls_Despues(result, 0, 1025, kSocket, kReadable);
+    sniffer.iSubCls_Despues(result, WindowHandle(), 1025, kSocket.Value(), kReadable);
   }
   forms::ListRow& Row() { return form.main_ListView1.Row(1); }
 
@@ -112,7 +112,7 @@ TEST_F(SnifferTest, A_readable_socket_is_read_and_its_packet_charged_by_its_payl
 TEST_F(SnifferTest, Any_other_event_of_a_socket_is_passed_over) {
   machine.sockets.Receive(kSocket, PacketOf(6, kOwnAddress, 1025, 80));
   std::int32_t result = 5;
-  sniffer.iSubCls_Despues(result, 0, 1025, kSocket, 2);
+  sniffer.iSubCls_Despues(result, WindowHandle(), 1025, kSocket.Value(), 2);
   EXPECT_EQ(Upload(Row()), 0);
   EXPECT_EQ(result, 5);
 }
@@ -121,7 +121,7 @@ TEST_F(SnifferTest, Before_the_windows_procedure_nothing_is_done) {
   machine.sockets.Receive(kSocket, PacketOf(6, kOwnAddress, 1025, 80));
   std::int32_t handled = 0;
   std::int32_t result = 0;
-  sniffer.iSubCls_Antes(handled, result, 0, 1025, kSocket, kReadable);
+  sniffer.iSubCls_Antes(handled, result, WindowHandle(), 1025, kSocket.Value(), kReadable);
   EXPECT_EQ(handled, 0);
   EXPECT_EQ(Upload(Row()), 0);
 }

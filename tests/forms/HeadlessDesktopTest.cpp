@@ -444,7 +444,7 @@ TEST_F(HeadlessDesktopTest, A_window_keeps_its_handle) {
 
   EXPECT_EQ(desktop.HandleOf(form), desktop.HandleOf(form));
   EXPECT_NE(desktop.HandleOf(form), desktop.HandleOf(second));
-  EXPECT_NE(desktop.HandleOf(form), 0U);
+  EXPECT_NE(desktop.HandleOf(form), kNoWindow);
 }
 
 // Drawing.

@@ -217,7 +217,7 @@ TEST_F(SocketFailures, A_read_that_fails_is_raised_from_RecvDataToBuffer) {
   Connect(1);
   Net().Fail("recv", 10054);
   const auto socket = static_cast<std::uint32_t>(Object->SocketHandle(1));
-  EXPECT_EQ(FaultText([&] { Object->WndProc(0, 32769, socket, 1); }),
+  EXPECT_EQ(FaultText([&] { Object->WndProc(WindowHandle(), 32769, socket, 1); }),
             "10054 Connection reset by peer. [CSocketPlus.RecvDataToBuffer]");
 }
 
@@ -323,7 +323,7 @@ TEST_F(SocketFailures, Error_numbers_are_cut_to_16_bits_and_unknown_ones_have_th
     description = d;
   };
   const auto socket = static_cast<std::uint32_t>(Object->SocketHandle(1));
-  Object->WndProc(0, 32769, socket, 50000u << 16 | 1u);
+  Object->WndProc(WindowHandle(), 32769, socket, 50000u << 16 | 1u);
   EXPECT_EQ(number, -15536);
   EXPECT_EQ(description, u"Unknown error.");
 }
@@ -367,7 +367,7 @@ TEST_F(SocketFailures, An_error_in_any_event_message_fails_the_socket_in_any_sta
   Peer().Close();
   Settle();
   const auto socket = static_cast<std::uint32_t>(Object->SocketHandle(1));
-  Object->WndProc(0, 32769, socket, 10053u << 16 | 2u);
+  Object->WndProc(WindowHandle(), 32769, socket, 10053u << 16 | 2u);
   EXPECT_EQ(Object->State(1), sckError);
   EXPECT_EQ(Object.Events.back(), "Error 1 10053 CSocketPlus.PostSocket");
 }

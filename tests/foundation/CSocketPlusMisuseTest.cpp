@@ -185,7 +185,8 @@ TEST_F(SocketMisuses, Connect_and_Bind_need_a_closed_socket) {
 
 TEST_F(SocketMisuses, Accept_needs_a_closed_socket) {
   Connect(1);
-  EXPECT_EQ(FaultText([&] { Object->Accept(1, 5); }), kAtState + "[CSocketPlus.Accept]");
+  EXPECT_EQ(FaultText([&] { Object->Accept(1, platform::SocketHandle(5)); }),
+            kAtState + "[CSocketPlus.Accept]");
 }
 
 TEST_F(SocketMisuses, Listen_needs_a_closed_or_an_open_socket) {

@@ -50,7 +50,7 @@ TEST_F(SocketSends, Data_added_behind_refused_data_waits_for_the_next_FD_WRITE) 
 
 TEST_F(SocketSends, FD_WRITE_with_nothing_to_send_does_nothing) {
   Connect(1);
-  Object->WndProc(0, 32769, static_cast<std::uint32_t>(Object->SocketHandle(1)), 2);
+  Object->WndProc(WindowHandle(), 32769, static_cast<std::uint32_t>(Object->SocketHandle(1)), 2);
   EXPECT_EQ(Net().Count("send"), 0);
   EXPECT_TRUE(Object.Events.empty());
 }
@@ -173,22 +173,23 @@ TEST_F(SocketSends, A_first_event_message_for_data_that_was_taken_meanwhile_rais
   Peer().Send("abc");
   Settle();
   Object.Events.clear();
-  EXPECT_EQ(
-      FaultText([&] { Object->WndProc(0, 32769, static_cast<std::uint32_t>(Object->SocketHandle(1)), 1); }),
-      "10035 Resource temporarily unavailable. [CSocketPlus.RecvDataToBuffer]");
+  EXPECT_EQ(FaultText([&] {
+              Object->WndProc(WindowHandle(), 32769, static_cast<std::uint32_t>(Object->SocketHandle(1)), 1);
+            }),
+            "10035 Resource temporarily unavailable. [CSocketPlus.RecvDataToBuffer]");
   EXPECT_TRUE(Object.Events.empty());
 }
 
 TEST_F(SocketSends, Events_that_do_not_fit_the_state_are_passed_over) {
   Connect(1);
   const auto socket = static_cast<std::uint32_t>(Object->SocketHandle(1));
-  for (const std::uint32_t event : {8u, 16u, 4u, 64u}) Object->WndProc(0, 32769, socket, event);
+  for (const std::uint32_t event : {8u, 16u, 4u, 64u}) Object->WndProc(WindowHandle(), 32769, socket, event);
   EXPECT_TRUE(Object.Events.empty());
   EXPECT_EQ(Object->State(1), sckConnected);
   Peer().Close();
   Settle();
   Object.Events.clear();
-  for (const std::uint32_t event : {1u, 2u, 32u}) Object->WndProc(0, 32769, socket, event);
+  for (const std::uint32_t event : {1u, 2u, 32u}) Object->WndProc(WindowHandle(), 32769, socket, event);
   EXPECT_TRUE(Object.Events.empty());
   EXPECT_EQ(Object->State(1), sckClosing);
 }
@@ -214,7 +215,7 @@ TEST_F(SocketSends, A_connection_that_was_reset_before_it_is_taken_is_connected_
 
 TEST_F(SocketSends, Accept_of_a_handle_that_is_no_socket_fails_at_its_options) {
   Add(1);
-  EXPECT_EQ(FaultText([&] { Object->Accept(1, 9999); }),
+  EXPECT_EQ(FaultText([&] { Object->Accept(1, platform::SocketHandle(9999)); }),
             "10038 Socket operation on nonsocket. [CSocketPlus.ProcessOptions]");
 }
 

@@ -10,7 +10,7 @@ CSocketPlus* const kFirst = reinterpret_cast<CSocketPlus*>(0x10);
 CSocketPlus* const kSecond = reinterpret_cast<CSocketPlus*>(0x20);
 
 TEST(HandleOwnersTest, Freed_entries_are_taken_again_before_the_arrays_grow) {
-  HandleOwners owners;
+  HandleOwners<std::uint32_t> owners;
   for (const std::uint32_t handle : {4u, 8u, 12u}) owners.Add(handle, kFirst);
   owners.Remove(8);
   EXPECT_EQ(owners.Count(), 3);
@@ -21,7 +21,7 @@ TEST(HandleOwnersTest, Freed_entries_are_taken_again_before_the_arrays_grow) {
 }
 
 TEST(HandleOwnersTest, A_handle_that_is_there_keeps_its_owner) {
-  HandleOwners owners;
+  HandleOwners<std::uint32_t> owners;
   owners.Add(4, kFirst);
   owners.Add(4, kSecond);
   EXPECT_EQ(owners.OwnerOf(4), kFirst);
@@ -29,7 +29,7 @@ TEST(HandleOwnersTest, A_handle_that_is_there_keeps_its_owner) {
 }
 
 TEST(HandleOwnersTest, A_free_entry_before_a_handle_takes_it_a_second_time) {
-  HandleOwners owners;
+  HandleOwners<std::uint32_t> owners;
   owners.Add(4, kFirst);
   owners.Add(8, kFirst);
   owners.Remove(4);
@@ -39,7 +39,7 @@ TEST(HandleOwnersTest, A_free_entry_before_a_handle_takes_it_a_second_time) {
 }
 
 TEST(HandleOwnersTest, Removing_an_unknown_handle_changes_nothing) {
-  HandleOwners owners;
+  HandleOwners<std::uint32_t> owners;
   owners.Add(4, kFirst);
   owners.Remove(8);
   EXPECT_EQ(owners.OwnerOf(4), kFirst);
@@ -47,7 +47,7 @@ TEST(HandleOwnersTest, Removing_an_unknown_handle_changes_nothing) {
 }
 
 TEST(HandleOwnersTest, An_owner_can_be_changed_in_place) {
-  HandleOwners owners;
+  HandleOwners<std::uint32_t> owners;
   owners.Add(4, kFirst);
   owners.ChangeOwner(4, kSecond);
   EXPECT_EQ(owners.OwnerOf(4), kSecond);
@@ -56,7 +56,7 @@ TEST(HandleOwnersTest, An_owner_can_be_changed_in_place) {
 }
 
 TEST(HandleOwnersTest, Minus_1_is_nobodys_handle) {
-  HandleOwners owners;
+  HandleOwners<std::uint32_t> owners;
   owners.Add(4, kFirst);
   owners.Remove(4);
   EXPECT_EQ(owners.OwnerOf(0xFFFFFFFF), nullptr);

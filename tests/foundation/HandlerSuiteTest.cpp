@@ -41,7 +41,7 @@ TEST_P(HandlerSuite, A_handler_may_remove_its_own_index_in_each_event) {
   const auto dialler = world->Dial(port);
   ASSERT_TRUE(world->Until([&] { return program->ArrayCount() == 0 && dialler->Ended(); }));
   EXPECT_FALSE(world->Desktop.Ended);
-  EXPECT_EQ(program.module.SocketWindow(), 0u);
+  EXPECT_EQ(program.module.SocketWindow(), kNoWindow);
 }
 
 TEST_P(HandlerSuite, A_handler_may_end_the_object_in_DataArrival) {
@@ -115,7 +115,7 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_ConnectionRequest) {
   const auto far = world->Dial(port);
   ASSERT_TRUE(world->Until([&] { return ended && far->Ended(); }));
   EXPECT_EQ(program.module.SocketClassCount(), 0);
-  EXPECT_EQ(program.module.SocketWindow(), 0u);
+  EXPECT_EQ(program.module.SocketWindow(), kNoWindow);
 }
 
 TEST_P(HandlerSuite, A_handler_may_end_the_object_while_it_takes_a_connection) {

@@ -88,7 +88,7 @@ TEST_P(HostileSuite, A_handler_may_remove_its_index_and_add_it_again_in_each_eve
     program->ArrayRemove(event);
   }
   EXPECT_EQ(program->ArrayCount(), 0);
-  EXPECT_EQ(program.module.SocketWindow(), 0u);
+  EXPECT_EQ(program.module.SocketWindow(), kNoWindow);
 }
 
 TEST_P(HostileSuite, A_handler_may_remove_the_index_that_takes_a_connection_in_the_events_of_Accept) {
@@ -146,7 +146,7 @@ TEST_P(HostileSuite, A_fault_in_a_handler_leaves_the_object_whole) {
   far->Send("data");
   EXPECT_EQ(FaultOf([&] {
               world->Until([&] {
-                program->WndProc(0, 32769, socket, 1);
+                program->WndProc(kNoWindow, 32769, socket, 1);
                 return false;
               });
             }),

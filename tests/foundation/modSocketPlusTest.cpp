@@ -8,7 +8,7 @@ namespace {
 /// Windows that can't be made or destroyed when the test says so.
 class StubbornWindows : public forms::MessageWindows {
  public:
-  forms::WindowHandle Create() override { return FailCreate ? 0 : MessageWindows::Create(); }
+  forms::WindowHandle Create() override { return FailCreate ? forms::kNoWindow : MessageWindows::Create(); }
   bool Destroy(forms::WindowHandle window) override {
     return !FailDestroy && MessageWindows::Destroy(window);
   }
@@ -98,16 +98,16 @@ TEST_F(SocketModule, The_arrays_are_empty_after_the_last_object) {
 TEST_F(SocketModule, The_window_stands_from_the_first_socket_to_the_last) {
   const auto first = NewObject();
   const auto second = NewObject();
-  EXPECT_EQ(Module.SocketWindow(), 0u);
+  EXPECT_EQ(Module.SocketWindow(), kNoWindow);
   Open(*first, 1);
   const auto window = Module.SocketWindow();
-  EXPECT_NE(window, 0u);
+  EXPECT_NE(window, kNoWindow);
   Open(*second, 1);
   EXPECT_EQ(Module.SocketWindow(), window);
   first->CloseSck(1);
   EXPECT_EQ(Module.SocketWindow(), window);
   second->CloseSck(1);
-  EXPECT_EQ(Module.SocketWindow(), 0u);
+  EXPECT_EQ(Module.SocketWindow(), kNoWindow);
   EXPECT_EQ(Windows.Count(), 0);
 }
 
@@ -117,7 +117,7 @@ TEST_F(SocketModule, A_socket_after_the_last_was_closed_makes_a_new_window) {
   const auto window = Module.SocketWindow();
   object->CloseSck(1);
   object->Bind(1);
-  EXPECT_NE(Module.SocketWindow(), 0u);
+  EXPECT_NE(Module.SocketWindow(), kNoWindow);
   EXPECT_NE(Module.SocketWindow(), window);
 }
 
@@ -140,14 +140,14 @@ TEST_F(SocketModule, A_window_that_can_not_be_destroyed_raises_7_at_the_close_of
             "7 Out of memory [modSocketPlus.DestroyWinsockMessageWindow]");
   EXPECT_EQ(object->State(1), sckClosing);
   EXPECT_NE(object->SocketHandle(1), -1);
-  EXPECT_NE(Module.SocketWindow(), 0u);
+  EXPECT_NE(Module.SocketWindow(), kNoWindow);
 }
 
 TEST_F(SocketModule, The_window_asks_for_its_five_events_with_message_32769) {
   const auto object = NewObject();
   Open(*object, 1);
   EXPECT_EQ(Machine.Calls.back(), "WSAAsyncSelect " + std::to_string(object->SocketHandle(1)) + " " +
-                                      std::to_string(Module.SocketWindow()) + " 32769 59");
+                                      std::to_string(Module.SocketWindow().Value()) + " 32769 59");
 }
 
 // The dispatcher.
@@ -182,7 +182,7 @@ TEST_F(SocketModule, The_former_procedure_sees_all_but_the_messages_that_have_an
 
 TEST_F(SocketModule, A_module_that_ends_leaves_no_dispatcher_behind) {
   AnsweringWindows windows;
-  forms::WindowHandle window = 0;
+  forms::WindowHandle window;
   {
     modSocketPlus module(Machine.sockets, Machine.hostNames, Desktop, windows);
     CSocketPlus object(module);
@@ -224,11 +224,11 @@ TEST_F(SocketModule, The_arrays_keep_the_peak_number_of_parallel_entries) {
 
 TEST_F(SocketModule, IsSocketRegistered_knows_the_sockets_of_all_objects) {
   const auto object = NewObject();
-  EXPECT_FALSE(Module.IsSocketRegistered(1));
+  EXPECT_FALSE(Module.IsSocketRegistered(platform::SocketHandle(1)));
   Open(*object, 1);
-  const auto socket = static_cast<platform::SocketHandle>(object->SocketHandle(1));
+  const platform::SocketHandle socket(static_cast<std::uint32_t>(object->SocketHandle(1)));
   EXPECT_TRUE(Module.IsSocketRegistered(socket));
-  EXPECT_FALSE(Module.IsSocketRegistered(socket + 4));
+  EXPECT_FALSE(Module.IsSocketRegistered(platform::SocketHandle(socket.Value() + 4)));
   object->CloseSck(1);
   EXPECT_FALSE(Module.IsSocketRegistered(socket));
 }
@@ -242,7 +242,7 @@ TEST_F(SocketModule, An_object_that_ends_with_a_socket_that_can_not_be_closed_ge
   Net().Fail("closesocket", 10050);
   object.reset();
   EXPECT_EQ(Windows.Dispatch(Module.SocketWindow(), 32769, socket, 1), 0);
-  EXPECT_FALSE(Module.IsSocketRegistered(socket));
+  EXPECT_FALSE(Module.IsSocketRegistered(platform::SocketHandle(socket)));
 }
 
 TEST_F(SocketModule, An_object_that_ends_closes_its_other_sockets_though_one_can_not_be_closed) {
@@ -268,8 +268,8 @@ TEST_F(SocketModule, An_object_that_ends_cancels_its_look_ups) {
 TEST_F(SocketModule, An_answer_to_a_socket_that_no_longer_waits_for_one_changes_nothing) {
   const auto object = NewObject();
   object->ArrayAdd(1);
-  EXPECT_EQ(object->WndProc(0, 32768, 4711, 0), 0);
-  EXPECT_EQ(object->WndProc(0, 32769, 4711, 1), 0);
+  EXPECT_EQ(object->WndProc(WindowHandle(), 32768, 4711, 0), 0);
+  EXPECT_EQ(object->WndProc(WindowHandle(), 32769, 4711, 1), 0);
   EXPECT_EQ(object->State(1), sckClosed);
 }
 

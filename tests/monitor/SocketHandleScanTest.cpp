@@ -34,10 +34,10 @@ struct OddHandles : platform::Handles {
   std::vector<std::uint8_t> driverInput;
   std::size_t driverOutputSize = 0;
   std::uint32_t controlCode = 0;
-  platform::Handle eventOfDriver = 0;
-  platform::Handle eventGiven = 0;
+  platform::Handle eventOfDriver;
+  platform::Handle eventGiven;
   std::string eventAsked;
-  platform::Handle target = 0;
+  platform::Handle target;
   std::uint32_t duplicateAccess = 0;
 
   std::uint32_t NtQuerySystemInformation(std::uint32_t, std::span<std::uint8_t> buffer,
@@ -55,7 +55,7 @@ struct OddHandles : platform::Handles {
                        platform::Handle& duplicate, std::uint32_t access, bool, std::uint32_t) override {
     target = targetProcess;
     duplicateAccess = access;
-    duplicate = 0x5000;
+    duplicate = platform::Handle(0x5000);
     return true;
   }
   std::uint32_t NtQueryObject(platform::Handle, std::uint32_t, std::span<std::uint8_t> buffer,
@@ -284,7 +284,8 @@ TEST_F(OddSocketHandles, A_name_that_could_not_be_had_is_not_read) {
 
 TEST_F(OddSocketHandles, The_duplicate_is_made_for_the_own_process) {
   odd.ScanSocketHandles();
-  EXPECT_EQ(handles.target, 0xFFFFFFFFu);
+  EXPECT_EQ(handles.target, platform::kOwnProcess);
+  EXPECT_EQ(handles.target.Value(), 0xFFFFFFFFu);
   EXPECT_EQ(handles.duplicateAccess, 0x101F0000u);
 }
 
@@ -301,37 +302,37 @@ TEST_F(OddSocketHandles, Only_the_invalid_handle_for_an_owner_ends_the_step_befo
 // The driver's answer.
 
 TEST_F(OddSocketHandles, The_driver_is_asked_for_the_address_of_query_type_3) {
-  handles.eventGiven = 0x6000;
-  odd.QueryHandlePort(0x5000);
+  handles.eventGiven = platform::Handle(0x6000);
+  odd.QueryHandlePort(platform::Handle(0x5000));
   std::vector<std::uint8_t> query(24);
   query[16] = 3;
   EXPECT_EQ(handles.driverInput, query);
   EXPECT_EQ(handles.driverOutputSize, 52u);
   EXPECT_EQ(handles.controlCode, 0x210012u);
   EXPECT_EQ(handles.eventAsked, "manual clear 0");
-  EXPECT_EQ(handles.eventOfDriver, 0x6000u);
+  EXPECT_EQ(handles.eventOfDriver, handles.eventGiven);
 }
 
 TEST_F(OddSocketHandles, The_event_is_closed_if_it_exists) {
-  odd.QueryHandlePort(0x5000);
+  odd.QueryHandlePort(platform::Handle(0x5000));
   EXPECT_EQ(machine.processes.VainCloses, 0);
-  handles.eventGiven = 0x6000;
-  odd.QueryHandlePort(0x5000);
+  handles.eventGiven = platform::Handle(0x6000);
+  odd.QueryHandlePort(platform::Handle(0x5000));
   EXPECT_EQ(machine.processes.VainCloses, 1);
 }
 
 TEST_F(OddSocketHandles, The_port_is_read_in_network_order) {
   handles.Port = {0x04, 0x01};
-  EXPECT_EQ(odd.QueryHandlePort(0x5000), 1025);
+  EXPECT_EQ(odd.QueryHandlePort(platform::Handle(0x5000)), 1025);
   handles.Port = {0xFF, 0xFE};
-  EXPECT_EQ(odd.QueryHandlePort(0x5000), 65534);
+  EXPECT_EQ(odd.QueryHandlePort(platform::Handle(0x5000)), 65534);
   handles.Port = {0x80, 0x00};
-  EXPECT_EQ(odd.QueryHandlePort(0x5000), 32768);
+  EXPECT_EQ(odd.QueryHandlePort(platform::Handle(0x5000)), 32768);
 }
 
 TEST_F(OddSocketHandles, Any_status_but_0_gives_port_0) {
   handles.DriverStatus = 0x103;
-  EXPECT_EQ(odd.QueryHandlePort(0x5000), 0);
+  EXPECT_EQ(odd.QueryHandlePort(platform::Handle(0x5000)), 0);
 }
 
 } // namespace quendra::monitor

@@ -15,13 +15,13 @@ struct Privilege : MonitorFixture {
 struct LongPathProcesses : platform::simulated::SimulatedProcesses {
   using SimulatedProcesses::SimulatedProcesses;
 
-  bool EnumProcessModules(platform::Handle process, std::span<std::uint32_t> modules) override {
+  bool EnumProcessModules(platform::Handle process, std::span<platform::ModuleHandle> modules) override {
     EnumeratedProcesses.push_back(process);
     tableBytes = modules.size_bytes();
-    modules[0] = 77;
+    modules[0] = platform::ModuleHandle(77);
     return true;
   }
-  std::uint32_t GetModuleFileNameExA(platform::Handle, std::uint32_t askedModule, std::string& path,
+  std::uint32_t GetModuleFileNameExA(platform::Handle, platform::ModuleHandle askedModule, std::string& path,
                                      std::uint32_t size) override {
     module = askedModule;
     blanks = path;
@@ -34,7 +34,7 @@ struct LongPathProcesses : platform::simulated::SimulatedProcesses {
   std::uint32_t ReturnedLength = 8;
   std::vector<platform::Handle> EnumeratedProcesses;
   std::size_t tableBytes = 0;
-  std::uint32_t module = 0;
+  platform::ModuleHandle module;
   std::string blanks;
   std::uint32_t statedSize = 0;
 };
@@ -123,7 +123,7 @@ TEST_F(ModulePath, Is_asked_for_with_a_table_of_200_bytes_and_260_blanks_of_a_st
   processes.Add({10, 1, "a.exe", "C:\\a.exe"});
   EXPECT_EQ(asked.ModulePathOf(10), u"C:\\a.exe");
   EXPECT_EQ(processes.tableBytes, 200u);
-  EXPECT_EQ(processes.module, 77u);
+  EXPECT_EQ(processes.module, platform::ModuleHandle(77));
   EXPECT_EQ(processes.blanks, std::string(260, ' '));
   EXPECT_EQ(processes.statedSize, 500u);
 }

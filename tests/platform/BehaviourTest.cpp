@@ -129,7 +129,7 @@ TEST_P(BehaviourTest, The_idle_process_cannot_be_opened) {
 
 TEST_P(BehaviourTest, The_first_module_of_the_own_process_is_its_executable) {
   const Handle process = machine.processes.OpenProcess(1040, false, backend->OwnId());
-  std::array<std::uint32_t, 50> modules{};
+  std::array<ModuleHandle, 50> modules{};
   ASSERT_TRUE(machine.processes.EnumProcessModules(process, modules));
 
   std::string path(260, ' ');
@@ -142,7 +142,7 @@ TEST_P(BehaviourTest, The_first_module_of_the_own_process_is_its_executable) {
 
 TEST_P(BehaviourTest, A_module_path_is_never_written_beyond_the_text_or_the_stated_size) {
   const Handle process = machine.processes.OpenProcess(1040, false, backend->OwnId());
-  std::array<std::uint32_t, 50> modules{};
+  std::array<ModuleHandle, 50> modules{};
   ASSERT_TRUE(machine.processes.EnumProcessModules(process, modules));
   std::string shortText(4, ' ');
   std::string longText(100, ' ');
@@ -156,11 +156,11 @@ TEST_P(BehaviourTest, A_module_path_is_never_written_beyond_the_text_or_the_stat
 }
 
 TEST_P(BehaviourTest, A_process_that_was_not_opened_has_no_modules) {
-  std::array<std::uint32_t, 50> modules{};
+  std::array<ModuleHandle, 50> modules{};
   std::string path(10, ' ');
 
   EXPECT_FALSE(machine.processes.EnumProcessModules(kNoHandle, modules));
-  EXPECT_EQ(machine.processes.GetModuleFileNameExA(kNoHandle, 1, path, 10), 0U);
+  EXPECT_EQ(machine.processes.GetModuleFileNameExA(kNoHandle, ModuleHandle(1), path, 10), 0U);
   EXPECT_NE(machine.processes.GetLastError(), 0U);
 }
 
@@ -263,7 +263,7 @@ TEST_P(BehaviourTest, The_own_name_has_addresses_and_the_first_is_the_loopback) 
 TEST_P(BehaviourTest, A_question_for_a_name_that_fails_has_its_own_number_which_socket_calls_leave_alone) {
   EXPECT_FALSE(machine.hostNames.gethostbyname(std::string(300, 'x')));
   machine.sockets.WSAStartup(257);
-  EXPECT_EQ(machine.sockets.listen(4711, 1), kSocketError);
+  EXPECT_EQ(machine.sockets.listen(SocketHandle(4711), 1), kSocketError);
   machine.sockets.WSACleanup();
   EXPECT_EQ(machine.hostNames.LastError(), kHostNotFound);
 
@@ -342,7 +342,7 @@ TEST_P(BehaviourTest, Handles_that_are_none_have_no_duplicate_no_name_and_no_por
   Handle duplicate = kNoHandle;
 
   EXPECT_FALSE(
-      machine.handles.DuplicateHandle(kNoHandle, 8, kInvalidHandle, duplicate, 0x101F0000, false, 0));
+      machine.handles.DuplicateHandle(kNoHandle, Handle(8), kInvalidHandle, duplicate, 0x101F0000, false, 0));
   EXPECT_EQ(duplicate, kNoHandle);
   EXPECT_NE(machine.handles.NtQueryObject(kNoHandle, 1, name, returned), 0U);
   EXPECT_NE(

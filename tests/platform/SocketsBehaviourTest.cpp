@@ -88,7 +88,7 @@ class SocketsBehaviour : public testing::TestWithParam<Kind> {
   std::vector<Told> told;
 
  private:
-  std::uint32_t window_ = 0;
+  forms::WindowHandle window_;
 };
 
 TEST_P(SocketsBehaviour, FD_CLOSE_comes_once_and_only_when_all_data_was_read) {

@@ -56,7 +56,7 @@ TEST_F(MainWindow, Every_label_that_acts_as_a_button_sets_the_hand_cursor) {
 }
 
 TEST_F(MainWindow, No_hand_cursor_is_set_where_the_system_has_none) {
-  desktop.CursorHandleToGive = 0;
+  desktop.CursorHandleToGive = forms::kNoCursor;
   ComeHome();
   desktop.Calls.clear();
   desktop.MouseMove(menu.lblCaption[0]);

@@ -148,7 +148,7 @@ TEST_F(Splash, Sets_the_hand_cursor_over_its_three_clickable_labels) {
 }
 
 TEST_F(Splash, Leaves_the_cursor_where_the_system_has_no_hand) {
-  desktop.CursorHandleToGive = 0;
+  desktop.CursorHandleToGive = forms::kNoCursor;
   program.Start();
   desktop.Calls.clear();
   desktop.MouseMove(splash.Label2);

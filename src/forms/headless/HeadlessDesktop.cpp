@@ -120,17 +120,20 @@ CursorHandle HeadlessDesktop::LoadCursor(int id) {
   return CursorHandleToGive;
 }
 
-void HeadlessDesktop::SetCursor(CursorHandle cursor) { Record("SetCursor " + std::to_string(cursor)); }
+void HeadlessDesktop::SetCursor(CursorHandle cursor) {
+  Record("SetCursor " + std::to_string(cursor.Value()));
+}
 
 WindowHandle HeadlessDesktop::HandleOf(Form& form) {
-  const auto [place, isNew] = windows_.try_emplace(&form, static_cast<WindowHandle>(windowNames_.size() + 1));
+  const auto [place, isNew] =
+      windows_.try_emplace(&form, WindowHandle(static_cast<std::uint32_t>(windowNames_.size() + 1)));
   if (isNew) windowNames_[place->second] = ToUtf8(form.Name());
   return place->second;
 }
 
 std::string HeadlessDesktop::NameOfWindow(WindowHandle window) const {
   const auto found = windowNames_.find(window);
-  return found == windowNames_.end() ? std::to_string(window) : found->second;
+  return found == windowNames_.end() ? std::to_string(window.Value()) : found->second;
 }
 
 void HeadlessDesktop::ReleaseCapture() { Record("ReleaseCapture"); }
@@ -148,11 +151,12 @@ RegionHandle HeadlessDesktop::CreateRoundRectRgn(int left, int top, int right, i
   for (const int number : {left, top, right, bottom, ellipseWidth, ellipseHeight})
     call += " " + std::to_string(number);
   Record(std::move(call));
-  return ++lastRegion_;
+  return RegionHandle(++lastRegion_);
 }
 
 void HeadlessDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) {
-  Record("SetWindowRgn " + NameOfWindow(window) + " " + std::to_string(region) + " " + (redraw ? "1" : "0"));
+  Record("SetWindowRgn " + NameOfWindow(window) + " " + std::to_string(region.Value()) + " " +
+         (redraw ? "1" : "0"));
 }
 
 void HeadlessDesktop::CreateView(Form& form) { views_[&form] = std::make_unique<FormView>(*this, form); }

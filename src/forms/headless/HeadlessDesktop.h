@@ -17,7 +17,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   HeadlessDesktop();
   ~HeadlessDesktop() override;
 
-  void PostMessage(std::uint32_t window, std::uint32_t message, std::uint32_t wParam,
+  void PostMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
                    std::uint32_t lParam) override {
     Post([=, this] { Windows.Dispatch(window, message, wParam, lParam); });
   }
@@ -50,7 +50,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
 
   /// Boxes without a scripted answer are answered with 1 (OK).
   void AnswerNextBox(int answer) { answers_.push_back(answer); }
-  CursorHandle CursorHandleToGive = 5;
+  CursorHandle CursorHandleToGive{5};
   /// Called at each DoEvents, before the queue is handled; not from within itself.
   std::function<void()> OnYield;
   /// What happens while a message box stands. Without it a box is answered at once.
@@ -146,7 +146,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   Form* active_ = nullptr;
   std::unordered_map<const Form*, WindowHandle> windows_;
   std::map<WindowHandle, std::string> windowNames_;
-  RegionHandle lastRegion_ = 0;
+  std::uint32_t lastRegion_ = 0;
   std::unordered_map<const PictureBox*, std::vector<std::string>> drawings_;
   mutable std::map<std::string, Picture> images_;
   std::unordered_map<const Form*, std::unique_ptr<FormView>>

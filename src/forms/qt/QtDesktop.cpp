@@ -78,17 +78,17 @@ int QtDesktop::MessageBox(const Text& text, int flags, const Text& title) {
 }
 
 CursorHandle QtDesktop::LoadCursor(int id) {
-  return ShapeOf(id) == kNoShape ? 0 : static_cast<CursorHandle>(id);
+  return ShapeOf(id) == kNoShape ? kNoCursor : CursorHandle(static_cast<std::uint32_t>(id));
 }
 
 void QtDesktop::SetCursor(CursorHandle cursor) {
-  const Qt::CursorShape shape = ShapeOf(static_cast<int>(cursor));
+  const Qt::CursorShape shape = ShapeOf(static_cast<int>(cursor.Value()));
   if (shape != kNoShape) mouse_.SetCursor(shape);
 }
 
 WindowHandle QtDesktop::HandleOf(Form& form) {
   const qt::FormView* view = ViewOf(form);
-  return view ? view->Handle() : 0;
+  return view ? view->Handle() : kNoWindow;
 }
 
 qt::FormView* QtDesktop::ViewOf(WindowHandle window) const {
@@ -108,8 +108,9 @@ std::int32_t QtDesktop::SendMessage(WindowHandle window, std::uint32_t message, 
 
 RegionHandle QtDesktop::CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
                                            int ellipseHeight) {
-  regions_[++lastRegion_] = {left, top, right, bottom, ellipseWidth, ellipseHeight};
-  return lastRegion_;
+  const RegionHandle handle(++lastRegion_);
+  regions_[handle] = {left, top, right, bottom, ellipseWidth, ellipseHeight};
+  return handle;
 }
 
 void QtDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) {
@@ -122,7 +123,7 @@ void QtDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, bool redr
 }
 
 void QtDesktop::CreateView(Form& form) {
-  auto* view = new qt::FormView(context_, form, ++lastWindow_);
+  auto* view = new qt::FormView(context_, form, WindowHandle(++lastWindow_));
   windows_[view->Handle()] = view;
   form.Attach(view);
 }

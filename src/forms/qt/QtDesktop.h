@@ -67,7 +67,7 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   Picture ImageOf(const PictureBox& box) const override { return drawing_.ImageOf(box); }
 
   void Post(std::function<void()> work) override { loop_.Post(std::move(work)); }
-  void PostMessage(std::uint32_t window, std::uint32_t message, std::uint32_t wParam,
+  void PostMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
                    std::uint32_t lParam) override {
     Post([=, this] { Windows.Dispatch(window, message, wParam, lParam); });
   }
@@ -111,9 +111,9 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   qt::QtDrawing drawing_;
   qt::QtEventLoop loop_;
   std::map<WindowHandle, qt::FormView*> windows_;
-  WindowHandle lastWindow_ = 0;
+  std::uint32_t lastWindow_ = 0;
   std::map<RegionHandle, qt::RoundRect> regions_;
-  RegionHandle lastRegion_ = 0;
+  std::uint32_t lastRegion_ = 0;
 };
 
 } // namespace quendra::forms

@@ -2,6 +2,7 @@
 
 #include "platform/net/Ipv4Address.h"
 #include "platform/net/SocketNumbers.h"
+#include "runtime/OpaqueHandle.h"
 
 #include <cstdint>
 #include <span>
@@ -9,8 +10,13 @@
 
 namespace quendra::platform {
 
-using SocketHandle = std::uint32_t;
-inline constexpr SocketHandle kNoSocket = 0xFFFFFFFF;
+using SocketHandle = OpaqueHandle<struct SocketKind>;
+inline constexpr SocketHandle kNoSocket{0xFFFFFFFF};
+
+/// A look-up of a name that is under way.
+using LookUpHandle = OpaqueHandle<struct LookUpKind>;
+inline constexpr LookUpHandle kNoLookUp;
+
 /// What is no address; as an address it is 255.255.255.255.
 inline constexpr Ipv4Address kNoAddress = Ipv4Address::FromMemory(0xFFFFFFFF);
 
@@ -64,15 +70,16 @@ class Sockets {
   virtual std::int32_t recvfrom(SocketHandle, std::span<std::uint8_t> buffer, std::int32_t flags,
                                 SocketAddress& from) = 0;
 
-  virtual std::int32_t WSAAsyncSelect(SocketHandle socket, std::uint32_t window, std::uint32_t message,
+  virtual std::int32_t WSAAsyncSelect(SocketHandle socket, WindowHandle window, std::uint32_t message,
                                       std::int32_t events) = 0;
-  /// Starts a look-up and gives its handle, 0 on failure. When it ends the window gets the message with the
-  /// handle as wParam and an error number in the high word of lParam; without an error `buffer` starts with
-  /// the count of the name's addresses (32 bits, host order) and the addresses as they lie in memory.
-  virtual std::uint32_t WSAAsyncGetHostByName(std::uint32_t window, std::uint32_t message,
-                                              const std::string& name, std::span<std::uint8_t> buffer) = 0;
+  /// Starts a look-up and gives its handle, kNoLookUp on failure. When it ends the window gets the message
+  /// with the handle as wParam and an error number in the high word of lParam; without an error `buffer`
+  /// starts with the count of the name's addresses (32 bits, host order) and the addresses as they lie in
+  /// memory.
+  virtual LookUpHandle WSAAsyncGetHostByName(WindowHandle window, std::uint32_t message,
+                                             const std::string& name, std::span<std::uint8_t> buffer) = 0;
   /// 0 when the look-up was under way: its message will not come and its buffer is not touched any more.
-  virtual std::int32_t WSACancelAsyncRequest(std::uint32_t lookUp) = 0;
+  virtual std::int32_t WSACancelAsyncRequest(LookUpHandle lookUp) = 0;
 
   virtual bool WSAIsBlocking() = 0;
   virtual std::int32_t WSACancelBlockingCall() = 0;

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "runtime/OpaqueHandle.h"
+
 #include <array>
 #include <cstdint>
 #include <span>
@@ -8,13 +10,16 @@
 namespace quendra::platform {
 
 /// An opaque 32-bit handle of the system.
-using Handle = std::uint32_t;
-inline constexpr Handle kNoHandle = 0;
-inline constexpr Handle kInvalidHandle = 0xFFFFFFFF;
+using Handle = OpaqueHandle<struct ObjectKind>;
+inline constexpr Handle kNoHandle;
+inline constexpr Handle kInvalidHandle{0xFFFFFFFF};
 /// Stands for the own process wherever a process's handle is asked for: the invalid handle's value.
 inline constexpr Handle kOwnProcess = kInvalidHandle;
 /// The room that the system's file names and paths may take, with their NUL.
 inline constexpr std::size_t kPathRoom = 260;
+
+/// A module of a process.
+using ModuleHandle = OpaqueHandle<struct ModuleKind>;
 
 /// The process list and opened processes, with the system's last error.
 class Processes {
@@ -43,10 +48,10 @@ class Processes {
   virtual bool CloseHandle(Handle handle) = 0;
 
   /// Fills `modules` with the handles of the process's modules, the executable first; false on failure.
-  virtual bool EnumProcessModules(Handle process, std::span<std::uint32_t> modules) = 0;
+  virtual bool EnumProcessModules(Handle process, std::span<ModuleHandle> modules) = 0;
   /// Writes the module's path in the system's code page over the start of `path`, at most `size` characters
   /// and never beyond the text's end; gives the number written, 0 on failure.
-  virtual std::uint32_t GetModuleFileNameExA(Handle process, std::uint32_t module, std::string& path,
+  virtual std::uint32_t GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
                                              std::uint32_t size) = 0;
 
   /// 0 when the last call that sets it left no error.

@@ -21,9 +21,9 @@ struct Core {
   };
 
   Handle Open(Kind kind, std::uint32_t number = 0) {
-    nextHandle += 4;
-    opened[nextHandle] = {kind, number};
-    return nextHandle;
+    lastHandle += 4;
+    opened[Handle(lastHandle)] = {kind, number};
+    return Handle(lastHandle);
   }
   const Opened* Find(Handle handle, Kind kind) const {
     const auto found = opened.find(handle);
@@ -31,7 +31,7 @@ struct Core {
   }
 
   std::map<Handle, Opened> opened;
-  Handle nextHandle = 0x100;
+  std::uint32_t lastHandle = 0x100;
   std::uint32_t lastError = 0;
   std::uint32_t tickCount = 0x00100000;
   std::vector<std::string> calls;

@@ -14,10 +14,8 @@ class UnavailableProcesses : public Processes {
   Handle OpenProcess(std::uint32_t, bool, std::uint32_t) override { return kNoHandle; }
   Handle GetCurrentProcess() override { return kOwnProcess; }
   bool CloseHandle(Handle) override { return false; }
-  bool EnumProcessModules(Handle, std::span<std::uint32_t>) override { return false; }
-  std::uint32_t GetModuleFileNameExA(Handle, std::uint32_t, std::string&, std::uint32_t) override {
-    return 0;
-  }
+  bool EnumProcessModules(Handle, std::span<ModuleHandle>) override { return false; }
+  std::uint32_t GetModuleFileNameExA(Handle, ModuleHandle, std::string&, std::uint32_t) override { return 0; }
   std::uint32_t GetLastError() override { return kCallNotImplemented; }
 };
 

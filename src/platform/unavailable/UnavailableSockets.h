@@ -37,14 +37,14 @@ class UnavailableSockets : public Sockets {
   std::int32_t recvfrom(SocketHandle, std::span<std::uint8_t>, std::int32_t, SocketAddress&) override {
     return kSocketError;
   }
-  std::int32_t WSAAsyncSelect(SocketHandle, std::uint32_t, std::uint32_t, std::int32_t) override {
+  std::int32_t WSAAsyncSelect(SocketHandle, WindowHandle, std::uint32_t, std::int32_t) override {
     return kSocketError;
   }
-  std::uint32_t WSAAsyncGetHostByName(std::uint32_t, std::uint32_t, const std::string&,
-                                      std::span<std::uint8_t>) override {
-    return 0;
+  LookUpHandle WSAAsyncGetHostByName(WindowHandle, std::uint32_t, const std::string&,
+                                     std::span<std::uint8_t>) override {
+    return kNoLookUp;
   }
-  std::int32_t WSACancelAsyncRequest(std::uint32_t) override { return kSocketError; }
+  std::int32_t WSACancelAsyncRequest(LookUpHandle) override { return kSocketError; }
   bool WSAIsBlocking() override { return false; }
   std::int32_t WSACancelBlockingCall() override { return kSocketError; }
 };

@@ -144,8 +144,8 @@ TEST_F(Mouse, The_hand_cursor_stays_until_the_mouse_moves_over_a_control_that_se
 }
 
 TEST_F(Mouse, Only_system_cursors_have_handles) {
-  EXPECT_GT(desktop.LoadCursor(32649), 0U);
-  EXPECT_EQ(desktop.LoadCursor(1), 0U);
+  EXPECT_NE(desktop.LoadCursor(32649), kNoCursor);
+  EXPECT_EQ(desktop.LoadCursor(1), kNoCursor);
 }
 
 TEST_F(Mouse, A_caption_press_drags_the_window_where_no_window_manager_does) {

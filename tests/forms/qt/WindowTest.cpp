@@ -118,14 +118,14 @@ TEST_F(Window, Handles_differ_and_end_with_their_window) {
   desktop.Load(form);
   desktop.Load(other);
   const WindowHandle handle = desktop.HandleOf(form);
-  EXPECT_NE(handle, 0U);
+  EXPECT_NE(handle, kNoWindow);
   EXPECT_NE(handle, desktop.HandleOf(other));
 
   desktop.Unload(form);
 
-  EXPECT_EQ(desktop.HandleOf(form), 0U);
+  EXPECT_EQ(desktop.HandleOf(form), kNoWindow);
   EXPECT_EQ(desktop.SendMessage(handle, 0xA1, 2, 0), 0);
-  desktop.SetWindowRgn(handle, 0, true);
+  desktop.SetWindowRgn(handle, {}, true);
 }
 
 TEST_F(Window, Twips_follow_the_screens_logical_resolution) {

@@ -133,14 +133,14 @@ TEST_F(LinuxMachineTest, Operations_that_this_system_lacks_answer_that_they_are_
   std::uint32_t returned = 1;
   EXPECT_EQ(operations.handles.NtQuerySystemInformation(16, buffer, returned),
             Handles::kStatusNotImplemented);
-  EXPECT_EQ(operations.handles.NtQueryObject(4, 1, buffer, returned), Handles::kStatusNotImplemented);
-  EXPECT_EQ(operations.handles.NtDeviceIoControlFile(4, 0, 0x210012, buffer, buffer),
+  EXPECT_EQ(operations.handles.NtQueryObject(Handle(4), 1, buffer, returned), Handles::kStatusNotImplemented);
+  EXPECT_EQ(operations.handles.NtDeviceIoControlFile(Handle(4), Handle(), 0x210012, buffer, buffer),
             Handles::kStatusNotImplemented);
-  Handle duplicate = 0;
-  EXPECT_FALSE(operations.handles.DuplicateHandle(4, 4, 4, duplicate, 0, false, 0));
-  EXPECT_EQ(operations.sockets.recv(4, buffer, 0), -1);
-  EXPECT_EQ(operations.sockets.WSAAsyncSelect(4, 1, 1, 1), -1);
-  EXPECT_EQ(operations.sockets.closesocket(4), -1);
+  Handle duplicate;
+  EXPECT_FALSE(operations.handles.DuplicateHandle(Handle(4), Handle(4), Handle(4), duplicate, 0, false, 0));
+  EXPECT_EQ(operations.sockets.recv(SocketHandle(4), buffer, 0), -1);
+  EXPECT_EQ(operations.sockets.WSAAsyncSelect(SocketHandle(4), WindowHandle(1), 1, 1), -1);
+  EXPECT_EQ(operations.sockets.closesocket(SocketHandle(4)), -1);
   EXPECT_FALSE(operations.sockets.WSAIsBlocking());
 }
 
@@ -170,7 +170,7 @@ TEST_F(LinuxMachineTest, A_user_without_rights_gets_snapshot_table_and_host_addr
          more = machine.processes.Process32Next(snapshot, entry))
       if (entry.processId == 1) text += entry.exeFile.data();
     const Handle first = machine.processes.OpenProcess(1040, false, 1);
-    std::uint32_t modules[50] = {};
+    ModuleHandle modules[50] = {};
     if (!machine.processes.EnumProcessModules(first, modules)) text += ", no path";
     IpHelper::TcpTable table;
     if (machine.ipHelper.AllocateAndGetTcpExTableFromStack(table) == 0) text += ", a table";

@@ -65,7 +65,7 @@ TEST_F(SimulatedMachineTest, Opening_a_chosen_process_fails_with_the_scripted_an
 TEST_F(SimulatedMachineTest, A_process_without_a_path_has_no_modules) {
   machine.AddProcess({.id = 4, .name = "System"});
   const Handle process = operations.processes.OpenProcess(1040, false, 4);
-  std::array<std::uint32_t, 50> modules{};
+  std::array<ModuleHandle, 50> modules{};
 
   EXPECT_FALSE(operations.processes.EnumProcessModules(process, modules));
 }
@@ -165,7 +165,8 @@ struct NativeHandlesTest : SimulatedMachineTest {
   Handle Duplicate(std::uint16_t handle) {
     const Handle process = operations.processes.OpenProcess(0x40, false, 100);
     Handle duplicate = kNoHandle;
-    operations.handles.DuplicateHandle(process, handle, kInvalidHandle, duplicate, 0x101F0000, false, 0);
+    operations.handles.DuplicateHandle(process, Handle(handle), kInvalidHandle, duplicate, 0x101F0000, false,
+                                       0);
     operations.processes.CloseHandle(process);
     return duplicate;
   }
@@ -214,12 +215,12 @@ TEST_F(NativeHandlesTest, The_transport_driver_answers_the_port_in_network_order
   std::array<std::uint8_t, 52> output{};
   const Handle duplicate = Duplicate(8);
 
-  EXPECT_NE(operations.handles.NtDeviceIoControlFile(duplicate, 0, 0x210012, input, output), 0U);
+  EXPECT_NE(operations.handles.NtDeviceIoControlFile(duplicate, Handle(), 0x210012, input, output), 0U);
   input[16] = 3;
-  EXPECT_EQ(operations.handles.NtDeviceIoControlFile(duplicate, 0, 0x210012, input, output), 0U);
+  EXPECT_EQ(operations.handles.NtDeviceIoControlFile(duplicate, Handle(), 0x210012, input, output), 0U);
   EXPECT_EQ(output[12], 0x12);
   EXPECT_EQ(output[13], 0x34);
-  EXPECT_NE(operations.handles.NtDeviceIoControlFile(duplicate, 0, 0x210013, input, output), 0U);
+  EXPECT_NE(operations.handles.NtDeviceIoControlFile(duplicate, Handle(), 0x210013, input, output), 0U);
 }
 
 TEST_F(NativeHandlesTest, A_handle_is_not_duplicated_when_told_so) {
@@ -488,15 +489,15 @@ TEST_F(SimulatedMachineTest, Started_command_lines_are_recorded_with_their_windo
 }
 
 TEST_F(SimulatedMachineTest, A_socket_gives_what_it_received_piece_by_piece) {
-  machine.sockets.Receive(7, {1, 2, 3});
-  machine.sockets.FailReceive(7);
+  machine.sockets.Receive(SocketHandle(7), {1, 2, 3});
+  machine.sockets.FailReceive(SocketHandle(7));
   std::array<std::uint8_t, 2> buffer{};
 
-  EXPECT_EQ(operations.sockets.recv(7, buffer, 0), 2);
-  EXPECT_EQ(operations.sockets.recv(7, buffer, 0), 1);
+  EXPECT_EQ(operations.sockets.recv(SocketHandle(7), buffer, 0), 2);
+  EXPECT_EQ(operations.sockets.recv(SocketHandle(7), buffer, 0), 1);
   EXPECT_EQ(buffer[0], 3);
-  EXPECT_EQ(operations.sockets.recv(7, buffer, 0), -1);
-  EXPECT_EQ(operations.sockets.recv(7, buffer, 0), 0);
+  EXPECT_EQ(operations.sockets.recv(SocketHandle(7), buffer, 0), -1);
+  EXPECT_EQ(operations.sockets.recv(SocketHandle(7), buffer, 0), 0);
   EXPECT_EQ(machine.Calls.size(), 4U);
 }
 

@@ -42,7 +42,7 @@ class SimulatedSocketsTest : public testing::Test {
     return net.recv(socket, buffer, 0);
   }
   std::string Line(SocketHandle socket, int event, int error = 0) {
-    return std::to_string(socket) + " " + std::to_string(event) + " " + std::to_string(error);
+    return std::to_string(socket.Value()) + " " + std::to_string(event) + " " + std::to_string(error);
   }
 
   forms::HeadlessDesktop desktop;
@@ -52,7 +52,7 @@ class SimulatedSocketsTest : public testing::Test {
   Lines seen;
 
  private:
-  forms::WindowHandle window_ = 0;
+  forms::WindowHandle window_;
 };
 
 TEST_F(SimulatedSocketsTest, A_connection_is_told_as_FD_CONNECT_then_FD_WRITE) {
@@ -162,7 +162,7 @@ TEST_F(SimulatedSocketsTest, Ports_given_by_the_machine_run_from_1025_to_5000_an
 TEST_F(SimulatedSocketsTest, A_look_up_that_never_answers_can_be_cancelled) {
   net.NeverAnswer("silent");
   std::array<std::uint8_t, 1024> buffer{};
-  const std::uint32_t lookUp = net.WSAAsyncGetHostByName(1, 32768, "silent", buffer);
+  const LookUpHandle lookUp = net.WSAAsyncGetHostByName(WindowHandle(1), 32768, "silent", buffer);
   desktop.RunUntilIdle();
   EXPECT_EQ(net.LookUpsUnderWay(), 1);
   EXPECT_EQ(net.WSACancelAsyncRequest(lookUp), 0);
@@ -170,16 +170,16 @@ TEST_F(SimulatedSocketsTest, A_look_up_that_never_answers_can_be_cancelled) {
 }
 
 TEST_F(SimulatedSocketsTest, Handles_that_are_no_socket_fail_with_10038) {
-  EXPECT_EQ(net.closesocket(77), kSocketError);
+  EXPECT_EQ(net.closesocket(SocketHandle(77)), kSocketError);
   EXPECT_EQ(net.WSAGetLastError(), kNotASocket);
-  EXPECT_EQ(net.WSAAsyncSelect(77, 1, 2, 3), kSocketError);
+  EXPECT_EQ(net.WSAAsyncSelect(SocketHandle(77), WindowHandle(1), 2, 3), kSocketError);
 }
 
 TEST(SimulatedSocketsWithoutALoop, Any_handle_is_taken_and_the_library_starts_and_ends) {
   SimulatedMachine machine;
   EXPECT_EQ(machine.sockets.WSAStartup(257), 0);
-  EXPECT_EQ(machine.sockets.closesocket(77), 0);
-  EXPECT_EQ(machine.sockets.WSAAsyncSelect(77, 1, 2, 3), 0);
+  EXPECT_EQ(machine.sockets.closesocket(SocketHandle(77)), 0);
+  EXPECT_EQ(machine.sockets.WSAAsyncSelect(SocketHandle(77), WindowHandle(1), 2, 3), 0);
   EXPECT_EQ(machine.sockets.WSACleanup(), 0);
   EXPECT_EQ(machine.sockets.WSACleanup(), 0);
 }

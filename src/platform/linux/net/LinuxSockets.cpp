@@ -69,6 +69,11 @@ std::int32_t LinuxSockets::Fail(std::int32_t error) {
   return kSocketError;
 }
 
+SocketHandle LinuxSockets::FailSocket(std::int32_t error) {
+  Fail(error);
+  return kNoSocket;
+}
+
 std::int32_t LinuxSockets::FailWithErrno() { return Fail(SocketErrorOf(errno)); }
 
 std::int32_t LinuxSockets::Answer(std::int64_t result) {
@@ -76,10 +81,10 @@ std::int32_t LinuxSockets::Answer(std::int64_t result) {
 }
 
 SocketHandle LinuxSockets::socket(std::int32_t family, std::int32_t type, std::int32_t protocol) {
-  if (started_ == 0) return static_cast<SocketHandle>(Fail(kNotStarted));
+  if (started_ == 0) return FailSocket(kNotStarted);
   SocketEntry entry;
   entry.descriptor = Descriptor(::socket(family, type | SOCK_CLOEXEC, protocol));
-  if (!entry.descriptor) return static_cast<SocketHandle>(FailWithErrno());
+  if (!entry.descriptor) return FailSocket(SocketErrorOf(errno));
   if (type == SOCK_DGRAM) entry.stage = SocketEntry::Stage::Datagram;
   return notifier_.Add(std::move(entry));
 }
@@ -117,7 +122,7 @@ SocketHandle LinuxSockets::accept(SocketHandle socket) {
                                           &size, SOCK_CLOEXEC | SOCK_NONBLOCK));
   const int error = errno;
   notifier_.Enable(socket, *listener, kFdAccept);
-  if (!entry.descriptor) return static_cast<SocketHandle>(Fail(SocketErrorOf(error)));
+  if (!entry.descriptor) return FailSocket(SocketErrorOf(error));
   entry.stage = SocketEntry::Stage::Connected;
   entry.peer = LibraryAddress(peer);
   entry.window = listener->window;
@@ -247,7 +252,7 @@ std::int32_t LinuxSockets::recvfrom(SocketHandle socket, std::span<std::uint8_t>
   return static_cast<std::int32_t>(read);
 }
 
-std::int32_t LinuxSockets::WSAAsyncSelect(SocketHandle socket, std::uint32_t window, std::uint32_t message,
+std::int32_t LinuxSockets::WSAAsyncSelect(SocketHandle socket, WindowHandle window, std::uint32_t message,
                                           std::int32_t events) {
   SocketEntry* entry = Entry(socket);
   if (!entry) return kSocketError;
@@ -261,14 +266,14 @@ std::int32_t LinuxSockets::WSAAsyncSelect(SocketHandle socket, std::uint32_t win
   return FailWithErrno();
 }
 
-std::uint32_t LinuxSockets::WSAAsyncGetHostByName(std::uint32_t window, std::uint32_t message,
-                                                  const std::string& name, std::span<std::uint8_t> buffer) {
+LookUpHandle LinuxSockets::WSAAsyncGetHostByName(WindowHandle window, std::uint32_t message,
+                                                 const std::string& name, std::span<std::uint8_t> buffer) {
   if (started_ == 0) {
     Fail(kNotStarted);
-    return 0;
+    return kNoLookUp;
   }
   // The handle is known only once the look-up has started, and its end needs it.
-  const auto handle = std::make_shared<std::uint32_t>(0);
+  const auto handle = std::make_shared<LookUpHandle>();
   *handle = lookUps_.Start(
       name, [this, handle, window, message, buffer](std::int32_t error, const auto& addresses) {
         const std::size_t room = buffer.size() / sizeof(std::uint32_t);
@@ -276,13 +281,13 @@ std::uint32_t LinuxSockets::WSAAsyncGetHostByName(std::uint32_t window, std::uin
         if (error == 0 && room > 0) PutLittle32(buffer, 0, static_cast<std::uint32_t>(count));
         for (std::size_t i = 0; error == 0 && i < count; ++i)
           PutLittle32(buffer, 4 + 4 * i, addresses[i].InMemory());
-        loop_.PostMessage(window, message, *handle, SocketMessageWord(0, error));
+        loop_.PostMessage(window, message, handle->Value(), SocketMessageWord(0, error));
       });
-  if (*handle == 0) Fail(kNoBufferSpace);
+  if (*handle == kNoLookUp) Fail(kNoBufferSpace);
   return *handle;
 }
 
-std::int32_t LinuxSockets::WSACancelAsyncRequest(std::uint32_t lookUp) {
+std::int32_t LinuxSockets::WSACancelAsyncRequest(LookUpHandle lookUp) {
   return lookUps_.Cancel(lookUp) ? 0 : Fail(kInvalidArgument);
 }
 

@@ -36,11 +36,11 @@ class LinuxSockets : public Sockets {
   std::int32_t recvfrom(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags,
                         SocketAddress& from) override;
 
-  std::int32_t WSAAsyncSelect(SocketHandle socket, std::uint32_t window, std::uint32_t message,
+  std::int32_t WSAAsyncSelect(SocketHandle socket, WindowHandle window, std::uint32_t message,
                               std::int32_t events) override;
-  std::uint32_t WSAAsyncGetHostByName(std::uint32_t window, std::uint32_t message, const std::string& name,
-                                      std::span<std::uint8_t> buffer) override;
-  std::int32_t WSACancelAsyncRequest(std::uint32_t lookUp) override;
+  LookUpHandle WSAAsyncGetHostByName(WindowHandle window, std::uint32_t message, const std::string& name,
+                                     std::span<std::uint8_t> buffer) override;
+  std::int32_t WSACancelAsyncRequest(LookUpHandle lookUp) override;
   /// No call blocks here.
   bool WSAIsBlocking() override { return false; }
   std::int32_t WSACancelBlockingCall() override { return Fail(kInvalidArgument); }
@@ -49,6 +49,7 @@ class LinuxSockets : public Sockets {
   /// nullptr, with the last error set, when the library isn't started or the handle is no socket.
   SocketEntry* Entry(SocketHandle socket);
   std::int32_t Fail(std::int32_t error);
+  SocketHandle FailSocket(std::int32_t error);
   std::int32_t FailWithErrno();
   std::int32_t Answer(std::int64_t result);
 

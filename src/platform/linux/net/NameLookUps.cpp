@@ -15,7 +15,7 @@ namespace quendra::platform::linux_ {
 /// Outlives the object as long as a thread waits for a name server: such a wait can't be cut short.
 struct NameLookUps::Shared {
   struct Job {
-    std::uint32_t handle;
+    LookUpHandle handle;
     std::string name;
   };
 
@@ -24,10 +24,10 @@ struct NameLookUps::Shared {
   std::deque<Job> jobs;
   int threads = 0;
   // Only the loop's thread touches these.
-  std::map<std::uint32_t, Done> underWay;
+  std::map<LookUpHandle, Done> underWay;
   std::uint32_t lastHandle = 0;
 
-  void Finish(const std::shared_ptr<Shared>& self, std::uint32_t handle, NameAnswer answer) {
+  void Finish(const std::shared_ptr<Shared>& self, LookUpHandle handle, NameAnswer answer) {
     const std::scoped_lock guard(lock);
     if (!loop) return;
     loop->Post([self, handle, answer = std::move(answer)] {
@@ -52,8 +52,8 @@ NameLookUps::~NameLookUps() {
   shared_->jobs.clear();
 }
 
-std::uint32_t NameLookUps::Start(const std::string& name, Done done) {
-  const std::uint32_t handle = ++shared_->lastHandle;
+LookUpHandle NameLookUps::Start(const std::string& name, Done done) {
+  const LookUpHandle handle(++shared_->lastHandle);
   shared_->underWay[handle] = std::move(done);
   const auto own = hostNames_.gethostname();
   if (own && ::strcasecmp(own->c_str(), name.c_str()) == 0) {
@@ -73,12 +73,12 @@ std::uint32_t NameLookUps::Start(const std::string& name, Done done) {
     if (shared_->threads > 0) return handle;
     shared_->jobs.clear();
     shared_->underWay.erase(handle);
-    return 0;
+    return kNoLookUp;
   }
   return handle;
 }
 
-bool NameLookUps::Cancel(std::uint32_t lookUp) {
+bool NameLookUps::Cancel(LookUpHandle lookUp) {
   if (shared_->underWay.erase(lookUp) == 0) return false;
   const std::scoped_lock guard(shared_->lock);
   std::erase_if(shared_->jobs, [&](const Shared::Job& job) { return job.handle == lookUp; });

@@ -2,6 +2,7 @@
 
 #include "platform/EventLoop.h"
 #include "platform/net/HostNames.h"
+#include "platform/net/Sockets.h"
 
 #include <cstdint>
 #include <functional>
@@ -23,11 +24,11 @@ class NameLookUps {
   /// Look-ups under way end without a word.
   ~NameLookUps();
 
-  /// The look-up's handle, 0 when the system has no thread for it. `done` runs from the loop, never before
-  /// this returns.
-  std::uint32_t Start(const std::string& name, Done done);
+  /// The look-up's handle, kNoLookUp when the system has no thread for it. `done` runs from the loop, never
+  /// before this returns.
+  LookUpHandle Start(const std::string& name, Done done);
   /// False when it isn't under way any more.
-  bool Cancel(std::uint32_t lookUp);
+  bool Cancel(LookUpHandle lookUp);
 
  private:
   struct Shared;

@@ -15,7 +15,7 @@ struct SocketEntry {
   std::int32_t endError = 0; ///< what ended a stream, as the library numbers it; 0 for an orderly end
 
   // What WSAAsyncSelect asked for.
-  std::uint32_t window = 0;
+  WindowHandle window;
   std::uint32_t message = 0;
   std::int32_t mask = 0;
 

@@ -53,7 +53,7 @@ std::uint32_t InterestOf(const SocketEntry& entry) {
 epoll_event EventFor(SocketHandle socket, std::uint32_t interest) {
   epoll_event event{};
   event.events = interest | EPOLLONESHOT;
-  event.data.u32 = socket;
+  event.data.u32 = socket.Value();
   return event;
 }
 
@@ -67,8 +67,9 @@ SocketEntry* SocketNotifier::Find(SocketHandle socket) {
 SocketHandle SocketNotifier::Add(SocketEntry entry) {
   // A number of its own, never that of a socket gone before: messages for that one may still be on their way.
   last_ += 4;
-  sockets_.emplace(last_, std::move(entry));
-  return last_;
+  const SocketHandle socket(last_);
+  sockets_.emplace(socket, std::move(entry));
+  return socket;
 }
 
 void SocketNotifier::Remove(SocketHandle socket) { sockets_.erase(socket); }
@@ -114,14 +115,14 @@ void SocketNotifier::Announce(SocketHandle socket, SocketEntry& entry, SocketEve
                               std::int32_t error) {
   if ((entry.mask & entry.enabled & event) == 0) return;
   entry.enabled &= ~event;
-  loop_.PostMessage(entry.window, entry.message, socket, SocketMessageWord(event, error));
+  loop_.PostMessage(entry.window, entry.message, socket.Value(), SocketMessageWord(event, error));
 }
 
 void SocketNotifier::Serve() {
   std::array<epoll_event, kBatch> ready;
   const int count = ::epoll_wait(epoll_.Number(), ready.data(), kBatch, 0);
   for (int i = 0; i < count; ++i) {
-    const SocketHandle socket = ready[static_cast<std::size_t>(i)].data.u32;
+    const SocketHandle socket(ready[static_cast<std::size_t>(i)].data.u32);
     SocketEntry* entry = Find(socket);
     if (!entry) continue;
     entry->watched = 0;

@@ -43,7 +43,7 @@ class SocketNotifier {
   Descriptor epoll_;
   std::unique_ptr<EventLoop::Subscription> watch_;
   std::map<SocketHandle, SocketEntry> sockets_;
-  SocketHandle last_ = 0x100;
+  std::uint32_t last_ = 0x100;
 };
 
 } // namespace quendra::platform::linux_

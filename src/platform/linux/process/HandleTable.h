@@ -42,7 +42,7 @@ class HandleTable {
   std::uint32_t lastError = 0;
 
  private:
-  Handle next_ = 0;
+  std::uint32_t next_ = 0;
   std::map<Handle, Object> objects_;
 };
 

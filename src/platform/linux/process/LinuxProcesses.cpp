@@ -6,7 +6,7 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-constexpr std::uint32_t kExecutableModule = 1;
+constexpr ModuleHandle kExecutableModule{1};
 
 } // namespace
 
@@ -83,17 +83,17 @@ std::optional<std::string> LinuxProcesses::ExecutableOf(Handle process) {
   return std::move(executable->path);
 }
 
-bool LinuxProcesses::EnumProcessModules(Handle process, std::span<std::uint32_t> modules) {
+bool LinuxProcesses::EnumProcessModules(Handle process, std::span<ModuleHandle> modules) {
   if (!ExecutableOf(process)) return false;
   if (!modules.empty()) modules[0] = kExecutableModule;
   return true;
 }
 
-std::uint32_t LinuxProcesses::GetModuleFileNameExA(Handle process, std::uint32_t module, std::string& path,
+std::uint32_t LinuxProcesses::GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
                                                    std::uint32_t size) {
   const auto executable = ExecutableOf(process);
   if (!executable) return 0;
-  if (module != kExecutableModule && module != 0) {
+  if (module != kExecutableModule && module != ModuleHandle()) {
     Fail(kModuleNotFound);
     return 0;
   }

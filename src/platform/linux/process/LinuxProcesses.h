@@ -20,8 +20,8 @@ class LinuxProcesses : public Processes {
   Handle OpenProcess(std::uint32_t access, bool inherit, std::uint32_t processId) override;
   Handle GetCurrentProcess() override { return kOwnProcess; }
   bool CloseHandle(Handle handle) override;
-  bool EnumProcessModules(Handle process, std::span<std::uint32_t> modules) override;
-  std::uint32_t GetModuleFileNameExA(Handle process, std::uint32_t module, std::string& path,
+  bool EnumProcessModules(Handle process, std::span<ModuleHandle> modules) override;
+  std::uint32_t GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
                                      std::uint32_t size) override;
   std::uint32_t GetLastError() override { return handles_.lastError; }
 

@@ -21,11 +21,10 @@ Handle LinuxIcons::ExtractIconExA(const std::string& path, int index) {
   if (index != 0 || path.empty()) return kNoHandle;
   Image image = ImageFor(paths_.ToRaw(path));
   if (!image) return kNoHandle;
-  do {
-    next_ += 4;
-  } while (next_ == kNoHandle || icons_.contains(next_));
-  icons_.emplace(next_, std::move(image));
-  return next_;
+  do next_ += 4;
+  while (Handle(next_) == kNoHandle || icons_.contains(Handle(next_)));
+  icons_.emplace(Handle(next_), std::move(image));
+  return Handle(next_);
 }
 
 const std::vector<std::uint8_t>& LinuxIcons::ImageOf(Handle icon) {

@@ -36,7 +36,7 @@ class LinuxIcons : public Icons {
   std::unordered_map<std::string, Image>
       imageOf_; ///< by executable, without an image for those that have none
   int generation_ = 0;
-  Handle next_ = 0;
+  std::uint32_t next_ = 0;
 };
 
 } // namespace quendra::platform::linux_

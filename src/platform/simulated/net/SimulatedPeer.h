@@ -27,7 +27,7 @@ struct SocketEnd {
   SocketAddress remote;
 
   // What WSAAsyncSelect asked for, and which events may be announced now.
-  std::uint32_t window = 0;
+  WindowHandle window;
   std::uint32_t message = 0;
   std::int32_t mask = 0;
   std::int32_t enabled = kFdRead | kFdWrite | kFdAccept | kFdConnect | kFdClose;

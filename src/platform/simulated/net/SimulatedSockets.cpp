@@ -108,21 +108,24 @@ SimulatedSockets::End SimulatedSockets::Find(SocketHandle socket) {
 
 SocketHandle SimulatedSockets::Give(const End& end) {
   lastSocket_ += 4;
-  end->handle = lastSocket_;
-  sockets_[lastSocket_] = end;
-  return lastSocket_;
+  end->handle = SocketHandle(lastSocket_);
+  sockets_[end->handle] = end;
+  return end->handle;
 }
 
 SocketHandle SimulatedSockets::socket(std::int32_t, std::int32_t type, std::int32_t) {
   if (Scripted("socket")) return kNoSocket;
-  if (started_ == 0) return static_cast<SocketHandle>(Refused(kNotStarted));
+  if (started_ == 0) {
+    Refused(kNotStarted);
+    return kNoSocket;
+  }
   const auto end = std::make_shared<SocketEnd>();
   if (type == kDatagramSocket) end->stage = SocketEnd::Stage::Datagram;
   return Give(end);
 }
 
 std::int32_t SimulatedSockets::closesocket(SocketHandle socket) {
-  core_.calls.push_back("closesocket " + std::to_string(socket));
+  core_.calls.push_back("closesocket " + std::to_string(socket.Value()));
   if (Scripted("closesocket")) return kSocketError;
   const End end = Find(socket);
   if (!end) return loop_ ? kSocketError : 0;
@@ -382,7 +385,7 @@ std::int32_t SimulatedSockets::ScriptedRead(SocketHandle socket, std::span<std::
 }
 
 std::int32_t SimulatedSockets::recv(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags) {
-  core_.calls.push_back("recv " + std::to_string(socket) + " " + std::to_string(buffer.size()));
+  core_.calls.push_back("recv " + std::to_string(socket.Value()) + " " + std::to_string(buffer.size()));
   if (waiting_.contains(socket) || (!loop_ && !sockets_.contains(socket)))
     return ScriptedRead(socket, buffer);
   if (Scripted("recv")) return kSocketError;
@@ -433,7 +436,7 @@ void SimulatedSockets::EndOf(SocketEnd& end, std::int32_t error) {
 void SimulatedSockets::Announce(SocketEnd& end, SocketEvent event, std::int32_t error) {
   if (end.handle == kNoSocket || (end.mask & end.enabled & event) == 0) return;
   end.enabled &= ~event;
-  if (loop_) loop_->PostMessage(end.window, end.message, end.handle, SocketMessageWord(event, error));
+  if (loop_) loop_->PostMessage(end.window, end.message, end.handle.Value(), SocketMessageWord(event, error));
 }
 
 void SimulatedSockets::Update(SocketEnd& end) {
@@ -448,10 +451,11 @@ void SimulatedSockets::Update(SocketEnd& end) {
   if (end.ended && (end.enabled & kFdRead) != 0) Announce(end, kFdClose, end.endError);
 }
 
-std::int32_t SimulatedSockets::WSAAsyncSelect(SocketHandle socket, std::uint32_t window,
-                                              std::uint32_t message, std::int32_t events) {
-  core_.calls.push_back("WSAAsyncSelect " + std::to_string(socket) + " " + std::to_string(window) + " " +
-                        std::to_string(message) + " " + std::to_string(events));
+std::int32_t SimulatedSockets::WSAAsyncSelect(SocketHandle socket, WindowHandle window, std::uint32_t message,
+                                              std::int32_t events) {
+  core_.calls.push_back("WSAAsyncSelect " + std::to_string(socket.Value()) + " " +
+                        std::to_string(window.Value()) + " " + std::to_string(message) + " " +
+                        std::to_string(events));
   if (Scripted("WSAAsyncSelect")) return kSocketError;
   const End end = Find(socket);
   if (!end) return loop_ ? kSocketError : 0;
@@ -464,22 +468,22 @@ std::int32_t SimulatedSockets::WSAAsyncSelect(SocketHandle socket, std::uint32_t
 
 // Names.
 
-std::uint32_t SimulatedSockets::WSAAsyncGetHostByName(std::uint32_t window, std::uint32_t message,
-                                                      const std::string& name,
-                                                      std::span<std::uint8_t> buffer) {
-  if (Scripted("WSAAsyncGetHostByName")) return 0;
+LookUpHandle SimulatedSockets::WSAAsyncGetHostByName(WindowHandle window, std::uint32_t message,
+                                                     const std::string& name,
+                                                     std::span<std::uint8_t> buffer) {
+  if (Scripted("WSAAsyncGetHostByName")) return kNoLookUp;
   if (started_ == 0) {
     lastError_ = kNotStarted;
-    return 0;
+    return kNoLookUp;
   }
-  const std::uint32_t lookUp = ++lastLookUp_;
+  const LookUpHandle lookUp(++lastLookUp_);
   lookUps_[lookUp] = {window, message, CutText(name), buffer};
   if (std::find(silentNames_.begin(), silentNames_.end(), CutText(name)) == silentNames_.end())
     Later([this, lookUp] { Resolved(lookUp); });
   return lookUp;
 }
 
-void SimulatedSockets::Resolved(std::uint32_t lookUp) {
+void SimulatedSockets::Resolved(LookUpHandle lookUp) {
   const auto found = lookUps_.find(lookUp);
   if (found == lookUps_.end()) return;
   const LookUp asked = found->second;
@@ -495,10 +499,10 @@ void SimulatedSockets::Resolved(std::uint32_t lookUp) {
     PutLittle32(asked.buffer, 0, static_cast<std::uint32_t>(count));
     for (std::size_t i = 0; i < count; ++i) PutLittle32(asked.buffer, 4 + 4 * i, (*addresses)[i].InMemory());
   }
-  if (loop_) loop_->PostMessage(asked.window, asked.message, lookUp, SocketMessageWord(0, error));
+  if (loop_) loop_->PostMessage(asked.window, asked.message, lookUp.Value(), SocketMessageWord(0, error));
 }
 
-std::int32_t SimulatedSockets::WSACancelAsyncRequest(std::uint32_t lookUp) {
+std::int32_t SimulatedSockets::WSACancelAsyncRequest(LookUpHandle lookUp) {
   if (Scripted("WSACancelAsyncRequest")) return kSocketError;
   return lookUps_.erase(lookUp) > 0 ? 0 : Refused(kInvalidArgument);
 }

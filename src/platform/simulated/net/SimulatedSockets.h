@@ -95,11 +95,11 @@ class SimulatedSockets : public Sockets {
   std::int32_t recv(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags) override;
   std::int32_t recvfrom(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags,
                         SocketAddress& from) override;
-  std::int32_t WSAAsyncSelect(SocketHandle socket, std::uint32_t window, std::uint32_t message,
+  std::int32_t WSAAsyncSelect(SocketHandle socket, WindowHandle window, std::uint32_t message,
                               std::int32_t events) override;
-  std::uint32_t WSAAsyncGetHostByName(std::uint32_t window, std::uint32_t message, const std::string& name,
-                                      std::span<std::uint8_t> buffer) override;
-  std::int32_t WSACancelAsyncRequest(std::uint32_t lookUp) override;
+  LookUpHandle WSAAsyncGetHostByName(WindowHandle window, std::uint32_t message, const std::string& name,
+                                     std::span<std::uint8_t> buffer) override;
+  std::int32_t WSACancelAsyncRequest(LookUpHandle lookUp) override;
   bool WSAIsBlocking() override;
   std::int32_t WSACancelBlockingCall() override;
 
@@ -113,7 +113,7 @@ class SimulatedSockets : public Sockets {
  private:
   using End = std::shared_ptr<SocketEnd>;
   struct LookUp {
-    std::uint32_t window;
+    WindowHandle window;
     std::uint32_t message;
     std::string name;
     std::span<std::uint8_t> buffer;
@@ -134,7 +134,7 @@ class SimulatedSockets : public Sockets {
   void Answered(const End& end);
   void Meet(const End& end, const End& listener);
   void Refill(const End& end);
-  void Resolved(std::uint32_t lookUp);
+  void Resolved(LookUpHandle lookUp);
   std::int32_t ScriptedRead(SocketHandle socket, std::span<std::uint8_t> buffer);
 
   Core& core_;
@@ -143,14 +143,14 @@ class SimulatedSockets : public Sockets {
   int started_ = 0;
   std::int32_t lastError_ = 0;
   std::map<SocketHandle, End> sockets_;
-  SocketHandle lastSocket_ = 0x400;
+  std::uint32_t lastSocket_ = 0x400;
   std::uint16_t lastPort_ = 1024;
   std::map<std::pair<Ipv4Address, std::uint16_t>, SimulatedServer> servers_;
   std::vector<std::weak_ptr<ScriptedPeer>> scripted_;
   std::vector<SocketAddress> echoes_;
   std::map<std::string, std::int32_t> failingNames_;
   std::vector<std::string> silentNames_;
-  std::map<std::uint32_t, LookUp> lookUps_;
+  std::map<LookUpHandle, LookUp> lookUps_;
   std::uint32_t lastLookUp_ = 0x9000;
   std::map<std::string, std::deque<std::int32_t>> failures_;
   std::map<std::string, int> counts_;

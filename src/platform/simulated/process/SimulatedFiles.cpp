@@ -67,7 +67,7 @@ SimulatedVersionInfo::VerQueryValueA(std::span<const std::uint8_t> block, const 
 Handle SimulatedIcons::ExtractIconExA(const std::string& path, int index) {
   const auto found = images_.find(CutText(path));
   if (found == images_.end() || index != 0) return kNoHandle;
-  const auto icon = static_cast<Handle>(++Extracted);
+  const auto icon = Handle(static_cast<std::uint32_t>(++Extracted));
   live_[icon] = found->second;
   return icon;
 }

@@ -35,7 +35,7 @@ bool SimulatedHandles::DuplicateHandle(Handle sourceProcess, Handle handle, Hand
   const Core::Opened* source = core_.Find(sourceProcess, Core::Kind::Process);
   if (!source) return false;
   const auto found = std::find_if(handles_.begin(), handles_.end(), [&](const SystemHandle& entry) {
-    return entry.pid == source->number && entry.handle == handle;
+    return entry.pid == source->number && Handle(entry.handle) == handle;
   });
   if (found == handles_.end() || !found->duplicable) return false;
   duplicate = core_.Open(Core::Kind::Duplicate, static_cast<std::uint32_t>(found - handles_.begin()));

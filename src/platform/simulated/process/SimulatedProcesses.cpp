@@ -8,7 +8,7 @@ namespace quendra::platform::simulated {
 
 namespace {
 
-constexpr std::uint32_t kExecutableModule = 0x00400000;
+constexpr ModuleHandle kExecutableModule{0x00400000};
 
 } // namespace
 
@@ -75,7 +75,7 @@ const Process* SimulatedProcesses::Opened(Handle handle) const {
   return found == processes_.end() ? nullptr : &*found;
 }
 
-bool SimulatedProcesses::EnumProcessModules(Handle handle, std::span<std::uint32_t> modules) {
+bool SimulatedProcesses::EnumProcessModules(Handle handle, std::span<ModuleHandle> modules) {
   const Process* process = Opened(handle);
   core_.lastError = process && !process->path.empty() ? kNoError : kErrorInvalidHandle;
   if (core_.lastError != 0) return false;
@@ -83,7 +83,7 @@ bool SimulatedProcesses::EnumProcessModules(Handle handle, std::span<std::uint32
   return true;
 }
 
-std::uint32_t SimulatedProcesses::GetModuleFileNameExA(Handle handle, std::uint32_t module, std::string& path,
+std::uint32_t SimulatedProcesses::GetModuleFileNameExA(Handle handle, ModuleHandle module, std::string& path,
                                                        std::uint32_t size) {
   const Process* process = Opened(handle);
   core_.lastError =

@@ -30,15 +30,15 @@ class LinuxSocketsTest : public testing::Test {
   LinuxSocketsTest() {
     window_ = desktop_.Windows.Create();
     using Procedure = forms::WindowProcedure::element_type;
-    desktop_.Windows.Replace(window_,
-                             std::make_shared<Procedure>([this](auto, std::uint32_t message,
-                                                                std::uint32_t wParam, std::uint32_t lParam) {
-                               const auto high = static_cast<std::int32_t>(lParam >> 16);
-                               if (message == kMessage)
-                                 seen.push_back({wParam, static_cast<std::int32_t>(lParam & 0xFFFF), high});
-                               if (message == kNameMessage) names.push_back({wParam, 0, high});
-                               return 0;
-                             }));
+    desktop_.Windows.Replace(
+        window_, std::make_shared<Procedure>([this](auto, std::uint32_t message, std::uint32_t wParam,
+                                                    std::uint32_t lParam) {
+          const auto high = static_cast<std::int32_t>(lParam >> 16);
+          if (message == kMessage)
+            seen.push_back({SocketHandle(wParam), static_cast<std::int32_t>(lParam & 0xFFFF), high});
+          if (message == kNameMessage) names.push_back({SocketHandle(wParam), 0, high});
+          return 0;
+        }));
     sockets.WSAStartup(257);
   }
   static SocketAddress At(std::uint16_t port) { return {Ipv4Address::FromHost(INADDR_LOOPBACK), port}; }
@@ -97,7 +97,7 @@ class LinuxSocketsTest : public testing::Test {
 
  private:
   forms::HeadlessDesktop desktop_;
-  forms::WindowHandle window_ = 0;
+  forms::WindowHandle window_;
   const ProcFolder folder_;
   LinuxHostNames hostNames_{folder_};
 

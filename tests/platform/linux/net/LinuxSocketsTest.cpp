@@ -18,16 +18,16 @@ TEST_F(LinuxSocketsTest, Without_a_start_every_call_fails_with_10093) {
   EXPECT_EQ(sockets.WSACleanup(), 0);
   EXPECT_EQ(NewSocket(), kNoSocket);
   EXPECT_EQ(LastError(), 10093);
-  EXPECT_EQ(sockets.closesocket(1), kSocketError);
+  EXPECT_EQ(sockets.closesocket(SocketHandle(1)), kSocketError);
   EXPECT_EQ(LastError(), 10093);
   EXPECT_EQ(sockets.WSACleanup(), kSocketError);
   EXPECT_EQ(LastError(), 10093);
   std::array<std::uint8_t, 64> buffer;
-  EXPECT_EQ(sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer), 0u);
+  EXPECT_EQ(sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer), kNoLookUp);
 }
 
 TEST_F(LinuxSocketsTest, A_handle_that_is_no_socket_fails_with_10038) {
-  EXPECT_EQ(sockets.closesocket(4711), kSocketError);
+  EXPECT_EQ(sockets.closesocket(SocketHandle(4711)), kSocketError);
   EXPECT_EQ(LastError(), 10038);
   const SocketHandle socket = NewSocket();
   EXPECT_EQ(sockets.closesocket(socket), 0);
@@ -325,10 +325,10 @@ TEST_F(LinuxSocketsTest, A_closed_socket_announces_nothing_more) {
 
 TEST_F(LinuxSocketsTest, A_name_is_found_and_its_addresses_stand_in_the_buffer) {
   std::array<std::uint8_t, 1024> buffer{};
-  const std::uint32_t lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
-  ASSERT_NE(lookUp, 0u);
+  const LookUpHandle lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
+  ASSERT_NE(lookUp, kNoLookUp);
   ASSERT_TRUE(Until([&] { return !names.empty(); }));
-  EXPECT_EQ(names, (std::vector<Seen>{{lookUp, 0, 0}}));
+  EXPECT_EQ(names, (std::vector<Seen>{{SocketHandle(lookUp.Value()), 0, 0}}));
   EXPECT_GE(Little32(buffer, 0), 1u);
   EXPECT_EQ(Big32(buffer, 4), INADDR_LOOPBACK);
 }
@@ -337,15 +337,15 @@ TEST_F(LinuxSocketsTest, A_name_that_no_host_can_have_is_not_found) {
   std::array<std::uint8_t, 1024> buffer{};
   for (const std::string& name : {std::string(300, 'x'), std::string(70'000, 'y')}) {
     names.clear();
-    const std::uint32_t lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, name, buffer);
+    const LookUpHandle lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, name, buffer);
     ASSERT_TRUE(Until([&] { return !names.empty(); }));
-    EXPECT_EQ(names, (std::vector<Seen>{{lookUp, 0, 11001}}));
+    EXPECT_EQ(names, (std::vector<Seen>{{SocketHandle(lookUp.Value()), 0, 11001}}));
   }
 }
 
 TEST_F(LinuxSocketsTest, A_look_up_that_is_cancelled_tells_nothing_and_can_not_be_cancelled_twice) {
   std::array<std::uint8_t, 1024> buffer{};
-  const std::uint32_t lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
+  const LookUpHandle lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
   EXPECT_EQ(sockets.WSACancelAsyncRequest(lookUp), 0);
   EXPECT_EQ(sockets.WSACancelAsyncRequest(lookUp), kSocketError);
   EXPECT_EQ(LastError(), kInvalidArgument);
@@ -362,7 +362,8 @@ TEST_F(LinuxSocketsTest, The_sockets_may_go_while_look_ups_run) {
   for (int round = 0; round < 20; ++round) {
     LinuxSockets gone(desktop, desktop, hostNames);
     gone.WSAStartup(257);
-    for (int i = 0; i < 5; ++i) gone.WSAAsyncGetHostByName(1, kNameMessage, "localhost", buffer);
+    for (int i = 0; i < 5; ++i)
+      gone.WSAAsyncGetHostByName(WindowHandle(1), kNameMessage, "localhost", buffer);
   }
   desktop.WaitFor([] { return false; }, 50);
   EXPECT_FALSE(desktop.Ended);

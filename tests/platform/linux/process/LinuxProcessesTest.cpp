@@ -31,7 +31,7 @@ struct LinuxProcessesTest : testing::Test {
   /// The path as the program asks for it: into 260 blanks, stating 500.
   std::string PathOf(std::uint32_t processId) {
     const Handle process = processes.OpenProcess(1040, false, processId);
-    std::uint32_t modules[50] = {};
+    ModuleHandle modules[50] = {};
     std::string path(260, ' ');
     std::uint32_t length = 0;
     if (processes.EnumProcessModules(process, modules))
@@ -120,7 +120,7 @@ TEST_F(LinuxProcessesTest, A_process_without_an_executable_has_no_module) {
   proc.Add(2, {"kthreadd", 0, "", 'S', true});
   const Handle process = processes.OpenProcess(1040, false, 2);
   ASSERT_NE(process, kNoHandle);
-  std::uint32_t modules[50] = {};
+  ModuleHandle modules[50] = {};
   EXPECT_FALSE(processes.EnumProcessModules(process, modules));
   EXPECT_EQ(processes.GetLastError(), 299u);
 }
@@ -129,7 +129,7 @@ TEST_F(LinuxProcessesTest, An_opened_process_is_not_mixed_up_with_one_that_takes
   proc.Add(7, {"seven", 1, "/bin/seven"});
   const Handle process = processes.OpenProcess(1040, false, 7);
   proc.TakeOver(7, {"other", 1, "/bin/other"});
-  std::uint32_t modules[50] = {};
+  ModuleHandle modules[50] = {};
   EXPECT_FALSE(processes.EnumProcessModules(process, modules));
 }
 
@@ -143,7 +143,7 @@ TEST_F(LinuxProcessesTest, A_path_is_written_over_the_start_of_the_text_and_its_
   const std::string file = AddRunning(7, "seven");
   const Handle process = processes.OpenProcess(1040, false, 7);
   std::string path(file.size() + 6, ' ');
-  EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, path, 500), file.size());
+  EXPECT_EQ(processes.GetModuleFileNameExA(process, ModuleHandle(1), path, 500), file.size());
   EXPECT_EQ(path, file + "      ");
 }
 
@@ -151,20 +151,20 @@ TEST_F(LinuxProcessesTest, A_path_is_cut_to_the_size_stated_and_to_the_text) {
   const std::string file = AddRunning(7, "seven");
   const Handle process = processes.OpenProcess(1040, false, 7);
   std::string path(20, ' ');
-  EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, path, 4), 4u);
+  EXPECT_EQ(processes.GetModuleFileNameExA(process, ModuleHandle(1), path, 4), 4u);
   EXPECT_EQ(path, file.substr(0, 4) + std::string(16, ' '));
   std::string shortText(8, ' ');
-  EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, shortText, 500), 8u);
+  EXPECT_EQ(processes.GetModuleFileNameExA(process, ModuleHandle(1), shortText, 500), 8u);
   EXPECT_EQ(shortText, file.substr(0, 8));
   std::string none;
-  EXPECT_EQ(processes.GetModuleFileNameExA(process, 1, none, 500), 0u);
+  EXPECT_EQ(processes.GetModuleFileNameExA(process, ModuleHandle(1), none, 500), 0u);
 }
 
 TEST_F(LinuxProcessesTest, A_module_that_a_process_lacks_has_no_path) {
   AddRunning(7, "seven");
   const Handle process = processes.OpenProcess(1040, false, 7);
   std::string path(20, ' ');
-  EXPECT_EQ(processes.GetModuleFileNameExA(process, 5, path, 500), 0u);
+  EXPECT_EQ(processes.GetModuleFileNameExA(process, ModuleHandle(5), path, 500), 0u);
 }
 
 TEST_F(LinuxProcessesTest, A_path_of_Hebrew_letters_stays_itself_and_leads_back_to_its_file) {
@@ -233,7 +233,7 @@ TEST_F(LinuxProcessesTest, The_own_process_has_a_path) {
   const ProcFolder real;
   LinuxProcesses own(real, handles, paths);
   std::string path(260, ' ');
-  const std::uint32_t length = own.GetModuleFileNameExA(own.GetCurrentProcess(), 0, path, 500);
+  const std::uint32_t length = own.GetModuleFileNameExA(own.GetCurrentProcess(), ModuleHandle(), path, 500);
   EXPECT_TRUE(path.substr(0, length).ends_with("platform_test")) << path;
   EXPECT_TRUE(own.CloseHandle(own.GetCurrentProcess()));
 }
@@ -272,9 +272,9 @@ TEST_F(LinuxTokensTest, A_privilege_of_another_name_is_not_known) {
 
 TEST_F(LinuxTokensTest, A_handle_that_is_no_token_adjusts_nothing) {
   LinuxTokens tokens(handles);
-  EXPECT_FALSE(tokens.AdjustTokenPrivileges(99, false, 20, 2, previous));
+  EXPECT_FALSE(tokens.AdjustTokenPrivileges(Handle(99), false, 20, 2, previous));
   EXPECT_EQ(handles.lastError, 6u);
-  EXPECT_FALSE(tokens.OpenProcessToken(99, 40, token));
+  EXPECT_FALSE(tokens.OpenProcessToken(Handle(99), 40, token));
 }
 
 TEST_F(LinuxTokensTest, The_administrator_may_look_at_every_process) {
