@@ -12,7 +12,7 @@
 #include "TablePassBenchCrowd.h"
 
 #include "app/Program.h"
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "forms/qt/QtDesktop.h"
 #include "monitor/MonitorControls.h"
 #include "monitor/ProcessRow.h"
@@ -124,7 +124,7 @@ void Measure(const Subject& subject, double first, int passes) {
 
 /// The table alone: no window shows it.
 void MeasureTable(int passes) {
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   platform::linux_::LinuxMachine machine(desktop, desktop);
   const platform::Machine operations = machine.Operations();
   monitor::MonitorControls controls;

@@ -3,7 +3,7 @@
 //   socket-download leave PORT           the handler leaves the data in the object's buffer
 //   socket-download many PORT COUNT      COUNT sockets of one object, all at once, each taking its data
 
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "foundation/CSocketPlus.h"
 #include "platform/linux/net/LinuxHostNames.h"
 #include "platform/linux/net/LinuxSockets.h"
@@ -21,7 +21,7 @@ namespace {
 constexpr int kMostMilliseconds = 100'000;
 
 struct Download {
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   platform::linux_::ProcFolder folder{"/proc"};
   platform::linux_::LinuxHostNames hostNames{folder};
   platform::linux_::LinuxSockets library{desktop, desktop, hostNames};

@@ -4,10 +4,6 @@
 
 #include <gtest/gtest.h>
 
-#include <unistd.h>
-
-#include <thread>
-
 namespace quendra::forms {
 namespace {
 
@@ -161,56 +157,6 @@ TEST_F(HeadlessDesktopTest, Work_that_posts_itself_for_ever_is_found_out) {
   again();
 
   EXPECT_THROW(desktop.RunUntilIdle(), std::runtime_error);
-}
-
-TEST_F(HeadlessDesktopTest, A_post_from_another_thread_arrives) {
-  bool arrived = false;
-  std::thread worker([&] { desktop.Post([&] { arrived = true; }); });
-
-  EXPECT_TRUE(desktop.WaitFor([&] { return arrived; }, 5000));
-  worker.join();
-}
-
-TEST_F(HeadlessDesktopTest, A_watched_descriptor_is_called_as_long_as_it_can_be_read) {
-  int ends[2];
-  ASSERT_EQ(pipe(ends), 0);
-  int calls = 0;
-  auto watch = desktop.WatchDescriptor(ends[0], [&] { ++calls; });
-
-  desktop.PumpOnce();
-  EXPECT_EQ(calls, 0);
-  ASSERT_EQ(write(ends[1], "x", 1), 1);
-  desktop.PumpOnce();
-  desktop.PumpOnce();
-  EXPECT_EQ(calls, 2);
-  watch.reset();
-  desktop.PumpOnce();
-
-  EXPECT_EQ(calls, 2);
-  close(ends[0]);
-  close(ends[1]);
-}
-
-TEST_F(HeadlessDesktopTest, A_watch_may_be_dropped_by_its_own_handler) {
-  int ends[2];
-  ASSERT_EQ(pipe(ends), 0);
-  ASSERT_EQ(write(ends[1], "x", 1), 1);
-  int calls = 0;
-  std::unique_ptr<platform::EventLoop::Subscription> watch;
-  watch = desktop.WatchDescriptor(ends[0], [&] {
-    ++calls;
-    watch.reset();
-  });
-
-  desktop.RunUntilIdle();
-
-  EXPECT_EQ(calls, 1);
-  close(ends[0]);
-  close(ends[1]);
-}
-
-TEST_F(HeadlessDesktopTest, Waiting_in_vain_gives_up) {
-  EXPECT_FALSE(desktop.WaitFor([] { return false; }, 1));
 }
 
 // Time.

@@ -17,8 +17,6 @@ namespace {
 /// Peers on loopback that mean no good. Each plays on a thread of its own, over plain sockets.
 class HostilePeers : public testing::Test {
  protected:
-  static constexpr int kMostMilliseconds = 40'000;
-
   ~HostilePeers() override {
     stop_ = true;
     if (peer_.joinable()) peer_.join();
@@ -45,9 +43,7 @@ class HostilePeers : public testing::Test {
     program->ArrayAdd(1);
     program->Connect(1, Text(u"127.0.0.1"), port);
   }
-  bool Until(const std::function<bool()>& condition) {
-    return world->Desktop.WaitFor(condition, kMostMilliseconds);
-  }
+  bool Until(const std::function<bool()>& condition) { return world->Until(condition); }
   void Play(std::function<void()> play) { peer_ = std::thread(std::move(play)); }
   static sockaddr_in Loopback(std::int32_t port) {
     sockaddr_in address{};

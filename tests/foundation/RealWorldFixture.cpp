@@ -1,3 +1,4 @@
+#include "forms/headless/posix/PolledDesktop.h"
 #include "foundation/WorldFixture.h"
 #include "platform/linux/net/LinuxHostNames.h"
 #include "platform/linux/net/LinuxSockets.h"
@@ -116,7 +117,7 @@ class RealFarDatagrams : public FarDatagrams {
 
 class RealWorld : public World {
  public:
-  RealWorld() : sockets_(Desktop, Desktop, names_) {}
+  RealWorld() : World(std::make_unique<forms::PolledDesktop>()) {}
 
   platform::Sockets& Sockets() override { return sockets_; }
   platform::HostNames& Names() override { return names_; }
@@ -129,15 +130,16 @@ class RealWorld : public World {
   }
   std::unique_ptr<FarDatagrams> OpenDatagrams() override { return std::make_unique<RealFarDatagrams>(); }
   std::int32_t ClosedPort() override { return PortOf(BoundSocket(SOCK_STREAM)); }
-  bool Until(const std::function<bool()>& condition) override { return Desktop.WaitFor(condition, 10'000); }
+  bool Until(const std::function<bool()>& condition) override { return desktop_.WaitFor(condition, 40'000); }
   void Settle() override {
-    Desktop.WaitFor([] { return false; }, 30);
+    desktop_.WaitFor([] { return false; }, 30);
   }
 
  private:
+  forms::PolledDesktop& desktop_ = static_cast<forms::PolledDesktop&>(Desktop);
   const platform::linux_::ProcFolder folder_;
   platform::linux_::LinuxHostNames names_{folder_};
-  platform::linux_::LinuxSockets sockets_;
+  platform::linux_::LinuxSockets sockets_{desktop_, desktop_, names_};
 };
 
 } // namespace

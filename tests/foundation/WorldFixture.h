@@ -44,6 +44,8 @@ class FarDatagrams {
 /// A network that the program's sockets live in: a simulated one, or this machine's loopback.
 class World {
  public:
+  explicit World(std::unique_ptr<forms::HeadlessDesktop> desktop)
+      : desktop_(std::move(desktop)), Desktop(*desktop_) {}
   virtual ~World() = default;
 
   virtual platform::Sockets& Sockets() = 0;
@@ -58,7 +60,11 @@ class World {
   /// Lets all happen that is under way.
   virtual void Settle() = 0;
 
-  forms::HeadlessDesktop Desktop;
+ private:
+  std::unique_ptr<forms::HeadlessDesktop> desktop_;
+
+ public:
+  forms::HeadlessDesktop& Desktop;
 };
 
 using MakeWorld = std::unique_ptr<World> (*)();

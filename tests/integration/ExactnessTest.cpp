@@ -1,5 +1,5 @@
 #include "app/Program.h"
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "integration/FrameLedger.h"
 #include "integration/LinkedNamespaces.h"
 #include "integration/Worker.h"
@@ -191,7 +191,7 @@ class Exactness : public testing::Test {
   Worker* datagrams = nullptr;
   std::map<std::uint16_t, pid_t> owners;
 
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   std::optional<FrameLedger> ledger;
   std::optional<platform::linux_::LinuxMachine> machine;
   std::optional<app::Program> program;

@@ -1,4 +1,4 @@
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "forms/qt/QtDesktop.h"
 #include "integration/MonitoredDownload.h"
 #include "integration/RawFrames.h"
@@ -17,7 +17,7 @@ namespace {
 constexpr int kBoxStands = 2500;
 
 /// A desktop whose boxes stand for a while before they are answered.
-class HeadlessWithSlowBoxes : public forms::HeadlessDesktop {
+class HeadlessWithSlowBoxes : public forms::PolledDesktop {
  public:
   HeadlessWithSlowBoxes() {
     OnBox = [this] { WaitFor([] { return false; }, kBoxStands); };

@@ -1,5 +1,5 @@
 #include "app/Program.h"
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "integration/LinkedNamespaces.h"
 #include "integration/Worker.h"
 #include "monitor/ProcessRow.h"
@@ -74,7 +74,7 @@ class LostLink : public testing::Test {
   std::optional<LinkedNamespaces> hosts;
   std::optional<Worker> server;
   std::optional<Worker> client;
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   std::optional<platform::linux_::LinuxMachine> machine;
   std::optional<app::Program> program;
 };

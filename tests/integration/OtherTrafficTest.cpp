@@ -1,4 +1,4 @@
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "integration/MonitoredDownload.h"
 
 #include <chrono>
@@ -73,7 +73,7 @@ class OtherTraffic : public MonitoredDownload, public testing::WithParamInterfac
     Settle();
   }
 
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   std::vector<Pass> passes{1};
   std::int32_t tick = 0;
   std::chrono::steady_clock::time_point passEnd;

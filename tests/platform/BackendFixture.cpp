@@ -1,5 +1,6 @@
 #include "platform/BackendFixture.h"
 
+#include "forms/headless/posix/PolledDesktop.h"
 #include "platform/linux/LinuxMachine.h"
 #include "platform/simulated/SimulatedMachine.h"
 
@@ -70,6 +71,13 @@ class SimulatedBackend : public Backend {
   std::unique_ptr<FarEnd> TakeConnection() override {
     if (taken_ == server_.Connections.size()) return nullptr;
     return std::make_unique<SimulatedFarEnd>(server_.Connections[taken_++]);
+  }
+  bool Until(const std::function<bool()>& condition) override {
+    for (int round = 0; round < 10'000; ++round) {
+      if (condition()) return true;
+      desktop_.PumpOnce();
+    }
+    return false;
   }
   void Settle() override { desktop_.RunUntilIdle(); }
 
@@ -151,6 +159,7 @@ class LinuxBackend : public Backend {
     const int taken = accept4(sockets_.back(), nullptr, nullptr, SOCK_CLOEXEC);
     return taken < 0 ? nullptr : std::make_unique<RealFarEnd>(taken);
   }
+  bool Until(const std::function<bool()>& condition) override { return loop_.WaitFor(condition, 10'000); }
   void Settle() override {
     loop_.WaitFor([] { return false; }, 30);
   }
@@ -175,7 +184,7 @@ class LinuxBackend : public Backend {
     return ntohs(address.sin_port);
   }
 
-  forms::HeadlessDesktop loop_;
+  forms::PolledDesktop loop_;
   linux_::LinuxMachine machine_;
   std::vector<int> sockets_;
 };

@@ -5,6 +5,7 @@
 #include "platform/net/Sockets.h"
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <string>
 
@@ -49,6 +50,8 @@ class Backend {
   virtual SocketAddress Outside() = 0;
   /// The next connection that came there; nullptr while there is none.
   virtual std::unique_ptr<FarEnd> TakeConnection() = 0;
+  /// Waits for what the machine does on its own; false when it doesn't come.
+  virtual bool Until(const std::function<bool()>& condition) = 0;
   /// Lets all happen that is under way.
   virtual void Settle() = 0;
 };

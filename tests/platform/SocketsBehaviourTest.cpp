@@ -61,7 +61,7 @@ class SocketsBehaviour : public testing::TestWithParam<Kind> {
     backend->Settle();
     told.clear();
   }
-  bool Until(const std::function<bool()>& condition) { return backend->Desktop().WaitFor(condition, 10'000); }
+  bool Until(const std::function<bool()>& condition) { return backend->Until(condition); }
   int Count(Told event) { return static_cast<int>(std::count(told.begin(), told.end(), event)); }
   bool Saw(Told event) {
     return Until([&] { return Count(event) > 0; });

@@ -1,22 +1,20 @@
 #pragma once
 
-#include "platform/DescriptorWatch.h"
+#include "platform/EventLoop.h"
 
 #include <cstdint>
 #include <deque>
-#include <mutex>
 #include <vector>
 
 namespace quendra::forms {
 
-/// The loop of a program under test: posted work waits until it is pumped and timers follow a clock that the
-/// test moves.
-class HeadlessLoop : public platform::EventLoop, public platform::DescriptorWatch {
+/// The loop of a program under test, on any system: posted work waits until it is pumped and timers follow a
+/// clock that the test moves. One thread.
+class HeadlessLoop : public platform::EventLoop {
  public:
-  void Post(std::function<void()> work) override;
-  std::unique_ptr<Subscription> WatchDescriptor(int descriptor, std::function<void()> ready) override;
+  void Post(std::function<void()> work) override { PostHere(std::move(work)); }
   std::unique_ptr<Subscription> StartTimer(int milliseconds, std::function<void()> tick) override;
-  /// What was posted before the call, then each descriptor that can be read, once.
+  /// What was posted before the call.
   void PumpOnce() override;
 
   /// Pumps until nothing waits. More than 100,000 rounds raise std::runtime_error: the work never ends.
@@ -24,10 +22,6 @@ class HeadlessLoop : public platform::EventLoop, public platform::DescriptorWatc
   /// Moves the clock on. Timers tick in the order of their times; what they post runs before the clock moves
   /// further.
   void Advance(int milliseconds);
-  /// For real descriptors and threads: pumps, with the clock following real time, until the condition holds.
-  /// False when it doesn't hold in time.
-  bool WaitFor(const std::function<bool()>& condition, int realMilliseconds);
-
   /// Milliseconds since the loop was made.
   std::int64_t Now() const { return now_; }
 
@@ -46,17 +40,32 @@ class HeadlessLoop : public platform::EventLoop, public platform::DescriptorWatc
   /// A period below 1 stops it.
   void SetAlarm(Alarm& alarm, int period);
 
- private:
-  class Watch;
+  /// Holds what the loop itself only knows weakly.
+  template <typename Held> class SubscriptionTo : public Subscription {
+   public:
+    explicit SubscriptionTo(std::shared_ptr<Held> held) : held_(std::move(held)) {}
 
-  bool HasPosted();
-  bool PumpPosted();
-  bool PumpDescriptors(int realMilliseconds);
+   private:
+    std::shared_ptr<Held> held_;
+  };
+
+  // For a loop that hears of more than its own thread tells it.
+
+  /// Posts what others left for this thread.
+  virtual void Collect() {}
+  /// Handles each other source of events once; true when one had something.
+  virtual bool PumpSources() { return false; }
+  void PostHere(std::function<void()> work) { posted_.push_back(std::move(work)); }
+  bool HasPosted() {
+    Collect();
+    return !posted_.empty();
+  }
+
+ private:
+  void PumpPosted();
   std::shared_ptr<Alarm> NextAlarm(std::int64_t until);
 
-  std::mutex postedLock_;
   std::deque<std::function<void()>> posted_;
-  std::vector<std::weak_ptr<Watch>> watches_;
   std::vector<std::weak_ptr<Alarm>> alarms_;
   std::int64_t now_ = 0;
   std::uint64_t sequence_ = 0;

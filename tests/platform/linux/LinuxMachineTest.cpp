@@ -1,5 +1,5 @@
 #include "platform/linux/LinuxMachine.h"
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "platform/linux/LinuxFixture.h"
 #include "platform/linux/system/Descriptor.h"
 #include "platform/linux/system/LinuxShellStart.h"
@@ -123,7 +123,7 @@ TEST(LinuxShellStartTest, Signs_that_a_shell_would_understand_are_plain_words) {
 }
 
 struct LinuxMachineTest : testing::Test {
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   LinuxMachine machine{desktop, desktop};
   Machine operations = machine.Operations();
 };
@@ -160,7 +160,7 @@ TEST_F(LinuxMachineTest, A_user_without_rights_gets_snapshot_table_and_host_addr
   if (::geteuid() != 0) GTEST_SKIP() << "needs the administrator to become another user";
   const Child user([] {
     if (::setgid(65534) != 0 || ::setuid(65534) != 0) return std::string("no other user");
-    forms::HeadlessDesktop loop;
+    forms::PolledDesktop loop;
     LinuxMachine limited(loop, loop);
     const Machine machine = limited.Operations();
     std::string text;

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "app/Program.h"
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "integration/NetworkNamespace.h"
 #include "platform/linux/LinuxMachine.h"
 #include "report/SupportRequests.h"
@@ -95,7 +95,7 @@ class LiveReportTest : public testing::Test {
  protected:
   std::string folder;
   std::string bodySent;
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   std::unique_ptr<platform::linux_::LinuxMachine> machine;
   std::unique_ptr<app::Program> program;
 };

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "integration/NetworkNamespace.h"
 #include "integration/RawFrames.h"
 #include "platform/linux/capture/LinuxCapture.h"
@@ -41,7 +41,7 @@ class LinuxCaptureFixture : public testing::Test {
   }
 
   std::unique_ptr<integration::NetworkNamespace> network;
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   std::optional<LinuxCapture> capture;
   std::int32_t lastIndex = -1; ///< as VBPcapInit told
   std::unique_ptr<CaptureControl> control;

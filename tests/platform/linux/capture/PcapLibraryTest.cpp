@@ -1,6 +1,6 @@
 #include "platform/linux/capture/PcapLibrary.h"
 
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "platform/linux/capture/LinuxCapture.h"
 
 #include <gtest/gtest.h>
@@ -16,7 +16,7 @@ constexpr const char* kOtherLibrary[] = {"libc.so.6"};
 struct CaptureOver {
   explicit CaptureOver(std::span<const char* const> names) : capture(desktop, desktop, PcapLibrary(names)) {}
 
-  forms::HeadlessDesktop desktop;
+  forms::PolledDesktop desktop;
   LinuxCapture capture;
 };
 

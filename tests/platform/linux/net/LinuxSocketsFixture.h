@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/headless/HeadlessDesktop.h"
+#include "forms/headless/posix/PolledDesktop.h"
 #include "platform/linux/net/LinuxHostNames.h"
 #include "platform/linux/net/LinuxSockets.h"
 
@@ -96,7 +96,7 @@ class LinuxSocketsTest : public testing::Test {
   int LastError() { return sockets.WSAGetLastError(); }
 
  private:
-  forms::HeadlessDesktop desktop_;
+  forms::PolledDesktop desktop_;
   forms::WindowHandle window_;
   const ProcFolder folder_;
   LinuxHostNames hostNames_{folder_};
