@@ -43,6 +43,7 @@ const std::map<std::string, Names>& Allowed() {
       {"forms/qt", {"forms", "runtime"}},
       {"forms/win32", {"forms", "runtime"}},
       {"forms/headless", {"forms", "runtime"}},
+      {"forms/headless/posix", {"forms", "forms/headless", "runtime"}},
       // What a system lacks is answered by the backend that lacks everything.
       {"platform/linux", {"platform", "platform/unavailable", "runtime"}},
       {"platform/windows", {"platform", "platform/unavailable", "runtime"}},
@@ -55,16 +56,21 @@ const std::map<std::string, Names>& Allowed() {
 bool IsDesktop(const std::string& folder) { return folder.starts_with("forms/"); }
 bool IsBackend(const std::string& folder) { return folder.find('/') != std::string::npos; }
 
+/// What only systems of one kind can be built with stands in these; all others compile for every edition.
+bool IsPortable(const std::string& folder) {
+  static const Names ofOneSystem{"forms/qt", "forms/win32", "forms/headless/posix", "platform/linux",
+                                 "platform/windows"};
+  return !ofOneSystem.contains(folder);
+}
+
 /// The layer or backend that a path lies in, however deep: "forms/qt" for "forms/qt/views/FormView.h",
 /// "forms" for "forms/Form.h", "platform" for "platform/net/Sockets.h", empty for a path outside the layers.
-std::string FolderOf(const std::string& path) {
-  const auto first = path.find('/');
-  if (first == std::string::npos) return {};
-  const auto second = path.find('/', first + 1);
-  if (second != std::string::npos && Allowed().contains(path.substr(0, second)))
-    return path.substr(0, second);
-  const std::string layer = path.substr(0, first);
-  return Allowed().contains(layer) ? layer : std::string{};
+std::string FolderOf(std::string path) {
+  for (auto end = path.rfind('/'); end != std::string::npos; end = path.rfind('/')) {
+    path.resize(end);
+    if (Allowed().contains(path)) return path;
+  }
+  return {};
 }
 
 const Names kStandardHeaders{"algorithm",
@@ -154,6 +160,11 @@ const Names kStandardHeaders{"algorithm",
                              "vector",
                              "version"};
 
+/// Headers of the standard library that the compiler of the Windows edition offers nothing of: its threads
+/// would need a system newer than XP.
+const Names kThreadHeaders{"barrier",   "condition_variable", "future",     "latch", "mutex",
+                           "semaphore", "shared_mutex",       "stop_token", "thread"};
+
 bool IsQtHeader(const std::string& header) {
   return header.starts_with("Qt") ||
          (header.size() > 1 && header[0] == 'Q' && std::isupper(static_cast<unsigned char>(header[1])));
@@ -162,8 +173,8 @@ bool IsQtHeader(const std::string& header) {
 /// Headers of a system or toolkit that a source may name.
 bool MayNameSystemHeader(const std::string& folder, const std::string& header) {
   if (folder == "forms/qt") return IsQtHeader(header);
-  if (folder == "forms/headless") return header == "poll.h" || header == "unistd.h";
-  if (folder == "forms/win32" || folder == "platform/linux" || folder == "platform/windows")
+  if (folder == "forms/headless/posix" || folder == "forms/win32" || folder == "platform/linux" ||
+      folder == "platform/windows")
     return !IsQtHeader(header);
   return false;
 }
@@ -180,8 +191,17 @@ std::string WhyNotIncluded(const std::string& path, const std::string& header) {
 }
 
 std::string WhyNotSystem(const std::string& path, const std::string& header) {
+  if (IsPortable(FolderOf(path)) && kThreadHeaders.contains(header)) return "asks for threads";
   if (kStandardHeaders.contains(header)) return {};
   return MayNameSystemHeader(FolderOf(path), header) ? "" : "is a header of a system or toolkit";
+}
+
+/// An atomic number of 64 bits is a call into a library on 32-bit machines.
+bool HasWideAtomic(const std::string& line) {
+  static const std::regex wide(R"(\batomic(_ref)?\s*<\s*(std::)?(u?int(_least|_fast)?64_t|u?intmax_t|)"
+                               R"((unsigned\s+)?long\s+long(\s+int)?|(long\s+)?double)\s*>|)"
+                               R"(\batomic_(u?int(_least|_fast)?64_t|u?intmax_t|u?llong)\b)");
+  return std::regex_search(line.substr(0, line.find("//")), wide);
 }
 
 std::string WhyWrongLine(const std::string& path, const std::string& line) {
@@ -202,6 +222,7 @@ std::string WhyWrongLine(const std::string& path, const std::string& line) {
     const std::string asked = match[2];
     if (std::regex_search(asked, system)) return "asks for an operating system";
   }
+  if (IsPortable(FolderOf(path)) && HasWideAtomic(line)) return "is an atomic number of 64 bits";
   return {};
 }
 

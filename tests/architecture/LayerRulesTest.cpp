@@ -30,7 +30,8 @@ TEST(LayerRules, An_include_that_goes_down_is_allowed) {
       {"forms/qt/QtDesktop.h", "#include \"platform/EventLoop.h\""},
       {"forms/headless/HeadlessLoop.h", "#include \"platform/EventLoop.h\""},
       {"forms/qt/QtDesktop.cpp", "#include <QApplication>"},
-      {"forms/headless/HeadlessLoop.cpp", "#include <poll.h>"},
+      {"forms/headless/posix/PolledDesktop.h", "#include \"forms/headless/HeadlessDesktop.h\""},
+      {"forms/headless/posix/PolledDesktop.cpp", "#include <poll.h>"},
       {"platform/linux/capture/LinuxCapture.cpp", "#include <pcap/pcap.h>"},
       {"platform/windows/WindowsMachine.cpp", "#include <windows.h>"},
       {"platform/linux/LinuxMachine.cpp", "#include \"platform/unavailable/UnavailableHandles.h\""},
@@ -66,6 +67,7 @@ TEST(LayerRules, A_backend_that_is_named_outside_app_is_found) {
       {"forms/Desktop.cpp", "#include \"forms/headless/HeadlessDesktop.h\""},
       {"platform/Machine.h", "#include \"platform/linux/LinuxMachine.h\""},
       {"forms/headless/HeadlessDesktop.h", "#include \"forms/qt/QtDesktop.h\""},
+      {"forms/headless/HeadlessDesktop.h", "#include \"forms/headless/posix/PolledDesktop.h\""},
       {"platform/simulated/SimulatedMachine.h", "#include \"platform/linux/LinuxMachine.h\""},
       {"platform/Machine.h", "#include \"platform/unavailable/UnavailableMachine.h\""},
       {"platform/unavailable/UnavailableMachine.h", "#include \"platform/linux/LinuxMachine.h\""},
@@ -83,13 +85,40 @@ TEST(LayerRules, A_header_of_a_system_or_toolkit_outside_its_backend_is_found) {
       {"forms/Form.h", "#include <QtGlobal>"},
       {"platform/linux/LinuxMachine.cpp", "#include <QSocketNotifier>"},
       {"forms/qt/QtDesktop.cpp", "#include <sys/socket.h>"},
+      {"forms/headless/HeadlessLoop.cpp", "#include <poll.h>"},
       {"forms/headless/HeadlessLoop.cpp", "#include <sys/socket.h>"},
+      {"forms/headless/posix/PolledDesktop.cpp", "#include <QSocketNotifier>"},
       {"platform/simulated/SimulatedMachine.cpp", "#include <netinet/in.h>"},
       {"runtime/Text.cpp", "#include <iconv.h>"},
       {"app/main_linux.cpp", "#include <QApplication>"},
       {"runtime/Text.cpp", "#include <string.h>"},
   };
   for (const Case& row : cases) EXPECT_FALSE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
+}
+
+TEST(LayerRules, Threads_above_the_backends_are_found) {
+  for (const std::string header : {"mutex", "shared_mutex", "thread", "condition_variable", "future",
+                                   "semaphore", "latch", "barrier", "stop_token"}) {
+    const std::string line = "#include <" + header + ">";
+    for (const char* path : {"runtime/Text.cpp", "forms/Form.h", "platform/Machine.h", "capture/Sniffer.cpp",
+                             "forms/headless/HeadlessLoop.h", "platform/simulated/SimulatedMachine.cpp"})
+      EXPECT_FALSE(IsAllowed(path, line)) << path << ": " << line;
+    for (const char* path : {"forms/qt/loop/QtEventLoop.h", "platform/linux/net/NameLookUps.cpp",
+                             "forms/headless/posix/PolledDesktop.h", "platform/windows/WindowsMachine.cpp"})
+      EXPECT_TRUE(IsAllowed(path, line)) << path << ": " << line;
+  }
+}
+
+TEST(LayerRules, An_atomic_number_of_64_bits_above_the_backends_is_found) {
+  for (const char* line : {"  std::atomic<std::int64_t> bytes;", "std::atomic< uint64_t > bytes;",
+                           "std::atomic<unsigned long long> bytes;", "std::atomic_uint64_t bytes;",
+                           "std::atomic<double> rate;", "std::atomic_ref<std::uint64_t> view(bytes);"}) {
+    EXPECT_FALSE(IsAllowed("capture/Sniffer.h", line)) << line;
+    EXPECT_TRUE(IsAllowed("platform/linux/capture/PcapSession.h", line)) << line;
+  }
+  for (const char* line : {"std::atomic<bool> posted;", "std::atomic<std::uint32_t> ticks;",
+                           "std::vector<std::int64_t> bytes;", "// no std::atomic<std::int64_t> here"})
+    EXPECT_TRUE(IsAllowed("capture/Sniffer.h", line)) << line;
 }
 
 TEST(LayerRules, An_include_that_is_not_written_from_src_is_found) {
