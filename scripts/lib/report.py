@@ -45,7 +45,7 @@ def start_server(stack, spaces, seconds):
 
 @contextlib.contextmanager
 def silence(spaces, program):
-    """Nobody but the program runs in the namespaces for a while: without packets the table stands still."""
+    """Stops all but the program and the server in the namespaces for a while: without packets the table stays."""
     quiet = []
     for space in spaces:
         listed = subprocess.run(["ip", "netns", "pids", space], capture_output=True, text=True).stdout

@@ -69,7 +69,7 @@ def manager_rules(directory, panel):
 
 
 def await_window_manager(name):
-    """A window that is there before its manager loses the first click."""
+    """Waits for the window manager: a window that is shown before it runs loses the first click."""
     for _ in range(100):
         if "window id" in run("xprop", "-display", name, "-root", "_NET_SUPPORTING_WM_CHECK"):
             return
@@ -121,7 +121,7 @@ def linked_namespaces():
 
 
 def end_processes_of(name):
-    """Whatever still runs in a namespace of ours was started by us."""
+    """Ends what still runs in a namespace: the tour made it, so the tour started what runs there."""
     listed = subprocess.run(["ip", "netns", "pids", name], capture_output=True, text=True).stdout
     for process in map(int, listed.split()):
         with contextlib.suppress(ProcessLookupError):

@@ -90,7 +90,7 @@ void CaptureSession::ListAdapter(std::int16_t adapter) {
 }
 
 /// An adapter that is listed a second time through the packet scheduler gets no item of its own. Its index
-/// counts all the same, so behind it the positions in the list fall short of the indexes.
+/// counts all the same, so from there on the positions in the list are lower than the indexes.
 void CaptureSession::AddDescription(const platform::AdapterInfo& info) {
   const Text all = Replaced(FromCodePage(TextOf(info.AdapterDescription)), kSchedulerWords, {});
   const Text description(CutAtNul(TextView(all)));

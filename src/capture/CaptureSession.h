@@ -29,7 +29,7 @@ class CaptureSession {
   /// LocalAddressLast, GatewayAddress and LocalAddressPrevious, in this order, fresh. First step of the
   /// page's start.
   void ReadLocalAddresses();
-  /// The capture half of the page's start, behind the table's first pass: adapters, choice, session. Fault 91
+  /// The capture half of the page's start, after the table's first pass: adapters, choice, session. Fault 91
   /// without `vpacket`, here and at the stop.
   void StartCapture();
   /// The capture half of the page's stop: from CaptureRunning on. Blocks for 300 ms.
@@ -63,7 +63,7 @@ class CaptureSession {
   std::vector<std::unique_ptr<platform::CaptureControl>> retired_;
   int eventsUnderWay_ = 0;
   std::optional<std::int32_t> goneSince_; ///< the second of the day at which the adapter was seen to go
-  int controlsMade_ = 0; ///< the number of `vpacket`: a new control may lie where a dropped one lay
+  int controlsMade_ = 0; ///< numbers `vpacket`: a new control may have the address of a dropped one
 };
 
 } // namespace quendra::capture

@@ -25,11 +25,11 @@ struct SniffedPacket {
   std::optional<Ports> ports;
 };
 
-/// The buffer counts as filled with zeros behind its end.
+/// Past its end the buffer counts as filled with zeros.
 SniffedPacket ReadSniffedPacket(std::span<const std::uint8_t, 2000> buffer);
 
-/// A second way to the packets, over raw sockets. Complete but asleep: nothing opens its sockets or lets it
-/// see window messages, so its flag stays false.
+/// A second way to the packets, over raw sockets. Complete but never used: nothing opens its sockets or lets
+/// it see window messages, so its flag stays false.
 class Sniffer {
  public:
   Sniffer(const platform::Machine& machine, forms::ListView& main_ListView1, forms::Timer& main_Timer1,
@@ -39,13 +39,13 @@ class Sniffer {
   bool Active = false;
   std::array<platform::SocketHandle, 2> Sockets{};
   WindowHandle Window;
-  /// Releases the window's subclass; dropped behind the teardown.
+  /// Releases the window's subclass; dropped after the teardown.
   std::function<void()> UnSubclass;
 
   /// Before the window's own procedure: does nothing.
   void iSubCls_Antes(std::int32_t& bHandled, std::int32_t& lReturn, WindowHandle hWnd, std::uint32_t uMsg,
                      std::uint32_t wParam, std::uint32_t lParam);
-  /// Behind it: reads the socket `wParam` to its end when `lParam` tells that it can be read.
+  /// After it: reads the socket `wParam` to its end when `lParam` tells that it can be read.
   void iSubCls_Despues(std::int32_t& lReturn, WindowHandle hWnd, std::uint32_t uMsg, std::uint32_t wParam,
                        std::uint32_t lParam);
   /// Does nothing unless Active.

@@ -5,8 +5,8 @@
 
 namespace quendra::capture {
 
-/// Decodes the link header of a frame. Texts are built when they are read, from copies of the few bytes
-/// behind them, so they hold when the frame is gone.
+/// Decodes the link header of a frame. Texts are built when they are read, from copies of the bytes that they
+/// show, so they hold when the frame is gone.
 class clsEthernet {
  public:
   /// The last byte that Decode consumed: 13, or 21 with the three bytes of the logical link.

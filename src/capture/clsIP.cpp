@@ -21,8 +21,8 @@ Text clsIP::Decode(const platform::FrameBytes& frame) {
   Ver_ = frame[offset + 14] >> 4;
   IHL_ = frame[offset + 14] & 15;
   TotalLength_ = WordAt(frame, offset + 16);
-  // The positions themselves and not the bytes that stand there: so it has always been, and nothing depends
-  // on it.
+  // Made of the positions and not of the bytes that stand there: so it has always been, and nothing
+  // depends on the result.
   Identification_ = modVBPcap::WordFromBytes(static_cast<std::uint8_t>(offset + 18),
                                              static_cast<std::uint8_t>(offset + 19));
   FragmentOffset_ = WordAt(frame, offset + 20) & 0x1FFF;

@@ -9,7 +9,7 @@ namespace quendra::capture {
 
 /// Decodes the IPv4 header of a frame at fixed positions, 40 bytes further on when byte 23 says that the
 /// frame is a tunnel's. A frame that ends too soon raises fault 9; the fields before the missing byte are the
-/// frame's then, those behind it the ones of the frame before.
+/// frame's then, those after it are still the ones of the frame before.
 class clsIP {
  public:
   /// Always 0: options aren't honoured.

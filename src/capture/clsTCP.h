@@ -6,7 +6,7 @@
 namespace quendra::capture {
 
 /// Decodes the TCP header of a frame at fixed positions. A frame that ends too soon raises fault 9; the
-/// fields before the missing byte are the frame's then, those behind it the ones of the frame before.
+/// fields before the missing byte are the frame's then, those after it still the ones of the frame before.
 class clsTCP {
  public:
   std::int16_t Protocol() const { return Protocol_; }

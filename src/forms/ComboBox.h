@@ -13,7 +13,7 @@ class ComboBox : public Control {
   void Clear();
   void AddItem(Text item);
   int ListCount() const { return static_cast<int>(items_.size()); }
-  /// The text of an item; fault 381's kin: an index outside the list raises fault 9.
+  /// The text of an item. Fault 9 for an index outside the list.
   const Text& List(int index) const;
 
   /// The selected item, -1 for none.

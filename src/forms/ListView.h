@@ -25,7 +25,7 @@ class ListRow {
   /// Fault 9 for a cell that the row lacks.
   const Text& CellText(int cell) const { return At(cell).text; }
   void SetCellText(int cell, Text text);
-  /// Puts `tail` behind the text; cheap however long the text is.
+  /// Appends `tail` to the text; cheap however long the text is.
   void AppendCellText(int cell, TextView tail);
   Variant& CellTag(int cell) { return At(cell).tag; }
   const Variant& CellTag(int cell) const { return At(cell).tag; }
@@ -102,7 +102,7 @@ class ListView : public Control {
   /// The place of a row of this list now.
   int IndexOf(const ListRow& row) const { return row.index_; }
 
-  /// Adds behind the last row; the first row of a list becomes its selection. Fault 457 for a key in use.
+  /// Adds after the last row; the first row of a list becomes its selection. Fault 457 for a key in use.
   ListRow& Add(Text key, Text text, int smallIcon);
   /// A removed selection passes to the row that takes its place, else to the last row.
   void Remove(int index);
@@ -126,8 +126,8 @@ class ListView : public Control {
   ImageList* SmallIcons = nullptr;
   ImageList* HeaderIcons = nullptr;
 
-  /// Grows with every change of the rows, their order or their texts; Tags don't count. What was indexed
-  /// beside the table holds as long as this number stands still.
+  /// Grows with every change of the rows, their order or their texts; Tags don't count. An index that was
+  /// made of the table holds as long as this number stays the same.
   std::uint64_t Revision() const { return revision_; }
 
   void Observe(ListViewObserver* observer) { observer_ = observer; }

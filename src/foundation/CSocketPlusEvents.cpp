@@ -48,7 +48,7 @@ void CSocketPlus::OnReadUDP(Slot slot) {
     Events.DataArrival(index, waiting);
   }
   if (!StillHolds(life, slot, socket)) return;
-  // A datagram that the handler left unread would announce nothing behind it: it goes.
+  // While a datagram stays unread the next one isn't announced, so one that the handler left is dropped.
   std::array<std::uint8_t, 1> byte{};
   module_.Library().recv(socket, byte, 0);
 }
@@ -114,8 +114,8 @@ void CSocketPlus::Accept(const Variant& index, platform::SocketHandle requestID)
     At(slot).RecvBufferSize = At(slot).SendBufferSize = 0;
     throw Misuse(kWrongProtocolOrState, u"CSocketPlus.Accept");
   }
-  // Nobody knows this socket: the object is the one that holds it until somebody takes it. It keeps the
-  // selection of the listener, so data that comes early is gathered here.
+  // No object knows this socket yet, so this one holds it until somebody takes it. It keeps the selection of
+  // the listener, so data that comes early is gathered here.
   acceptClass_ = true;
   At(slot).State = sckConnected;
   StoreLocalAddress(slot);

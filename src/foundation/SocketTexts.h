@@ -4,7 +4,7 @@
 
 namespace quendra::foundation {
 
-/// A name as the library takes it: what stands behind a NUL isn't there.
+/// A name as the library takes it: it ends at the first NUL.
 std::string LibraryName(const Text& name);
 
 } // namespace quendra::foundation

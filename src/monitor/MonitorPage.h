@@ -6,7 +6,7 @@
 
 namespace quendra::monitor {
 
-/// The controls of the monitor page as the logic behind it sees them; the main window owns them.
+/// The controls of the monitor page that its logic uses; the main window owns them.
 struct MonitorPage {
   forms::Frame& frameMain;
   forms::ListView& main_ListView1;

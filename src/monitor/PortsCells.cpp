@@ -9,7 +9,7 @@ namespace quendra::monitor {
 namespace {
 
 constexpr std::size_t kLongestPort = 5;
-/// About what it costs to clear and fill an index, in code units searched.
+/// What it costs to clear and fill an index: about as much as searching so many code units.
 constexpr std::size_t kIndexCost = 8192;
 
 bool IsDigit(char16_t unit) { return unit >= u'0' && unit <= u'9'; }
@@ -55,7 +55,7 @@ void PortsCells::Append(forms::ListRow& row, TextView port) {
   const Text tail = Text(text.empty() ? u"." : u"").append(port).append(u".");
   const auto known = revision_ == list_.Revision() ? cells_.find(&row) : cells_.end();
   row.AppendCellText(kPortsCell, tail);
-  // One step is this very change; whoever changed more in answer to it makes the index worthless.
+  // This change counts one step. If a listener changed the list further, the index no longer holds.
   if (known == cells_.end() || list_.Revision() != revision_ + 1) return;
   revision_ = list_.Revision();
   const std::size_t joined = std::min(before, kLongestPort - 1);

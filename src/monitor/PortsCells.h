@@ -10,14 +10,14 @@ namespace quendra::monitor {
 
 /// The ports cells of a list during one walk of a connection table. A port counts as present where its
 /// decimal text stands anywhere in the cell. A cell that is asked for so often that plain searches cost more
-/// than reading it once is indexed beside the table, as long as the list stands still.
+/// than reading it once is indexed beside the table, as long as the list doesn't change.
 class PortsCells {
  public:
   explicit PortsCells(forms::ListView& list) : list_(list) {}
 
   /// `port` is the decimal text of a number from 0 to 65535.
   bool Contains(const forms::ListRow& row, TextView port);
-  /// Puts the port and a dot behind the cell's text, after a first dot when the cell is empty.
+  /// Appends the port and a dot to the cell's text; an empty cell gets a dot first.
   void Append(forms::ListRow& row, TextView port);
 
  private:

@@ -37,7 +37,8 @@ std::vector<SocketHandleScan::HandleEntry> SocketHandleScan::AllHandles() {
   do {
     std::uint32_t returned = 0;
     std::vector<std::uint8_t> buffer(kFirstRoom);
-    // What fits in the first room is not looked at: a success here means a list of one handle at most.
+    // The first buffer has room for one handle, so what fits there is ignored; a longer list tells its
+    // length.
     if (handles.NtQuerySystemInformation(Handles::kHandleTable, buffer, returned) == 0) break;
     const auto count = Little32(buffer, 0);
     const std::int32_t room = ToInt32(std::int64_t{count} * std::int64_t{Handles::kRecordBytes} +

@@ -23,7 +23,7 @@ class SocketHandleScan {
 
   /// Writes the owners found over those in `owners`, 65536 records by port.
   void Run(std::vector<PortOwner>& owners);
-  /// The local port behind an own handle, 0 when unknown.
+  /// The local port of an own handle, 0 when unknown.
   std::int32_t QueryHandlePort(platform::Handle handle);
 
  private:

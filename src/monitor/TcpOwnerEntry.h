@@ -14,7 +14,7 @@ struct TcpOwnerEntry : platform::TcpTableEntry {
 
 /// How many whole entries the table holds, whatever its count claims beyond that.
 std::int32_t TcpEntryCount(const platform::IpHelper::TcpTable& table);
-/// The entry `offset` bytes behind the table's count; all zero where the table holds no whole entry.
+/// The entry `offset` bytes after the table's count; all zero where the table holds no whole entry.
 TcpOwnerEntry TcpEntryAt(const platform::IpHelper::TcpTable& table, std::int32_t offset);
 
 } // namespace quendra::monitor

@@ -18,7 +18,7 @@ constexpr std::uint32_t kStatedPathSize = 500;
 constexpr std::array<TextView, 5> kSystemNames{u"system", u"smss.exe", u"winlogon.exe", u"csrss.exe",
                                                u"lsass.exe"};
 
-/// Needs a text with room for `kPathRoom` characters, fewer than the size that it states.
+/// Makes room for `kPathRoom` characters and states more, as the program always has.
 Text FirstModulePath(platform::Processes& processes, platform::Handle process) {
   std::array<platform::ModuleHandle, kModuleTableBytes / sizeof(platform::ModuleHandle)> modules{};
   if (!processes.EnumProcessModules(process, modules)) return {};

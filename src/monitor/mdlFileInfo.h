@@ -44,8 +44,8 @@ class mdlFileInfo {
   /// Remembers the well-known process of this name, compared without regard to case. Other names are passed
   /// over.
   void RecordWellKnown(TextView exeName, std::uint32_t processId);
-  /// "Service", "User" or "System" for a child of a well-known process; nullptr for any other parent. An id
-  /// that wasn't seen yet is 0 and compares as that.
+  /// "Service", "User" or "System" for a child of a well-known process; nullptr for any other parent. A
+  /// well-known process that wasn't seen yet has the id 0, so children of 0 count as its own.
   const char16_t* ClassOfParent(std::uint32_t parentProcessId) const;
   bool IsSystemPid(std::uint32_t processId) const;
 

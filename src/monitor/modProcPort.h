@@ -25,7 +25,7 @@ class modProcPort {
 
   /// Brings PortOwnerTable up to date from the handles of all processes. True when the walk has finished.
   bool ScanSocketHandles();
-  /// The local port behind an own handle, 0 when unknown.
+  /// The local port of an own handle, 0 when unknown.
   std::int32_t QueryHandlePort(platform::Handle handle);
   /// Takes the system's table of TCP connections and starts the walk over. On failure the table before stays.
   bool FetchTcpOwnerTable();

@@ -8,22 +8,22 @@
 
 namespace quendra::platform {
 
-/// The one loop from which events come, implemented by the desktop. Handlers run on its thread, one at a time
-/// save that a handler that pumps lets others run inside it.
+/// The one loop from which events come, implemented by the desktop. Handlers run on its thread, one at a
+/// time; only a handler that pumps lets others run inside it.
 class EventLoop {
  public:
   virtual ~EventLoop() = default;
 
-  /// Ends what it stands for when it goes.
+  /// A watch or timer, which ends when this object is destroyed.
   class Subscription {
    public:
     virtual ~Subscription() = default;
   };
 
-  /// Runs `work` from the loop, behind what is posted already. May be called from any thread.
+  /// Runs `work` from the loop, after what is posted already. May be called from any thread.
   virtual void Post(std::function<void()> work) = 0;
-  /// Puts a window message behind what is posted already: window, message, wParam, lParam. May be called from
-  /// any thread. A loop without windows loses it, as one for a window that has gone is lost.
+  /// Queues a window message after what is posted already: window, message, wParam, lParam. May be called
+  /// from any thread. A loop without windows loses it, as one for a window that has gone is lost.
   virtual void PostMessage(WindowHandle /*window*/, std::uint32_t /*message*/, std::uint32_t /*wParam*/,
                            std::uint32_t /*lParam*/) {}
   [[nodiscard]] virtual std::unique_ptr<Subscription> StartTimer(int milliseconds,

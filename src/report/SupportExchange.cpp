@@ -80,7 +80,7 @@ void SupportExchange::main_spSockets_DataArrival(Index index) {
   case kProcsPage: ProcsPageText += TakeText(index); return;
   case kNumber: return NumberArrived();
   case kReport: ReportReply += TakeText(index); return;
-  default: return; // the load stays where it is: only its traffic counts
+  default: return; // the load is left in the socket's buffer: only its traffic counts
   }
 }
 
@@ -138,8 +138,8 @@ void SupportExchange::NumberArrived() {
   Connect(kReport, settings::SupportServerHost);
 }
 
-/// The next piece of a reply may arrive behind the box and stack its own on it. A server that sends piece
-/// after piece must not bring the stack down.
+/// While the box stands, the next piece of a reply may arrive and open its own box on top. A server that
+/// sends piece after piece must not use up the stack.
 void SupportExchange::ShowNumber(const Text& number) {
   if (standingNumberBoxes_ == kMostNumberBoxes) throw Fault(Fault::kOutOfStackSpace);
   struct Standing {
@@ -166,7 +166,7 @@ void SupportExchange::ProcsPageClosed() {
   main_Timer1_.Enabled = true;
 }
 
-/// The page was to fill a table once. The table is still made, and dropped as it is.
+/// Reserved for reading the page into a table of 3 by 3 texts, which is made and dropped.
 void SupportExchange::ReadProcsPage() { const Text table[3][3]; }
 
 void SupportExchange::ShowHebrewBox(const Text& text, int icon) {

@@ -32,7 +32,7 @@ Decimal DecimalOf(double value) {
   return decimal;
 }
 
-/// Rounds to `places` behind the point, half away from zero; gives the digits up to there, at least one
+/// Rounds to `places` after the point, half away from zero; gives the digits up to there, at least one
 /// before them.
 std::string RoundedDigits(const Decimal& decimal, int places) {
   std::string digits(static_cast<std::size_t>(std::max(0, -decimal.pointAt)) + 1, '0');

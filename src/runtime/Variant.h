@@ -85,7 +85,7 @@ class Variant {
   std::int32_t AsInt32() const;
   /// The value as text; fault 13 for bytes, dates and Null.
   Text AsText() const;
-  /// The number in place, or nullptr when no double stands here: the road for those that add in a hot loop.
+  /// The number in place, or nullptr when no double stands here: for adding to it in a hot loop.
   double* NumberInPlace() { return Find<double>(); }
 
   /// Numbers are the same whatever their width; a number and its text are not.

@@ -5,7 +5,8 @@
 namespace quendra::capture {
 namespace {
 
-/// The attribution as it is told, on texts alone: what the packets of one drain add to the rows of a table.
+/// The attribution in its plain form, on texts alone: what the packets of one drain add to the rows of a
+/// table.
 class PlainAttribution {
  public:
   PlainAttribution(forms::ListView& rows, const CaptureFields& capture) : rows_(rows), capture_(capture) {}

@@ -153,7 +153,7 @@ TEST_F(DrainLoop, A_failed_capture_does_not_count_the_frame_before_it_again) {
   EXPECT_EQ(Charged(), 1);
 }
 
-/// Fails behind its one frame and leaves the array as it was.
+/// Fails after its one frame and leaves the array as it was.
 struct LeavingLibrary : platform::simulated::SimulatedCapture {
   using SimulatedCapture::SimulatedCapture;
   std::int32_t vpCapture(platform::FrameBytes& frame, platform::CaptureHeader&) override {

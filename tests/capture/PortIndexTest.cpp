@@ -9,7 +9,7 @@
 namespace quendra::capture {
 namespace {
 
-/// The search as it is told: rows from the first, "." + port + "." anywhere in the ports text.
+/// The search in its plain form: rows from the first, "." + port + "." anywhere in the ports text.
 forms::ListRow* PlainSearch(forms::ListView& table, std::int16_t port) {
   const Text what = u"." + DecimalText(port) + u".";
   for (int i = 1; i <= table.Count(); ++i)

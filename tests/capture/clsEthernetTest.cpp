@@ -7,7 +7,7 @@
 namespace quendra::capture {
 namespace {
 
-/// Bytes 0 to 11 count up from A0; the type code and the three bytes behind it are the test's.
+/// Bytes 0 to 11 count up from A0; the type code and the three bytes after it are the test's.
 Bytes LinkFrame(unsigned type, std::size_t size = 60, Bytes behind = {}) {
   Bytes frame(size);
   for (std::size_t i = 0; i < 12; ++i) frame[i] = static_cast<std::uint8_t>(0xA0 + i);

@@ -9,7 +9,7 @@
 namespace quendra::capture {
 namespace {
 
-/// A record with a header of `headerLength` bytes and the frame behind it.
+/// A record with a header of `headerLength` bytes and the frame after it.
 Bytes RecordOf(const Bytes& frame, std::uint16_t headerLength) {
   Bytes record{0x78, 0x56, 0x34, 0x12, 0x40, 0xE2, 0x01, 0x00, 60, 0, 0, 0, 0xEA, 0x05, 0, 0};
   record.resize(std::max<std::size_t>(headerLength, 18));

@@ -277,8 +277,8 @@ TEST_F(HostilePeers, A_flood_of_500_connections_that_are_all_taken_are_500_socke
     program->SendData(index, Text(u"!"));
   };
   Play([&, port] {
-    // The system turns away who comes when five wait, and the kernel has him try again a second later: each
-    // waits for its greeting before the next one dials.
+    // The system turns away a connection when five wait already, and the client's kernel tries again a second
+    // later. So each waits for its greeting before the next one connects.
     std::vector<int> diallers;
     for (int i = 0; i < 500 && !stop_; ++i) {
       diallers.push_back(socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0));

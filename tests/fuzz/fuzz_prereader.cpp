@@ -46,7 +46,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   std::fill(std::begin(PeekBytes), std::end(PeekBytes), std::uint8_t{0});
   std::copy_n(data, std::min(size, sizeof PeekBytes), PeekBytes);
   ReadHostileRecord(platform::FrameBytes(PeekBytes, sizeof PeekBytes));
-  // And without the room behind it.
+  // And without the room after it.
   ReadHostileRecord(platform::FrameBytes(data, static_cast<int>(size)));
   return 0;
 }

@@ -19,7 +19,7 @@ namespace quendra::integration {
 
 using Bytes = std::vector<std::uint8_t>;
 
-/// An IPv4 packet of `total` bytes with the two ports behind its header; the payload is zeros.
+/// An IPv4 packet of `total` bytes with the two ports after its header; the payload is zeros.
 inline Bytes Ipv4Packet(int protocol, const char* source, unsigned sourcePort, const char* target,
                         unsigned targetPort, std::size_t total = 40) {
   Bytes packet(total);

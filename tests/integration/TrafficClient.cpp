@@ -48,7 +48,7 @@ void Exchange(int connection, const Order& order) {
   if (!ReceiveAll(connection, bytes.data(), head.reply)) throw std::runtime_error("no reply");
 }
 
-/// Behind one word, which says nothing, so that an answer is never empty.
+/// After one word that means nothing, so that an answer is never empty.
 void Report(int channel, std::vector<std::uint16_t> ports) {
   ports.insert(ports.begin(), 0);
   Check(send(channel, ports.data(), ports.size() * sizeof ports[0], 0), "the channel");

@@ -87,7 +87,7 @@ bool Worker::HasAnswered(Answer& answer) {
   const ssize_t size = recv(channel_, ports.data(), sizeof ports, MSG_DONTWAIT);
   if (size < 0 && (errno == EAGAIN || errno == EINTR)) return false;
   if (size <= 0) throw std::runtime_error("worker " + std::to_string(process_) + " has gone");
-  // An answer is its ports behind one word that says nothing.
+  // An answer is one word that means nothing, then its ports.
   answer.done = true;
   answer.localPorts.assign(ports.begin() + 1, ports.begin() + size / 2);
   return true;

@@ -26,7 +26,7 @@ struct MonitorFixture : testing::Test {
 
   std::int32_t Tick() { return static_cast<std::int32_t>(machine.system.GetTickCount()); }
 
-  /// A pass as the page's callers make it: some time on, and the tick is stored behind it.
+  /// A pass as the page's callers make it: some time on, and the tick is stored after it.
   void Pass(std::uint32_t milliseconds = 1000) {
     machine.AdvanceTick(milliseconds);
     table.RefreshProcessTable(u"");

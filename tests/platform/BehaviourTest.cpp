@@ -14,7 +14,7 @@
 #include <optional>
 #include <vector>
 
-// What every machine must answer alike, whatever stands behind it.
+// What every machine must answer alike, real or simulated.
 
 namespace quendra::platform {
 namespace {
@@ -450,7 +450,7 @@ TEST_P(BehaviourTest, A_control_without_an_adapter_answers_every_call) {
 
   EXPECT_EQ(address, Ipv4Address());
   EXPECT_EQ(events, 0);
-  // A record header that states no bytes of a frame, and none behind it.
+  // A record header that states no bytes of a frame, and none after it.
   EXPECT_TRUE(
       std::all_of(buffer.begin() + 8, buffer.begin() + 16, [](std::uint8_t byte) { return byte == 0; }));
   ASSERT_LE(buffer[16], 32);

@@ -11,12 +11,12 @@
 
 namespace quendra::report {
 
-/// A desktop whose boxes stand until what the test has planned behind them has happened.
+/// A desktop whose boxes stand until what the test has planned for that time has happened.
 class DesktopWithStandingBoxes : public forms::HeadlessDesktop {
  public:
   /// What happens while the next boxes stand, one step a box.
   std::deque<std::function<void()>> WhileBoxStands;
-  /// A program that was ended behind a box doesn't come back from it.
+  /// A program that was ended while a box stood doesn't come back from it.
   int MessageBox(const Text& text, int flags, const Text& title) override {
     const int answer = HeadlessDesktop::MessageBox(text, flags, title);
     if (WhileBoxStands.empty()) return answer;
@@ -101,7 +101,7 @@ class ReportTest : public testing::Test {
   foundation::SocketState StateOf(std::int16_t index) {
     return program.supportExchange.Sockets()->State(index);
   }
-  /// What stands between the headers of a request and the two line ends behind its body.
+  /// What stands between the headers of a request and the two line ends after its body.
   static std::string BodyOf(const std::string& request) {
     const auto start = request.find("\r\n\r\n") + 4;
     return request.substr(start, request.size() - start - 4);

@@ -36,7 +36,7 @@ class AgreementRollTest : public testing::Test {
   void Tick(int times = 1) {
     for (int i = 0; i < times; ++i) form.ReDrawTimer.Tick();
   }
-  /// The prints of the last picture the user saw, without their places' and colours' siblings.
+  /// What was printed in the last picture that the user saw; boxes and copies are left out.
   std::vector<std::string> Prints() const {
     std::vector<std::string> prints;
     for (const std::string& drawing : desktop.DrawingOf(form.picOut))

@@ -42,7 +42,7 @@ TEST(AgreementWrap, A_lone_carriage_return_or_line_feed_ends_no_paragraph) {
 }
 
 TEST(AgreementWrap, A_line_over_the_limit_ends_before_its_last_blank_and_the_rest_goes_back) {
-  // "aaa bbb c" is over the limit with its ninth character; what stands behind the blank starts the next
+  // "aaa bbb c" is over the limit with its ninth character; what follows the blank starts the next
   // line. That line is filled up to the limit, as the rest of the text fits by then, and ends in a blank.
   EXPECT_EQ(Wrapped(u"aaa bbb ccc ddd eee", 80), (Lines{u"aaa bbb", u"ccc ddd ", u"eee"}));
 }

@@ -29,7 +29,7 @@ class BadRequest(Exception):
 
 
 def read_request(connection):
-    """Head and body, each as bytes; what stands behind the body is left alone."""
+    """Head and body, each as bytes; what stands after the body is left alone."""
     data = b""
     while HEAD_END not in data:
         if len(data) > LONGEST_HEAD:
@@ -63,7 +63,7 @@ def body_length(head):
 
 
 def method_and_path(head):
-    """The address may be absolute, and blanks may stand behind the version."""
+    """The address may be absolute, and blanks may stand after the version."""
     words = head.split(b"\r\n")[0].decode("latin-1").split()
     if len(words) != 3 or not words[2].startswith("HTTP/"):
         raise BadRequest("no request line")
@@ -139,7 +139,7 @@ class Exchange(socketserver.BaseRequestHandler):
             return reply("400 Bad Request", str(fault).encode())
 
     def wait_for_the_end(self):
-        """Closing with bytes unread, such as line ends behind a body, would reset the connection under the reply."""
+        """Closing with bytes unread, such as line ends after a body, would reset the connection under the reply."""
         self.request.shutdown(socket.SHUT_WR)
         self.request.settimeout(2)
         for _ in range(1000):

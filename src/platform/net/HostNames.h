@@ -8,7 +8,7 @@
 
 namespace quendra::platform {
 
-/// The host's name and the addresses behind a name. These questions have an error of their own: what sockets
+/// The host's own name, and the addresses of names. These questions have an error of their own: what sockets
 /// do in between neither sets nor hides it.
 class HostNames {
  public:

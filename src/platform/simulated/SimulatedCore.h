@@ -37,7 +37,7 @@ struct Core {
   std::vector<std::string> calls;
 };
 
-/// A text as the system takes it: what stands behind a NUL isn't there.
+/// A text as the system takes it: it ends at the first NUL.
 inline std::string CutText(const std::string& text) { return text.substr(0, text.find('\0')); }
 
 /// The address of a dotted text; 0.0.0.0 for a text that is none.

@@ -15,8 +15,8 @@ class StandIn : public LiveReportTest {
   }
   std::string Kept(const std::string& name) const { return ContentOf(folder + "/reports/" + name); }
   static constexpr std::int32_t kEnough = 8 << 20;
-  /// The load may come whole in one turn of the loop, so what is to happen in its middle happens behind the
-  /// event that tells of it.
+  /// The whole load may come in one turn of the loop, so what is to happen in its middle is done right after
+  /// the event that tells of so many bytes.
   void WhenLoaded(std::int32_t bytes, std::function<void()> action) {
     loaded = false;
     auto& arrival = program->supportExchange.Sockets()->Events.DataArrival;

@@ -48,7 +48,7 @@ template <typename Visit> bool ForEachEntry(int folder, Visit visit) {
   }
 }
 
-/// Splits on blanks, as the figures behind the name are.
+/// Splits on blanks, which separate the figures after the name.
 class Fields {
  public:
   explicit Fields(std::string_view text) : rest_(text) {}

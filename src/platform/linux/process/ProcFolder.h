@@ -50,8 +50,8 @@ class ProcFolder {
   /// The path of the executable; nothing when there is none or it may not be known.
   std::optional<std::string> Executable(std::uint32_t processId) const;
   static std::optional<ExecutableFile> Executable(const Descriptor& processFolder);
-  /// The socket behind a descriptor of the process, by its node number; 0 when it is no socket or can't be
-  /// read.
+  /// The socket that a descriptor of the process stands for, by its node number; 0 when it is no socket or
+  /// can't be read.
   std::uint32_t SocketOf(std::uint32_t processId, std::uint32_t descriptor) const;
   /// The content of a file of the folder, up to 1 MB.
   std::optional<std::string> File(const std::string& name) const;

@@ -16,8 +16,8 @@ constexpr std::uint32_t kFirstProcess = 1;
 // No process has it: the kernel's own limit is far below.
 constexpr std::uint32_t kNoProcess = 0xFFFFFFFF;
 
-// Those that show the desktop and start what the user picks there; a bare window manager only where no panel
-// runs.
+// Programs that show the desktop and start what the user picks there, the best first. The window managers at
+// the end count only where none of the others runs.
 constexpr std::array<std::string_view, 20> kDesktopShells = {
     "gnome-shell",  "plasmashell",  "cinnamon", "mate-panel", "xfce4-panel", "lxqt-panel", "lxpanel",
     "budgie-panel", "cosmic-panel", "gala",     "phosh",      "xfdesktop",   "pcmanfm-qt", "enlightenment",
@@ -45,13 +45,13 @@ bool ProcessList::Read(std::vector<Row>& rows) {
   rows.clear();
   if (!folder_.List(places_)) return false;
   const std::uint64_t now = clock_();
-  // In a series of passes the second looks are spread; after a pause every name is read anew.
+  // While passes follow each other, names are read again a few at a time; after a pause all at once.
   const bool inSeries = now - lastRead_ <= kSeriesMilliseconds;
   mostRereads_ = inSeries ? places_.size() / 8 + 16 : places_.size();
   rereads_ = 0;
   lastRead_ = now;
 
-  // What isn't carried over belongs to processes that are gone.
+  // What isn't carried over below belongs to processes that are gone.
   previous_.swap(known_);
   known_.clear();
   rows.reserve(places_.size());

@@ -11,8 +11,8 @@ namespace {
 
 constexpr std::string_view kGroup = "Desktop Entry";
 
-// Programs that only start another, which the entry names behind them: the entry tells nothing of the program
-// itself.
+// Programs that only start another, which the entry names after them. Such an entry says nothing about the
+// starter itself.
 constexpr std::array<std::string_view, 20> kStarters = {
     "sh",   "bash", "dash",        "zsh",    "flatpak",
     "snap", "perl", "ruby",        "java",   "node",

@@ -96,7 +96,7 @@ void DesktopIndex::AddEntry(const std::string& path) {
   if (!isNew && ranked.rank < place->second.rank) place->second = std::move(ranked);
 }
 
-/// The file behind a program's name or path, every link followed; empty when there is none.
+/// The file that a program's name or path leads to, every link followed; empty when there is none.
 std::string DesktopIndex::Resolve(const std::string& program) const {
   if (program.starts_with('/')) return IsProgram(program) ? RealPath(program) : std::string();
   if (program.find('/') != std::string::npos) return {};

@@ -6,7 +6,7 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-// A block is pairs of texts, each ended by a NUL: a name and its value, behind this mark.
+// A block is this mark and then pairs of texts, each ended by a NUL: a name and its value.
 constexpr std::string_view kMark("desktop entry\0", 14);
 constexpr std::string_view kStrings = "\\StringFileInfo\\040D04E7\\";
 

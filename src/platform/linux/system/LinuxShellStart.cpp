@@ -17,7 +17,7 @@ namespace {
 [[noreturn]] void BecomeProgram(const std::vector<std::string>& files, char* const* words, int report) {
   ::setsid();
   const pid_t second = ::fork();
-  // The first child ends at once, so that the program is nobody's to wait for.
+  // The first child ends at once, so that the program has no parent that would have to wait for it.
   if (second > 0) ::_exit(0);
   if (second == 0) {
     const int nothing = ::open("/dev/null", O_RDONLY | O_CLOEXEC);

@@ -57,7 +57,7 @@ class SimulatedPeer : public std::enable_shared_from_this<SimulatedPeer> {
   virtual ~SimulatedPeer() = default;
 
   void Send(const std::string& bytes);
-  /// An orderly end, behind what was sent.
+  /// An orderly end, after what was sent.
   void Close();
   /// An end by force: the program reads what arrived before, then sees kConnectionReset.
   void Reset();

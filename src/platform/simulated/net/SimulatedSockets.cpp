@@ -314,7 +314,7 @@ std::int32_t SimulatedSockets::ioctlsocket(SocketHandle socket, std::uint32_t co
 
 std::int32_t SimulatedSockets::send(SocketHandle socket, std::span<const std::uint8_t> bytes, std::int32_t) {
   if (Scripted("send")) {
-    // A refusal for now is followed by the word that it has passed.
+    // After a send that would block comes the event that the socket can send again.
     const auto found = sockets_.find(socket);
     if (lastError_ == kWouldBlock && found != sockets_.end()) {
       found->second->room = 0;
@@ -447,7 +447,7 @@ void SimulatedSockets::Update(SocketEnd& end) {
   if (end.stage != Stage::Connected) return;
   if (end.room > 0) Announce(end, kFdWrite);
   if (!end.arrived.empty()) return Announce(end, kFdRead);
-  // The end is told behind the last data.
+  // The end is announced after the last data was read.
   if (end.ended && (end.enabled & kFdRead) != 0) Announce(end, kFdClose, end.endError);
 }
 

@@ -67,7 +67,7 @@ class SimulatedSockets : public Sockets {
   void Receive(SocketHandle socket, std::vector<std::uint8_t> bytes) {
     waiting_[socket].push_back(std::move(bytes));
   }
-  /// A read that fails, behind what waits already.
+  /// A read that fails, after those that wait already.
   void FailReceive(SocketHandle socket) { waiting_[socket].push_back(std::nullopt); }
   bool Blocking = false;
 
@@ -107,7 +107,7 @@ class SimulatedSockets : public Sockets {
 
   void Arrive(SocketEnd& end, const std::string& bytes);
   void EndOf(SocketEnd& end, std::int32_t error);
-  /// Runs behind what waits in the loop.
+  /// Runs after what waits in the loop.
   void Later(std::function<void()> work);
 
  private:

@@ -37,7 +37,7 @@ bool SimulatedProcesses::Process32Next(Handle snapshot, Entry& entry) {
   const Process& process = found->second.processes[found->second.next++];
   entry.processId = process.id;
   entry.parentProcessId = process.parent;
-  // Bytes behind the NUL stay from the entry before, as in the system's own record.
+  // Bytes after the NUL stay from the entry before, as in the system's own record.
   const std::size_t length = std::min(process.name.size(), entry.exeFile.size() - 1);
   std::copy_n(process.name.begin(), length, entry.exeFile.begin());
   entry.exeFile[length] = '\0';

@@ -61,7 +61,7 @@ Bytes V6OnlyAttribute(std::uint8_t value) {
 }
 
 std::vector<TcpSocket> SocketsOf(const Bytes& datagram) {
-  // A copy takes exactly the memory that it needs, so that a checker sees a read behind it.
+  // A copy takes exactly the memory that it needs, so that a checker sees a read past its end.
   const Bytes exact(datagram);
   std::vector<TcpSocket> sockets;
   EXPECT_EQ(SocketDiagnostics::TakeUp(exact, 7, sockets), Progress::More);
@@ -158,7 +158,7 @@ TEST(LinuxSocketDiagnostics, The_end_and_an_error_end_the_answer) {
 TEST(LinuxSocketDiagnostics, A_datagram_cut_at_any_length_is_read_no_further_than_it_goes) {
   const Bytes whole = Datagram(Message(AF_INET6, 10), V6OnlyAttribute(0));
   for (std::size_t length = 0; length < whole.size(); ++length) {
-    // In memory of exactly this size, so that a checker sees a read behind it.
+    // In memory of exactly this size, so that a checker sees a read past its end.
     const Bytes cut(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(length));
     std::vector<TcpSocket> sockets;
     SocketDiagnostics::TakeUp(cut, 7, sockets);
