@@ -25,19 +25,26 @@ class HostilePeers : public testing::Test {
 
   /// Listens, and plays `play` with the first connection.
   std::int32_t Serve(std::function<void(int)> play) {
+    const std::int32_t port = Listen();
+    PlayWithTheFirst(std::move(play));
+    return port;
+  }
+  std::int32_t Listen() {
     listener_ = socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
     sockaddr_in address = Loopback(0);
     socklen_t size = sizeof address;
     EXPECT_EQ(bind(listener_, reinterpret_cast<const sockaddr*>(&address), sizeof address), 0);
     EXPECT_EQ(listen(listener_, 4096), 0);
     getsockname(listener_, reinterpret_cast<sockaddr*>(&address), &size);
-    peer_ = std::thread([this, play = std::move(play)] {
+    return ntohs(address.sin_port);
+  }
+  void PlayWithTheFirst(std::function<void(int)> play) {
+    Play([this, play = std::move(play)] {
       const int connection = accept(listener_, nullptr, nullptr);
       if (connection < 0) return;
       play(connection);
       close(connection);
     });
-    return ntohs(address.sin_port);
   }
   void ConnectTo(std::int32_t port) {
     program->ArrayAdd(1);
@@ -209,7 +216,7 @@ TEST_F(HostilePeers, Urgent_bytes_cost_no_data_and_do_not_hide_the_end) {
 }
 
 TEST_F(HostilePeers, Without_a_descriptor_to_watch_a_socket_Connect_raises_10024_and_works_after_CloseSck) {
-  const std::int32_t port = Serve([](int connection) { SendAll(connection, "hello"); });
+  const std::int32_t port = Listen();
   {
     // A sanitizer looks at a kind of object through a pipe when it meets the first: that must have been
     // before the descriptors run out.
@@ -231,6 +238,7 @@ TEST_F(HostilePeers, Without_a_descriptor_to_watch_a_socket_Connect_raises_10024
   EXPECT_EQ(fault, "10024 Too many open files. [modSocketPlus.RegisterSocket]");
   EXPECT_EQ(program->State(1), sckClosed);
 
+  PlayWithTheFirst([](int connection) { SendAll(connection, "hello"); });
   program->CloseSck(1);
   program->Connect(1, Text(u"127.0.0.1"), port);
   EXPECT_TRUE(Until([&] { return program.Saw("DataArrival 1 5"); }));
