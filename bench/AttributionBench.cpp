@@ -66,10 +66,10 @@ class QuietDesktop : public forms::HeadlessDesktop {
 class Program {
  public:
   Program() {
-    capture.LocalAddressLast = u"10.0.0.138";
-    capture.LocalAddressPrevious = u"192.168.7.1";
-    capture.vpacket = library.Create();
-    fields.OsVersionCode = 2002;
+    addresses.LocalAddressLast = u"10.0.0.138";
+    addresses.LocalAddressPrevious = u"192.168.7.1";
+    control.Create();
+    version.OsVersionCode = 2002;
     FillTable();
     PutNewestRecord();
   }
@@ -77,7 +77,7 @@ class Program {
   /// One event that drains the whole file. `lastRefreshTick` decides whether a pass of the table is due in
   /// it.
   void Drain(std::int32_t lastRefreshTick) {
-    fields.LastRefreshTick = lastRefreshTick;
+    table.LastRefreshTick = lastRefreshTick;
     attribution.vpacket_PacketReceived();
   }
   std::int32_t Now() { return static_cast<std::int32_t>(clock.GetTickCount()); }
@@ -108,12 +108,6 @@ class Program {
     tcp[23] = 6;
     library.Deliver(tcp);
   }
-  platform::Machine Operations() {
-    const platform::Machine all = machine.Operations();
-    return {all.captureControls, library,        all.handles, all.hostNames, all.icons,  all.ipHelper,
-            all.processes,       all.shellStart, all.sockets, clock,         all.tokens, all.versionInfo};
-  }
-
   platform::simulated::Core core;
 
  public:
@@ -122,12 +116,17 @@ class Program {
   OfflineCapture library{core};
   QuietDesktop desktop;
   monitor::MonitorControls form;
-  monitor::MonitorFields fields;
-  CaptureFields capture;
-  monitor::mdlFileInfo fileInfo{Operations(), desktop};
-  monitor::modProcPort procPort{Operations(), desktop, form.main_ListView1, fileInfo};
-  monitor::ProcessTable table{Operations(), desktop, form.Page(), fields, fileInfo, procPort};
-  PacketAttribution attribution{Operations(), desktop, form.Page(), fields, capture, table};
+  monitor::SystemVersion version{clock, desktop};
+  monitor::mdlFileInfo fileInfo{machine.processes, machine.tokens, machine.versionInfo, desktop};
+  monitor::modProcPort procPort{
+      machine.ipHelper, {machine.processes, machine.handles}, desktop, form.main_ListView1, fileInfo};
+  monitor::ProcessRowAdder adder{machine.icons, clock, desktop, form.table, fileInfo};
+  monitor::PortSource ports{version, fileInfo, procPort};
+  monitor::ProcessTable table{machine.processes, clock, form.table, adder, ports};
+  HostAddresses host{machine.hostNames, machine.ipHelper};
+  OwnAddresses addresses{host};
+  PacketControl control{library};
+  PacketAttribution attribution{library, desktop, control, addresses, table};
 };
 
 void ReportPerFrame(benchmark::State& state, double frames) {

@@ -128,15 +128,18 @@ void MeasureTable(int passes) {
   platform::linux_::LinuxMachine machine(desktop, desktop);
   const platform::Machine operations = machine.Operations();
   monitor::MonitorControls controls;
-  monitor::MonitorFields fields{2002, 0};
-  monitor::mdlFileInfo fileInfo(operations, desktop);
-  monitor::modProcPort procPort(operations, desktop, controls.main_ListView1, fileInfo);
-  monitor::ProcessTable table(operations, desktop, controls.Page(), fields, fileInfo, procPort);
+  monitor::SystemVersion version(operations.system, desktop);
+  version.OsVersionCode = 2002;
+  monitor::mdlFileInfo fileInfo(operations.processes, operations.tokens, operations.versionInfo, desktop);
+  monitor::modProcPort procPort(operations.ipHelper, {operations.processes, operations.handles}, desktop,
+                                controls.main_ListView1, fileInfo);
+  monitor::ProcessRowAdder adder(operations.icons, operations.system, desktop, controls.table, fileInfo);
+  monitor::PortSource ports(version, fileInfo, procPort);
+  monitor::ProcessTable table(operations.processes, operations.system, controls.table, adder, ports);
   const Subject subject{controls.main_ListView1,
                         [&] {
                           table.RefreshProcessTable(u"");
-                          fields.LastRefreshTick =
-                              static_cast<std::int32_t>(operations.system.GetTickCount());
+                          table.StampLastRefresh();
                         },
                         [] {}};
   const double first = TimePass(subject);
@@ -147,13 +150,11 @@ void MeasureTable(int passes) {
 int MeasureProgram(int passes) {
   forms::QtDesktop desktop("table_pass_bench");
   platform::linux_::LinuxMachine machine(desktop, desktop);
-  const platform::Machine operations = machine.Operations();
-  app::Program program(operations, desktop);
-  const Subject subject{program.frmMenu.main_ListView1,
+  app::Program program(machine.Operations(), desktop);
+  const Subject subject{program.monitorPage.table.main_ListView1,
                         [&] {
                           program.processTable.RefreshProcessTable(u"");
-                          program.monitorFields.LastRefreshTick =
-                              static_cast<std::int32_t>(operations.system.GetTickCount());
+                          program.processTable.StampLastRefresh();
                         },
                         [&] {
                           // Painting is put off by the toolkit, so it gets some time to come.

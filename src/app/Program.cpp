@@ -2,21 +2,40 @@
 
 namespace quendra::app {
 
+using shell::kPageTable;
+
 Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
-    : desktop_(desktop), frmSplash(desktop, frmMenu), frmAbout(desktop),
-      frmMenu(machine, desktop, frmSplash, frmAbout,
-              {monitorPageSwitch, processTable, modProcPort, captureSession, supportExchange, hostAddresses,
-               monitorFields}),
-      mdlFileInfo(machine, desktop), modProcPort(machine, desktop, frmMenu.main_ListView1, mdlFileInfo),
-      processTable(machine, desktop, frmMenu.Page(), monitorFields, mdlFileInfo, modProcPort),
-      hostAddresses(machine),
-      packetAttribution(machine, desktop, frmMenu.Page(), monitorFields, captureFields, processTable),
-      captureSession(machine, desktop, frmMenu.Page(), captureFields, packetAttribution),
+    : desktop_(desktop),
+
+      systemVersion(machine.system, desktop), hostAddresses(machine.hostNames, machine.ipHelper),
+
+      frmAbout(desktop), frmMenu(desktop, frmAbout, systemVersion, hostAddresses),
+      frmSplash(desktop, frmMenu),
+
+      monitorPage(frmMenu, kPageTable[shell::kMonitorPage]), surfPage(frmMenu, kPageTable[shell::kSurfPage]),
+      firstConnectionPage(frmMenu, kPageTable[shell::kFirstConnectionPage]),
+
+      mdlFileInfo(machine.processes, machine.tokens, machine.versionInfo, desktop),
+      modProcPort(machine.ipHelper, {machine.processes, machine.handles}, desktop,
+                  monitorPage.table.main_ListView1, mdlFileInfo),
+      processRowAdder(machine.icons, machine.system, desktop, monitorPage.table, mdlFileInfo),
+      portSource(systemVersion, mdlFileInfo, modProcPort),
+      processTable(machine.processes, machine.system, monitorPage.table, processRowAdder, portSource),
+
+      ownAddresses(hostAddresses), packetControl(machine.captureControls),
+      packetAttribution(machine.captureLibrary, desktop, packetControl, ownAddresses, processTable),
+      captureSession(machine.captureLibrary, machine.system, monitorPage.adapters, packetControl,
+                     ownAddresses),
+
       modSocketPlus(machine.sockets, machine.hostNames, desktop),
-      supportExchange(modSocketPlus, desktop, frmMenu.main_ListView1, frmMenu.main_cmdRpt, processTable,
-                      frmMenu.main_Timer1),
-      monitorPageSwitch(machine, monitorFields, processTable, supportExchange, captureSession) {
-  captureSession.UnloadMainWindow = [this] { desktop_.Unload(frmMenu); };
+      supportExchange(modSocketPlus, desktop, monitorPage.reporting, processTable, monitorPage.main_Timer1),
+
+      captureSetup(machine.shellStart, frmSplash, frmMenu, captureSession, packetControl),
+      monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession) {
+  frmMenu.Add(monitorPage);
+  frmMenu.Add(surfPage);
+  frmMenu.Add(firstConnectionPage);
+  surfPage.surf_Timer1.Tick = [this] { modProcPort.surf_Timer1_Timer(); };
 }
 
 void Program::Start() { desktop_.Show(frmSplash); }

@@ -3,22 +3,24 @@
 #include "capture/CaptureSession.h"
 #include "capture/HostAddresses.h"
 #include "capture/PacketAttribution.h"
+#include "diagnostics/SurfPage.h"
 #include "forms/Desktop.h"
 #include "foundation/modSocketPlus.h"
 #include "monitor/ProcessTable.h"
-#include "monitor/mdlFileInfo.h"
-#include "monitor/modProcPort.h"
 #include "platform/Machine.h"
+#include "provisioning/FirstConnectionPage.h"
 #include "report/SupportExchange.h"
-#include "shell/MonitorPageSwitch.h"
+#include "shell/CaptureSetup.h"
+#include "shell/MonitorPage.h"
+#include "shell/MonitorWork.h"
 #include "shell/frmAbout.h"
 #include "shell/frmMenu.h"
 #include "shell/frmSplash.h"
 
 namespace quendra::app {
 
-/// The whole program over one machine and one desktop: its forms and the one object of each of its modules.
-/// Nothing of it is shared, so that several programs can live side by side.
+/// The whole program over one machine and one desktop: its forms, its pages and the one object of each of its
+/// modules. Nothing of it is shared, so that several programs can live side by side.
 class Program {
  public:
   Program(const platform::Machine& machine, forms::Desktop& desktop);
@@ -31,26 +33,37 @@ class Program {
   forms::Desktop& desktop_;
 
  public:
-  // The forms come first: modules are made over the main window's controls, and a form uses them only once it
-  // is loaded.
-  shell::frmSplash frmSplash;
+  // What only asks the machine.
+  monitor::SystemVersion systemVersion;
+  capture::HostAddresses hostAddresses;
+
+  // Forms.
   shell::frmAbout frmAbout;
   shell::frmMenu frmMenu;
+  shell::frmSplash frmSplash;
 
-  monitor::MonitorFields monitorFields;
+  // Pages.
+  shell::MonitorPage monitorPage;
+  diagnostics::SurfPage surfPage;
+  provisioning::FirstConnectionPage firstConnectionPage;
+
+  // Modules.
   monitor::mdlFileInfo mdlFileInfo;
   monitor::modProcPort modProcPort;
+  monitor::ProcessRowAdder processRowAdder;
+  monitor::PortSource portSource;
   monitor::ProcessTable processTable;
 
-  capture::CaptureFields captureFields;
-  capture::HostAddresses hostAddresses;
+  capture::OwnAddresses ownAddresses;
+  capture::PacketControl packetControl;
   capture::PacketAttribution packetAttribution;
   capture::CaptureSession captureSession;
 
   foundation::modSocketPlus modSocketPlus;
   report::SupportExchange supportExchange;
 
-  shell::MonitorPageSwitch monitorPageSwitch;
+  shell::CaptureSetup captureSetup;
+  shell::MonitorWork monitorWork;
 };
 
 } // namespace quendra::app

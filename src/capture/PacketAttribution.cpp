@@ -6,34 +6,31 @@
 #include "capture/mod_get_proto.h"
 #include "monitor/ProcessRow.h"
 #include "monitor/ProcessTable.h"
-#include "platform/system/System.h"
 
 namespace quendra::capture {
 
-namespace {
+namespace {} // namespace
 
-constexpr std::uint32_t kRefreshInterval = 1000;
-
-} // namespace
-
-PacketAttribution::PacketAttribution(const platform::Machine& machine, forms::Desktop& desktop,
-                                     monitor::MonitorPage page, monitor::MonitorFields& fields,
-                                     CaptureFields& capture, monitor::ProcessTable& table)
-    : machine_(machine), desktop_(desktop), page_(page), fields_(fields), capture_(capture), table_(table),
-      ports_(page.main_ListView1) {}
+PacketAttribution::PacketAttribution(platform::CaptureLibrary& library, forms::Desktop& desktop,
+                                     PacketControl& control, const OwnAddresses& addresses,
+                                     monitor::ProcessTable& table)
+    : library_(library), desktop_(desktop), control_(control), addresses_(addresses), table_(table),
+      ports_(table.List()) {
+  control_.vpacket_PacketReceived = [this] { vpacket_PacketReceived(); };
+}
 
 void PacketAttribution::vpacket_PacketReceived() {
   desktop_.DoEvents();
-  if (!page_.frameMain.Visible()) return;
+  if (!table_.PageIsOpen()) return;
   const std::optional<int> newest = PeekProtocol();
   if (newest == kTcp || newest == kGre) Drain(newest == kGre);
 }
 
 /// The protocol of the newest record; nothing for a record whose headers lie beyond the buffer.
 std::optional<int> PacketAttribution::PeekProtocol() {
-  if (!capture_.vpacket) throw Fault(Fault::kObjectNotSet);
+  platform::CaptureControl& vpacket = control_.Get();
   PeekBytes_.fill(0);
-  capture_.vpacket->ReadBuffer(PeekBytes_);
+  vpacket.ReadBuffer(PeekBytes_);
   const platform::FrameBytes record(PeekBytes_.data(), static_cast<int>(PeekBytes_.size()));
   try {
     std::int32_t index = mod_get_header::ReadCaptureHeader(record).headerLength;
@@ -52,12 +49,12 @@ void PacketAttribution::Drain(bool tunnelled) {
   std::int32_t n = 1;
   while (n > 0) {
     desktop_.DoEvents();
-    n = machine_.captureLibrary.vpCapture(frame, header);
+    n = library_.vpCapture(frame, header);
     const Verdict verdict = Decode(frame, decoders, tunnelled);
     if (verdict == Verdict::Malformed) return;
     if (verdict == Verdict::EndDrain) n = 0;
     if (verdict == Verdict::Charge) ChargePacket(decoders);
-    RefreshWhenDue();
+    table_.RefreshWhenDue();
     // The bytes of this round are gone with the next call; a call that delivers nothing must not show them
     // again.
     frame = platform::FrameBytes::Blank();
@@ -112,8 +109,8 @@ void PacketAttribution::AttributePolledFrame(const platform::FrameBytes& frame, 
 
 bool PacketAttribution::IsOutgoing(const clsIP& ip) {
   const platform::Ipv4Address source = *ip.SourceAddress();
-  return lastAddress_.Equals(capture_.LocalAddressLast, source) ||
-         previousAddress_.Equals(capture_.LocalAddressPrevious, source);
+  return lastAddress_.Equals(addresses_.LocalAddressLast, source) ||
+         previousAddress_.Equals(addresses_.LocalAddressPrevious, source);
 }
 
 void PacketAttribution::ChargePacket(const FrameDecoders& decoders) {
@@ -122,13 +119,6 @@ void PacketAttribution::ChargePacket(const FrameDecoders& decoders) {
   forms::ListRow* row = ports_.RowOf(static_cast<std::int16_t>(port));
   if (!row) return;
   AddBytes(row->CellTag(outgoing ? monitor::kUploadCell : monitor::kDownloadCell), decoders.ip.TotalLength());
-}
-
-void PacketAttribution::RefreshWhenDue() {
-  if (fields_.SinceLastRefresh(machine_.system.GetTickCount()) < kRefreshInterval) return;
-  if (!page_.frameMain.Visible()) return;
-  table_.RefreshProcessTable({});
-  fields_.LastRefreshTick = static_cast<std::int32_t>(machine_.system.GetTickCount());
 }
 
 } // namespace quendra::capture

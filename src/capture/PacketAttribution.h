@@ -1,14 +1,14 @@
 #pragma once
 
-#include "capture/CaptureFields.h"
 #include "capture/LocalAddress.h"
+#include "capture/OwnAddresses.h"
+#include "capture/PacketControl.h"
 #include "capture/PortIndex.h"
 #include "capture/clsEthernet.h"
 #include "capture/clsIP.h"
 #include "capture/clsTCP.h"
 #include "forms/Desktop.h"
-#include "monitor/MonitorPage.h"
-#include "platform/Machine.h"
+#include "platform/capture/Capture.h"
 
 #include <optional>
 
@@ -28,10 +28,10 @@ struct FrameDecoders {
 /// Charges captured packets to the rows of the process table and drives the table's regular refresh.
 class PacketAttribution {
  public:
-  PacketAttribution(const platform::Machine& machine, forms::Desktop& desktop, monitor::MonitorPage page,
-                    monitor::MonitorFields& fields, CaptureFields& capture, monitor::ProcessTable& table);
+  PacketAttribution(platform::CaptureLibrary& library, forms::Desktop& desktop, PacketControl& control,
+                    const OwnAddresses& addresses, monitor::ProcessTable& table);
 
-  /// The event of the capture control `vpacket`: drains the frames that wait, when the newest record is TCP
+  /// The event of the capture control: drains the frames that wait, when the newest record is TCP
   /// or a tunnel. It yields with each frame, and anything may run there: a second event inside this one, a
   /// page change, a table pass.
   void vpacket_PacketReceived();
@@ -39,8 +39,6 @@ class PacketAttribution {
   /// The polling loop's way with one frame: TCP is charged, always as if in a tunnel, anything else is passed
   /// over.
   void AttributePolledFrame(const platform::FrameBytes& frame, FrameDecoders& decoders);
-  /// Runs a pass of the table when the page is open and a second has gone since the last one.
-  void RefreshWhenDue();
   /// Frames and records that ended before the fields that their own bytes announce. They are dropped.
   std::uint64_t MalformedFrames() const { return malformedFrames_; }
 
@@ -55,11 +53,10 @@ class PacketAttribution {
   void ChargePacket(const FrameDecoders& decoders);
   bool IsOutgoing(const clsIP& ip);
 
-  platform::Machine machine_;
+  platform::CaptureLibrary& library_;
   forms::Desktop& desktop_;
-  monitor::MonitorPage page_;
-  monitor::MonitorFields& fields_;
-  CaptureFields& capture_;
+  PacketControl& control_;
+  const OwnAddresses& addresses_;
   monitor::ProcessTable& table_;
   PortIndex ports_;
   LocalAddress lastAddress_;

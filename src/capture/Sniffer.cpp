@@ -62,7 +62,7 @@ void Sniffer::iSubCls_Despues(std::int32_t&, WindowHandle, std::uint32_t, std::u
   std::int32_t received = kBufferSize;
   while (received == kBufferSize) {
     std::array<std::uint8_t, kBufferSize> buffer{};
-    received = machine_.sockets.recv(platform::SocketHandle(wParam), buffer, 0);
+    received = sockets_.recv(platform::SocketHandle(wParam), buffer, 0);
     if (received > 0) Charge(ReadSniffedPacket(buffer));
   }
 }
@@ -77,8 +77,8 @@ void Sniffer::Charge(const SniffedPacket& packet) {
 
 bool Sniffer::IsOutgoing(const SniffedPacket& packet) const {
   const Text source = packet.source.AsText();
-  return source == Trimmed(capture_.LocalAddressLast) || source == Trimmed(capture_.LocalAddressPrevious) ||
-         source == Trimmed(capture_.GatewayAddress);
+  return source == Trimmed(addresses_.LocalAddressLast) ||
+         source == Trimmed(addresses_.LocalAddressPrevious) || source == Trimmed(addresses_.GatewayAddress);
 }
 
 forms::ListRow* Sniffer::OwnerOf(const SniffedPacket& packet, bool outgoing) {
@@ -93,16 +93,16 @@ forms::ListRow* Sniffer::OwnerOf(const SniffedPacket& packet, bool outgoing) {
 
 void Sniffer::DeselectAndCloseSockets() {
   for (const platform::SocketHandle socket : Sockets)
-    machine_.sockets.WSAAsyncSelect(socket, Window, kSocketMessage, 0);
-  for (const platform::SocketHandle socket : Sockets) machine_.sockets.closesocket(socket);
+    sockets_.WSAAsyncSelect(socket, Window, kSocketMessage, 0);
+  for (const platform::SocketHandle socket : Sockets) sockets_.closesocket(socket);
 }
 
 void Sniffer::Teardown() {
   if (!Active) return;
   main_Timer1_.Enabled = false;
   DeselectAndCloseSockets();
-  if (machine_.sockets.WSAIsBlocking()) machine_.sockets.WSACancelBlockingCall();
-  machine_.sockets.WSACleanup();
+  if (sockets_.WSAIsBlocking()) sockets_.WSACancelBlockingCall();
+  sockets_.WSACleanup();
   DeselectAndCloseSockets();
   if (UnSubclass) UnSubclass();
   UnSubclass = nullptr;

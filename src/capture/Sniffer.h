@@ -1,9 +1,8 @@
 #pragma once
 
-#include "capture/CaptureFields.h"
+#include "capture/OwnAddresses.h"
 #include "forms/Controls.h"
 #include "forms/ListView.h"
-#include "platform/Machine.h"
 #include "platform/net/Sockets.h"
 
 #include <functional>
@@ -32,9 +31,10 @@ SniffedPacket ReadSniffedPacket(std::span<const std::uint8_t, 2000> buffer);
 /// it see window messages, so its flag stays false.
 class Sniffer {
  public:
-  Sniffer(const platform::Machine& machine, forms::ListView& main_ListView1, forms::Timer& main_Timer1,
-          CaptureFields& capture)
-      : machine_(machine), main_ListView1_(main_ListView1), main_Timer1_(main_Timer1), capture_(capture) {}
+  Sniffer(platform::Sockets& sockets, forms::ListView& main_ListView1, forms::Timer& main_Timer1,
+          const OwnAddresses& addresses)
+      : sockets_(sockets), main_ListView1_(main_ListView1), main_Timer1_(main_Timer1), addresses_(addresses) {
+  }
 
   bool Active = false;
   std::array<platform::SocketHandle, 2> Sockets{};
@@ -57,10 +57,10 @@ class Sniffer {
   forms::ListRow* OwnerOf(const SniffedPacket& packet, bool outgoing);
   void DeselectAndCloseSockets();
 
-  platform::Machine machine_;
+  platform::Sockets& sockets_;
   forms::ListView& main_ListView1_;
   forms::Timer& main_Timer1_;
-  CaptureFields& capture_;
+  const OwnAddresses& addresses_;
 };
 
 } // namespace quendra::capture

@@ -11,6 +11,11 @@ constexpr std::uint32_t kFileTransferPort = 21;
 
 } // namespace
 
+void modProcPort::surf_Timer1_Timer() {
+  FetchTcpOwnerTable();
+  SweepConnections();
+}
+
 bool modProcPort::SweepConnections() {
   if (!HasEntries()) return false;
   const std::int32_t last = entryCount_;
@@ -49,7 +54,7 @@ void modProcPort::DeleteConnection(std::uint32_t localAddress, std::uint32_t loc
                                       remoteAddress,        remotePort,   0};
   std::array<std::uint8_t, platform::TcpTableEntry::kBytes> record{};
   entry.WriteTo(record, 0);
-  machine_.ipHelper.SetTcpEntry(std::span(record).first<platform::TcpTableEntry::kBytesWithoutOwner>());
+  ipHelper_.SetTcpEntry(std::span(record).first<platform::TcpTableEntry::kBytesWithoutOwner>());
 }
 
 } // namespace quendra::monitor

@@ -1,5 +1,4 @@
 #include "monitor/mdlFileInfo.h"
-#include "platform/process/VersionInfo.h"
 #include "runtime/ByteFields.h"
 
 #include <algorithm>
@@ -46,17 +45,16 @@ Text ValueText(const std::optional<std::vector<std::uint8_t>>& value) {
 FileVersionInfo mdlFileInfo::ReadFileVersionInfo(const Text& path) {
   FileVersionInfo info;
   if (path.empty()) return info;
-  platform::VersionInfo& versions = machine_.versionInfo;
   const std::string file = ToCodePage(path);
-  const auto size = static_cast<std::int32_t>(versions.GetFileVersionInfoSizeA(file));
+  const auto size = static_cast<std::int32_t>(versions_.GetFileVersionInfoSizeA(file));
   if (size <= 0) return info;
   std::vector<std::uint8_t> block(static_cast<std::size_t>(size));
-  if (!versions.GetFileVersionInfoA(file, block)) return info;
-  const auto translation = versions.VerQueryValueA(block, std::string(versions.kTranslation));
+  if (!versions_.GetFileVersionInfoA(file, block)) return info;
+  const auto translation = versions_.VerQueryValueA(block, std::string(versions_.kTranslation));
   if (!translation) return info;
-  const std::string section = std::string(versions.kTexts) + TranslationText(*translation) + "\\";
+  const std::string section = std::string(versions_.kTexts) + TranslationText(*translation) + "\\";
   for (const VersionName& version : kVersionNames)
-    info.*version.field = ValueText(versions.VerQueryValueA(block, section + version.name));
+    info.*version.field = ValueText(versions_.VerQueryValueA(block, section + version.name));
   return info;
 }
 

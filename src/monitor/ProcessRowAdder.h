@@ -1,9 +1,10 @@
 #pragma once
 
-#include "monitor/MonitorPage.h"
+#include "monitor/TableControls.h"
 #include "monitor/mdlFileInfo.h"
-#include "platform/Machine.h"
+#include "platform/process/Icons.h"
 #include "platform/process/Processes.h"
+#include "platform/system/System.h"
 
 namespace quendra::forms {
 class Desktop;
@@ -11,27 +12,27 @@ class Desktop;
 
 namespace quendra::monitor {
 
-/// Adds the rows of the processes that one pass sees for the first time.
+/// Adds the rows of the processes that a pass sees for the first time.
 class ProcessRowAdder {
  public:
-  ProcessRowAdder(const platform::Machine& machine, forms::Desktop& desktop, MonitorPage page,
-                  mdlFileInfo& fileInfo)
-      : machine_(machine), desktop_(desktop), page_(page), fileInfo_(fileInfo) {}
+  ProcessRowAdder(platform::Icons& icons, platform::System& system, forms::Desktop& desktop,
+                  TableControls& controls, mdlFileInfo& fileInfo)
+      : icons_(icons), system_(system), desktop_(desktop), controls_(controls), fileInfo_(fileInfo) {}
 
-  void Add(const platform::Processes::Entry& entry, Text ports);
+  /// `classOfRow` is the class of the row added before, and becomes that of this one.
+  void Add(const platform::Processes::Entry& entry, Text ports, Text& classOfRow);
 
  private:
   void AddIconOf(const Text& path);
   int IconIndexOf(const Text& path) const;
-  void AddCells(forms::ListRow& row, const Text& name, const Text& path, Text ports);
+  static void AddRateCells(forms::ListRow& row);
   std::int32_t Tick() const;
 
-  platform::Machine machine_;
+  platform::Icons& icons_;
+  platform::System& system_;
   forms::Desktop& desktop_;
-  MonitorPage page_;
+  TableControls& controls_;
   mdlFileInfo& fileInfo_;
-  // One text for the whole pass: a process of an unknown parent takes the class of the row added before it.
-  Text class_;
 };
 
 } // namespace quendra::monitor

@@ -1,7 +1,6 @@
 #include "monitor/SocketHandleScan.h"
 
 #include "monitor/OwnedHandle.h"
-#include "platform/process/Handles.h"
 #include "runtime/ByteFields.h"
 #include "runtime/Integers.h"
 
@@ -31,7 +30,6 @@ void SocketHandleScan::Run(std::vector<PortOwner>& owners) {
 }
 
 std::vector<SocketHandleScan::HandleEntry> SocketHandleScan::AllHandles() {
-  Handles& handles = machine_.handles;
   std::vector<HandleEntry> entries;
   std::uint32_t status = 0;
   do {
@@ -39,12 +37,12 @@ std::vector<SocketHandleScan::HandleEntry> SocketHandleScan::AllHandles() {
     std::vector<std::uint8_t> buffer(kFirstRoom);
     // The first buffer has room for one handle, so what fits there is ignored; a longer list tells its
     // length.
-    if (handles.NtQuerySystemInformation(Handles::kHandleTable, buffer, returned) == 0) break;
+    if (handles_.NtQuerySystemInformation(Handles::kHandleTable, buffer, returned) == 0) break;
     const auto count = Little32(buffer, 0);
     const std::int32_t room = ToInt32(std::int64_t{count} * std::int64_t{Handles::kRecordBytes} +
                                       std::int64_t{Handles::kCountBytes});
     buffer.assign(static_cast<std::size_t>(room), 0);
-    status = handles.NtQuerySystemInformation(Handles::kHandleTable, buffer, returned);
+    status = handles_.NtQuerySystemInformation(Handles::kHandleTable, buffer, returned);
     entries.resize(count);
     std::size_t at = Handles::kCountBytes;
     for (HandleEntry& entry : entries) {
@@ -58,15 +56,14 @@ std::vector<SocketHandleScan::HandleEntry> SocketHandleScan::AllHandles() {
 
 void SocketHandleScan::Examine(const HandleEntry& entry, std::vector<PortOwner>& owners) {
   if (entry.processId == 0) return;
-  platform::Processes& processes = machine_.processes;
-  const platform::Handle opened = processes.OpenProcess(kMayDuplicate, false, entry.processId);
+  const platform::Handle opened = processes_.OpenProcess(kMayDuplicate, false, entry.processId);
   if (opened == platform::kInvalidHandle) return;
-  const OwnedHandle process(processes, opened);
+  const OwnedHandle process(processes_, opened);
   platform::Handle copy = platform::kNoHandle;
-  if (!machine_.handles.DuplicateHandle(process.Get(), platform::Handle(entry.handle), platform::kOwnProcess,
-                                        copy, kDuplicateAccess, false, 0))
+  if (!handles_.DuplicateHandle(process.Get(), platform::Handle(entry.handle), platform::kOwnProcess, copy,
+                                kDuplicateAccess, false, 0))
     return;
-  const OwnedHandle duplicate(processes, copy);
+  const OwnedHandle duplicate(processes_, copy);
   const std::optional<Text> name = DeviceName(duplicate.Get());
   if (!name) return;
   const std::int32_t port = QueryHandlePort(duplicate.Get());
@@ -79,7 +76,7 @@ void SocketHandleScan::Examine(const HandleEntry& entry, std::vector<PortOwner>&
 std::optional<Text> SocketHandleScan::DeviceName(platform::Handle handle) {
   std::array<std::uint8_t, kNameRoom> buffer{};
   std::uint32_t returned = 0;
-  const std::uint32_t status = machine_.handles.NtQueryObject(handle, Handles::kObjectName, buffer, returned);
+  const std::uint32_t status = handles_.NtQueryObject(handle, Handles::kObjectName, buffer, returned);
   if (status != 0 || Little16(buffer, 0) != kDeviceNameBytes) return std::nullopt;
   Text name(kDeviceNameBytes / sizeof(char16_t), u'\0');
   for (std::size_t i = 0; i < name.size(); ++i) name[i] = Little16(buffer, Handles::kNameOffset + 2 * i);
@@ -90,9 +87,9 @@ std::int32_t SocketHandleScan::QueryHandlePort(platform::Handle handle) {
   std::array<std::uint8_t, Handles::kQueryBytes> input{};
   std::array<std::uint8_t, Handles::kAnswerBytes> output{};
   input[Handles::kQueryTypeOffset] = Handles::kQueryAddressInfo;
-  const OwnedHandle event(machine_.processes, machine_.handles.CreateEventW(true, false, u"0"));
+  const OwnedHandle event(processes_, handles_.CreateEventW(true, false, u"0"));
   const std::uint32_t status =
-      machine_.handles.NtDeviceIoControlFile(handle, event.Get(), Handles::kQueryInformation, input, output);
+      handles_.NtDeviceIoControlFile(handle, event.Get(), Handles::kQueryInformation, input, output);
   if (status != 0) return 0;
   return Big16(output, Handles::kPortOffset);
 }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Machine.h"
+#include "platform/process/Handles.h"
 #include "platform/process/Processes.h"
 #include "runtime/Text.h"
 
@@ -19,7 +19,8 @@ struct PortOwner {
 /// socket.
 class SocketHandleScan {
  public:
-  explicit SocketHandleScan(const platform::Machine& machine) : machine_(machine) {}
+  SocketHandleScan(platform::Processes& processes, platform::Handles& handles)
+      : processes_(processes), handles_(handles) {}
 
   /// Writes the owners found over those in `owners`, 65536 records by port.
   void Run(std::vector<PortOwner>& owners);
@@ -37,7 +38,8 @@ class SocketHandleScan {
   /// The object's name in capitals; nothing for names of a length that no socket's device has.
   std::optional<Text> DeviceName(platform::Handle handle);
 
-  platform::Machine machine_;
+  platform::Processes& processes_;
+  platform::Handles& handles_;
 };
 
 } // namespace quendra::monitor

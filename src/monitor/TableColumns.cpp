@@ -32,7 +32,7 @@ constexpr std::array<Column, 9> kColumns{{
 } // namespace
 
 void ProcessTable::PrepareTable() {
-  forms::ListView& list = page_.main_ListView1;
+  forms::ListView& list = controls_.main_ListView1;
   list.Clear();
   list.ClearColumns();
   for (const Column& column : kColumns)
@@ -41,7 +41,7 @@ void ProcessTable::PrepareTable() {
 }
 
 void ProcessTable::main_ListView1_ColumnClick(int header) {
-  forms::ListView& list = page_.main_ListView1;
+  forms::ListView& list = controls_.main_ListView1;
   const int key = header - 1;
   const bool turnsOver = key == list.SortKey() && list.Order() == forms::SortOrder::Ascending;
   list.Sort(key, turnsOver ? forms::SortOrder::Descending : forms::SortOrder::Ascending);

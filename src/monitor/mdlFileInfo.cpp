@@ -1,8 +1,6 @@
 #include "monitor/mdlFileInfo.h"
 
 #include "monitor/OwnedHandle.h"
-#include "platform/process/Processes.h"
-#include "platform/process/Tokens.h"
 
 #include <algorithm>
 
@@ -29,51 +27,49 @@ Text FirstModulePath(platform::Processes& processes, platform::Handle process) {
 
 } // namespace
 
-Boolean16 mdlFileInfo::EnablePrivilege(TextView name, std::uint32_t attributes) {
-  platform::Processes& processes = machine_.processes;
-  const auto failed = [&](TextView step) {
-    // Judged by the last error and not by the call's result, so an error left over from before fails the
-    // first step.
-    const auto error = static_cast<std::int32_t>(processes.GetLastError());
-    if (error != 0) desktop_.MessageBox(Text(step) + u", Error: " + DecimalText(error), 0, {});
-    return error != 0;
-  };
+/// Judges a step by the last error and not by the call's result, so an error left over from before fails the
+/// first step. Says so in a box.
+bool mdlFileInfo::LeftAnError(TextView step) {
+  const auto error = static_cast<std::int32_t>(processes_.GetLastError());
+  if (error != 0) desktop_.MessageBox(Text(step) + u", Error: " + DecimalText(error), 0, {});
+  return error != 0;
+}
 
-  const platform::Handle process = processes.GetCurrentProcess();
-  if (failed(u"GetCurrentProcess")) return kFalse16;
+Boolean16 mdlFileInfo::EnablePrivilege(TextView name, std::uint32_t attributes) {
+  const platform::Handle process = processes_.GetCurrentProcess();
+  if (LeftAnError(u"GetCurrentProcess")) return kFalse16;
   platform::Handle opened = platform::kNoHandle;
-  machine_.tokens.OpenProcessToken(process, kAdjustAndQuery, opened);
-  const OwnedHandle token(processes, opened);
-  if (failed(u"OpenProcessToken")) return kFalse16;
+  tokens_.OpenProcessToken(process, kAdjustAndQuery, opened);
+  const OwnedHandle token(processes_, opened);
+  if (LeftAnError(u"OpenProcessToken")) return kFalse16;
   std::uint64_t luid = 0;
-  machine_.tokens.LookupPrivilegeValueA("", ToCodePage(name), luid);
-  if (failed(u"LookupPrivilegeValue")) return kFalse16;
+  tokens_.LookupPrivilegeValueA("", ToCodePage(name), luid);
+  if (LeftAnError(u"LookupPrivilegeValue")) return kFalse16;
   std::array<std::uint8_t, 16> previousState{};
-  machine_.tokens.AdjustTokenPrivileges(token.Get(), false, luid, attributes, previousState);
-  return failed(u"AdjustTokenPrivileges") ? kFalse16 : kTrue16;
+  tokens_.AdjustTokenPrivileges(token.Get(), false, luid, attributes, previousState);
+  return LeftAnError(u"AdjustTokenPrivileges") ? kFalse16 : kTrue16;
 }
 
 Text mdlFileInfo::ModulePathOf(std::uint32_t processId) {
-  const platform::Handle process = machine_.processes.OpenProcess(kQueryAndRead, false, processId);
-  Text path = FirstModulePath(machine_.processes, process);
-  machine_.processes.CloseHandle(process);
+  const platform::Handle process = processes_.OpenProcess(kQueryAndRead, false, processId);
+  Text path = FirstModulePath(processes_, process);
+  processes_.CloseHandle(process);
   return path;
 }
 
 Text mdlFileInfo::ModulePathOrSystem(std::uint32_t processId) {
-  const platform::Handle process = machine_.processes.OpenProcess(kQueryAndRead, false, processId);
-  const Text path = process == platform::kNoHandle ? Text() : FirstModulePath(machine_.processes, process);
-  machine_.processes.CloseHandle(process);
+  const platform::Handle process = processes_.OpenProcess(kQueryAndRead, false, processId);
+  const Text path = process == platform::kNoHandle ? Text() : FirstModulePath(processes_, process);
+  processes_.CloseHandle(process);
   return path.empty() ? u"SYSTEM" : path;
 }
 
 void mdlFileInfo::LoadSystemPids(const Text&) {
-  platform::Processes& processes = machine_.processes;
-  const OwnedHandle snapshot(processes,
-                             processes.CreateToolhelp32Snapshot(platform::Processes::kSnapProcess, 0));
+  const OwnedHandle snapshot(processes_,
+                             processes_.CreateToolhelp32Snapshot(platform::Processes::kSnapProcess, 0));
   platform::Processes::Entry entry;
-  for (bool more = processes.Process32First(snapshot.Get(), entry); more;
-       more = processes.Process32Next(snapshot.Get(), entry)) {
+  for (bool more = processes_.Process32First(snapshot.Get(), entry); more;
+       more = processes_.Process32Next(snapshot.Get(), entry)) {
     const Text name = ExeNameOf(entry);
     RecordWellKnown(name, entry.processId);
     if (name == u"quendra.exe") OwnPid = entry.processId;

@@ -1,9 +1,9 @@
 #pragma once
 
 #include "forms/Desktop.h"
-#include "platform/Machine.h"
 #include "platform/process/Processes.h"
 #include "platform/process/Tokens.h"
+#include "platform/process/VersionInfo.h"
 #include "runtime/Integers.h"
 
 #include <array>
@@ -26,8 +26,9 @@ struct FileVersionInfo {
 /// What the monitor knows of a process beyond its id. Process ids have 32 bits here, all together.
 class mdlFileInfo {
  public:
-  mdlFileInfo(const platform::Machine& machine, forms::Desktop& desktop)
-      : machine_(machine), desktop_(desktop) {}
+  mdlFileInfo(platform::Processes& processes, platform::Tokens& tokens, platform::VersionInfo& versions,
+              forms::Desktop& desktop)
+      : processes_(processes), tokens_(tokens), versions_(versions), desktop_(desktop) {}
 
   /// True when no step left an error. A step that left one says so in a message box.
   Boolean16 EnablePrivilege(TextView name, std::uint32_t attributes = platform::Tokens::kEnabled);
@@ -55,7 +56,11 @@ class mdlFileInfo {
   std::uint32_t OwnPid = 0;
 
  private:
-  platform::Machine machine_;
+  bool LeftAnError(TextView step);
+
+  platform::Processes& processes_;
+  platform::Tokens& tokens_;
+  platform::VersionInfo& versions_;
   forms::Desktop& desktop_;
 };
 

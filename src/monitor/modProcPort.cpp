@@ -19,24 +19,24 @@ constexpr std::array<TextView, 12> kStateNames{
 
 } // namespace
 
-modProcPort::modProcPort(const platform::Machine& machine, forms::Desktop& desktop,
-                         forms::ListView& main_ListView1, mdlFileInfo& fileInfo)
-    : PortOwnerTable(kPorts), machine_(machine), desktop_(desktop), main_ListView1_(main_ListView1),
-      fileInfo_(fileInfo) {}
+modProcPort::modProcPort(platform::IpHelper& ipHelper, const SocketHandleScan& handleScan,
+                         forms::Desktop& desktop, forms::ListView& main_ListView1, mdlFileInfo& fileInfo)
+    : PortOwnerTable(kPorts), ipHelper_(ipHelper), handleScan_(handleScan), desktop_(desktop),
+      main_ListView1_(main_ListView1), fileInfo_(fileInfo) {}
 
 bool modProcPort::ScanSocketHandles() {
-  SocketHandleScan(machine_).Run(PortOwnerTable);
+  handleScan_.Run(PortOwnerTable);
   return true;
 }
 
 std::int32_t modProcPort::QueryHandlePort(platform::Handle handle) {
-  return SocketHandleScan(machine_).QueryHandlePort(handle);
+  return handleScan_.QueryHandlePort(handle);
 }
 
 bool modProcPort::FetchTcpOwnerTable() {
   walkOffset_ = 0;
   platform::IpHelper::TcpTable table;
-  if (machine_.ipHelper.AllocateAndGetTcpExTableFromStack(table) != 0) return false;
+  if (ipHelper_.AllocateAndGetTcpExTableFromStack(table) != 0) return false;
   TcpOwnerSnapshot_ = std::move(table);
   entryCount_ = TcpEntryCount(TcpOwnerSnapshot_);
   return true;

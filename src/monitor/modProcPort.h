@@ -5,7 +5,6 @@
 #include "monitor/SocketHandleScan.h"
 #include "monitor/TcpOwnerEntry.h"
 #include "monitor/mdlFileInfo.h"
-#include "platform/Machine.h"
 #include "platform/net/IpHelper.h"
 #include "runtime/Integers.h"
 
@@ -20,8 +19,8 @@ class modProcPort {
  public:
   using PortOwner = monitor::PortOwner;
 
-  modProcPort(const platform::Machine& machine, forms::Desktop& desktop, forms::ListView& main_ListView1,
-              mdlFileInfo& fileInfo);
+  modProcPort(platform::IpHelper& ipHelper, const SocketHandleScan& handleScan, forms::Desktop& desktop,
+              forms::ListView& main_ListView1, mdlFileInfo& fileInfo);
 
   /// Brings PortOwnerTable up to date from the handles of all processes. True when the walk has finished.
   bool ScanSocketHandles();
@@ -35,6 +34,8 @@ class modProcPort {
   /// Deletes the connections of foreign processes, up to the first that must stay. False without a table or
   /// entries. Yields twice an entry.
   bool SweepConnections();
+  /// The handler of a timer that nothing enables.
+  void surf_Timer1_Timer();
   /// Addresses and ports as they lie in memory. Does nothing while ConnectionDeleteEnabled is false.
   void DeleteConnection(std::uint32_t localAddress, std::uint32_t localPort, std::uint32_t remoteAddress,
                         std::uint32_t remotePort);
@@ -56,7 +57,8 @@ class modProcPort {
   void MergeCurrentEntry(PortsCells& cells);
   bool SweepEndsAtCurrentEntry();
 
-  platform::Machine machine_;
+  platform::IpHelper& ipHelper_;
+  SocketHandleScan handleScan_;
   forms::Desktop& desktop_;
   forms::ListView& main_ListView1_;
   mdlFileInfo& fileInfo_;

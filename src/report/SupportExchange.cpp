@@ -1,5 +1,6 @@
 #include "report/SupportExchange.h"
 
+#include "foundation/Wording.h"
 #include "report/SupportRequests.h"
 #include "runtime/Settings.h"
 
@@ -15,7 +16,6 @@ constexpr std::int16_t kWebPort = 80;
 /// Boxes that stand on one another: each holds about 1.5 KB of the stack for as long as it stands.
 constexpr int kMostNumberBoxes = 250;
 
-constexpr const char16_t* kHebrewTitle = u"זלמר בינלאומי@נט";
 constexpr const char16_t* kDefaultTitle = u"Quendra";
 
 /// 0, which no socket has, for an index that is no number.
@@ -28,10 +28,13 @@ std::int32_t NumberOfIndex(const Variant& index) {
 } // namespace
 
 SupportExchange::SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop,
-                                 forms::ListView& main_ListView1, forms::Label& main_cmdRpt,
-                                 monitor::ProcessTable& table, forms::Timer& main_Timer1)
-    : module_(module), desktop_(desktop), main_ListView1_(main_ListView1), main_cmdRpt_(main_cmdRpt),
-      table_(table), main_Timer1_(main_Timer1) {}
+                                 ReportControls& controls, monitor::ProcessTable& table,
+                                 forms::Timer& main_Timer1)
+    : module_(module), desktop_(desktop), controls_(controls), table_(table), main_Timer1_(main_Timer1) {
+  controls_.main_cmdRpt.Click = [this] { main_cmdRpt_Click(); };
+  controls_.main_Label2.DoubleClick = [this] { main_Label2_DblClick(); };
+  controls_.main_Label3.DoubleClick = [this] { main_Label3_DblClick(); };
+}
 
 void SupportExchange::PrepareSockets() {
   main_spSockets_ = std::make_unique<foundation::CSocketPlus>(module_);
@@ -68,7 +71,7 @@ void SupportExchange::main_spSockets_Connect(Index index) {
   case kNumber: return OpenSockets().SendData(index, GetRequest(settings::SupportServerHost, u"/getid.asp"));
   case kReport:
     ReportReply.clear();
-    return OpenSockets().SendData(index, PostRequest(ReportBody(ReportNumber, main_ListView1_)));
+    return OpenSockets().SendData(index, PostRequest(ReportBody(ReportNumber, table_.List())));
   case kLoad:
     return OpenSockets().SendData(index, GetRequest(settings::SupportServerAddress, u"/files/big.zip"));
   default: return;
@@ -99,7 +102,7 @@ void SupportExchange::main_spSockets_Error(Index index, std::int16_t number, con
   if (socket < kProcsPage || socket > kLoad) return;
   OfferReport(); // a connection that fails at once shows its box before Connect returns
   desktop_.MessageBox(u"winsock error: " + DecimalText(number) + u" - " + description, 0,
-                      socket == kProcsPage ? kHebrewTitle : kDefaultTitle);
+                      socket == kProcsPage ? foundation::kTitle : kDefaultTitle);
 }
 
 foundation::CSocketPlus& SupportExchange::OpenSockets() {
@@ -122,7 +125,7 @@ void SupportExchange::OfferReport() {
   const auto isClosed = [this](std::int16_t index) {
     return main_spSockets_->State(index) == foundation::sckClosed;
   };
-  main_cmdRpt_.Enabled = standingNumberBoxes_ == 0 && isClosed(kNumber) && isClosed(kReport);
+  controls_.main_cmdRpt.Enabled = standingNumberBoxes_ == 0 && isClosed(kNumber) && isClosed(kReport);
 }
 
 Text SupportExchange::TakeText(Index index) {
@@ -170,7 +173,7 @@ void SupportExchange::ProcsPageClosed() {
 void SupportExchange::ReadProcsPage() { const Text table[3][3]; }
 
 void SupportExchange::ShowHebrewBox(const Text& text, int icon) {
-  desktop_.MessageBox(text, icon | forms::kHebrewBox, kHebrewTitle);
+  desktop_.MessageBox(text, icon | forms::kHebrewBox, foundation::kTitle);
 }
 
 } // namespace quendra::report

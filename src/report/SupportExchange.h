@@ -4,6 +4,7 @@
 #include "forms/Desktop.h"
 #include "foundation/CSocketPlus.h"
 #include "monitor/ProcessTable.h"
+#include "report/ReportControls.h"
 
 #include <memory>
 
@@ -14,8 +15,8 @@ namespace quendra::report {
 /// is the order of the events; leaving the page ends it without a word.
 class SupportExchange {
  public:
-  SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop, forms::ListView& main_ListView1,
-                  forms::Label& main_cmdRpt, monitor::ProcessTable& table, forms::Timer& main_Timer1);
+  SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop, ReportControls& controls,
+                  monitor::ProcessTable& table, forms::Timer& main_Timer1);
 
   /// The sockets' half of the page's start.
   void PrepareSockets();
@@ -58,8 +59,7 @@ class SupportExchange {
 
   foundation::modSocketPlus& module_;
   forms::Desktop& desktop_;
-  forms::ListView& main_ListView1_;
-  forms::Label& main_cmdRpt_;
+  ReportControls& controls_;
   monitor::ProcessTable& table_;
   forms::Timer& main_Timer1_;
   std::unique_ptr<foundation::CSocketPlus> main_spSockets_;

@@ -1,12 +1,12 @@
 #include "shell/Agreement.h"
 
-#include "shell/Wording.h"
+#include "foundation/Wording.h"
 
 namespace quendra::shell {
 
 Text AgreementText() {
   Text text;
-  text += kTitle;
+  text += foundation::kTitle;
   text += u"\r\n";
   text += u"____________________________";
   text += u"\r\n";

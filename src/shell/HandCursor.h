@@ -14,6 +14,9 @@ class HandCursor {
   void Show() const {
     if (handle_ != forms::kNoCursor) desktop_.SetCursor(handle_);
   }
+  /// For every label in the container that acts as a button and does nothing else when the mouse moves over
+  /// it.
+  void ShowOverButtons(const forms::Container& container);
   forms::CursorHandle Handle() const { return handle_; }
 
  private:

@@ -1,6 +1,6 @@
 #include "shell/IpPanel.h"
 
-#include "shell/Wording.h"
+#include "foundation/Wording.h"
 
 namespace quendra::shell {
 
@@ -10,10 +10,10 @@ bool IpPanel::IsItsKey(int keyCode, int shift) {
 
 void IpPanel::Show() const {
   Text text = u"נתוני IP:";
-  text += u"\r\n1: " + addresses_.LocalHostAddress(true);
+  text += u"\r\n1: " + addresses_.LocalHostAddress(capture::HostAddress::Last);
   text += u"\r\n2: " + addresses_.GatewayAddress();
-  text += u"\r\n3: " + addresses_.LocalHostAddress(false);
-  desktop_.MessageBox(text, forms::kInformation | forms::kHebrewBox, kTitle);
+  text += u"\r\n3: " + addresses_.LocalHostAddress(capture::HostAddress::BeforeLast);
+  desktop_.MessageBox(text, forms::kInformation | forms::kHebrewBox, foundation::kTitle);
 }
 
 } // namespace quendra::shell

@@ -2,34 +2,38 @@
 
 namespace quendra::shell {
 
-void MenuHighlight::Hover(int entry, bool pageChosen) {
-  if (entry >= kButtons) return ShowLinesOf(entry, entry - kButtons);
+void MenuHighlight::Hover(std::size_t entry, bool pageChosen) {
+  if (entry >= kPageCount) return ShowLinesOf(entry);
   if (pageChosen) return;
   ShowNormal();
   ShowHighlighted(entry);
 }
 
 void MenuHighlight::Leave(bool pageChosen) {
-  ShowLinesOf(-1, -1);
+  HideAllLines();
   if (!pageChosen) ShowNormal();
 }
 
 void MenuHighlight::ShowNormal() {
-  for (std::size_t button = 0; button < kButtons; ++button)
+  for (std::size_t button = 0; button < kPageCount; ++button)
     controls_.PicMenu[button].Contents = controls_.picMenu3[button].Contents;
 }
 
-void MenuHighlight::ShowHighlighted(int button) {
-  const auto index = static_cast<std::size_t>(button);
-  controls_.PicMenu[index].Contents = controls_.picMenu2[index].Contents;
+void MenuHighlight::ShowHighlighted(std::size_t button) {
+  controls_.PicMenu[button].Contents = controls_.picMenu2[button].Contents;
 }
 
-void MenuHighlight::ShowLinesOf(int entry, int second) {
-  for (int each = 0; each < kEntries; ++each) {
-    const bool shown = each == entry || each == second;
-    controls_.upperLines[static_cast<std::size_t>(each)].Visible = shown;
-    controls_.lowerLines[static_cast<std::size_t>(each)].Visible = shown;
+void MenuHighlight::ShowLinesOf(std::size_t entry) {
+  for (std::size_t each = 0; each < kEntryCount; ++each) {
+    const bool shown = each == entry || each + kPageCount == entry;
+    controls_.upperLines[each].Visible = shown;
+    controls_.lowerLines[each].Visible = shown;
   }
+}
+
+void MenuHighlight::HideAllLines() {
+  for (MenuHighlight::Lines* lines : {&controls_.upperLines, &controls_.lowerLines})
+    for (forms::Line& line : *lines) line.Visible = false;
 }
 
 } // namespace quendra::shell

@@ -1,40 +1,36 @@
 #pragma once
 
 #include "forms/Controls.h"
-
-#include <array>
+#include "shell/PageTable.h"
 
 namespace quendra::shell {
 
-/// How the menu answers the mouse: the pictures of its three buttons and the decorative lines of its six
-/// entries.
+/// How the menu answers the mouse: the pictures of its buttons and the decorative lines of its entries.
 class MenuHighlight {
  public:
-  static constexpr int kButtons = 3;
-  static constexpr int kEntries = 6;
-  using Lines = std::array<forms::Line, kEntries>;
+  using Lines = std::array<forms::Line, kEntryCount>;
 
   struct Controls {
-    std::array<forms::PictureBox, kEntries>& PicMenu;
-    std::array<forms::PictureBox, kButtons>& picMenu2; ///< highlighted
-    std::array<forms::PictureBox, kButtons>& picMenu3; ///< normal
+    std::array<forms::PictureBox, kEntryCount>& PicMenu;
+    std::array<forms::PictureBox, kPageCount>& picMenu2; ///< highlighted
+    std::array<forms::PictureBox, kPageCount>& picMenu3; ///< normal
     Lines& upperLines;
     Lines& lowerLines;
   };
 
   explicit MenuHighlight(Controls controls) : controls_(controls) {}
 
-  /// The mouse moves over an entry, 0 to 5. Once a page was chosen the buttons' pictures stand still.
-  void Hover(int entry, bool pageChosen);
+  /// The mouse moves over an entry. Once a page was chosen the buttons' pictures stand still.
+  void Hover(std::size_t entry, bool pageChosen);
   /// The mouse moves beside the menu.
   void Leave(bool pageChosen);
   void ShowNormal();
-  /// A button, 0 to 2.
-  void ShowHighlighted(int button);
+  void ShowHighlighted(std::size_t button);
 
  private:
-  /// Shows the lines of two entries and hides all others; -1 stands for no entry.
-  void ShowLinesOf(int entry, int second);
+  /// Shows the lines of an entry of the second row and of the button over it, and hides all others.
+  void ShowLinesOf(std::size_t entry);
+  void HideAllLines();
 
   Controls controls_;
 };

@@ -1,8 +1,10 @@
 #include "shell/frmAbout.h"
 
-#include "shell/Twips.h"
+#include "foundation/Twips.h"
 
 namespace quendra::shell {
+
+using foundation::Px;
 
 frmAbout::frmAbout(forms::Desktop& desktop) : Form(u"frmAbout"), desktop_(desktop) {
   Image1.Click = [this] { desktop_.Unload(*this); };

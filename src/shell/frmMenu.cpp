@@ -1,11 +1,7 @@
 #include "shell/frmMenu.h"
 
-#include "monitor/modProcPort.h"
-#include "platform/system/ShellStart.h"
-#include "platform/system/System.h"
-#include "shell/OsVersionCode.h"
+#include "runtime/Integers.h"
 #include "shell/frmAbout.h"
-#include "shell/frmSplash.h"
 
 namespace quendra::shell {
 
@@ -17,55 +13,50 @@ constexpr int kCornerEllipse = 10;
 
 } // namespace
 
-frmMenu::frmMenu(const platform::Machine& machine, forms::Desktop& desktop, frmSplash& splash,
-                 frmAbout& about, MenuModules modules)
-    : Form(u"frmMenu"), system_(machine.system), shellStart_(machine.shellStart), desktop_(desktop),
-      splash_(splash), about_(about), modules_(modules), handCursor_(desktop),
-      highlight_({PicMenu, picMenu2, picMenu3, linMenu1, linMenu2}),
-      pages_(PageTable(), lblCaption, highlight_), ipPanel_(desktop, modules.hostAddresses) {
+frmMenu::frmMenu(forms::Desktop& desktop, frmAbout& about, monitor::SystemVersion& version,
+                 const capture::HostAddresses& addresses)
+    : PageWindow(u"frmMenu"), desktop_(desktop), about_(about), version_(version), handCursor_(desktop),
+      highlight_({PicMenu, picMenu2, picMenu3, linMenu1, linMenu2}), pages_(lblCaption, highlight_),
+      ipPanel_(desktop, addresses) {
   KeyPreview = true;
   WireMenu();
-  WireMonitorPage();
-  WireOtherPages();
-  WireHandCursor();
+}
+
+MenuHighlight::Lines frmMenu::LinesOnSecondRow(TextView name) {
+  const auto holder = [this](std::size_t entry) -> forms::Container& {
+    return PicMenu[entry < kPageCount ? entry + kPageCount : entry];
+  };
+  return MakeControls<forms::Line>(name, holder, std::make_index_sequence<kEntryCount>());
+}
+
+void frmMenu::WireMenu() {
+  for (std::size_t entry = 0; entry < kEntryCount; ++entry) {
+    lblCaption[entry].Click = [this, entry] { pages_.Choose(entry); };
+    lblCaption[entry].MouseMove = [this, entry](int, int, int, int) {
+      handCursor_.Show();
+      highlight_.Hover(entry, PageChosen());
+    };
+    PicMenu[entry].MouseMove = [this, entry](int, int, int, int) { highlight_.Hover(entry, PageChosen()); };
+  }
+  Label1.Click = [this] { Label1_Click(); };
+  // The welcome lies on the background and shall not stand in the way of a drag.
+  for (forms::Control* background :
+       {static_cast<forms::Control*>(&picOut), static_cast<forms::Control*>(&lblWelcome),
+        static_cast<forms::Control*>(&lblWelcomeHint)})
+    background->MouseMove = [this](int button, int, int, int) { picOut_MouseMove(button); };
 }
 
 void frmMenu::Form_Load() {
-  ReadOsVersion();
+  version_.Read();
   pages_.PageChosen = kFalse16;
   handCursor_.Load();
+  handCursor_.ShowOverButtons(*this);
   picOut.BackColour = forms::Rgb(162, 233, 93);
   StartCaptureLibrary();
 }
 
-void frmMenu::ReadOsVersion() {
-  modules_.fields.OsVersionCode = 0;
-  platform::OsVersion version;
-  if (system_.GetVersionExA(version)) {
-    modules_.fields.OsVersionCode = OsVersionCodeOf(version);
-    return;
-  }
-  desktop_.MessageBox(
-      u"An error occured while trying to get the OS version and information.\r\nClick OK to continue.",
-      forms::kExclamation, u"  Error Getting OS Information");
-}
-
-void frmMenu::StartCaptureLibrary() try {
-  modules_.captureSession.InitLibrary();
-  modules_.captureSession.CreateControl();
-} catch (const Fault& fault) {
-  // Any other fault leaves the window up without a capture control.
-  if (fault.number == Fault::kCannotCreateObject) RegisterCaptureControl();
-}
-
-void frmMenu::RegisterCaptureControl() {
-  shellStart_.Shell("regsvr32.exe -s \"packetvb.dll\"", platform::ShellStart::kNormalWindow);
-  splash_.Tag = Text(u"not unload");
-  Tag = Text(u"not close");
-}
-
 void frmMenu::Form_Unload() {
-  if (frameMain.Visible) modules_.monitorPage.main_StopPage();
+  pages_.StopWithWindow();
   if (Tag().empty()) desktop_.End();
 }
 
@@ -89,21 +80,5 @@ void frmMenu::picOut_MouseMove(int button) {
   desktop_.ReleaseCapture();
   desktop_.SendMessage(desktop_.HandleOf(*this), kNonClientLeftButtonDown, kCaptionHit, 0);
 }
-
-void frmMenu::surf_Timer1_Timer() {
-  modules_.modProcPort.FetchTcpOwnerTable();
-  modules_.modProcPort.SweepConnections();
-}
-
-void frmMenu::surf_StartChecks() { inBackground_ = kFalse16; }
-
-void frmMenu::surf_StopChecks() {
-  frameSurfProb.Visible = false;
-  resetButtons();
-}
-
-void frmMenu::PrepareFirstConnectionPage() { frameFirstConnection.Visible = true; }
-
-void frmMenu::CloseFirstConnectionPage() { frameFirstConnection.Visible = false; }
 
 } // namespace quendra::shell

@@ -24,12 +24,11 @@ frmSplash::frmSplash(forms::Desktop& desktop, frmMenu& menu)
   Label3.Click = [this] { desktop_.Unload(*this); };
   picOut.Click = [this] { HideAgreement(); };
   ReDrawTimer.Tick = [this] { roll_.Tick(); };
-  for (forms::Label* button : {&Label1, &Label2, &Label3})
-    button->MouseMove = [this](int, int, int, int) { handCursor_.Show(); };
 }
 
 void frmSplash::Form_Load() {
   handCursor_.Load();
+  handCursor_.ShowOverButtons(*this);
   lines_.Wrap(AgreementText(), desktop_.ScaleWidth(picBuffer) - kSideRoom,
               [this](TextView text) { return desktop_.TextWidth(picBuffer, text); });
   HideAgreement();

@@ -12,7 +12,6 @@ class frmMenu;
 /// Tag holds "not unload" when the main window failed to come up and the user is to try again.
 class frmSplash : public forms::Form {
  public:
-  /// `menu` need not be made yet; it is used from the first click on.
   frmSplash(forms::Desktop& desktop, frmMenu& menu);
 
   void Design() override;

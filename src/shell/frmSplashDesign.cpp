@@ -1,9 +1,12 @@
-#include "shell/Looks.h"
-#include "shell/Twips.h"
-#include "shell/Wording.h"
+#include "foundation/Looks.h"
+#include "foundation/Wording.h"
 #include "shell/frmSplash.h"
 
 namespace quendra::shell {
+
+namespace looks = foundation::looks;
+using foundation::kTitle;
+using foundation::Px;
 
 void frmSplash::Design() {
   Caption = Text(kTitle);
@@ -19,15 +22,16 @@ void frmSplash::Design() {
 }
 
 void frmSplash::DesignTexts() {
-  looks::Text(lblProductName, kTitle, {26, true, false}, looks::kForest);
+  looks::PlainText(lblProductName, kTitle, {26, true, false}, looks::kForest);
   lblProductName.Move(Px(36), Px(84), Px(360), Px(52));
-  looks::Text(lblPlatform, u"ל-Windows XP", {12, false, false}, looks::kForest);
+  looks::PlainText(lblPlatform, u"ל-Windows XP", {12, false, false}, looks::kForest);
   lblPlatform.Move(Px(38), Px(140), Px(200), Px(26));
-  looks::Text(lblVersion, u"גירסה 1.1", {10, false, false}, looks::kForest);
+  looks::PlainText(lblVersion, u"גירסה 1.1", {10, false, false}, looks::kForest);
   lblVersion.Move(Px(38), Px(168), Px(200), Px(22));
 
-  looks::Text(lblWarning, u"הרצת התוכנה פירושה הסכמה מפורשת לתנאים המצורפים. ניתן לעיין בתנאים בלחיצה כאן.",
-              looks::kBody);
+  looks::PlainText(lblWarning,
+                   u"הרצת התוכנה פירושה הסכמה מפורשת לתנאים המצורפים. ניתן לעיין בתנאים בלחיצה כאן.",
+                   looks::kBody);
   lblWarning.Move(Px(24), Px(288), Px(560), Px(22));
   looks::Link(Label1, u"כאן", looks::kBody, looks::kLeaf);
   Label1.TabIndex = 1; // the buttons come first
@@ -40,10 +44,10 @@ void frmSplash::DesignTexts() {
   looks::Button(Label3, u"סגור");
   Label3.Move(Px(156), Px(330), Px(120), Px(36));
 
-  looks::Text(lblCompany, u"זלמר בינלאומי בע\"מ", looks::kSmall, looks::kQuiet);
+  looks::PlainText(lblCompany, u"זלמר בינלאומי בע\"מ", looks::kSmall, looks::kQuiet);
   lblCompany.Align = forms::Alignment::Trailing;
   lblCompany.Move(Px(300), Px(332), Px(276), Px(18));
-  looks::Text(lblCopyright, u"© כל הזכויות שמורות", looks::kSmall, looks::kQuiet);
+  looks::PlainText(lblCopyright, u"© כל הזכויות שמורות", looks::kSmall, looks::kQuiet);
   lblCopyright.Align = forms::Alignment::Trailing;
   lblCopyright.Move(Px(300), Px(350), Px(276), Px(18));
 }

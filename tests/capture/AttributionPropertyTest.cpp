@@ -9,15 +9,16 @@ namespace {
 /// table.
 class PlainAttribution {
  public:
-  PlainAttribution(forms::ListView& rows, const CaptureFields& capture) : rows_(rows), capture_(capture) {}
+  PlainAttribution(forms::ListView& rows, const OwnAddresses& addresses)
+      : rows_(rows), addresses_(addresses) {}
 
   void Charge(const Bytes& bytes) {
     clsIP ip;
     clsTCP tcp;
     ip.Decode(FrameOf(bytes));
     tcp.Decode(FrameOf(bytes), 0, false);
-    const bool outgoing = ip.SrcIP() == Trimmed(capture_.LocalAddressLast) ||
-                          ip.SrcIP() == Trimmed(capture_.LocalAddressPrevious);
+    const bool outgoing = ip.SrcIP() == Trimmed(addresses_.LocalAddressLast) ||
+                          ip.SrcIP() == Trimmed(addresses_.LocalAddressPrevious);
     for (int i = 1; i <= rows_.Count(); ++i) {
       const Text& ports = rows_.Row(i).CellText(monitor::kPortsCell);
       const bool sourceHit = ports.find(u"." + tcp.srcPort() + u".") != Text::npos;
@@ -34,7 +35,7 @@ class PlainAttribution {
 
  private:
   forms::ListView& rows_;
-  const CaptureFields& capture_;
+  const OwnAddresses& addresses_;
   std::map<std::pair<Text, bool>, double> totals_;
 };
 
@@ -71,15 +72,15 @@ struct AttributionProperty : CaptureProgram {
 };
 
 TEST_F(AttributionProperty, Every_total_of_every_row_equals_that_of_the_plain_search) {
-  const Text addresses[] = {u"10.0.0.138", u" 10.0.0.138  ", u"10.0.0.0138", u"",
-                            u"0.0.0.0",    u"010.0.0.138",   u"10.0.0.138.", u"266.0.0.138"};
+  const Text candidates[] = {u"10.0.0.138", u" 10.0.0.138  ", u"10.0.0.0138", u"",
+                             u"0.0.0.0",    u"010.0.0.138",   u"10.0.0.138.", u"266.0.0.138"};
   int charged = 0;
   for (int round = 0; round < 400; ++round) {
     form.main_ListView1.Clear();
     for (int i = Below(8); i > 0; --i) AddRow(static_cast<std::uint32_t>(i), Ports());
-    capture.LocalAddressLast = addresses[Below(std::size(addresses))];
-    capture.LocalAddressPrevious = addresses[Below(std::size(addresses))];
-    PlainAttribution plain(form.main_ListView1, capture);
+    addresses.LocalAddressLast = candidates[Below(std::size(candidates))];
+    addresses.LocalAddressPrevious = candidates[Below(std::size(candidates))];
+    PlainAttribution plain(form.main_ListView1, addresses);
     for (int i = 0; i < 40; ++i) {
       const Bytes packet = Packet();
       machine.Deliver(packet);

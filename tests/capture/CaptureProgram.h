@@ -19,15 +19,14 @@ struct CaptureProgram : testing::Test {
   CaptureProgram() {
     machine.hostNames.Addresses = {"192.168.7.1", kOwnAddress};
     machine.AddCaptureAdapter({"eth0", "Card A", kOwnAddress});
-    form.main_cmbAdapters.Click = [this] { session.main_cmbAdapters_Click(); };
-    fields.LastRefreshTick = static_cast<std::int32_t>(machine.system.GetTickCount());
+    table.StampLastRefresh();
   }
 
   /// As the main window's load and the page's start bring it up.
   void StartCapture() {
     session.InitLibrary();
-    session.CreateControl();
-    session.ReadLocalAddresses();
+    control.Create();
+    addresses.Read();
     session.StartCapture();
   }
 
@@ -50,13 +49,19 @@ struct CaptureProgram : testing::Test {
   platform::simulated::SimulatedMachine machine;
   forms::HeadlessDesktop desktop;
   monitor::MonitorControls form;
-  monitor::MonitorFields fields;
-  CaptureFields capture;
-  monitor::mdlFileInfo fileInfo{machine.Operations(), desktop};
-  monitor::modProcPort procPort{machine.Operations(), desktop, form.main_ListView1, fileInfo};
-  monitor::ProcessTable table{machine.Operations(), desktop, form.Page(), fields, fileInfo, procPort};
-  PacketAttribution attribution{machine.Operations(), desktop, form.Page(), fields, capture, table};
-  CaptureSession session{machine.Operations(), desktop, form.Page(), capture, attribution};
+  AdapterControls adapters{form.frameMain};
+  monitor::SystemVersion version{machine.system, desktop};
+  monitor::mdlFileInfo fileInfo{machine.processes, machine.tokens, machine.versionInfo, desktop};
+  monitor::modProcPort procPort{
+      machine.ipHelper, {machine.processes, machine.handles}, desktop, form.main_ListView1, fileInfo};
+  monitor::ProcessRowAdder adder{machine.icons, machine.system, desktop, form.table, fileInfo};
+  monitor::PortSource ports{version, fileInfo, procPort};
+  monitor::ProcessTable table{machine.processes, machine.system, form.table, adder, ports};
+  HostAddresses host{machine.hostNames, machine.ipHelper};
+  OwnAddresses addresses{host};
+  PacketControl control{machine.capture};
+  PacketAttribution attribution{machine.capture, desktop, control, addresses, table};
+  CaptureSession session{machine.capture, machine.system, adapters, control, addresses};
 };
 
 using Calls = std::vector<std::string>;

@@ -16,11 +16,11 @@ struct CaptureSessionTest : CaptureProgram {
   }
   std::vector<Text> Listed() const {
     std::vector<Text> items;
-    for (int i = 0; i < form.main_cmbAdapters.ListCount(); ++i)
-      items.push_back(form.main_cmbAdapters.List(i));
+    for (int i = 0; i < adapters.main_cmbAdapters.ListCount(); ++i)
+      items.push_back(adapters.main_cmbAdapters.List(i));
     return items;
   }
-  const Text& StateLine() const { return form.main_lblCaptureState.Caption(); }
+  const Text& StateLine() const { return adapters.main_lblCaptureState.Caption(); }
 };
 
 using Items = std::vector<Text>;
@@ -49,7 +49,7 @@ TEST_F(CaptureSessionTest, An_adapter_change_makes_these_calls_in_this_order) {
   AddAdapter("eth1");
   StartCapture();
   machine.Calls.clear();
-  form.main_cmbAdapters.SelectItem(1);
+  adapters.main_cmbAdapters.SelectItem(1);
   EXPECT_EQ(machine.Calls,
             (Calls{"StopEvents", "CloseChannel", "drop control", "create control", "vpSetCurrentAdapter 1",
                    "vpGetAdapterInfo 1", "BindAdapter eth1", "SetValueA 32", "SetValueB 1000", "OpenChannel",
@@ -60,10 +60,10 @@ TEST_F(CaptureSessionTest, Capture_runs_between_start_and_stop_and_the_start_sho
   AddAdapter("eth0");
   form.frameMain.Visible = false;
   StartCapture();
-  EXPECT_TRUE(capture.CaptureRunning);
+  EXPECT_TRUE(session.CaptureRunning);
   EXPECT_TRUE(form.frameMain.Visible());
   session.StopCapture();
-  EXPECT_FALSE(capture.CaptureRunning);
+  EXPECT_FALSE(session.CaptureRunning);
 }
 
 TEST_F(CaptureSessionTest, The_adapters_name_goes_to_the_control_in_all_its_255_characters) {
@@ -86,7 +86,7 @@ TEST_F(CaptureSessionTest, The_adapters_name_goes_to_the_control_in_all_its_255_
   std::string bound;
   AddAdapter("eth0");
   session.InitLibrary();
-  capture.vpacket = std::make_unique<Control>(bound);
+  control.vpacket = std::make_unique<Control>(bound);
   session.StartCapture();
   EXPECT_EQ(bound.size(), 255u);
   EXPECT_EQ(CutAtNul(bound), "eth0");
@@ -94,26 +94,26 @@ TEST_F(CaptureSessionTest, The_adapters_name_goes_to_the_control_in_all_its_255_
 
 TEST_F(CaptureSessionTest, Local_addresses_and_gateway_are_read_fresh_at_each_opening) {
   machine.ipHelper.Adapters.push_back({"name", "description", {}, {"10.0.0.1"}});
-  session.ReadLocalAddresses();
-  EXPECT_EQ(capture.LocalAddressLast, u"10.0.0.138");
-  EXPECT_EQ(capture.LocalAddressPrevious, u"192.168.7.1");
-  EXPECT_EQ(capture.GatewayAddress, u"10.0.0.1");
+  addresses.Read();
+  EXPECT_EQ(addresses.LocalAddressLast, u"10.0.0.138");
+  EXPECT_EQ(addresses.LocalAddressPrevious, u"192.168.7.1");
+  EXPECT_EQ(addresses.GatewayAddress, u"10.0.0.1");
   machine.hostNames.Addresses = {"192.0.2.7"};
   machine.ipHelper.Adapters.clear();
-  session.ReadLocalAddresses();
-  EXPECT_EQ(capture.LocalAddressLast, u"192.0.2.7");
-  EXPECT_EQ(capture.LocalAddressPrevious, u"");
-  EXPECT_EQ(capture.GatewayAddress, u"");
+  addresses.Read();
+  EXPECT_EQ(addresses.LocalAddressLast, u"192.0.2.7");
+  EXPECT_EQ(addresses.LocalAddressPrevious, u"");
+  EXPECT_EQ(addresses.GatewayAddress, u"");
 }
 
 TEST_F(CaptureSessionTest,
        With_an_init_result_of_minus_1_each_opening_terminates_the_library_and_nothing_starts) {
   StartCapture();
   session.StartCapture();
-  EXPECT_EQ(capture.CaptureInitResult, -1);
+  EXPECT_EQ(session.CaptureInitResult, -1);
   EXPECT_EQ(machine.Calls, (Calls{"VBPcapInit", "create control", "VBPcapTerminate", "VBPcapTerminate"}));
-  EXPECT_EQ(form.main_cmbAdapters.ListCount(), 0);
-  EXPECT_FALSE(capture.CaptureRunning);
+  EXPECT_EQ(adapters.main_cmbAdapters.ListCount(), 0);
+  EXPECT_FALSE(session.CaptureRunning);
   LetSecondPass();
   machine.Deliver(Outgoing(1025));
   EXPECT_FALSE(machine.SignalPackets());
@@ -134,15 +134,15 @@ TEST_F(CaptureSessionTest, The_first_adapter_that_carries_the_last_address_is_fo
   AddAdapter("eth1", kOwnAddress);
   AddAdapter("eth2", kOwnAddress);
   StartCapture();
-  EXPECT_EQ(capture.CurrentAdapter, 1);
-  EXPECT_EQ(form.main_cmbAdapters.ListIndex(), 1);
+  EXPECT_EQ(session.CurrentAdapter, 1);
+  EXPECT_EQ(adapters.main_cmbAdapters.ListIndex(), 1);
 }
 
 TEST_F(CaptureSessionTest, An_adapter_that_carries_the_address_before_the_last_is_followed) {
   AddAdapter("eth0");
   AddAdapter("eth1", "192.168.7.1");
   StartCapture();
-  EXPECT_EQ(capture.CurrentAdapter, 1);
+  EXPECT_EQ(session.CurrentAdapter, 1);
 }
 
 TEST_F(CaptureSessionTest, An_adapter_that_carries_the_gateways_address_is_followed) {
@@ -150,15 +150,15 @@ TEST_F(CaptureSessionTest, An_adapter_that_carries_the_gateways_address_is_follo
   AddAdapter("eth0");
   AddAdapter("eth1", "10.0.0.1");
   StartCapture();
-  EXPECT_EQ(capture.CurrentAdapter, 1);
+  EXPECT_EQ(session.CurrentAdapter, 1);
 }
 
 TEST_F(CaptureSessionTest, When_no_adapter_carries_a_known_address_adapter_0_is_followed) {
   AddAdapter("eth0", "192.0.2.1");
   AddAdapter("eth1", "192.0.2.2");
   StartCapture();
-  EXPECT_EQ(capture.CurrentAdapter, 0);
-  EXPECT_EQ(form.main_cmbAdapters.ListIndex(), 0);
+  EXPECT_EQ(session.CurrentAdapter, 0);
+  EXPECT_EQ(adapters.main_cmbAdapters.ListIndex(), 0);
 }
 
 TEST_F(CaptureSessionTest,
@@ -168,8 +168,8 @@ TEST_F(CaptureSessionTest,
   AddAdapter("eth1");
   AddAdapter("eth2", kOwnAddress);
   StartCapture();
-  EXPECT_EQ(capture.LocalAddressPrevious, u"");
-  EXPECT_EQ(capture.CurrentAdapter, 2);
+  EXPECT_EQ(addresses.LocalAddressPrevious, u"");
+  EXPECT_EQ(session.CurrentAdapter, 2);
 }
 
 TEST_F(CaptureSessionTest, An_adapter_without_an_address_is_not_the_default_for_an_unset_gateway) {
@@ -178,8 +178,8 @@ TEST_F(CaptureSessionTest, An_adapter_without_an_address_is_not_the_default_for_
   AddAdapter("eth1");
   AddAdapter("eth2", kOwnAddress);
   StartCapture();
-  EXPECT_EQ(capture.GatewayAddress, u"0.0.0.0");
-  EXPECT_EQ(capture.CurrentAdapter, 2);
+  EXPECT_EQ(addresses.GatewayAddress, u"0.0.0.0");
+  EXPECT_EQ(session.CurrentAdapter, 2);
 }
 
 TEST_F(CaptureSessionTest, The_schedulers_words_do_not_stand_in_the_list) {
@@ -222,19 +222,19 @@ struct TwinAdapters : CaptureSessionTest {
 TEST_F(TwinAdapters, The_item_behind_a_twin_follows_the_wrong_adapter) {
   StartCapture();
   machine.Calls.clear();
-  form.main_cmbAdapters.SelectItem(1);
-  EXPECT_EQ(form.main_cmbAdapters.SelectedText(), u"B");
-  EXPECT_EQ(capture.CurrentAdapter, 1);
+  adapters.main_cmbAdapters.SelectItem(1);
+  EXPECT_EQ(adapters.main_cmbAdapters.SelectedText(), u"B");
+  EXPECT_EQ(session.CurrentAdapter, 1);
   EXPECT_EQ(std::count(machine.Calls.begin(), machine.Calls.end(), "BindAdapter twin"), 1);
 }
 
 TEST_F(TwinAdapters, A_default_adapter_whose_index_the_list_lacks_is_followed_with_nothing_selected) {
   machine.capture.Adapters[2].address = kOwnAddress;
   StartCapture();
-  EXPECT_EQ(capture.CurrentAdapter, 2);
-  EXPECT_EQ(form.main_cmbAdapters.ListIndex(), -1);
+  EXPECT_EQ(session.CurrentAdapter, 2);
+  EXPECT_EQ(adapters.main_cmbAdapters.ListIndex(), -1);
   EXPECT_EQ(machine.capture.SelectedAdapter, 2);
-  EXPECT_TRUE(capture.CaptureRunning);
+  EXPECT_TRUE(session.CaptureRunning);
 }
 
 TEST_F(CaptureSessionTest, Choosing_the_selected_item_again_does_nothing) {
@@ -242,7 +242,7 @@ TEST_F(CaptureSessionTest, Choosing_the_selected_item_again_does_nothing) {
   AddAdapter("eth1");
   StartCapture();
   machine.Calls.clear();
-  form.main_cmbAdapters.SelectItem(0);
+  adapters.main_cmbAdapters.SelectItem(0);
   EXPECT_EQ(machine.Calls, Calls{});
 }
 
@@ -250,9 +250,9 @@ TEST_F(CaptureSessionTest, After_an_adapter_change_capture_runs_on_the_chosen_ad
   AddAdapter("eth0");
   AddAdapter("eth1");
   StartCapture();
-  form.main_cmbAdapters.SelectItem(1);
-  EXPECT_EQ(capture.CurrentAdapter, 1);
-  EXPECT_TRUE(capture.CaptureRunning);
+  adapters.main_cmbAdapters.SelectItem(1);
+  EXPECT_EQ(session.CurrentAdapter, 1);
+  EXPECT_TRUE(session.CaptureRunning);
   EXPECT_EQ(machine.capture.LiveControls(), 1);
   AddRow(1, u".1025.");
   Receive({Outgoing(1025)});
@@ -264,28 +264,28 @@ TEST_F(CaptureSessionTest, An_adapter_change_whose_control_cannot_be_made_leaves
   AddAdapter("eth1");
   StartCapture();
   machine.capture.CreateFault = Fault::kCannotCreateObject;
-  EXPECT_THROW(form.main_cmbAdapters.SelectItem(1), Fault);
-  EXPECT_EQ(capture.vpacket, nullptr);
-  EXPECT_EQ(capture.CurrentAdapter, 0);
+  EXPECT_THROW(adapters.main_cmbAdapters.SelectItem(1), Fault);
+  EXPECT_EQ(control.vpacket, nullptr);
+  EXPECT_EQ(session.CurrentAdapter, 0);
 }
 
 TEST_F(CaptureSessionTest, Coming_back_repeats_the_choice_and_loses_the_users) {
   AddAdapter("eth0");
   AddAdapter("eth1");
   StartCapture();
-  form.main_cmbAdapters.SelectItem(1);
+  adapters.main_cmbAdapters.SelectItem(1);
   session.StopCapture();
-  session.ReadLocalAddresses();
+  addresses.Read();
   session.StartCapture();
-  EXPECT_EQ(capture.CurrentAdapter, 0);
-  EXPECT_EQ(form.main_cmbAdapters.ListIndex(), 0);
-  EXPECT_EQ(form.main_cmbAdapters.ListCount(), 2);
+  EXPECT_EQ(session.CurrentAdapter, 0);
+  EXPECT_EQ(adapters.main_cmbAdapters.ListIndex(), 0);
+  EXPECT_EQ(adapters.main_cmbAdapters.ListCount(), 2);
 }
 
 TEST_F(CaptureSessionTest, A_control_that_is_not_registered_raises_429) {
   machine.capture.CreateFault = Fault::kCannotCreateObject;
   try {
-    session.CreateControl();
+    control.Create();
     FAIL() << "no fault";
   } catch (const Fault& fault) {
     EXPECT_EQ(fault.number, Fault::kCannotCreateObject);
@@ -342,7 +342,7 @@ TEST_F(CaptureSessionTest, The_state_line_goes_when_capture_runs) {
   machine.capture.Available = Availability::NoRights;
   StartCapture();
   machine.capture.Available = Availability::Available;
-  form.main_cmbAdapters.SelectItem(1);
+  adapters.main_cmbAdapters.SelectItem(1);
   EXPECT_EQ(StateLine(), u"");
 }
 
@@ -352,14 +352,14 @@ TEST_F(CaptureSessionTest, An_adapter_that_stands_behind_several_indexes_is_list
   for (int spare = 0; spare < 3; ++spare) AddAdapter("eth1");
   StartCapture();
   EXPECT_EQ(Listed(), (Items{u"Card eth0", u"Card eth1"}));
-  EXPECT_EQ(capture.CurrentAdapter, 0);
+  EXPECT_EQ(session.CurrentAdapter, 0);
 }
 
 TEST_F(CaptureSessionTest, A_session_that_has_gone_is_told_of_no_adapter) {
   AddAdapter("eth0");
   {
-    CaptureFields other;
-    CaptureSession brief(machine.Operations(), desktop, form.Page(), other, attribution);
+    PacketControl other(machine.capture);
+    CaptureSession brief(machine.capture, machine.system, adapters, other, addresses);
     brief.InitLibrary();
   }
   machine.capture.vpSetCurrentAdapter(0);
@@ -371,9 +371,9 @@ TEST_F(CaptureSessionTest, A_session_that_has_gone_is_told_of_no_adapter) {
 TEST_F(CaptureSessionTest, The_control_goes_with_the_session) {
   AddAdapter("eth0");
   {
-    CaptureFields other;
-    CaptureSession brief(machine.Operations(), desktop, form.Page(), other, attribution);
-    brief.CreateControl();
+    PacketControl other(machine.capture);
+    CaptureSession brief(machine.capture, machine.system, adapters, other, addresses);
+    other.Create();
     EXPECT_EQ(machine.capture.LiveControls(), 1);
   }
   EXPECT_EQ(machine.capture.LiveControls(), 0);

@@ -168,11 +168,7 @@ struct LeavingLibrary : platform::simulated::SimulatedCapture {
 TEST_F(DrainLoop, A_failed_capture_that_leaves_the_array_alone_does_not_count_its_frame_again) {
   platform::simulated::Core core;
   LeavingLibrary library(core);
-  const platform::Machine all = machine.Operations();
-  PacketAttribution other({all.captureControls, library, all.handles, all.hostNames, all.icons, all.ipHelper,
-                           all.processes, all.shellStart, all.sockets, all.system, all.tokens,
-                           all.versionInfo},
-                          desktop, form.Page(), fields, capture, table);
+  PacketAttribution other(library, desktop, control, addresses, table);
   machine.Deliver(Outgoing(1025));
   other.vpacket_PacketReceived();
   EXPECT_EQ(library.Calls, 2);
@@ -230,11 +226,11 @@ TEST_F(DrainLoop, From_1000_ms_on_a_pass_runs_and_the_tick_behind_it_is_kept) {
   machine.AdvanceTick(1000);
   Receive({Outgoing(1025), Outgoing(1025), Outgoing(1025)});
   EXPECT_EQ(Passes(), 1);
-  EXPECT_EQ(fields.LastRefreshTick, static_cast<std::int32_t>(machine.system.GetTickCount()));
+  EXPECT_EQ(table.LastRefreshTick, static_cast<std::int32_t>(machine.system.GetTickCount()));
 }
 
 TEST_F(DrainLoop, The_kept_tick_is_read_after_the_pass) {
-  fields.OsVersionCode = 2002;
+  version.OsVersionCode = 2002;
   machine.AddConnection({5, kOwnAddress, 1025, kServer, 80, 4});
   machine.AdvanceTick(1000);
   desktop.OnYield = [this] {
@@ -246,17 +242,17 @@ TEST_F(DrainLoop, The_kept_tick_is_read_after_the_pass) {
       machine.system.GetTickCount() - 7; // one more yield, for the empty round
   EXPECT_EQ(Passes(), 1);
   EXPECT_GT(behindThePass, before);
-  EXPECT_EQ(static_cast<std::uint32_t>(fields.LastRefreshTick), behindThePass);
+  EXPECT_EQ(static_cast<std::uint32_t>(table.LastRefreshTick), behindThePass);
 }
 
 TEST_F(DrainLoop, A_day_number_as_last_tick_makes_the_first_event_refresh) {
-  fields.LastRefreshTick = machine.system.DayNumber();
+  table.LastRefreshTick = machine.system.DayNumber();
   Receive({Outgoing(1025)});
   EXPECT_EQ(Passes(), 1);
 }
 
 TEST_F(DrainLoop, The_second_is_measured_across_the_wrap_of_the_tick) {
-  fields.LastRefreshTick = -500;
+  table.LastRefreshTick = -500;
   machine.SetTick(499);
   Receive({Outgoing(1025)});
   EXPECT_EQ(Passes(), 0);
@@ -268,7 +264,7 @@ TEST_F(DrainLoop, The_second_is_measured_across_the_wrap_of_the_tick) {
 TEST_F(DrainLoop, A_day_number_as_last_tick_makes_the_first_event_refresh_at_any_uptime) {
   int passes = 0;
   for (const std::uint32_t tick : {1000u, 0x7FFFFFFFu, 0x80000000u, 0x80000000u + 46000, 0xFFFFFFFFu}) {
-    fields.LastRefreshTick = 46000;
+    table.LastRefreshTick = 46000;
     machine.SetTick(tick);
     Receive({Outgoing(1025)});
     EXPECT_EQ(Passes(), ++passes) << tick;
@@ -278,7 +274,7 @@ TEST_F(DrainLoop, A_day_number_as_last_tick_makes_the_first_event_refresh_at_any
 TEST_F(DrainLoop, From_the_25th_day_of_uptime_on_a_pass_runs_each_second_too) {
   constexpr std::uint32_t k25Days = 25u * 24 * 60 * 60 * 1000;
   machine.SetTick(k25Days);
-  fields.LastRefreshTick = static_cast<std::int32_t>(k25Days);
+  table.LastRefreshTick = static_cast<std::int32_t>(k25Days);
   for (int second = 1; second <= 3; ++second) {
     machine.AdvanceTick(999);
     Receive({Outgoing(1025)});

@@ -9,7 +9,7 @@ namespace {
 
 struct HostAddressesTest : testing::Test {
   platform::simulated::SimulatedMachine machine;
-  HostAddresses host{machine.Operations()};
+  HostAddresses host{machine.hostNames, machine.ipHelper};
 
   void AddAdapter(std::vector<std::string> gateways) {
     machine.ipHelper.Adapters.push_back({"name", "description", {}, std::move(gateways)});
@@ -18,33 +18,33 @@ struct HostAddressesTest : testing::Test {
 
 TEST_F(HostAddressesTest, The_last_address_is_the_one_at_the_end_of_the_hosts_list) {
   machine.hostNames.Addresses = {"127.0.0.1", "192.168.7.1", "10.0.0.138"};
-  EXPECT_EQ(host.LocalHostAddress(true), u"10.0.0.138");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::Last), u"10.0.0.138");
 }
 
 TEST_F(HostAddressesTest, The_other_address_is_the_one_before_the_last) {
   machine.hostNames.Addresses = {"127.0.0.1", "192.168.7.1", "10.0.0.138"};
-  EXPECT_EQ(host.LocalHostAddress(false), u"192.168.7.1");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::BeforeLast), u"192.168.7.1");
 }
 
 TEST_F(HostAddressesTest, With_one_address_the_one_before_the_last_is_empty) {
   machine.hostNames.Addresses = {"10.0.0.138"};
-  EXPECT_EQ(host.LocalHostAddress(true), u"10.0.0.138");
-  EXPECT_EQ(host.LocalHostAddress(false), u"");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::Last), u"10.0.0.138");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::BeforeLast), u"");
 }
 
 TEST_F(HostAddressesTest, Without_addresses_both_are_empty) {
-  EXPECT_EQ(host.LocalHostAddress(true), u"");
-  EXPECT_EQ(host.LocalHostAddress(false), u"");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::Last), u"");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::BeforeLast), u"");
 }
 
 TEST_F(HostAddressesTest, A_failure_of_either_call_gives_empty_texts) {
   machine.hostNames.Addresses = {"192.168.7.1", "10.0.0.138"};
   machine.hostNames.FailName = true;
-  EXPECT_EQ(host.LocalHostAddress(true), u"");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::Last), u"");
   machine.hostNames.FailName = false;
   machine.hostNames.FailAddresses = true;
-  EXPECT_EQ(host.LocalHostAddress(true), u"");
-  EXPECT_EQ(host.LocalHostAddress(false), u"");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::Last), u"");
+  EXPECT_EQ(host.LocalHostAddress(HostAddress::BeforeLast), u"");
 }
 
 TEST_F(HostAddressesTest, The_gateway_is_the_first_address_on_any_adapters_list) {
@@ -88,10 +88,7 @@ struct GrowingIpHelper : platform::simulated::SimulatedIpHelper {
 TEST_F(HostAddressesTest, The_adapters_are_asked_for_once_without_room_and_once_with_what_they_need) {
   GrowingIpHelper helper;
   helper.Adapters.push_back({"name", "description", {}, {"10.0.0.1"}});
-  const platform::Machine all = machine.Operations();
-  const HostAddresses other({all.captureControls, all.captureLibrary, all.handles, all.hostNames, all.icons,
-                             helper, all.processes, all.shellStart, all.sockets, all.system, all.tokens,
-                             all.versionInfo});
+  const HostAddresses other(machine.hostNames, helper);
   EXPECT_EQ(other.GatewayAddress(), u"10.0.0.1");
   EXPECT_EQ(helper.Rooms, (std::vector<std::uint32_t>{0, 640}));
   helper.Grow = true;

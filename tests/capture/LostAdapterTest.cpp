@@ -17,11 +17,11 @@ struct LostAdapter : CaptureProgram {
   }
   void LeavePageAndReturn() {
     session.StopCapture();
-    session.ReadLocalAddresses();
+    addresses.Read();
     session.StartCapture();
   }
   double Charged() { return Upload(form.main_ListView1.Row(1)); }
-  const Text& StateLine() const { return form.main_lblCaptureState.Caption(); }
+  const Text& StateLine() const { return adapters.main_lblCaptureState.Caption(); }
 };
 
 constexpr char16_t kGoneAt1432[] = u"התעבורה אינה נמדדת: ההתקן נותק בשעה 14:32";
@@ -78,7 +78,7 @@ TEST_F(LostAdapter, Another_device_that_goes_is_of_no_interest) {
 
 TEST_F(LostAdapter, The_line_goes_when_another_device_is_chosen) {
   LoseAt(14, 32);
-  form.main_cmbAdapters.SelectItem(1);
+  adapters.main_cmbAdapters.SelectItem(1);
   EXPECT_EQ(StateLine(), u"");
   machine.capture.ReturnAdapter("eth0");
   EXPECT_EQ(StateLine(), u"");
@@ -86,9 +86,9 @@ TEST_F(LostAdapter, The_line_goes_when_another_device_is_chosen) {
 }
 
 TEST_F(LostAdapter, A_device_that_is_chosen_while_it_is_gone_is_not_connected_since_nobody_knows_when) {
-  form.main_cmbAdapters.SelectItem(1);
+  adapters.main_cmbAdapters.SelectItem(1);
   machine.capture.RemoveAdapter("eth0");
-  form.main_cmbAdapters.SelectItem(0);
+  adapters.main_cmbAdapters.SelectItem(0);
   EXPECT_EQ(StateLine(), kNotConnected);
   machine.capture.ReturnAdapter("eth0");
   EXPECT_EQ(StateLine(), u"");
@@ -114,7 +114,7 @@ TEST_F(LostAdapter, A_device_that_comes_back_with_another_address_has_its_packet
   LoseAt(14, 32);
   machine.hostNames.Addresses = {"192.168.7.1", "10.0.0.99"};
   machine.capture.ReturnAdapter("eth0");
-  EXPECT_EQ(capture.LocalAddressLast, u"10.0.0.99");
+  EXPECT_EQ(addresses.LocalAddressLast, u"10.0.0.99");
   TestFrame frame;
   frame.source = "10.0.0.99";
   frame.sourcePort = 1025;
@@ -125,7 +125,7 @@ TEST_F(LostAdapter, A_device_that_comes_back_with_another_address_has_its_packet
 TEST_F(LostAdapter, The_addresses_stay_those_of_the_opening_while_the_device_is_gone) {
   machine.hostNames.Addresses = {"127.0.0.1"};
   LoseAt(14, 32);
-  EXPECT_EQ(capture.LocalAddressLast, u"10.0.0.138");
+  EXPECT_EQ(addresses.LocalAddressLast, u"10.0.0.138");
 }
 
 TEST_F(LostAdapter, A_loss_inside_an_event_ends_the_drain_and_counts_what_had_come) {

@@ -33,7 +33,7 @@ TEST_F(NestedEvents, A_second_event_inside_the_first_yield_leaves_the_first_one_
 }
 
 TEST_F(NestedEvents, A_yield_of_a_pass_lets_an_event_in_which_finds_the_second_over_and_runs_a_nested_pass) {
-  fields.OsVersionCode = 2002;
+  version.OsVersionCode = 2002;
   machine.AddProcess({1, 0, "client", ""});
   machine.AddConnection({5, kOwnAddress, 2000, kServer, 80, 1});
   LetSecondPass();
@@ -52,7 +52,7 @@ TEST_F(NestedEvents, A_yield_of_a_pass_lets_an_event_in_which_finds_the_second_o
 }
 
 TEST_F(NestedEvents, A_port_that_a_pass_has_just_merged_is_charged_by_the_event_inside_the_pass) {
-  fields.OsVersionCode = 2002;
+  version.OsVersionCode = 2002;
   machine.AddProcess({1, 0, "client", ""});
   machine.AddConnection({5, kOwnAddress, 2000, kServer, 80, 1});
   LetSecondPass();
@@ -96,7 +96,7 @@ TEST_F(NestedEvents, A_page_that_stops_in_a_yield_stops_the_session_and_gets_no_
 }
 
 TEST_F(NestedEvents, An_adapter_change_in_the_first_yield_lets_the_event_peek_through_the_new_control) {
-  AtYield(1, [this] { form.main_cmbAdapters.SelectItem(1); });
+  AtYield(1, [this] { adapters.main_cmbAdapters.SelectItem(1); });
   Receive({Outgoing(1025)});
   EXPECT_EQ(machine.capture.ControlsMade, 2);
   EXPECT_EQ(machine.capture.ReadBufferCalls, 1);
@@ -104,14 +104,14 @@ TEST_F(NestedEvents, An_adapter_change_in_the_first_yield_lets_the_event_peek_th
 }
 
 TEST_F(NestedEvents, An_adapter_change_in_the_drain_goes_on_with_the_librarys_own_session) {
-  AtYield(3, [this] { form.main_cmbAdapters.SelectItem(1); });
+  AtYield(3, [this] { adapters.main_cmbAdapters.SelectItem(1); });
   Receive({Outgoing(1025), Outgoing(1025)});
   EXPECT_EQ(Charged(), 2);
-  EXPECT_TRUE(capture.CaptureRunning);
+  EXPECT_TRUE(session.CaptureRunning);
 }
 
 TEST_F(NestedEvents, A_control_that_is_replaced_during_its_event_lives_until_no_event_is_under_way) {
-  AtYield(3, [this] { form.main_cmbAdapters.SelectItem(1); });
+  AtYield(3, [this] { adapters.main_cmbAdapters.SelectItem(1); });
   Receive({Outgoing(1025)});
   EXPECT_EQ(machine.capture.LiveControls(), 2);
   Receive({Outgoing(1025)});
@@ -119,8 +119,8 @@ TEST_F(NestedEvents, A_control_that_is_replaced_during_its_event_lives_until_no_
 }
 
 TEST_F(NestedEvents, The_event_of_a_control_that_was_replaced_no_longer_arrives) {
-  const auto oldEvent = capture.vpacket->PacketReceived;
-  form.main_cmbAdapters.SelectItem(1);
+  const auto oldEvent = control.vpacket->PacketReceived;
+  adapters.main_cmbAdapters.SelectItem(1);
   machine.Deliver(Outgoing(1025));
   oldEvent();
   EXPECT_EQ(desktop.YieldCount, 0);
@@ -128,7 +128,7 @@ TEST_F(NestedEvents, The_event_of_a_control_that_was_replaced_no_longer_arrives)
 }
 
 TEST_F(NestedEvents, Without_a_control_behind_the_first_yield_the_event_faults_with_91) {
-  AtYield(1, [this] { capture.vpacket.reset(); });
+  AtYield(1, [this] { control.vpacket.reset(); });
   machine.Deliver(Outgoing(1025));
   try {
     attribution.vpacket_PacketReceived();
@@ -148,7 +148,7 @@ TEST_F(NestedEvents, After_an_event_that_ended_by_a_fault_a_replaced_control_goe
   form.main_ListView1.Row(1).CellTag(monitor::kUploadCell) = u"much";
   machine.Deliver(Outgoing(1025));
   EXPECT_THROW(machine.SignalPackets(), Fault);
-  form.main_cmbAdapters.SelectItem(1);
+  adapters.main_cmbAdapters.SelectItem(1);
   EXPECT_EQ(machine.capture.LiveControls(), 1);
 }
 

@@ -77,7 +77,7 @@ TEST_F(PacketAttributionTest, The_address_before_the_last_is_local_too) {
 }
 
 TEST_F(PacketAttributionTest, The_gateway_plays_no_part_in_the_direction) {
-  capture.GatewayAddress = u"10.0.0.1";
+  addresses.GatewayAddress = u"10.0.0.1";
   const auto& row = AddRow(1, u".1025.");
   TestFrame frame;
   frame.source = "10.0.0.1";
@@ -86,14 +86,14 @@ TEST_F(PacketAttributionTest, The_gateway_plays_no_part_in_the_direction) {
 }
 
 TEST_F(PacketAttributionTest, Blanks_around_a_local_address_do_not_count) {
-  capture.LocalAddressLast = u"  10.0.0.138 ";
+  addresses.LocalAddressLast = u"  10.0.0.138 ";
   const auto& row = AddRow(1, u".1025.");
   Receive({Outgoing(1025)});
   EXPECT_EQ(Upload(row), 1);
 }
 
 TEST_F(PacketAttributionTest, An_empty_local_address_equals_no_source) {
-  capture.LocalAddressLast = capture.LocalAddressPrevious = {};
+  addresses.LocalAddressLast = addresses.LocalAddressPrevious = {};
   const auto& row = AddRow(1, u".1025.");
   TestFrame frame;
   frame.source = "0.0.0.0";
@@ -104,7 +104,7 @@ TEST_F(PacketAttributionTest, An_empty_local_address_equals_no_source) {
 TEST_F(PacketAttributionTest, A_local_address_that_changes_during_a_drain_counts_from_then_on) {
   const auto& row = AddRow(1, u".1025.");
   desktop.OnYield = [this, yields = 0]() mutable {
-    if (++yields == 3) capture.LocalAddressLast = u"10.0.0.99";
+    if (++yields == 3) addresses.LocalAddressLast = u"10.0.0.99";
   };
   Receive({Outgoing(1025), Outgoing(1025)});
   EXPECT_EQ(Upload(row), 1);
@@ -245,7 +245,7 @@ TEST_F(PacketAttributionTest, Totals_live_as_long_as_their_row_through_an_adapte
   StartCapture();
   const auto& row = AddRow(1, u".1025.");
   Receive({Outgoing(1025)});
-  form.main_cmbAdapters.SelectItem(1);
+  adapters.main_cmbAdapters.SelectItem(1);
   Receive({Outgoing(1025)});
   EXPECT_EQ(Upload(row), 2);
 }

@@ -1,3 +1,5 @@
+#include "capture/PollingLoop.h"
+
 #include "capture/CaptureProgram.h"
 
 namespace quendra::capture {
@@ -9,13 +11,15 @@ struct PollingCapture : CaptureProgram {
     StartCapture();
     machine.Calls.clear();
     AddRow(1, u".1025.");
-    desktop.OnYield = [this] { capture.CaptureRunning = false; };
+    desktop.OnYield = [this] { session.CaptureRunning = false; };
   }
   void Poll(std::initializer_list<Bytes> frames) {
     for (const Bytes& frame : frames) machine.Deliver(frame);
-    session.main_DoCapture();
+    polling.main_DoCapture();
   }
   double Charged() { return Upload(form.main_ListView1.Row(1)); }
+
+  PollingLoop polling{machine.capture, desktop, session, attribution, table};
 };
 
 TEST_F(PollingCapture, Ends_at_once_on_a_hidden_page) {
@@ -30,7 +34,7 @@ TEST_F(PollingCapture, Sets_two_parameters_and_opens_and_closes_a_session) {
 }
 
 TEST_F(PollingCapture, Without_a_running_capture_no_frame_is_asked_for) {
-  capture.CaptureRunning = false;
+  session.CaptureRunning = false;
   Poll({Outgoing(1025)});
   EXPECT_EQ(machine.capture.CaptureCalls, 0);
   EXPECT_EQ(machine.Calls.back(), "vpEnd");
@@ -88,9 +92,9 @@ TEST_F(PollingCapture, Each_round_applies_the_refresh_rule) {
 
 TEST_F(PollingCapture, A_failed_capture_unloads_the_main_window) {
   int unloaded = 0;
-  session.UnloadMainWindow = [&] {
+  polling.UnloadMainWindow = [&] {
     ++unloaded;
-    capture.CaptureRunning = false;
+    session.CaptureRunning = false;
   };
   machine.capture.FailCapture();
   Poll({});
@@ -103,9 +107,9 @@ TEST_F(PollingCapture, The_main_window_is_the_form_of_the_page) {
     std::function<void()> Unloading;
     void Form_Unload() override { Unloading(); }
   } window;
-  window.Unloading = [this] { capture.CaptureRunning = false; };
-  CaptureFields& fieldsOfPage = capture;
-  CaptureSession other(machine.Operations(), desktop, window.Page(), fieldsOfPage, attribution);
+  window.Unloading = [this] { session.CaptureRunning = false; };
+  monitor::ProcessTable tableOfWindow(machine.processes, machine.system, window.table, adder, ports);
+  PollingLoop other(machine.capture, desktop, session, attribution, tableOfWindow);
   desktop.Show(window);
   machine.capture.FailCapture();
   EXPECT_THROW(other.main_DoCapture(), forms::ProgramEnded);

@@ -88,7 +88,7 @@ TEST(SniffedPackets, An_empty_packet_is_no_fault) { EXPECT_EQ(Read({}).payloadSi
 
 struct SnifferTest : CaptureProgram {
   SnifferTest() {
-    session.ReadLocalAddresses();
+    addresses.Read();
     sniffer.Sockets = {platform::SocketHandle(7), platform::SocketHandle(8)};
     sniffer.Window = WindowHandle(9);
     AddRow(1, u".1025.");
@@ -100,7 +100,7 @@ struct SnifferTest : CaptureProgram {
   forms::ListRow& Row() { return form.main_ListView1.Row(1); }
 
   forms::Timer main_Timer1{form, u"main_Timer1", 1000, true};
-  Sniffer sniffer{machine.Operations(), form.main_ListView1, main_Timer1, capture};
+  Sniffer sniffer{machine.sockets, form.main_ListView1, main_Timer1, addresses};
 };
 
 TEST_F(SnifferTest, A_readable_socket_is_read_and_its_packet_charged_by_its_payload) {
@@ -152,7 +152,7 @@ TEST_F(SnifferTest, A_short_packet_is_not_completed_with_bytes_of_the_one_before
 }
 
 TEST_F(SnifferTest, Three_addresses_are_local_here_the_gateways_among_them) {
-  capture.GatewayAddress = u"10.0.0.1";
+  addresses.GatewayAddress = u"10.0.0.1";
   for (const std::string source : {kOwnAddress, "192.168.7.1", "10.0.0.1"})
     machine.sockets.Receive(kSocket, PacketOf(6, source, 1025, 80, 20, 1064, 2000));
   Sniff();

@@ -15,8 +15,8 @@ struct TrafficMeters : CaptureProgram {
     machine.AdvanceTick(afterMilliseconds);
     Receive({Outgoing(999)});
   }
-  const Text& UploadMeter() const { return form.main_lblUpload.Caption(); }
-  const Text& DownloadMeter() const { return form.main_lblDownload.Caption(); }
+  const Text& UploadMeter() const { return form.table.main_lblUpload.Caption(); }
+  const Text& DownloadMeter() const { return form.table.main_lblDownload.Caption(); }
 };
 
 TEST_F(TrafficMeters, One_kilobyte_a_second_reads_01_00) {

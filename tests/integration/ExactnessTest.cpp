@@ -31,7 +31,7 @@ class Exactness : public testing::Test {
     program->Start();
     ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));
     ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[0]));
-    ASSERT_TRUE(program->captureFields.CaptureRunning);
+    ASSERT_TRUE(program->captureSession.CaptureRunning);
   }
 
   void TearDown() override {
@@ -114,7 +114,8 @@ class Exactness : public testing::Test {
   }
 
   forms::ListRow* RowOf(pid_t process) {
-    return program->frmMenu.main_ListView1.Find(monitor::KeyOfProcess(static_cast<std::uint32_t>(process)));
+    return program->monitorPage.table.main_ListView1.Find(
+        monitor::KeyOfProcess(static_cast<std::uint32_t>(process)));
   }
 
   bool EveryPortStandsInItsRow() {
@@ -136,7 +137,7 @@ class Exactness : public testing::Test {
   /// The running totals of all rows that have any.
   std::map<pid_t, Totals> Rows() {
     std::map<pid_t, Totals> result;
-    auto& list = program->frmMenu.main_ListView1;
+    auto& list = program->monitorPage.table.main_ListView1;
     for (int i = 1; i <= list.Count(); ++i) {
       const auto& row = list.Row(i);
       const Totals totals{BytesOf(row.CellTag(monitor::kUploadCell)),

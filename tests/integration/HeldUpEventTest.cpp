@@ -72,7 +72,7 @@ template <typename TestedDesktop> class HeldUpEvent : public MonitoredDownload {
 
   /// An event finds this work waiting when it yields: the fifth one, on a line that has become busy.
   void InAnEvent(std::function<void()> work) {
-    auto& event = program->captureFields.vpacket->PacketReceived;
+    auto& event = program->packetControl.vpacket->PacketReceived;
     event = [this, raise = event, work = std::move(work), count = std::make_shared<int>(0)] {
       deepest = std::max(deepest, ++depth);
       if (++*count == 5) desktop->Post(work);
@@ -96,11 +96,11 @@ TYPED_TEST(HeldUpEvent, While_a_box_stands_in_it_packets_are_charged_and_the_tab
   int ticksInBox = 0;
   this->InAnEvent([&] {
     const auto before = this->Charged(monitor::kDownloadCell);
-    const auto tick = this->program->monitorFields.LastRefreshTick;
+    const auto tick = this->program->processTable.LastRefreshTick;
     EXPECT_EQ(this->depth, 1);
     this->desktop->MessageBox(u"text", forms::kInformation, u"title");
     chargedInBox = this->Charged(monitor::kDownloadCell) - before;
-    ticksInBox = this->program->monitorFields.LastRefreshTick - tick;
+    ticksInBox = this->program->processTable.LastRefreshTick - tick;
   });
 
   this->Download().Tell({Order::Kind::Exchange, 160, 100, 2000, 20'000});

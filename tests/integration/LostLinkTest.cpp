@@ -44,7 +44,7 @@ class LostLink : public testing::Test {
     ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[0]));
   }
 
-  const Text& StateLine() { return program->frmMenu.main_lblCaptureState.Caption(); }
+  const Text& StateLine() { return program->monitorPage.adapters.main_lblCaptureState.Caption(); }
   bool SaysGone() { return StateLine().find(u"ההתקן נותק בשעה ") != Text::npos; }
   void Await(const std::function<bool()>& condition, const char* what) {
     ASSERT_TRUE(desktop.WaitFor(condition, 20000)) << what;
@@ -66,7 +66,7 @@ class LostLink : public testing::Test {
         "traffic in the table");
   }
   bool IsCharged(int cell) {
-    const auto* row = program->frmMenu.main_ListView1.Find(
+    const auto* row = program->monitorPage.table.main_ListView1.Find(
         monitor::KeyOfProcess(static_cast<std::uint32_t>(client->Process())));
     return row != nullptr && !row->CellTag(cell).IsEmpty() && row->CellTag(cell).Number() > 0;
   }
@@ -94,19 +94,19 @@ TEST_F(LostLink, A_link_that_is_taken_away_and_made_again_is_told_of_and_measure
 TEST_F(LostLink, A_link_that_is_renamed_is_not_followed_by_another_one_without_a_word) {
   RunCommand("ip link set qnear down && ip link set qnear name qaway");
   Await([&] { return SaysGone(); }, "the line that says so");
-  EXPECT_EQ(program->frmMenu.main_cmbAdapters.SelectedText(), u"Virtual Ethernet (qnear)");
+  EXPECT_EQ(program->monitorPage.adapters.main_cmbAdapters.SelectedText(), u"Virtual Ethernet (qnear)");
 }
 
 TEST_F(LostLink, The_page_may_be_left_and_opened_again_while_the_link_is_gone) {
   RunCommand("ip link del qnear");
   Await([&] { return SaysGone(); }, "the line that says so");
   ReopenPage();
-  EXPECT_EQ(program->frmMenu.main_cmbAdapters.SelectedText(), u"Loopback (lo)");
+  EXPECT_EQ(program->monitorPage.adapters.main_cmbAdapters.SelectedText(), u"Loopback (lo)");
   EXPECT_EQ(StateLine(), u"");
   hosts->MakeLink();
   ReopenPage();
-  EXPECT_EQ(program->frmMenu.main_cmbAdapters.SelectedText(), u"Virtual Ethernet (qnear)");
-  EXPECT_EQ(program->frmMenu.main_cmbAdapters.ListCount(), 2);
+  EXPECT_EQ(program->monitorPage.adapters.main_cmbAdapters.SelectedText(), u"Virtual Ethernet (qnear)");
+  EXPECT_EQ(program->monitorPage.adapters.main_cmbAdapters.ListCount(), 2);
   ConnectAndAwaitCharges();
 }
 
@@ -114,11 +114,11 @@ TEST_F(LostLink, A_network_that_comes_after_the_start_is_found_when_the_page_ope
   RunCommand("ip link del qnear && ip link set lo down");
   StartProgram();
   EXPECT_EQ(StateLine(), u"התעבורה אינה נמדדת: לא נמצא מתאם רשת");
-  EXPECT_EQ(program->frmMenu.main_cmbAdapters.SelectedText(), u"Loopback (lo)");
+  EXPECT_EQ(program->monitorPage.adapters.main_cmbAdapters.SelectedText(), u"Loopback (lo)");
   hosts->MakeLink();
   ReopenPage();
   EXPECT_EQ(StateLine(), u"");
-  EXPECT_EQ(program->frmMenu.main_cmbAdapters.SelectedText(), u"Virtual Ethernet (qnear)");
+  EXPECT_EQ(program->monitorPage.adapters.main_cmbAdapters.SelectedText(), u"Virtual Ethernet (qnear)");
   ConnectAndAwaitCharges();
 }
 

@@ -46,7 +46,7 @@ class MonitoredDownload : public testing::Test {
     program->Start();
     program->frmSplash.Label2.Click();
     program->frmMenu.lblCaption[0].Click();
-    ASSERT_TRUE(program->captureFields.CaptureRunning);
+    ASSERT_TRUE(program->captureSession.CaptureRunning);
     ledger.emplace(LinkedNamespaces::kNearLink, LinkedNamespaces::kNearAddress);
     ledger->Watch(port);
   }
@@ -65,7 +65,7 @@ class MonitoredDownload : public testing::Test {
   }
 
   forms::ListRow& Row() {
-    auto* row = program->frmMenu.main_ListView1.Find(
+    auto* row = program->monitorPage.table.main_ListView1.Find(
         monitor::KeyOfProcess(static_cast<std::uint32_t>(Download().Process())));
     return row != nullptr ? *row : throw std::runtime_error("the download has no row");
   }

@@ -47,8 +47,8 @@ class OtherTraffic : public MonitoredDownload, public testing::WithParamInterfac
       const std::chrono::duration<double> since = yieldBefore - passEnd;
       passes.push_back({since.count(), RateShown(), total, WallClock()});
     }
-    if (program->monitorFields.LastRefreshTick != tick) passEnd = now;
-    tick = program->monitorFields.LastRefreshTick;
+    if (program->processTable.LastRefreshTick != tick) passEnd = now;
+    tick = program->processTable.LastRefreshTick;
     yieldBefore = now;
   }
 

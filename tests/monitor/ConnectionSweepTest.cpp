@@ -132,7 +132,8 @@ TEST_F(Sweep, The_record_of_an_entry_holds_its_own_fields) {
 }
 
 TEST_F(Sweep, Deleting_stays_disarmed_in_the_program) {
-  modProcPort fresh{machine.Operations(), desktop, controls.main_ListView1, fileInfo};
+  modProcPort fresh{
+      machine.ipHelper, {machine.processes, machine.handles}, desktop, controls.main_ListView1, fileInfo};
   EXPECT_EQ(fresh.ConnectionDeleteEnabled, kFalse16);
   EXPECT_EQ(fresh.SystemPidsLoaded, kFalse16);
   fresh.DeleteConnection(1, 2, 3, 4);

@@ -38,13 +38,7 @@ struct OddVersions : platform::VersionInfo {
 
 struct OddFileVersion : MonitorFixture {
   OddVersions versions;
-  mdlFileInfo odd{Machine(), desktop};
-
-  platform::Machine Machine() {
-    const platform::Machine all = machine.Operations();
-    return {all.captureControls, all.captureLibrary, all.handles, all.hostNames, all.icons,  all.ipHelper,
-            all.processes,       all.shellStart,     all.sockets, all.system,    all.tokens, versions};
-  }
+  mdlFileInfo odd{machine.processes, machine.tokens, versions, desktop};
 };
 
 } // namespace

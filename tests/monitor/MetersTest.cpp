@@ -5,8 +5,8 @@ namespace quendra::monitor {
 namespace {
 
 struct Meters : MonitorFixture {
-  Text Upload() { return controls.main_lblUpload.Caption(); }
-  Text Download() { return controls.main_lblDownload.Caption(); }
+  Text Upload() { return controls.table.main_lblUpload.Caption(); }
+  Text Download() { return controls.table.main_lblDownload.Caption(); }
 };
 
 } // namespace

@@ -1,33 +1,22 @@
 #pragma once
 
 #include "forms/Form.h"
-#include "monitor/MonitorPage.h"
+#include "monitor/TableControls.h"
 
 namespace quendra::monitor {
 
-/// The controls of the monitor page on a form of their own, with the default image that the main window puts
-/// first.
+/// The controls of the process table on a form of their own, with the default image that the page puts first.
 struct MonitorControls : forms::Form {
   MonitorControls() : Form(u"frmTest") {
     main_ImList.Add(forms::Picture::Artwork("default"));
-    main_Pic.ScaleMode = 3;
+    table.main_Pic.ScaleMode = 3;
   }
   void Design() override {}
 
-  MonitorPage Page() {
-    return {frameMain,      main_ListView1,   main_ImList,      main_headersIL,      main_Pic,
-            main_lblUpload, main_lblDownload, main_cmbAdapters, main_lblCaptureState};
-  }
-
   forms::Frame frameMain{*this, u"frameMain"};
-  forms::ListView main_ListView1{frameMain, u"main_ListView1"};
-  forms::ImageList main_ImList{frameMain, u"main_ImList"};
-  forms::ImageList main_headersIL{frameMain, u"main_headersIL"};
-  forms::PictureBox main_Pic{frameMain, u"main_Pic"};
-  forms::Label main_lblUpload{frameMain, u"main_lblUpload"};
-  forms::Label main_lblDownload{frameMain, u"main_lblDownload"};
-  forms::ComboBox main_cmbAdapters{frameMain, u"main_cmbAdapters"};
-  forms::Label main_lblCaptureState{frameMain, u"main_lblCaptureState"};
+  TableControls table{frameMain};
+  forms::ListView& main_ListView1 = table.main_ListView1;
+  forms::ImageList& main_ImList = table.main_ImList;
 };
 
 /// A row as a pass leaves it, for tests of what happens to rows.

@@ -16,13 +16,19 @@ struct MonitorFixture : testing::Test {
   platform::simulated::SimulatedMachine machine;
   forms::HeadlessDesktop desktop;
   MonitorControls controls;
-  MonitorFields fields{2002, 0};
-  mdlFileInfo fileInfo{machine.Operations(), desktop};
-  modProcPort procPort{machine.Operations(), desktop, controls.main_ListView1, fileInfo};
-  ProcessTable table{machine.Operations(), desktop, controls.Page(), fields, fileInfo, procPort};
+  SystemVersion version{machine.system, desktop};
+  mdlFileInfo fileInfo{machine.processes, machine.tokens, machine.versionInfo, desktop};
+  modProcPort procPort{
+      machine.ipHelper, {machine.processes, machine.handles}, desktop, controls.main_ListView1, fileInfo};
+  ProcessRowAdder adder{machine.icons, machine.system, desktop, controls.table, fileInfo};
+  PortSource ports{version, fileInfo, procPort};
+  ProcessTable table{machine.processes, machine.system, controls.table, adder, ports};
   forms::ListView& list = controls.main_ListView1;
 
-  MonitorFixture() { fields.LastRefreshTick = Tick(); }
+  MonitorFixture() {
+    version.OsVersionCode = 2002;
+    table.StampLastRefresh();
+  }
 
   std::int32_t Tick() { return static_cast<std::int32_t>(machine.system.GetTickCount()); }
 
@@ -30,7 +36,7 @@ struct MonitorFixture : testing::Test {
   void Pass(std::uint32_t milliseconds = 1000) {
     machine.AdvanceTick(milliseconds);
     table.RefreshProcessTable(u"");
-    fields.LastRefreshTick = Tick();
+    table.StampLastRefresh();
   }
 
   void AddProcesses(std::initializer_list<std::uint32_t> ids) {

@@ -10,7 +10,7 @@ const char16_t* kUdp = u"\\Device\\Udp";
 /// The version whose ports come from the handles of all processes.
 struct PassOfVersion2000 : MonitorFixture {
   PassOfVersion2000() {
-    fields.OsVersionCode = 2000;
+    version.OsVersionCode = 2000;
     machine.AddProcess({10, 1, "a.exe", ""});
     machine.AddProcess({70000, 1, "b.exe", ""});
     // Two handles of no socket, so that the table never fits in the first room.
@@ -69,7 +69,7 @@ TEST_F(PassOfVersion2000, The_debug_privilege_is_enabled_once) {
   Pass();
   Pass();
   EXPECT_EQ(machine.tokens.Adjusted, (std::vector<std::string>{"SeDebugPrivilege 2"}));
-  EXPECT_EQ(table.SeDebugEnabled, kTrue16);
+  EXPECT_EQ(ports.SeDebugEnabled, kTrue16);
 }
 
 TEST_F(PassOfVersion2000, Without_the_debug_privilege_the_scan_runs_and_no_port_is_shown) {
@@ -78,7 +78,7 @@ TEST_F(PassOfVersion2000, Without_the_debug_privilege_the_scan_runs_and_no_port_
   Pass();
   EXPECT_EQ(procPort.PortOwnerTable[80].tcpOwner, 10);
   EXPECT_EQ(PortsOf(10), u"");
-  EXPECT_EQ(table.SeDebugEnabled, kFalse16);
+  EXPECT_EQ(ports.SeDebugEnabled, kFalse16);
 }
 
 TEST_F(PassOfVersion2000, Without_the_debug_privilege_every_pass_says_so) {
@@ -91,7 +91,7 @@ TEST_F(PassOfVersion2000, Without_the_debug_privilege_every_pass_says_so) {
 }
 
 TEST_F(PassOfVersion2000, A_privilege_enabled_elsewhere_is_not_enabled_again) {
-  table.SeDebugEnabled = kTrue16;
+  ports.SeDebugEnabled = kTrue16;
   Pass();
   EXPECT_TRUE(machine.tokens.Adjusted.empty());
 }

@@ -96,7 +96,7 @@ TEST_F(NewRow, Shows_the_icon_of_its_file) {
   ASSERT_EQ(Images(), 2);
   EXPECT_EQ(Row(10).SmallIcon(), 2);
   EXPECT_EQ(controls.main_ImList.Item(2).Tag, u"C:\\a.exe");
-  EXPECT_EQ(controls.main_ImList.Item(2).picture, desktop.ImageOf(controls.main_Pic));
+  EXPECT_EQ(controls.main_ImList.Item(2).picture, desktop.ImageOf(controls.table.main_Pic));
 }
 
 TEST_F(NewRow, Draws_its_icon_at_the_origin_in_32_by_32_pixels_on_a_clear_box) {
@@ -105,7 +105,7 @@ TEST_F(NewRow, Draws_its_icon_at_the_origin_in_32_by_32_pixels_on_a_clear_box) {
   machine.SetIcon("C:\\a.exe", {1, 2, 3});
   machine.SetIcon("C:\\b.exe", {1, 2, 3, 4});
   Pass();
-  const auto& drawing = desktop.DrawingOf(controls.main_Pic);
+  const auto& drawing = desktop.DrawingOf(controls.table.main_Pic);
   ASSERT_EQ(drawing.size(), 1u);
   EXPECT_TRUE(drawing[0].starts_with("Icon 0,0 32x32 of 4 bytes")) << drawing[0];
 }

@@ -65,7 +65,7 @@ TEST_F(ProcessTableTest, The_seconds_since_the_day_number_are_positive_at_any_up
     machine.SetTick(day * kDay);
     Pass(0);
     Charge(10, 1024 * 1024, 0);
-    fields.LastRefreshTick = machine.system.DayNumber();
+    table.LastRefreshTick = machine.system.DayNumber();
     table.RefreshProcessTable(u"");
     const double rate = 1024.0 * 1024 / (day * 86400.0 - machine.system.DayNumber() / 1000.0);
     EXPECT_EQ(CellOf(10, kUploadCell), Format(rate, u"###00.00")) << day;
@@ -92,18 +92,18 @@ TEST_F(ProcessTableTest, A_pass_of_new_rows_alone_divides_nothing) {
 }
 
 TEST_F(ProcessTableTest, The_pass_never_stores_the_tick_itself) {
-  fields.LastRefreshTick = 77;
+  table.LastRefreshTick = 77;
   table.RefreshProcessTable(u"");
-  EXPECT_EQ(fields.LastRefreshTick, 77);
+  EXPECT_EQ(table.LastRefreshTick, 77);
 }
 
 TEST_F(ProcessTableTest, The_day_number_that_the_first_pass_measures_from_does_no_harm) {
   AddProcesses({10});
-  fields.LastRefreshTick = machine.system.DayNumber();
+  table.LastRefreshTick = machine.system.DayNumber();
   table.RefreshProcessTable(u"");
   EXPECT_EQ(CellOf(10, kUploadCell), u"0");
-  EXPECT_EQ(controls.main_lblUpload.Caption(), u"0.0");
-  EXPECT_EQ(controls.main_lblDownload.Caption(), u"0.0");
+  EXPECT_EQ(controls.table.main_lblUpload.Caption(), u"0.0");
+  EXPECT_EQ(controls.table.main_lblDownload.Caption(), u"0.0");
 }
 
 TEST_F(ProcessTableTest, The_reason_of_a_pass_is_ignored) {
@@ -134,13 +134,13 @@ TEST_F(ProcessTableTest, A_failed_snapshot_clears_the_marks_and_touches_nothing_
   Pass();
   Charge(10, 2, 2);
   list.Sort(0, forms::SortOrder::Ascending);
-  controls.main_lblUpload.Caption = Text(u"33.00");
+  controls.table.main_lblUpload.Caption = Text(u"33.00");
   machine.processes.FailSnapshots = true;
   Pass();
   EXPECT_TRUE(Row(10).CellTag(kApplicationCell).IsEmpty());
   EXPECT_EQ(CellOf(10, kUploadCell), u"0");
   EXPECT_EQ(list.Count(), 2);
-  EXPECT_EQ(controls.main_lblUpload.Caption(), u"33.00");
+  EXPECT_EQ(controls.table.main_lblUpload.Caption(), u"33.00");
   EXPECT_EQ(list.SortKey(), 0);
   EXPECT_EQ(machine.ipHelper.TablesFetched, 1);
 }
@@ -362,7 +362,7 @@ TEST_F(ProcessTableTest, A_failed_fetch_leaves_the_previous_table_to_be_walked_a
 struct OtherVersions : ProcessTableTest, testing::WithParamInterface<std::int32_t> {};
 
 TEST_P(OtherVersions, Leave_the_ports_cells_empty) {
-  fields.OsVersionCode = GetParam();
+  version.OsVersionCode = GetParam();
   AddProcesses({10});
   machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 10});
   machine.AddHandle({10, 4, u"\\Device\\Tcp", 80});

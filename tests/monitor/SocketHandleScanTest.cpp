@@ -86,15 +86,9 @@ struct OddHandles : platform::Handles {
 
 struct OddSocketHandles : MonitorFixture {
   OddHandles handles;
-  modProcPort odd{Machine(), desktop, controls.main_ListView1, fileInfo};
+  modProcPort odd{machine.ipHelper, {machine.processes, handles}, desktop, controls.main_ListView1, fileInfo};
 
   OddSocketHandles() { machine.AddProcess({10, 1, "a.exe", ""}); }
-
-  platform::Machine Machine() {
-    const platform::Machine all = machine.Operations();
-    return {all.captureControls, all.captureLibrary, handles,     all.hostNames, all.icons,  all.ipHelper,
-            all.processes,       all.shellStart,     all.sockets, all.system,    all.tokens, all.versionInfo};
-  }
 };
 
 } // namespace
@@ -119,8 +113,9 @@ TEST(SocketHandlesOfABareMachine, A_table_that_fits_in_20_bytes_is_not_looked_at
   platform::simulated::SimulatedMachine machine;
   forms::HeadlessDesktop desktop;
   MonitorControls controls;
-  mdlFileInfo fileInfo{machine.Operations(), desktop};
-  modProcPort procPort{machine.Operations(), desktop, controls.main_ListView1, fileInfo};
+  mdlFileInfo fileInfo{machine.processes, machine.tokens, machine.versionInfo, desktop};
+  modProcPort procPort{
+      machine.ipHelper, {machine.processes, machine.handles}, desktop, controls.main_ListView1, fileInfo};
   machine.AddProcess({10, 1, "a.exe", ""});
   machine.AddHandle({10, 4, kTcp, 80});
   EXPECT_TRUE(procPort.ScanSocketHandles());

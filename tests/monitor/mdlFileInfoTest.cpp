@@ -39,16 +39,10 @@ struct LongPathProcesses : platform::simulated::SimulatedProcesses {
   std::uint32_t statedSize = 0;
 };
 
-platform::Machine WithProcesses(const platform::Machine& machine, platform::Processes& processes) {
-  return {machine.captureControls, machine.captureLibrary, machine.handles, machine.hostNames,
-          machine.icons,           machine.ipHelper,       processes,       machine.shellStart,
-          machine.sockets,         machine.system,         machine.tokens,  machine.versionInfo};
-}
-
 struct ModulePath : MonitorFixture {
   platform::simulated::Core core;
   LongPathProcesses processes{core};
-  mdlFileInfo asked{WithProcesses(machine.Operations(), processes), desktop};
+  mdlFileInfo asked{processes, machine.tokens, machine.versionInfo, desktop};
 };
 
 struct WellKnown : MonitorFixture {};

@@ -223,13 +223,8 @@ struct RawTables : platform::simulated::SimulatedIpHelper {
 
 struct RawTcpPorts : MonitorFixture {
   RawTables tables;
-  modProcPort raw{Machine(), desktop, controls.main_ListView1, fileInfo};
+  modProcPort raw{tables, {machine.processes, machine.handles}, desktop, controls.main_ListView1, fileInfo};
 
-  platform::Machine Machine() {
-    const platform::Machine all = machine.Operations();
-    return {all.captureControls, all.captureLibrary, all.handles, all.hostNames, all.icons,  tables,
-            all.processes,       all.shellStart,     all.sockets, all.system,    all.tokens, all.versionInfo};
-  }
   void PutTable(std::uint32_t count, const std::vector<TcpOwnerEntry>& entries, std::size_t extra = 0) {
     tables.Bytes.assign(4 + entries.size() * 24 + extra, 0xAA);
     PutLittle32(tables.Bytes, 0, count);

@@ -8,7 +8,7 @@ class LoadDownload : public ReportTest {
   void StartLoad() {
     LoadServer();
     OpenPage();
-    ASSERT_TRUE(desktop.DoubleClick(menu.main_Label3));
+    ASSERT_TRUE(desktop.DoubleClick(program.monitorPage.table.main_Label3));
     Run();
     ASSERT_EQ(LoadServer().Connections.size(), 1u);
   }
@@ -49,7 +49,7 @@ TEST_F(LoadDownload, A_double_click_on_the_upload_caption_stops_it_at_once) {
   Load().Send("data");
   Run();
 
-  EXPECT_TRUE(desktop.DoubleClick(menu.main_Label2));
+  EXPECT_TRUE(desktop.DoubleClick(program.monitorPage.table.main_Label2));
 
   EXPECT_TRUE(Load().Ended);
   EXPECT_EQ(StateOf(4), foundation::sckClosed);
@@ -59,9 +59,9 @@ TEST_F(LoadDownload, A_double_click_on_the_upload_caption_stops_it_at_once) {
 
 TEST_F(LoadDownload, It_can_be_started_again_after_it_was_stopped) {
   StartLoad();
-  desktop.DoubleClick(menu.main_Label2);
+  desktop.DoubleClick(program.monitorPage.table.main_Label2);
 
-  EXPECT_TRUE(desktop.DoubleClick(menu.main_Label3));
+  EXPECT_TRUE(desktop.DoubleClick(program.monitorPage.table.main_Label3));
   Run();
 
   EXPECT_EQ(LoadServer().Connections.size(), 2u);
@@ -82,7 +82,7 @@ TEST_F(LoadDownload, The_servers_end_closes_the_socket_and_drops_the_data) {
 TEST_F(LoadDownload, A_stop_without_a_download_does_nothing) {
   OpenPage();
 
-  EXPECT_TRUE(desktop.DoubleClick(menu.main_Label2));
+  EXPECT_TRUE(desktop.DoubleClick(program.monitorPage.table.main_Label2));
 
   EXPECT_EQ(StateOf(4), foundation::sckClosed);
   EXPECT_TRUE(desktop.Boxes.empty());
@@ -93,7 +93,7 @@ TEST_F(LoadDownload, A_stop_without_a_download_does_nothing) {
 TEST_F(LoadDownload, A_second_start_during_a_download_ends_the_program_with_the_run_times_message) {
   StartLoad();
 
-  desktop.DoubleClick(menu.main_Label3);
+  desktop.DoubleClick(program.monitorPage.table.main_Label3);
 
   EXPECT_TRUE(desktop.Ended);
   EXPECT_EQ(desktop.EndStatus, 1);
@@ -130,13 +130,14 @@ TEST_F(LoadDownload, Leaving_the_page_stops_it) {
 TEST_F(LoadDownload, The_captions_take_single_clicks_for_nothing_and_show_no_hand) {
   OpenPage();
 
-  for (forms::Label* caption : {&menu.main_Label2, &menu.main_Label3}) {
+  for (forms::Label* caption :
+       {&program.monitorPage.table.main_Label2, &program.monitorPage.table.main_Label3}) {
     EXPECT_FALSE(static_cast<bool>(caption->Click)) << ToUtf8(caption->Name());
     EXPECT_FALSE(static_cast<bool>(caption->MouseMove)) << ToUtf8(caption->Name());
     EXPECT_EQ(caption->Style(), forms::Label::Look::Plain) << ToUtf8(caption->Name());
   }
-  EXPECT_EQ(menu.main_Label2.Caption(), u"העלאה:");
-  EXPECT_EQ(menu.main_Label3.Caption(), u"הורדה:");
+  EXPECT_EQ(program.monitorPage.table.main_Label2.Caption(), u"העלאה:");
+  EXPECT_EQ(program.monitorPage.table.main_Label3.Caption(), u"הורדה:");
 }
 
 } // namespace

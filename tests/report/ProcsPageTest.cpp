@@ -21,11 +21,11 @@ TEST_F(ProcsPage, No_action_of_the_user_connects_it) {
   LoadServer();
   OpenPage();
   GetNumber();
-  desktop.DoubleClick(menu.main_Label3);
+  desktop.DoubleClick(program.monitorPage.table.main_Label3);
   Run();
 
   EXPECT_EQ(StateOf(1), foundation::sckClosed);
-  EXPECT_FALSE(menu.main_Timer1.Enabled());
+  EXPECT_FALSE(program.monitorPage.main_Timer1.Enabled());
 }
 
 TEST_F(ProcsPage, A_report_and_a_load_leave_the_timer_off) {
@@ -35,12 +35,12 @@ TEST_F(ProcsPage, A_report_and_a_load_leave_the_timer_off) {
   GetNumber();
   Connection(0).Close();
   AnswerReport({"~OK"});
-  desktop.DoubleClick(menu.main_Label3);
+  desktop.DoubleClick(program.monitorPage.table.main_Label3);
   Run();
   LoadServer().Connections.back()->Close();
   Run();
 
-  EXPECT_FALSE(menu.main_Timer1.Enabled());
+  EXPECT_FALSE(program.monitorPage.main_Timer1.Enabled());
 }
 
 TEST_F(ProcsPage, Its_connection_sends_the_request_byte_for_byte) {
@@ -73,8 +73,8 @@ TEST_F(ProcsPage, Its_end_closes_the_socket_makes_a_pass_and_enables_the_timer) 
 
   EXPECT_EQ(StateOf(1), foundation::sckClosed);
   EXPECT_EQ(machine.processes.SnapshotsTaken, passes + 1);
-  EXPECT_EQ(menu.main_ListView1.Count(), 1);
-  EXPECT_TRUE(menu.main_Timer1.Enabled());
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Count(), 1);
+  EXPECT_TRUE(program.monitorPage.main_Timer1.Enabled());
   EXPECT_TRUE(desktop.Boxes.empty());
 }
 
@@ -97,15 +97,16 @@ TEST_F(ProcsPage, Its_socket_is_closed_before_the_pass_and_the_timer_enabled_aft
   machine.AddProcess({100, 1, "one.exe", ""});
   ConnectFirstSocket();
   std::vector<std::pair<foundation::SocketState, bool>> duringThePass;
-  RowWatcher watcher([&] { duringThePass.emplace_back(StateOf(1), menu.main_Timer1.Enabled()); });
-  menu.main_ListView1.Observe(&watcher);
+  RowWatcher watcher(
+      [&] { duringThePass.emplace_back(StateOf(1), program.monitorPage.main_Timer1.Enabled()); });
+  program.monitorPage.table.main_ListView1.Observe(&watcher);
 
   Connection(0).Close();
   Run();
 
   EXPECT_EQ(duringThePass,
             (std::vector<std::pair<foundation::SocketState, bool>>{{foundation::sckClosed, false}}));
-  EXPECT_TRUE(menu.main_Timer1.Enabled());
+  EXPECT_TRUE(program.monitorPage.main_Timer1.Enabled());
 }
 
 TEST_F(ProcsPage, The_timer_that_it_enables_stamps_the_time) {
@@ -116,7 +117,7 @@ TEST_F(ProcsPage, The_timer_that_it_enables_stamps_the_time) {
 
   desktop.Advance(1000);
 
-  EXPECT_EQ(program.monitorFields.LastRefreshTick, 7'000'000);
+  EXPECT_EQ(program.processTable.LastRefreshTick, 7'000'000);
 }
 
 TEST_F(ProcsPage, Its_error_is_shown_under_the_providers_title) {

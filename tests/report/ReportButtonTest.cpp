@@ -7,7 +7,7 @@ namespace {
 /// program.
 class ReportButton : public ReportTest {
  protected:
-  bool CanBePressed() const { return program.frmMenu.main_cmdRpt.Enabled(); }
+  bool CanBePressed() const { return program.monitorPage.reporting.main_cmdRpt.Enabled(); }
   /// What the button says while the next box stands.
   void WatchNextBox() {
     desktop.WhileBoxStands.push_back([this] {
@@ -34,7 +34,7 @@ TEST_F(ReportButton, Takes_no_second_press_while_the_number_is_fetched) {
   Run();
 
   EXPECT_FALSE(CanBePressed());
-  EXPECT_FALSE(desktop.Click(menu.main_cmdRpt));
+  EXPECT_FALSE(desktop.Click(program.monitorPage.reporting.main_cmdRpt));
   EXPECT_FALSE(desktop.Ended);
 }
 
@@ -135,7 +135,7 @@ TEST_F(ReportButton, Takes_no_press_behind_a_refusal_nor_after_its_box) {
   EXPECT_EQ(behindBoxes, std::vector<bool>{false});
   EXPECT_EQ(StateOf(2), foundation::sckError);
   EXPECT_FALSE(CanBePressed());
-  EXPECT_FALSE(desktop.Click(menu.main_cmdRpt));
+  EXPECT_FALSE(desktop.Click(program.monitorPage.reporting.main_cmdRpt));
   EXPECT_FALSE(desktop.Ended);
 }
 
@@ -191,7 +191,7 @@ TEST_F(ReportButton, Takes_no_part_in_the_load) {
   LoadServer();
   OpenPage();
 
-  ASSERT_TRUE(desktop.DoubleClick(menu.main_Label3));
+  ASSERT_TRUE(desktop.DoubleClick(program.monitorPage.table.main_Label3));
   Run();
 
   EXPECT_TRUE(CanBePressed());

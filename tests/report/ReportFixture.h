@@ -45,20 +45,20 @@ class ReportTest : public testing::Test {
     program.Start();
     ASSERT_TRUE(desktop.Click(program.frmSplash.Label2));
     ASSERT_TRUE(desktop.Click(menu.lblCaption[0]));
-    menu.main_ListView1.Clear();
+    program.monitorPage.table.main_ListView1.Clear();
   }
   void LeavePage() { ASSERT_TRUE(desktop.Click(menu.lblCaption[1])); }
   void AddRow(const Text& application, const std::vector<Text>& cells) {
-    forms::ListView& table = menu.main_ListView1;
+    forms::ListView& table = program.monitorPage.table.main_ListView1;
     forms::ListRow& row = table.Add(u"p" + DecimalText(1000 + table.Count()), application, 1);
     for (const Text& cell : cells) row.AddCell(cell, {});
   }
 
-  void ClickReport() { ASSERT_TRUE(desktop.Click(menu.main_cmdRpt)); }
+  void ClickReport() { ASSERT_TRUE(desktop.Click(program.monitorPage.reporting.main_cmdRpt)); }
   /// A click that the disabled button would not let through.
   void ClickReportAllTheSame() {
-    EXPECT_FALSE(desktop.Click(menu.main_cmdRpt));
-    desktop.Dispatch([this] { menu.main_cmdRpt.Click(); });
+    EXPECT_FALSE(desktop.Click(program.monitorPage.reporting.main_cmdRpt));
+    desktop.Dispatch([this] { program.monitorPage.reporting.main_cmdRpt.Click(); });
   }
   /// Lets all happen that is under way.
   void Run() { desktop.RunUntilIdle(); }

@@ -121,7 +121,7 @@ TEST_F(SupportExchange, The_report_holds_the_table_as_it_is_when_the_post_connec
   OpenPage();
   AddRow(u"Old", {u"old.exe", u"", u"", u"", u"", u""});
   desktop.WhileBoxStands.push_back([&] {
-    menu.main_ListView1.Clear();
+    program.monitorPage.table.main_ListView1.Clear();
     AddRow(u"New", {u"new.exe", u"", u"", u"", u"", u""});
   });
 
@@ -486,7 +486,7 @@ TEST_F(SupportExchange, Leaving_the_page_closes_the_sockets_in_the_order_of_thei
   Server();
   LoadServer();
   OpenPage();
-  ASSERT_TRUE(desktop.DoubleClick(menu.main_Label3));
+  ASSERT_TRUE(desktop.DoubleClick(program.monitorPage.table.main_Label3));
   ClickReport();
   Run();
   const auto closing = [&](std::int16_t index) {

@@ -103,7 +103,7 @@ TEST_F(SupportFailures, A_refused_load_shows_the_error_without_the_providers_tit
   LoadServer().Refuse();
   OpenPage();
 
-  desktop.DoubleClick(menu.main_Label3);
+  desktop.DoubleClick(program.monitorPage.table.main_Label3);
   Run();
 
   EXPECT_EQ(desktop.Boxes, (Boxes{{u"winsock error: 10061 - Connection refused.", kOkOnly, kApplication}}));

@@ -74,15 +74,15 @@ TEST_F(Looks, Every_place_falls_on_whole_pixels) {
 }
 
 TEST_F(Looks, The_controls_of_a_page_lie_beside_each_other) {
-  ExpectApart(program.frmMenu.frameMain);
-  ExpectApart(program.frmMenu.main_Frame1);
-  ExpectApart(program.frmMenu.frameSurfProb);
-  ExpectApart(program.frmMenu.frameFirstConnection);
+  ExpectApart(program.monitorPage.frameMain);
+  ExpectApart(program.monitorPage.adapters.main_Frame1);
+  ExpectApart(program.surfPage.frameSurfProb);
+  ExpectApart(program.firstConnectionPage.frameFirstConnection);
 }
 
 TEST_F(Looks, The_menu_stays_clear_of_the_pages) {
   for (const forms::PictureBox& picture : program.frmMenu.PicMenu)
-    EXPECT_FALSE(Overlap(picture.Position, program.frmMenu.frameMain.Position)) << ToUtf8(picture.Name());
+    EXPECT_FALSE(Overlap(picture.Position, program.monitorPage.frameMain.Position)) << ToUtf8(picture.Name());
 }
 
 TEST_F(Looks, Every_menu_label_covers_its_picture_and_lets_it_shine_through) {
@@ -99,10 +99,10 @@ TEST_F(Looks, The_table_shows_all_its_columns_beside_a_scroll_bar_and_wide_enoug
   ComeHome();
   ClickEntry(0);
   std::vector<int> told;
-  for (const forms::ColumnHeader& column : program.frmMenu.main_ListView1.Columns())
+  for (const forms::ColumnHeader& column : program.monitorPage.table.main_ListView1.Columns())
     told.push_back(column.width / 15);
   constexpr int kScrollBarAndFrame = 17 + 2;
-  const int room = program.frmMenu.main_ListView1.Position().width / 15 - kScrollBarAndFrame;
+  const int room = program.monitorPage.table.main_ListView1.Position().width / 15 - kScrollBarAndFrame;
 
   const std::vector<int> shown = forms::ColumnWidths(told, room);
 
@@ -148,14 +148,14 @@ TEST_F(Looks, Every_control_returns_to_its_design_at_the_next_load) {
   menu.Tag = Text(u"not close");
   desktop.CloseBox(menu);
   desktop.Click(program.frmSplash.Label2);
-  EXPECT_FALSE(menu.frameMain.Visible());
+  EXPECT_FALSE(program.monitorPage.frameMain.Visible());
   EXPECT_FALSE(menu.linMenu1[4].Visible());
   EXPECT_FALSE(menu.PageChosen());
   EXPECT_EQ(menu.PicMenu[0].Contents().ArtworkName(), "menu_monitor");
-  EXPECT_EQ(menu.main_ListView1.Count(), 0);
-  EXPECT_EQ(menu.main_ImList.Count(), 1);
-  EXPECT_EQ(menu.main_headersIL.Count(), 2);
-  EXPECT_EQ(menu.main_cmbAdapters.ListCount(), 0);
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Count(), 0);
+  EXPECT_EQ(program.monitorPage.table.main_ImList.Count(), 1);
+  EXPECT_EQ(program.monitorPage.table.main_headersIL.Count(), 2);
+  EXPECT_EQ(program.monitorPage.adapters.main_cmbAdapters.ListCount(), 0);
 }
 
 } // namespace

@@ -21,7 +21,12 @@ class MenuTest : public ProgramTest {
     return entries;
   }
   std::vector<bool> VisiblePages() const {
-    return {menu.frameMain.Visible(), menu.frameSurfProb.Visible(), menu.frameFirstConnection.Visible()};
+    return {program.monitorPage.frameMain.Visible(), program.surfPage.frameSurfProb.Visible(),
+            program.firstConnectionPage.frameFirstConnection.Visible()};
+  }
+
+  std::vector<forms::Page*> AllPages() {
+    return {&program.monitorPage, &program.surfPage, &program.firstConnectionPage};
   }
 
   const std::vector<std::string> normal{"menu_monitor", "menu_surf", "menu_connect"};

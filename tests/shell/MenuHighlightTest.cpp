@@ -89,10 +89,10 @@ TEST_F(Hovering, Once_a_page_was_chosen_the_lines_still_follow_the_mouse) {
 TEST_F(Hovering, A_chosen_page_is_never_unchosen_while_the_window_lives) {
   ComeHome();
   ClickEntry(1);
-  desktop.Click(menu.surf_lblBack);
+  desktop.Click(program.surfPage.surf_lblBack);
   EXPECT_TRUE(menu.PageChosen());
   ClickEntry(2);
-  desktop.Click(menu.frsCon_lblBack);
+  desktop.Click(program.firstConnectionPage.frsCon_lblBack);
   EXPECT_TRUE(menu.PageChosen());
   desktop.MouseMove(menu.PicMenu[0]);
   EXPECT_EQ(PictureOf(0), "menu_monitor");

@@ -51,15 +51,15 @@ TEST_F(Pages, The_second_row_bears_the_names_of_the_first_in_reverse_order) {
 
 TEST_F(Pages, A_number_without_a_page_resets_the_menu_and_does_no_more) {
   MenuHighlight highlight({menu.PicMenu, menu.picMenu2, menu.picMenu3, menu.linMenu1, menu.linMenu2});
+  MenuPages pages(menu.lblCaption, highlight);
   int calls = 0;
-  const auto count = [&] { ++calls; };
-  MenuPages pages({{{menu.frameMain, count, count},
-                    {menu.frameSurfProb, count, count},
-                    {menu.frameFirstConnection, count, count}}},
-                  menu.lblCaption, highlight);
+  for (forms::Page* page : AllPages()) {
+    page->Start = page->Stop = [&] { ++calls; };
+    pages.Add(*page);
+  }
   menu.Design();
   menu.lblCaption[4].Visible = false;
-  for (const int entry : {-1, 6, 100}) pages.Choose(entry);
+  for (const int entry : {-1, 6, 100}) pages.Choose(static_cast<std::size_t>(entry));
   EXPECT_EQ(calls, 0);
   EXPECT_TRUE(menu.lblCaption[4].Visible());
   EXPECT_EQ(VisiblePages(), (Visible{false, false, false}));
@@ -79,21 +79,21 @@ TEST_F(Pages, The_button_of_the_open_page_is_highlighted_and_the_others_are_not)
 TEST_F(Pages, The_opened_page_comes_to_the_front) {
   ComeHome();
   ClickEntry(0);
-  EXPECT_EQ(menu.Children().back(), &menu.frameMain);
+  EXPECT_EQ(menu.Children().back(), &program.monitorPage.frameMain);
   ClickEntry(1);
-  EXPECT_EQ(menu.Children().back(), &menu.frameSurfProb);
+  EXPECT_EQ(menu.Children().back(), &program.surfPage.frameSurfProb);
 }
 
 TEST_F(Pages, A_page_is_started_before_it_is_shown_brought_to_front_and_its_button_highlighted) {
   ComeHome();
   ChangeLog log;
-  log.Watch(menu.frameSurfProb);
+  log.Watch(program.surfPage.frameSurfProb);
   log.Watch(menu.PicMenu[1]);
   menu.Form_Deactivate();
   ClickEntry(1);
   EXPECT_EQ(log.Lines, (std::vector<std::string>{"show frameSurfProb", "to front frameSurfProb",
                                                  "picture of PicMenu(1)"}));
-  EXPECT_EQ(menu.InBackground(), 0);
+  EXPECT_EQ(menu.InBackground, 0);
 }
 
 TEST_F(Pages, Choosing_the_page_that_shows_stops_and_restarts_it) {
@@ -101,7 +101,7 @@ TEST_F(Pages, Choosing_the_page_that_shows_stops_and_restarts_it) {
   ClickEntry(0);
   machine.Calls.clear();
   ClickEntry(0);
-  EXPECT_TRUE(menu.frameMain.Visible());
+  EXPECT_TRUE(program.monitorPage.frameMain.Visible());
   const auto stopped = std::find(machine.Calls.begin(), machine.Calls.end(), "CloseChannel");
   const auto started = std::find(machine.Calls.begin(), machine.Calls.end(), "vpBegin 1000");
   ASSERT_NE(stopped, machine.Calls.end());
@@ -125,7 +125,7 @@ TEST_F(Pages, Resetting_shows_the_labels_then_the_normal_pictures_then_stops_and
   ChangeLog log;
   for (forms::Label& label : menu.lblCaption) log.Watch(label);
   for (forms::PictureBox& picture : menu.PicMenu) log.Watch(picture);
-  log.Watch(menu.frameMain);
+  log.Watch(program.monitorPage.frameMain);
   menu.resetButtons();
   EXPECT_EQ(log.Lines,
             (std::vector<std::string>{"show lblCaption(0)", "show lblCaption(1)", "show lblCaption(2)",
@@ -136,20 +136,38 @@ TEST_F(Pages, Resetting_shows_the_labels_then_the_normal_pictures_then_stops_and
 TEST_F(Pages, Resetting_stops_pages_in_the_order_monitor_surf_problems_first_connection_then_hides_them) {
   MenuHighlight highlight({menu.PicMenu, menu.picMenu2, menu.picMenu3, menu.linMenu1, menu.linMenu2});
   ChangeLog log;
-  const auto stop = [&](const char* page) { return [&log, page] { log.Lines.push_back(page); }; };
-  MenuPages pages({{{menu.frameMain, [] {}, stop("stop monitor")},
-                    {menu.frameSurfProb, [] {}, stop("stop surf")},
-                    {menu.frameFirstConnection, [] {}, stop("stop first connection")}}},
-                  menu.lblCaption, highlight);
+  MenuPages pages(menu.lblCaption, highlight);
+  for (forms::Page* page : AllPages()) {
+    page->Stop = [&log, page] { log.Lines.push_back("stop " + ToUtf8(page->frame.Name())); };
+    pages.Add(*page);
+  }
   menu.Design();
-  for (forms::Frame* frame : {&menu.frameMain, &menu.frameSurfProb, &menu.frameFirstConnection}) {
-    frame->Visible = true;
-    log.Watch(*frame);
+  for (forms::Page* page : AllPages()) {
+    page->frame.Visible = true;
+    log.Watch(page->frame);
   }
   pages.resetButtons();
   EXPECT_EQ(log.Lines,
-            (std::vector<std::string>{"stop monitor", "stop surf", "stop first connection", "hide frameMain",
-                                      "hide frameSurfProb", "hide frameFirstConnection"}));
+            (std::vector<std::string>{"stop frameMain", "stop frameSurfProb", "stop frameFirstConnection",
+                                      "hide frameMain", "hide frameSurfProb", "hide frameFirstConnection"}));
+}
+
+TEST_F(Pages, A_window_that_unloads_stops_the_monitor_page_when_it_is_open_and_no_other) {
+  ComeHome();
+  std::vector<const forms::Page*> stopped;
+  for (forms::Page* page : AllPages()) page->Stop = [&stopped, page] { stopped.push_back(page); };
+  for (forms::Page* page : AllPages()) page->frame.Visible = true;
+  desktop.CloseBox(menu);
+  EXPECT_EQ(stopped, (std::vector<const forms::Page*>{&program.monitorPage}));
+}
+
+TEST_F(Pages, A_menu_without_pages_opens_none) {
+  MenuHighlight highlight({menu.PicMenu, menu.picMenu2, menu.picMenu3, menu.linMenu1, menu.linMenu2});
+  MenuPages pages(menu.lblCaption, highlight);
+  menu.Design();
+  for (std::size_t entry = 0; entry < kEntryCount; ++entry) pages.Choose(entry);
+  EXPECT_EQ(VisiblePages(), (Visible{false, false, false}));
+  EXPECT_EQ(Pictures(), normal);
 }
 
 TEST_F(Pages, Resetting_stops_no_page_that_is_hidden) {
@@ -172,7 +190,7 @@ TEST_F(Pages, All_pages_are_hidden_at_design_time_and_the_stores_of_pictures_too
 TEST_F(Pages, Back_from_surf_problems_hides_the_page_and_puts_the_menu_back) {
   ComeHome();
   ClickEntry(1);
-  EXPECT_TRUE(desktop.Click(menu.surf_lblBack));
+  EXPECT_TRUE(desktop.Click(program.surfPage.surf_lblBack));
   EXPECT_EQ(VisiblePages(), (Visible{false, false, false}));
   EXPECT_EQ(Pictures(), normal);
 }
@@ -180,15 +198,15 @@ TEST_F(Pages, Back_from_surf_problems_hides_the_page_and_puts_the_menu_back) {
 TEST_F(Pages, Back_from_the_first_connection_hides_the_page_and_leaves_its_button_as_it_is) {
   ComeHome();
   ClickEntry(2);
-  EXPECT_TRUE(desktop.Click(menu.frsCon_lblBack));
+  EXPECT_TRUE(desktop.Click(program.firstConnectionPage.frsCon_lblBack));
   EXPECT_EQ(VisiblePages(), (Visible{false, false, false}));
   EXPECT_EQ(PictureOf(2), "menu_connect_hot");
 }
 
 TEST_F(Pages, The_back_labels_say_so) {
   menu.Design();
-  EXPECT_EQ(menu.surf_lblBack.Caption(), u"חזרה");
-  EXPECT_EQ(menu.frsCon_lblBack.Caption(), u"חזרה");
+  EXPECT_EQ(program.surfPage.surf_lblBack.Caption(), u"חזרה");
+  EXPECT_EQ(program.firstConnectionPage.frsCon_lblBack.Caption(), u"חזרה");
 }
 
 } // namespace

@@ -1,4 +1,4 @@
-#include "shell/MonitorPageSwitch.h"
+#include "shell/MonitorPage.h"
 
 #include "shell/ProgramFixture.h"
 
@@ -71,7 +71,7 @@ TEST_F(MonitorPageSwitchTest,
   desktop.Click(other.frmSplash.Label2);
   desktop.Click(other.frmMenu.lblCaption[0]);
   desktop.Click(other.frmMenu.lblCaption[1]);
-  other.frmMenu.main_ListView1.Observe(&recorder);
+  other.monitorPage.table.main_ListView1.Observe(&recorder);
   recorder.StartOver();
   desktop.Click(other.frmMenu.lblCaption[0]);
   EXPECT_EQ(machine.Calls,
@@ -86,7 +86,7 @@ TEST_F(MonitorPageSwitchTest, The_start_seeds_the_last_refresh_with_the_day_numb
   machine.AddProcess({100, 1, "one.exe", ""});
   ComeHome();
   ClickEntry(0);
-  EXPECT_EQ(program.monitorFields.LastRefreshTick, machine.system.Day);
+  EXPECT_EQ(program.processTable.LastRefreshTick, machine.system.Day);
   EXPECT_EQ(machine.processes.SnapshotsTaken, 1);
 }
 
@@ -101,20 +101,20 @@ TEST_F(MonitorPageSwitchTest, The_stop_releases_the_sockets_ends_the_session_pau
   ComeHome();
   ClickEntry(0);
   machine.Calls.clear();
-  program.monitorPageSwitch.main_StopPage();
+  program.monitorWork.main_StopPage();
   EXPECT_EQ(machine.Calls, (std::vector<std::string>{"WSACleanup", "vpEnd", "Sleep 300", "StopEvents",
                                                      "ReleaseChannel", "CloseChannel"}));
-  EXPECT_FALSE(program.captureFields.CaptureRunning);
+  EXPECT_FALSE(program.captureSession.CaptureRunning);
 }
 
 TEST_F(MonitorPageSwitchTest, Timer_1_stamps_the_time_and_makes_no_pass) {
   ComeHome();
   ClickEntry(0);
   const int passes = machine.processes.SnapshotsTaken;
-  menu.main_Timer1.Enabled = true;
+  program.monitorPage.main_Timer1.Enabled = true;
   machine.SetTick(5'000'000);
   desktop.Advance(1000);
-  EXPECT_EQ(program.monitorFields.LastRefreshTick, 5'000'000);
+  EXPECT_EQ(program.processTable.LastRefreshTick, 5'000'000);
   EXPECT_EQ(machine.processes.SnapshotsTaken, passes);
 }
 
@@ -122,9 +122,9 @@ TEST_F(MonitorPageSwitchTest, Timer_1_makes_a_pass_behind_its_gate) {
   ComeHome();
   ClickEntry(0);
   const int passes = machine.processes.SnapshotsTaken;
-  EXPECT_EQ(program.monitorPageSwitch.TimerRefreshGate, 0);
-  program.monitorPageSwitch.TimerRefreshGate = kTrue16;
-  menu.main_Timer1.Enabled = true;
+  EXPECT_EQ(program.monitorWork.TimerRefreshGate, 0);
+  program.monitorWork.TimerRefreshGate = kTrue16;
+  program.monitorPage.main_Timer1.Enabled = true;
   desktop.Advance(1000);
   EXPECT_EQ(machine.processes.SnapshotsTaken, passes + 1);
 }
@@ -133,9 +133,9 @@ TEST_F(MonitorPageSwitchTest, Timer_1_makes_no_pass_while_the_sort_is_pinned) {
   ComeHome();
   ClickEntry(0);
   const int passes = machine.processes.SnapshotsTaken;
-  program.monitorPageSwitch.TimerRefreshGate = kTrue16;
+  program.monitorWork.TimerRefreshGate = kTrue16;
   program.processTable.SortPinned = kTrue16;
-  menu.main_Timer1.Enabled = true;
+  program.monitorPage.main_Timer1.Enabled = true;
   desktop.Advance(1000);
   EXPECT_EQ(machine.processes.SnapshotsTaken, passes);
 }
@@ -143,8 +143,8 @@ TEST_F(MonitorPageSwitchTest, Timer_1_makes_no_pass_while_the_sort_is_pinned) {
 TEST_F(MonitorPageSwitchTest, A_tick_beyond_31_bits_is_stored_as_it_wraps) {
   ComeHome();
   machine.SetTick(0xFFFFFFFE);
-  program.monitorPageSwitch.main_Timer1_Timer();
-  EXPECT_EQ(program.monitorFields.LastRefreshTick, -2);
+  program.monitorWork.main_Timer1_Timer();
+  EXPECT_EQ(program.processTable.LastRefreshTick, -2);
 }
 
 TEST_F(MonitorPageSwitchTest, A_header_click_sorts_by_its_column) {
@@ -152,18 +152,18 @@ TEST_F(MonitorPageSwitchTest, A_header_click_sorts_by_its_column) {
   machine.AddProcess({101, 1, "ant.exe", ""});
   ComeHome();
   ClickEntry(0);
-  EXPECT_TRUE(desktop.ClickHeader(menu.main_ListView1, 2));
-  EXPECT_EQ(menu.main_ListView1.Row(1).CellText(1), u"ant.exe");
-  EXPECT_TRUE(desktop.ClickHeader(menu.main_ListView1, 2));
-  EXPECT_EQ(menu.main_ListView1.Row(1).CellText(1), u"zebra.exe");
+  EXPECT_TRUE(desktop.ClickHeader(program.monitorPage.table.main_ListView1, 2));
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Row(1).CellText(1), u"ant.exe");
+  EXPECT_TRUE(desktop.ClickHeader(program.monitorPage.table.main_ListView1, 2));
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Row(1).CellText(1), u"zebra.exe");
 }
 
 TEST_F(MonitorPageSwitchTest, Choosing_another_adapter_follows_it) {
   machine.AddCaptureAdapter({"wlan0", "Radio card", ""});
   ComeHome();
   ClickEntry(0);
-  EXPECT_TRUE(desktop.ChooseItem(menu.main_cmbAdapters, 1));
-  EXPECT_EQ(program.captureFields.CurrentAdapter, 1);
+  EXPECT_TRUE(desktop.ChooseItem(program.monitorPage.adapters.main_cmbAdapters, 1));
+  EXPECT_EQ(program.captureSession.CurrentAdapter, 1);
   EXPECT_EQ(machine.capture.ControlsMade, 2);
 }
 
@@ -172,24 +172,25 @@ TEST_F(MonitorPageSwitchTest, The_actions_that_come_later_are_disabled_and_the_r
   ComeHome();
   ClickEntry(0);
   machine.Calls.clear();
-  for (forms::Label* label : {&menu.main_lblEndProcess, &menu.main_lblJumpToPath, &menu.main_cmdAddRemove,
-                              &menu.main_cmdChecks, &menu.main_cmdMemInfo}) {
+  for (forms::Label* label : {&program.monitorPage.main_lblEndProcess,
+                              &program.monitorPage.main_lblJumpToPath, &program.monitorPage.main_cmdAddRemove,
+                              &program.monitorPage.main_cmdChecks, &program.monitorPage.main_cmdMemInfo}) {
     EXPECT_FALSE(label->Enabled()) << ToUtf8(label->Name());
     EXPECT_FALSE(desktop.Click(*label)) << ToUtf8(label->Name());
   }
-  EXPECT_TRUE(menu.main_cmdRpt.Enabled());
+  EXPECT_TRUE(program.monitorPage.reporting.main_cmdRpt.Enabled());
   EXPECT_TRUE(machine.Calls.empty());
   EXPECT_TRUE(desktop.Boxes.empty());
-  EXPECT_EQ(menu.main_ListView1.Count(), 1);
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Count(), 1);
 }
 
 TEST_F(MonitorPageSwitchTest, An_action_is_enabled_by_the_design_once_it_has_a_handler) {
-  menu.main_cmdMemInfo.Click = [] {};
+  program.monitorPage.main_cmdMemInfo.Click = [] {};
 
   menu.Design();
 
-  EXPECT_TRUE(menu.main_cmdMemInfo.Enabled());
-  EXPECT_FALSE(menu.main_cmdChecks.Enabled());
+  EXPECT_TRUE(program.monitorPage.main_cmdMemInfo.Enabled());
+  EXPECT_FALSE(program.monitorPage.main_cmdChecks.Enabled());
 }
 
 } // namespace

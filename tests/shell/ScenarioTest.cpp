@@ -46,7 +46,7 @@ class Scenario : public ProgramTest {
     desktop.Dispatch([this] { machine.capture.SignalWhileFramesAreTaken(); });
   }
   const forms::ListRow& RowOf(std::uint32_t id) {
-    forms::ListRow* row = program.frmMenu.main_ListView1.Find(u"p" + DecimalText(id));
+    forms::ListRow* row = program.monitorPage.table.main_ListView1.Find(u"p" + DecimalText(id));
     if (!row) throw std::runtime_error("no row of process " + std::to_string(id));
     return *row;
   }
@@ -56,15 +56,15 @@ class Scenario : public ProgramTest {
 
 TEST_F(Scenario, The_monitor_page_opens_with_the_processes_and_their_ports) {
   OpenMonitor();
-  EXPECT_EQ(menu.main_ListView1.Count(), 3);
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Count(), 3);
   EXPECT_EQ(RowOf(100).CellText(1), u"browser.exe");
   EXPECT_EQ(RowOf(100).CellText(3), u".1025.1026.");
   EXPECT_EQ(RowOf(200).CellText(3), u".1110.");
   EXPECT_EQ(RowOf(0).CellText(0), u"");
   EXPECT_EQ(RowOf(0).SmallIcon(), 1);
-  EXPECT_EQ(menu.main_lblUpload.Caption(), u"0.0");
-  EXPECT_EQ(menu.main_lblDownload.Caption(), u"0.0");
-  EXPECT_EQ(menu.main_cmbAdapters.SelectedText(), u"Network card");
+  EXPECT_EQ(program.monitorPage.table.main_lblUpload.Caption(), u"0.0");
+  EXPECT_EQ(program.monitorPage.table.main_lblDownload.Caption(), u"0.0");
+  EXPECT_EQ(program.monitorPage.adapters.main_cmbAdapters.SelectedText(), u"Network card");
 }
 
 TEST_F(Scenario, The_first_packet_after_the_opening_refreshes_at_once) {
@@ -73,7 +73,7 @@ TEST_F(Scenario, The_first_packet_after_the_opening_refreshes_at_once) {
   Upload(1025, 1024);
   Signal();
   EXPECT_EQ(machine.processes.SnapshotsTaken, passes + 1);
-  EXPECT_EQ(program.monitorFields.LastRefreshTick, static_cast<std::int32_t>(machine.system.GetTickCount()));
+  EXPECT_EQ(program.processTable.LastRefreshTick, static_cast<std::int32_t>(machine.system.GetTickCount()));
 }
 
 TEST_F(Scenario, Traffic_becomes_rates_in_the_rows_and_in_the_meters) {
@@ -93,10 +93,10 @@ TEST_F(Scenario, Traffic_becomes_rates_in_the_rows_and_in_the_meters) {
   EXPECT_EQ(RowOf(100).CellText(6), u"36.00");
   EXPECT_EQ(RowOf(200).CellText(4), u"");
   EXPECT_EQ(RowOf(200).CellText(5), u"002.00");
-  EXPECT_EQ(menu.main_lblUpload.Caption(), u"05.00");
-  EXPECT_EQ(menu.main_lblDownload.Caption(), u"33.00");
-  EXPECT_EQ(menu.main_ListView1.Row(1).Key(), u"p100");
-  EXPECT_EQ(menu.main_ListView1.Row(2).Key(), u"p200");
+  EXPECT_EQ(program.monitorPage.table.main_lblUpload.Caption(), u"05.00");
+  EXPECT_EQ(program.monitorPage.table.main_lblDownload.Caption(), u"33.00");
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Row(1).Key(), u"p100");
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Row(2).Key(), u"p200");
 }
 
 TEST_F(Scenario, The_table_refreshes_at_most_once_a_second) {
@@ -123,10 +123,10 @@ TEST_F(Scenario, Without_traffic_the_table_stands_still_whatever_the_time) {
   machine.AdvanceTick(60000);
   desktop.Advance(60000);
   EXPECT_EQ(machine.processes.SnapshotsTaken, passes);
-  EXPECT_EQ(menu.main_ListView1.Count(), 3);
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Count(), 3);
   Upload(1025, 40);
   Signal();
-  EXPECT_EQ(menu.main_ListView1.Count(), 4);
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Count(), 4);
 }
 
 TEST_F(Scenario, No_packet_is_looked_at_on_other_pages) {
@@ -146,7 +146,7 @@ TEST_F(Scenario, Leaving_the_page_and_returning_begins_all_totals_again) {
   Signal();
   EXPECT_EQ(RowOf(100).CellTag(4).Number(), 7.0);
   ClickEntry(2);
-  desktop.Click(menu.frsCon_lblBack);
+  desktop.Click(program.firstConnectionPage.frsCon_lblBack);
   ClickEntry(0);
   EXPECT_EQ(RowOf(100).CellTag(4).Number(), 0.0);
   EXPECT_EQ(RowOf(100).CellText(4), u"0");
@@ -155,25 +155,25 @@ TEST_F(Scenario, Leaving_the_page_and_returning_begins_all_totals_again) {
 TEST_F(Scenario, Returning_to_the_page_forgets_the_adapter_that_the_user_chose) {
   machine.AddCaptureAdapter({"wlan0", "Radio card", ""});
   OpenMonitor();
-  desktop.ChooseItem(menu.main_cmbAdapters, 1);
-  EXPECT_EQ(program.captureFields.CurrentAdapter, 1);
+  desktop.ChooseItem(program.monitorPage.adapters.main_cmbAdapters, 1);
+  EXPECT_EQ(program.captureSession.CurrentAdapter, 1);
   ClickEntry(1);
   ClickEntry(0);
-  EXPECT_EQ(program.captureFields.CurrentAdapter, 0);
-  EXPECT_EQ(menu.main_cmbAdapters.ListIndex(), 0);
-  EXPECT_EQ(menu.main_cmbAdapters.ListCount(), 2);
+  EXPECT_EQ(program.captureSession.CurrentAdapter, 0);
+  EXPECT_EQ(program.monitorPage.adapters.main_cmbAdapters.ListIndex(), 0);
+  EXPECT_EQ(program.monitorPage.adapters.main_cmbAdapters.ListCount(), 2);
 }
 
 TEST_F(Scenario, Without_the_capture_library_the_page_opens_filled_once_and_nothing_moves) {
   machine.capture.InitResult = -1;
   machine.capture.Adapters.clear();
   OpenMonitor();
-  EXPECT_TRUE(menu.frameMain.Visible());
-  EXPECT_EQ(menu.main_ListView1.Count(), 3);
-  EXPECT_EQ(menu.main_cmbAdapters.ListCount(), 0);
+  EXPECT_TRUE(program.monitorPage.frameMain.Visible());
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Count(), 3);
+  EXPECT_EQ(program.monitorPage.adapters.main_cmbAdapters.ListCount(), 0);
   EXPECT_TRUE(WasCalled("VBPcapTerminate"));
   EXPECT_FALSE(WasCalled("vpBegin 1000"));
-  EXPECT_FALSE(menu.main_lblCaptureState.Caption().empty());
+  EXPECT_FALSE(program.monitorPage.adapters.main_lblCaptureState.Caption().empty());
   EXPECT_TRUE(desktop.Boxes.empty());
   const int passes = machine.processes.SnapshotsTaken;
   machine.AdvanceTick(10000);
@@ -193,7 +193,7 @@ TEST_F(Scenario, Without_the_capture_library_each_opening_ends_it_again) {
 
 TEST_F(Scenario, The_capture_state_is_silent_while_all_is_well) {
   OpenMonitor();
-  EXPECT_EQ(menu.main_lblCaptureState.Caption(), u"");
+  EXPECT_EQ(program.monitorPage.adapters.main_lblCaptureState.Caption(), u"");
 }
 
 TEST_F(Scenario, A_window_without_a_capture_control_ends_the_program_when_the_monitor_is_opened) {
@@ -212,9 +212,9 @@ TEST_F(Scenario, A_page_change_while_packets_are_drained_stops_the_capture_in_be
     if (++yields == 10) menu.lblCaption[1].Click();
   };
   Signal();
-  EXPECT_TRUE(menu.frameSurfProb.Visible());
-  EXPECT_FALSE(menu.frameMain.Visible());
-  EXPECT_FALSE(program.captureFields.CaptureRunning);
+  EXPECT_TRUE(program.surfPage.frameSurfProb.Visible());
+  EXPECT_FALSE(program.monitorPage.frameMain.Visible());
+  EXPECT_FALSE(program.captureSession.CaptureRunning);
   EXPECT_FALSE(desktop.Ended);
 }
 

@@ -30,9 +30,9 @@ class RecordingSystem : public platform::System {
 
 TEST_F(StartUp, The_main_window_comes_up_without_a_page) {
   ComeHome();
-  EXPECT_FALSE(program.frmMenu.frameMain.Visible());
-  EXPECT_FALSE(program.frmMenu.frameSurfProb.Visible());
-  EXPECT_FALSE(program.frmMenu.frameFirstConnection.Visible());
+  EXPECT_FALSE(program.monitorPage.frameMain.Visible());
+  EXPECT_FALSE(program.surfPage.frameSurfProb.Visible());
+  EXPECT_FALSE(program.firstConnectionPage.frameFirstConnection.Visible());
   EXPECT_FALSE(program.frmMenu.PageChosen());
   EXPECT_EQ(program.frmMenu.Caption(), u"זלמר בינלאומי@נט");
 }
@@ -40,7 +40,7 @@ TEST_F(StartUp, The_main_window_comes_up_without_a_page) {
 TEST_F(StartUp, The_load_opens_the_capture_library_and_makes_the_control_and_does_nothing_else) {
   ComeHome();
   EXPECT_EQ(machine.Calls, (std::vector<std::string>{"VBPcapInit", "create control"}));
-  EXPECT_EQ(program.captureFields.CaptureInitResult, 0);
+  EXPECT_EQ(program.captureSession.CaptureInitResult, 0);
   EXPECT_EQ(machine.capture.ControlsMade, 1);
   EXPECT_EQ(machine.processes.SnapshotsTaken, 0);
   EXPECT_EQ(machine.ipHelper.TablesFetched, 0);
@@ -61,9 +61,9 @@ TEST_F(StartUp, The_load_reads_the_version_before_it_stores_the_cursor_and_start
   desktop.Calls.clear();
   desktop.Click(other.frmSplash.Label2);
   EXPECT_EQ(desktop.Calls, (std::vector<std::string>{"GetVersionExA", "LoadCursor 32649", "Show frmMenu"}));
-  EXPECT_FALSE(other.frmMenu.main_Timer1.Enabled());
-  EXPECT_FALSE(other.frmMenu.main_Timer2.Enabled());
-  EXPECT_FALSE(other.frmMenu.surf_Timer1.Enabled());
+  EXPECT_FALSE(other.monitorPage.main_Timer1.Enabled());
+  EXPECT_FALSE(other.monitorPage.main_Timer2.Enabled());
+  EXPECT_FALSE(other.surfPage.surf_Timer1.Enabled());
 }
 
 TEST_F(StartUp, The_background_takes_its_colour_at_the_load) {
@@ -74,14 +74,14 @@ TEST_F(StartUp, The_background_takes_its_colour_at_the_load) {
 TEST_F(StartUp, The_result_of_the_capture_library_is_kept_also_when_it_is_minus_1) {
   machine.capture.InitResult = -1;
   ComeHome();
-  EXPECT_EQ(program.captureFields.CaptureInitResult, -1);
+  EXPECT_EQ(program.captureSession.CaptureInitResult, -1);
   EXPECT_EQ(machine.capture.ControlsMade, 1);
 }
 
 TEST_F(StartUp, The_version_of_the_system_is_kept_for_the_monitor) {
   machine.system.Version = {2, 5, 0};
   ComeHome();
-  EXPECT_EQ(program.monitorFields.OsVersionCode, 2000);
+  EXPECT_EQ(program.systemVersion.OsVersionCode, 2000);
 }
 
 TEST_F(StartUp, An_unlisted_version_stays_0_and_leaves_the_ports_of_every_row_empty) {
@@ -89,10 +89,10 @@ TEST_F(StartUp, An_unlisted_version_stays_0_and_leaves_the_ports_of_every_row_em
   machine.AddProcess({100, 1, "server.exe", "C:\\server.exe"});
   machine.AddConnection({2, "0.0.0.0", 80, "0.0.0.0", 0, 100});
   ComeHome();
-  EXPECT_EQ(program.monitorFields.OsVersionCode, 0);
+  EXPECT_EQ(program.systemVersion.OsVersionCode, 0);
   ClickEntry(0);
-  ASSERT_EQ(program.frmMenu.main_ListView1.Count(), 1);
-  EXPECT_EQ(program.frmMenu.main_ListView1.Row(1).CellText(3), u"");
+  ASSERT_EQ(program.monitorPage.table.main_ListView1.Count(), 1);
+  EXPECT_EQ(program.monitorPage.table.main_ListView1.Row(1).CellText(3), u"");
 }
 
 TEST_F(StartUp, A_version_that_cannot_be_read_is_told_in_a_box_and_the_load_goes_on) {
@@ -103,7 +103,7 @@ TEST_F(StartUp, A_version_that_cannot_be_read_is_told_in_a_box_and_the_load_goes
                                    u"Click OK to continue.");
   EXPECT_EQ(desktop.Boxes[0].title, u"  Error Getting OS Information");
   EXPECT_EQ(desktop.Boxes[0].flags, 0x30);
-  EXPECT_EQ(program.monitorFields.OsVersionCode, 0);
+  EXPECT_EQ(program.systemVersion.OsVersionCode, 0);
   EXPECT_TRUE(WasCalled("VBPcapInit"));
 }
 
@@ -219,8 +219,8 @@ TEST_F(StartUp, Two_programs_live_side_by_side) {
   ComeHome();
   other.Start();
   otherDesktop.Click(other.frmSplash.Label2);
-  EXPECT_EQ(program.monitorFields.OsVersionCode, 2002);
-  EXPECT_EQ(other.monitorFields.OsVersionCode, 98);
+  EXPECT_EQ(program.systemVersion.OsVersionCode, 2002);
+  EXPECT_EQ(other.systemVersion.OsVersionCode, 98);
   otherDesktop.CloseBox(other.frmMenu);
   EXPECT_TRUE(otherDesktop.Ended);
   EXPECT_FALSE(desktop.Ended);

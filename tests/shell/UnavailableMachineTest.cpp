@@ -45,9 +45,9 @@ TEST_F(UnavailableMachineTest, The_main_window_comes_up_and_says_that_the_versio
 TEST_F(UnavailableMachineTest, Pages_that_ask_nothing_of_the_machine_open_and_close) {
   ComeHome(machine.Operations());
   ClickEntry(1);
-  EXPECT_TRUE(program->frmMenu.frameSurfProb.Visible());
+  EXPECT_TRUE(program->surfPage.frameSurfProb.Visible());
   ClickEntry(2);
-  EXPECT_TRUE(program->frmMenu.frameFirstConnection.Visible());
+  EXPECT_TRUE(program->firstConnectionPage.frameFirstConnection.Visible());
   desktop.CloseBox(program->frmMenu);
   EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
   EXPECT_EQ(desktop.EndStatus, 0);
@@ -68,10 +68,10 @@ TEST_F(UnavailableMachineTest,
   ClickEntry(0);
   EXPECT_FALSE(desktop.Ended);
   EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
-  EXPECT_TRUE(program->frmMenu.frameMain.Visible());
-  EXPECT_EQ(program->frmMenu.main_ListView1.Count(), 0);
-  EXPECT_EQ(program->frmMenu.main_cmbAdapters.ListCount(), 0);
-  EXPECT_EQ(program->frmMenu.main_lblCaptureState.Caption(),
+  EXPECT_TRUE(program->monitorPage.frameMain.Visible());
+  EXPECT_EQ(program->monitorPage.table.main_ListView1.Count(), 0);
+  EXPECT_EQ(program->monitorPage.adapters.main_cmbAdapters.ListCount(), 0);
+  EXPECT_EQ(program->monitorPage.adapters.main_lblCaptureState.Caption(),
             capture::CaptureStateText(platform::CaptureLibrary::Availability::NoLibrary));
 }
 
@@ -81,7 +81,7 @@ TEST_F(UnavailableMachineTest, With_a_network_alone_the_pages_follow_each_other_
     ClickEntry(entry);
     desktop.Advance(5000);
   }
-  EXPECT_TRUE(program->frmMenu.frameMain.Visible());
+  EXPECT_TRUE(program->monitorPage.frameMain.Visible());
   EXPECT_FALSE(desktop.Ended);
   EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
 }

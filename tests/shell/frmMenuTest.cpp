@@ -40,8 +40,9 @@ TEST_F(MainWindow, Every_label_that_acts_as_a_button_sets_the_hand_cursor) {
   ComeHome();
   ClickEntry(0);
   for (forms::Label* label :
-       {&menu.Label1, &menu.main_lblEndProcess, &menu.main_lblJumpToPath, &menu.main_cmdAddRemove,
-        &menu.main_cmdChecks, &menu.main_cmdMemInfo, &menu.main_cmdRpt}) {
+       {&menu.Label1, &program.monitorPage.main_lblEndProcess, &program.monitorPage.main_lblJumpToPath,
+        &program.monitorPage.main_cmdAddRemove, &program.monitorPage.main_cmdChecks,
+        &program.monitorPage.main_cmdMemInfo, &program.monitorPage.reporting.main_cmdRpt}) {
     label->Enabled = true; // as it is once its action stands
     desktop.Calls.clear();
     EXPECT_TRUE(desktop.MouseMove(*label)) << ToUtf8(label->Name());
@@ -49,9 +50,9 @@ TEST_F(MainWindow, Every_label_that_acts_as_a_button_sets_the_hand_cursor) {
   }
   ClickEntry(1);
   desktop.Calls.clear();
-  desktop.MouseMove(menu.surf_lblBack);
+  desktop.MouseMove(program.surfPage.surf_lblBack);
   ClickEntry(2);
-  desktop.MouseMove(menu.frsCon_lblBack);
+  desktop.MouseMove(program.firstConnectionPage.frsCon_lblBack);
   EXPECT_EQ(desktop.CountOf("SetCursor 5"), 2);
 }
 
@@ -66,38 +67,40 @@ TEST_F(MainWindow, No_hand_cursor_is_set_where_the_system_has_none) {
 
 TEST_F(MainWindow, Its_activation_and_deactivation_keep_one_flag_which_the_surf_page_clears_too) {
   ComeHome();
-  EXPECT_EQ(menu.InBackground(), 0);
+  EXPECT_EQ(menu.InBackground, 0);
   desktop.Deactivate(menu);
-  EXPECT_EQ(menu.InBackground(), -1);
+  EXPECT_EQ(menu.InBackground, -1);
   desktop.Activate(menu);
-  EXPECT_EQ(menu.InBackground(), 0);
+  EXPECT_EQ(menu.InBackground, 0);
   desktop.Deactivate(menu);
   ClickEntry(1);
-  EXPECT_EQ(menu.InBackground(), 0);
+  EXPECT_EQ(menu.InBackground, 0);
 }
 
 TEST_F(MainWindow, Its_timers_stand_as_designed) {
   ComeHome();
-  EXPECT_EQ(menu.main_Timer1.Interval(), 1000);
-  EXPECT_EQ(menu.main_Timer2.Interval(), 1000);
-  EXPECT_EQ(menu.surf_Timer1.Interval(), 100);
+  EXPECT_EQ(program.monitorPage.main_Timer1.Interval(), 1000);
+  EXPECT_EQ(program.monitorPage.main_Timer2.Interval(), 1000);
+  EXPECT_EQ(program.surfPage.surf_Timer1.Interval(), 100);
   desktop.Advance(10000);
   ClickEntry(0);
   ClickEntry(1);
   ClickEntry(2);
-  EXPECT_FALSE(menu.main_Timer1.Enabled());
-  EXPECT_FALSE(menu.main_Timer2.Enabled());
-  EXPECT_FALSE(menu.surf_Timer1.Enabled());
+  EXPECT_FALSE(program.monitorPage.main_Timer1.Enabled());
+  EXPECT_FALSE(program.monitorPage.main_Timer2.Enabled());
+  EXPECT_FALSE(program.surfPage.surf_Timer1.Enabled());
 }
 
-TEST_F(MainWindow, Timer_2_has_no_handler) { EXPECT_FALSE(static_cast<bool>(menu.main_Timer2.Tick)); }
+TEST_F(MainWindow, Timer_2_has_no_handler) {
+  EXPECT_FALSE(static_cast<bool>(program.monitorPage.main_Timer2.Tick));
+}
 
 TEST_F(MainWindow, The_surf_timer_would_fetch_the_table_and_sweep_it) {
   machine.AddProcess({700, 1, "client.exe", "C:\\client.exe"});
   machine.AddConnection({5, "10.0.0.5", 1025, "10.0.0.9", 80, 700});
   ComeHome();
   const int yields = desktop.YieldCount;
-  menu.surf_Timer1.Enabled = true;
+  program.surfPage.surf_Timer1.Enabled = true;
   desktop.Advance(100);
   EXPECT_EQ(machine.ipHelper.TablesFetched, 1);
   EXPECT_GT(desktop.YieldCount, yields);
@@ -110,7 +113,7 @@ TEST_F(MainWindow, The_surf_timer_sweeps_for_good_once_its_deletion_is_armed) {
   machine.AddConnection({5, "10.0.0.5", 1025, "10.0.0.9", 80, 700});
   ComeHome();
   program.modProcPort.ConnectionDeleteEnabled = kTrue16;
-  menu.surf_Timer1.Enabled = true;
+  program.surfPage.surf_Timer1.Enabled = true;
   desktop.Advance(100);
   EXPECT_EQ(machine.ipHelper.Deleted.size(), 1U);
 }
@@ -136,7 +139,7 @@ TEST_F(MainWindow, The_main_window_stays_in_use_beside_the_about_box) {
   ComeHome();
   desktop.Click(menu.Label1);
   ClickEntry(1);
-  EXPECT_TRUE(menu.frameSurfProb.Visible());
+  EXPECT_TRUE(program.surfPage.frameSurfProb.Visible());
 }
 
 TEST_F(MainWindow, A_click_on_its_picture_closes_the_about_box) {

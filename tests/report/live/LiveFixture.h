@@ -33,7 +33,7 @@ class LiveReportTest : public testing::Test {
     program = std::make_unique<app::Program>(machine->Operations(), desktop);
   }
   void TearDown() override {
-    if (program && program->frmMenu.frameMain.Visible()) desktop.CloseBox(program->frmMenu);
+    if (program && program->monitorPage.frameMain.Visible()) desktop.CloseBox(program->frmMenu);
     program.reset();
     machine.reset();
     if (!folder.empty()) std::filesystem::remove_all(folder);
@@ -48,13 +48,13 @@ class LiveReportTest : public testing::Test {
     connected = [this, handler = connected](const Variant& index) {
       handler(index);
       if (index == Variant(std::int16_t{3}))
-        bodySent =
-            ToCodePage(ReportBody(program->supportExchange.ReportNumber, program->frmMenu.main_ListView1));
+        bodySent = ToCodePage(
+            ReportBody(program->supportExchange.ReportNumber, program->monitorPage.table.main_ListView1));
     };
   }
   /// A click and what comes of it; true once that many boxes have stood.
   bool ClickAndAwaitBoxes(std::size_t boxes) {
-    desktop.Click(program->frmMenu.main_cmdRpt);
+    desktop.Click(program->monitorPage.reporting.main_cmdRpt);
     return AwaitBoxes(boxes);
   }
   bool AwaitBoxes(std::size_t boxes) {

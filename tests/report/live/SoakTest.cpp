@@ -72,7 +72,7 @@ class Soak : public LiveReportTest {
     desktop.Boxes.clear();
     desktop.Calls.clear();
     quiet.Calls.clear();
-    desktop.Click(program->frmMenu.main_cmdRpt);
+    desktop.Click(program->monitorPage.reporting.main_cmdRpt);
     return AwaitBoxes(2) && desktop.Boxes[1].text == kSuccess &&
            Await([&] { return StateOf(2) == foundation::sckClosed; });
   }

@@ -85,9 +85,9 @@ TEST_F(StandIn, Without_a_server_the_click_shows_that_the_connection_was_refused
 TEST_F(StandIn, The_load_gathers_in_the_buffer_until_its_stop) {
   const auto server = Start(64);
   OpenPage();
-  WhenLoaded(kEnough, [&] { desktop.DoubleClick(program->frmMenu.main_Label2); });
+  WhenLoaded(kEnough, [&] { desktop.DoubleClick(program->monitorPage.table.main_Label2); });
 
-  desktop.DoubleClick(program->frmMenu.main_Label3);
+  desktop.DoubleClick(program->monitorPage.table.main_Label3);
 
   ASSERT_TRUE(Await([&] { return loaded; }));
   EXPECT_GE(waitingThen, kEnough);
@@ -100,8 +100,8 @@ TEST_F(StandIn, The_capture_sees_the_load_and_moves_a_meter) {
   const auto server = Start(64);
   OpenPage();
   const auto load = [&] {
-    WhenLoaded(kEnough, [&] { desktop.DoubleClick(program->frmMenu.main_Label2); });
-    desktop.DoubleClick(program->frmMenu.main_Label3);
+    WhenLoaded(kEnough, [&] { desktop.DoubleClick(program->monitorPage.table.main_Label2); });
+    desktop.DoubleClick(program->monitorPage.table.main_Label3);
     ASSERT_TRUE(Await([&] { return loaded; }));
   };
 
@@ -112,9 +112,11 @@ TEST_F(StandIn, The_capture_sees_the_load_and_moves_a_meter) {
 
   EXPECT_TRUE(Await([&] {
     const auto rate = [](const forms::Label& meter) { return std::stod(ToUtf8(meter.Caption())); };
-    return rate(program->frmMenu.main_lblUpload) + rate(program->frmMenu.main_lblDownload) > 1000;
-  })) << ToUtf8(program->frmMenu.main_lblUpload.Caption())
-      << " up, " << ToUtf8(program->frmMenu.main_lblDownload.Caption()) << " down";
+    return rate(program->monitorPage.table.main_lblUpload) +
+               rate(program->monitorPage.table.main_lblDownload) >
+           1000;
+  })) << ToUtf8(program->monitorPage.table.main_lblUpload.Caption())
+      << " up, " << ToUtf8(program->monitorPage.table.main_lblDownload.Caption()) << " down";
 }
 
 TEST_F(StandIn, A_load_that_the_server_ends_closes_its_socket) {
@@ -122,7 +124,7 @@ TEST_F(StandIn, A_load_that_the_server_ends_closes_its_socket) {
   OpenPage();
   WhenLoaded(4 << 20, [] {});
 
-  desktop.DoubleClick(program->frmMenu.main_Label3);
+  desktop.DoubleClick(program->monitorPage.table.main_Label3);
 
   ASSERT_TRUE(Await([&] { return loaded && StateOf(4) == foundation::sckClosed; }));
   EXPECT_EQ(Waiting(), 0);
@@ -134,7 +136,7 @@ TEST_F(StandIn, Leaving_the_page_in_the_middle_of_a_load_closes_every_socket) {
   OpenPage();
   WhenLoaded(kEnough, [&] { desktop.Click(program->frmMenu.lblCaption[1]); });
 
-  desktop.DoubleClick(program->frmMenu.main_Label3);
+  desktop.DoubleClick(program->monitorPage.table.main_Label3);
 
   ASSERT_TRUE(Await([&] { return loaded; }));
   EXPECT_EQ(program->supportExchange.Sockets(), nullptr);

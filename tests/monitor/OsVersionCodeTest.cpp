@@ -1,8 +1,8 @@
-#include "shell/OsVersionCode.h"
+#include "monitor/OsVersionCode.h"
 
 #include <gtest/gtest.h>
 
-namespace quendra::shell {
+namespace quendra::monitor {
 namespace {
 
 struct Case {
@@ -29,4 +29,4 @@ INSTANTIATE_TEST_SUITE_P(Unlisted, OsVersionCode,
                                          Case{{3, 5, 1}, 0}, Case{{0xFFFFFFFF, 0, 0}, 0}));
 
 } // namespace
-} // namespace quendra::shell
+} // namespace quendra::monitor

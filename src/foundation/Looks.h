@@ -1,9 +1,10 @@
 #pragma once
 
 #include "forms/Controls.h"
+#include "foundation/Twips.h"
 
 /// Colours and letter sizes that the forms share.
-namespace quendra::shell::looks {
+namespace quendra::foundation::looks {
 
 inline constexpr forms::Colour kLime = forms::Rgb(162, 233, 93);
 /// The foot of the main window, as its background picture has it.
@@ -23,9 +24,9 @@ inline constexpr forms::Font kEntry{12, true, false};
 inline constexpr forms::Font kFigure{14, true, false};
 
 /// A plain text that lets what lies under it shine through.
-inline void Text(forms::Label& label, const char16_t* caption, forms::Font font,
-                 forms::Colour colour = kInk) {
-  label.Caption = quendra::Text(caption);
+inline void PlainText(forms::Label& label, const char16_t* caption, forms::Font font,
+                      forms::Colour colour = kInk) {
+  label.Caption = Text(caption);
   label.TextFont = font;
   label.ForeColour = colour;
   label.Transparent = true;
@@ -33,13 +34,13 @@ inline void Text(forms::Label& label, const char16_t* caption, forms::Font font,
 
 inline void Link(forms::Label& label, const char16_t* caption, forms::Font font,
                  forms::Colour colour = kForest) {
-  Text(label, caption, font, colour);
+  PlainText(label, caption, font, colour);
   label.Style = forms::Label::Look::Link;
 }
 
 /// A button that nothing answers to is shown disabled until its form gives it a handler.
 inline void Button(forms::Label& label, const char16_t* caption) {
-  Text(label, caption, kBody);
+  PlainText(label, caption, kBody);
   label.Style = forms::Label::Look::Button;
   label.Align = forms::Alignment::Centre;
   label.Enabled = static_cast<bool>(label.Click);
@@ -54,4 +55,13 @@ inline void LeadingButton(forms::Label& label, const char16_t* caption) {
   label.Transparent = false;
 }
 
-} // namespace quendra::shell::looks
+/// The title of a page of this width and the link that leaves the page.
+inline void PageHead(forms::Label& title, forms::Label& back, const char16_t* caption, int pageWidth) {
+  PlainText(title, caption, kHeading, kForest);
+  title.Move(Px(20), Px(14), Px(400), Px(32));
+  Link(back, u"חזרה", kBody);
+  back.Align = forms::Alignment::Trailing;
+  back.Move(pageWidth - Px(120), Px(20), Px(100), Px(22));
+}
+
+} // namespace quendra::foundation::looks

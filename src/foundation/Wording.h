@@ -1,8 +1,8 @@
 #pragma once
 
-namespace quendra::shell {
+namespace quendra::foundation {
 
 /// Title of the main window and of every Hebrew message box.
 inline constexpr const char16_t* kTitle = u"זלמר בינלאומי@נט";
 
-} // namespace quendra::shell
+} // namespace quendra::foundation

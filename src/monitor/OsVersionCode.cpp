@@ -1,6 +1,6 @@
-#include "shell/OsVersionCode.h"
+#include "monitor/OsVersionCode.h"
 
-namespace quendra::shell {
+namespace quendra::monitor {
 
 namespace {
 
@@ -30,4 +30,4 @@ std::int32_t OsVersionCodeOf(const platform::OsVersion& version) {
   return 0;
 }
 
-} // namespace quendra::shell
+} // namespace quendra::monitor

@@ -2,19 +2,17 @@
 
 #include "capture/CaptureSession.h"
 #include "monitor/ProcessTable.h"
-#include "platform/Machine.h"
 #include "report/SupportExchange.h"
+#include "shell/MonitorPage.h"
 
 namespace quendra::shell {
 
 /// What opens, keeps and leaves the monitor page: the order in which its table, its sockets and its capture
 /// are set to work.
-class MonitorPageSwitch {
+class MonitorWork {
  public:
-  MonitorPageSwitch(const platform::Machine& machine, monitor::MonitorFields& fields,
-                    monitor::ProcessTable& table, report::SupportExchange& support,
-                    capture::CaptureSession& capture)
-      : system_(machine.system), fields_(fields), table_(table), support_(support), capture_(capture) {}
+  MonitorWork(MonitorPage& page, monitor::ProcessTable& table, report::SupportExchange& support,
+              capture::OwnAddresses& addresses, capture::CaptureSession& capture);
 
   void main_StartPage();
   void main_StopPage();
@@ -24,10 +22,9 @@ class MonitorPageSwitch {
   Boolean16 TimerRefreshGate = kFalse16;
 
  private:
-  platform::System& system_;
-  monitor::MonitorFields& fields_;
   monitor::ProcessTable& table_;
   report::SupportExchange& support_;
+  capture::OwnAddresses& addresses_;
   capture::CaptureSession& capture_;
 };
 
