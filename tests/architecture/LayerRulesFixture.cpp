@@ -179,6 +179,11 @@ bool MayNameSystemHeader(const std::string& folder, const std::string& header) {
   return false;
 }
 
+/// Above platform/ a class takes the families that it uses; the program and the backends alone see them all.
+bool MaySeeTheWholeMachine(const std::string& folder) {
+  return folder == "app" || folder.starts_with("platform");
+}
+
 std::string WhyNotIncluded(const std::string& path, const std::string& header) {
   const std::string folder = FolderOf(path);
   const std::string target = FolderOf(header);
@@ -186,6 +191,7 @@ std::string WhyNotIncluded(const std::string& path, const std::string& header) {
   if (target == folder) return {};
   if (IsDesktop(folder) && (header == "platform/EventLoop.h" || header == "platform/DescriptorWatch.h"))
     return {};
+  if (header == "platform/Machine.h" && !MaySeeTheWholeMachine(folder)) return "names the whole machine";
   if (Allowed().at(folder).contains(target)) return {};
   return IsBackend(target) ? "names a backend" : "goes against the layers";
 }

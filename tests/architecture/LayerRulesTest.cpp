@@ -16,10 +16,10 @@ struct Case {
 
 TEST(LayerRules, An_include_that_goes_down_is_allowed) {
   const Case cases[] = {
-      {"monitor/ProcessTable.h", "#include \"monitor/MonitorPage.h\""},
+      {"monitor/ProcessTable.h", "#include \"monitor/TableControls.h\""},
       {"monitor/ProcessTable.h", "#include \"forms/ListView.h\""},
-      {"monitor/ProcessTable.h", "#include \"platform/Machine.h\""},
-      {"capture/PacketAttribution.h", "#include \"monitor/MonitorPage.h\""},
+      {"monitor/ProcessTable.h", "#include \"platform/process/Processes.h\""},
+      {"capture/PacketAttribution.h", "#include \"monitor/TableControls.h\""},
       {"report/Report.cpp", "#include \"monitor/ProcessRow.h\""},
       {"provisioning/mdlDun.cpp", "#include \"diagnostics/mdlPing.h\""},
       {"provisioning/mdlDun.cpp", "#include \"mail/mdlEmail.h\""},
@@ -46,7 +46,7 @@ TEST(LayerRules, An_include_that_goes_up_or_sideways_is_found) {
       {"forms/Form.h", "#include \"platform/EventLoop.h\""},
       {"platform/Machine.h", "#include \"forms/Form.h\""},
       {"foundation/CSocketPlus.h", "#include \"monitor/ProcessRow.h\""},
-      {"monitor/ProcessTable.h", "#include \"capture/CaptureFields.h\""},
+      {"monitor/ProcessTable.h", "#include \"capture/CaptureSession.h\""},
       {"monitor/ProcessTable.h", "#include \"shell/frmMenu.h\""},
       {"mail/mdlEmail.h", "#include \"provisioning/mdlDun.h\""},
       {"diagnostics/mdlPing.h", "#include \"monitor/ProcessRow.h\""},
@@ -58,6 +58,15 @@ TEST(LayerRules, An_include_that_goes_up_or_sideways_is_found) {
       {"platform/simulated/SimulatedMachine.h", "#include \"monitor/ProcessRow.h\""},
   };
   for (const Case& row : cases) EXPECT_FALSE(IsAllowed(row.path, row.line)) << row.path << ": " << row.line;
+}
+
+TEST(LayerRules, The_whole_machine_is_named_by_the_program_and_its_backends_alone) {
+  const std::string include = "#include \"platform/Machine.h\"";
+  for (const char* path : {"app/Program.h", "platform/linux/LinuxMachine.h", "platform/Machine.cpp"})
+    EXPECT_TRUE(IsAllowed(path, include)) << path;
+  for (const char* path : {"monitor/ProcessTable.h", "capture/CaptureSession.h", "report/SupportExchange.h",
+                           "foundation/modSocketPlus.h", "diagnostics/SurfPage.h", "shell/frmMenu.h"})
+    EXPECT_FALSE(IsAllowed(path, include)) << path;
 }
 
 TEST(LayerRules, A_backend_that_is_named_outside_app_is_found) {
