@@ -12,7 +12,7 @@ class UnavailableIcons : public Icons {
   bool DestroyIcon(Handle) override { return false; }
 
  private:
-  const std::vector<std::uint8_t> none_;
+  const std::vector<std::uint8_t> none_{};
 };
 
 } // namespace quendra::platform::unavailable
