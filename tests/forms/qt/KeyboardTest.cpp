@@ -3,6 +3,7 @@
 #include "forms/qt/input/KeyEvents.h"
 
 #include <QKeyEvent>
+#include <QTreeView>
 
 namespace quendra::forms {
 
@@ -10,6 +11,16 @@ class Keyboard : public QtFixture {
  protected:
   static constexpr int kHebrewFinalNun = 0x05DF;
   static constexpr quint32 kFinalNunSymbol = 0xCEF;
+
+  /// As the display server tells it: without a word on whether the key is held.
+  static void SendKey(QWidget& widget, QEvent::Type type, int key, quint64 moment) {
+    QKeyEvent event(type, key, Qt::NoModifier);
+    event.setTimestamp(moment);
+    QCoreApplication::sendEvent(&widget, &event);
+  }
+  void SendEscape(QEvent::Type type, quint64 moment) {
+    SendKey(WidgetOf(form), type, Qt::Key_Escape, moment);
+  }
 };
 
 TEST_F(Keyboard, Tab_reaches_every_clickable_label_and_no_other) {
@@ -264,6 +275,52 @@ TEST_F(Keyboard, A_key_that_is_held_down_clicks_once) {
   QCoreApplication::sendEvent(&WidgetOf(form), &repeated);
 
   EXPECT_EQ(clicks, 1);
+}
+
+TEST_F(Keyboard, A_press_at_the_very_moment_of_the_release_is_the_held_key_again) {
+  Image picture(form, u"picture");
+  int clicks = 0;
+  picture.Click = [&] { ++clicks; };
+  form.Cancel = &picture;
+  ShowActive();
+
+  SendEscape(QEvent::KeyPress, 1000);
+  for (const quint64 moment : {1500, 1540, 1580}) {
+    SendEscape(QEvent::KeyRelease, moment);
+    SendEscape(QEvent::KeyPress, moment);
+  }
+
+  EXPECT_EQ(clicks, 1);
+}
+
+TEST_F(Keyboard, Two_presses_in_quick_succession_click_twice) {
+  Image picture(form, u"picture");
+  int clicks = 0;
+  picture.Click = [&] { ++clicks; };
+  form.Cancel = &picture;
+  ShowActive();
+
+  SendEscape(QEvent::KeyPress, 1000);
+  SendEscape(QEvent::KeyRelease, 1004);
+  SendEscape(QEvent::KeyPress, 1005);
+
+  EXPECT_EQ(clicks, 2);
+}
+
+TEST_F(Keyboard, A_held_key_goes_on_in_a_list) {
+  ListView list(form, u"list");
+  list.AddColumn({u"name", 1500});
+  form.design = [&] { list.Move(0, 0, 6000, 4500); };
+  ShowActive();
+  for (const char16_t* key : {u"first", u"second", u"third"}) list.Add(key, key, 0);
+  auto& view = As<QTreeView>(list);
+  SendKey(view, QEvent::KeyPress, Qt::Key_Down, 1000);
+  const int row = view.currentIndex().row();
+
+  SendKey(view, QEvent::KeyRelease, Qt::Key_Down, 1500);
+  SendKey(view, QEvent::KeyPress, Qt::Key_Down, 1500);
+
+  EXPECT_EQ(view.currentIndex().row(), row + 1);
 }
 
 TEST_F(Keyboard, Escape_may_unload_the_form_that_it_reached) {

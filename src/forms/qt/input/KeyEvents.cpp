@@ -4,6 +4,7 @@
 #include "forms/qt/input/MouseEvents.h"
 #include "forms/qt/views/FormView.h"
 
+#include <QCoreApplication>
 #include <QKeyEvent>
 #include <QPointer>
 
@@ -41,6 +42,13 @@ int CharacterOfSymbol(quint32 symbol) {
   return isLatin ? CharacterCode(static_cast<int>(symbol)) : 0;
 }
 
+void SendMarked(QWidget& widget, const QKeyEvent& key) {
+  QKeyEvent marked(QEvent::KeyPress, key.key(), key.modifiers(), key.nativeScanCode(), key.nativeVirtualKey(),
+                   key.nativeModifiers(), key.text(), true, static_cast<quint16>(key.count()));
+  marked.setTimestamp(key.timestamp());
+  QCoreApplication::sendEvent(&widget, &marked);
+}
+
 } // namespace
 
 int KeyCodeOf(const QKeyEvent& event) {
@@ -55,15 +63,32 @@ int KeyCodeOf(const QKeyEvent& event) {
 }
 
 bool KeyEvents::eventFilter(QObject* watched, QEvent* event) {
-  if (event->type() != QEvent::KeyPress || !watched->isWidgetType()) return false;
+  if (!watched->isWidgetType()) return false;
+  if (event->type() == QEvent::KeyRelease) {
+    const auto& released = static_cast<const QKeyEvent&>(*event);
+    releasedKey_ = released.key();
+    releasedAt_ = released.timestamp();
+  }
+  if (event->type() != QEvent::KeyPress) return false;
   auto* widget = static_cast<QWidget*>(watched);
+  const auto& key = static_cast<const QKeyEvent&>(*event);
+  if (IsUnmarkedRepeat(key)) {
+    SendMarked(*widget, key);
+    return true;
+  }
   const QPointer<FormView> view = dynamic_cast<FormView*>(widget->window());
   if (!view) return false;
-  const auto& key = static_cast<const QKeyEvent&>(*event);
   // A key that a control doesn't want climbs through its containers; the form hears of it where it came in.
   const QWidget* focused = view->focusWidget();
   if (widget == (focused ? focused : view.data())) Preview(*view, *widget, key);
   return view && widget == view && Press(*view, key);
+}
+
+/// A held key comes from the display server as releases and presses of one moment. The toolkit marks those as
+/// repeats only where it has read both when it looks at the release.
+bool KeyEvents::IsUnmarkedRepeat(const QKeyEvent& press) const {
+  return !press.isAutoRepeat() && press.timestamp() != 0 && press.timestamp() == releasedAt_ &&
+         press.key() == releasedKey_;
 }
 
 void KeyEvents::Preview(FormView& view, const QWidget& widget, const QKeyEvent& key) {

@@ -24,10 +24,13 @@ class KeyEvents : public QObject {
   bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
+  bool IsUnmarkedRepeat(const QKeyEvent& press) const;
   void Preview(FormView& view, const QWidget& widget, const QKeyEvent& key);
   bool Press(FormView& view, const QKeyEvent& key);
 
   Dispatcher& dispatcher_;
+  int releasedKey_ = 0;
+  quint64 releasedAt_ = 0;
 };
 
 } // namespace quendra::forms::qt
