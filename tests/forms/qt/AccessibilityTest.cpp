@@ -112,6 +112,25 @@ TEST_F(Accessibility, A_disabled_label_offers_no_press) {
       QAccessibleActionInterface::pressAction()));
 }
 
+TEST_F(Accessibility, A_label_behind_a_modal_form_takes_no_press) {
+  Label button(form, u"Label2");
+  TestForm dialog;
+  Label ok(dialog, u"ok");
+  std::string pressed;
+  button.Click = [&] { pressed += "behind "; };
+  ok.Click = [&] { pressed += "ok "; };
+  desktop.Show(form);
+  desktop.Post([&] {
+    for (const Label* label : {&button, &ok})
+      InterfaceOf(*label).actionInterface()->doAction(QAccessibleActionInterface::pressAction());
+    desktop.Unload(dialog);
+  });
+
+  desktop.Show(dialog, Modality::Modal, &form);
+
+  EXPECT_EQ(pressed, "ok ");
+}
+
 TEST_F(Accessibility, A_table_gives_its_rows_and_headers) {
   ListView list(form, u"main_ListView1");
   list.AddColumn({u"שם תהליך", 3000});

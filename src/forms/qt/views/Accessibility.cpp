@@ -1,6 +1,7 @@
 #include "forms/qt/views/WidgetView.h"
 
 #include <QAccessibleWidget>
+#include <QApplication>
 
 namespace quendra::forms::qt {
 
@@ -26,7 +27,12 @@ class ControlInterface : public QAccessibleWidget {
   }
 
  private:
-  bool IsPressable() const { return role() == QAccessible::Button && widget()->isEnabled(); }
+  bool IsPressable() const { return role() == QAccessible::Button && widget()->isEnabled() && !IsBlocked(); }
+  // Mouse and keys don't reach a window behind a box or a modal form; a request like this one would.
+  bool IsBlocked() const {
+    const QWidget* modal = QApplication::activeModalWidget();
+    return modal && modal != widget()->window();
+  }
 
   WidgetView& view_;
 };
