@@ -37,7 +37,7 @@ SupportExchange::SupportExchange(foundation::modSocketPlus& module, forms::Deskt
 }
 
 void SupportExchange::PrepareSockets() {
-  main_spSockets_ = std::make_unique<foundation::CSocketPlus>(module_);
+  main_spSockets_ = std::make_shared<foundation::CSocketPlus>(module_);
   for (std::int16_t index = kProcsPage; index <= kLoad; ++index) main_spSockets_->ArrayAdd(index);
   auto& events = main_spSockets_->Events;
   events.Connect = [this](Index index) { main_spSockets_Connect(index); };
@@ -136,30 +136,28 @@ Text SupportExchange::TakeText(Index index) {
 
 void SupportExchange::NumberArrived() {
   const Text number = ReportNumberIn(TakeText(kNumber));
-  ShowNumber(number);
+  if (!ShowNumber(number)) return OfferReport(); // the page may be open again
   ReportNumber = number;
   Connect(kReport, settings::SupportServerHost);
 }
 
 /// While the box stands, the next piece of a reply may arrive and open its own box on top. A server that
 /// sends piece after piece must not use up the stack.
-void SupportExchange::ShowNumber(const Text& number) {
+bool SupportExchange::ShowNumber(const Text& number) {
   if (standingNumberBoxes_ == kMostNumberBoxes) throw Fault(Fault::kOutOfStackSpace);
   struct Standing {
     int& count;
     explicit Standing(int& boxes) : count(boxes) { ++count; }
     ~Standing() { --count; }
   } const standing(standingNumberBoxes_);
-  ShowHebrewBox(u"מספר הדו\"ח שלך הוא: " + number, forms::kInformation);
+  return ShowHebrewBox(u"מספר הדו\"ח שלך הוא: " + number, forms::kInformation);
 }
 
 void SupportExchange::ReportClosed() {
   const bool accepted = ReportReply.find(u"~OK") != Text::npos;
-  if (accepted)
-    ShowHebrewBox(u"הדו\"ח נשלח בהצלחה.", forms::kInformation);
-  else
-    ShowHebrewBox(u"בעיה בשליחת הדו\"ח!", forms::kCritical);
-  Close(kReport);
+  const bool goesOn = accepted ? ShowHebrewBox(u"הדו\"ח נשלח בהצלחה.", forms::kInformation)
+                               : ShowHebrewBox(u"בעיה בשליחת הדו\"ח!", forms::kCritical);
+  if (goesOn) Close(kReport);
 }
 
 void SupportExchange::ProcsPageClosed() {
@@ -172,8 +170,10 @@ void SupportExchange::ProcsPageClosed() {
 /// Reserved for reading the page into a table of 3 by 3 texts, which is made and dropped.
 void SupportExchange::ReadProcsPage() { const Text table[3][3]; }
 
-void SupportExchange::ShowHebrewBox(const Text& text, int icon) {
+bool SupportExchange::ShowHebrewBox(const Text& text, int icon) {
+  const std::weak_ptr<foundation::CSocketPlus> page = main_spSockets_;
   desktop_.MessageBox(text, icon | forms::kHebrewBox, foundation::kTitle);
+  return !page.expired();
 }
 
 } // namespace quendra::report

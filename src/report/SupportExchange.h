@@ -52,17 +52,18 @@ class SupportExchange {
   Text TakeText(Index index);
   void NumberArrived();
   void ReportClosed();
-  void ShowNumber(const Text& number);
+  /// Both are false when the page was left behind the box: the exchange has ended with it.
+  bool ShowNumber(const Text& number);
+  bool ShowHebrewBox(const Text& text, int icon);
   void ProcsPageClosed();
   void ReadProcsPage();
-  void ShowHebrewBox(const Text& text, int icon);
 
   foundation::modSocketPlus& module_;
   forms::Desktop& desktop_;
   ReportControls& controls_;
   monitor::ProcessTable& table_;
   forms::Timer& main_Timer1_;
-  std::unique_ptr<foundation::CSocketPlus> main_spSockets_;
+  std::shared_ptr<foundation::CSocketPlus> main_spSockets_;
   int standingNumberBoxes_ = 0;
 };
 

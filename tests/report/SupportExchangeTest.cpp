@@ -442,6 +442,45 @@ TEST_F(SupportExchange, Leaving_the_page_in_the_middle_of_an_exchange_ends_it_wi
   EXPECT_EQ(ConnectionCount(), 2u);
 }
 
+TEST_F(SupportExchange, Leaving_the_page_behind_the_box_of_the_number_ends_the_exchange_without_a_message) {
+  Server();
+  OpenPage();
+  desktop.WhileBoxStands.push_back([&] { LeavePage(); });
+
+  GetNumber();
+
+  EXPECT_EQ(desktop.Boxes.size(), 1u);
+  EXPECT_FALSE(desktop.Ended);
+  EXPECT_EQ(ConnectionCount(), 1u);
+}
+
+TEST_F(SupportExchange, Leaving_the_page_behind_the_box_of_the_result_ends_the_exchange_without_a_message) {
+  Server();
+  OpenPage();
+  GetNumber();
+  desktop.WhileBoxStands.push_back([&] { LeavePage(); });
+
+  AnswerReport({"~OK"});
+
+  EXPECT_EQ(desktop.Boxes.size(), 2u);
+  EXPECT_FALSE(desktop.Ended);
+}
+
+TEST_F(SupportExchange, A_page_that_was_left_and_opened_again_behind_a_box_takes_nothing_over_from_it) {
+  Server();
+  OpenPage();
+  desktop.WhileBoxStands.push_back([&] {
+    LeavePage();
+    ASSERT_TRUE(desktop.Click(menu.lblCaption[0]));
+  });
+
+  GetNumber();
+
+  EXPECT_EQ(ConnectionCount(), 1u);
+  EXPECT_EQ(StateOf(3), foundation::sckClosed);
+  EXPECT_TRUE(program.monitorPage.reporting.main_cmdRpt.Enabled());
+}
+
 TEST_F(SupportExchange, Closing_the_window_in_the_middle_of_an_exchange_ends_the_program_as_usual) {
   Server();
   OpenPage();
