@@ -204,6 +204,7 @@ void LinuxCaptureCore::UpdateBell() {
   if (!MayRing()) {
     watch_.reset();
     pace_.reset();
+    if (HasFailed()) StartPace();
     return;
   }
   if (watch_ != nullptr || pace_ != nullptr) return;
@@ -232,6 +233,8 @@ void LinuxCaptureCore::LookAgain() {
   // A timer doesn't tick inside its own tick, in which a box may come up that stands for long: hence another
   // one each time.
   StartPace();
+  // The interface may have been made again under its name and number before anybody looked.
+  if (HasFailed()) return LinksChanged();
   if (Busy() || secondRingPosted_ || Serve()) return;
   pace_.reset();
   UpdateBell();

@@ -62,6 +62,7 @@ class LinuxCaptureCore : public std::enable_shared_from_this<LinuxCaptureCore> {
   void TakeUpLink();
   void AwaitAddress();
   bool HasSession() const { return session_ != nullptr && !session_->Failed(); }
+  bool HasFailed() const { return session_ != nullptr && session_->Failed(); }
   bool MayRing() const;
   void UpdateBell();
   /// Whether an event is under way that no box or modal form holds up.

@@ -1,6 +1,7 @@
 #include "platform/linux/capture/LinuxCaptureFixture.h"
 
 #include <filesystem>
+#include <net/if.h>
 
 namespace quendra::platform::linux_ {
 
@@ -117,6 +118,24 @@ TEST_F(LinuxCaptureLinksTest, One_that_was_made_again_before_anybody_looked_is_c
   WaitUntil([&] { return !told.empty(); }, "the change");
   EXPECT_EQ(told, (Told{Availability::Available}));
   ExpectFrames();
+}
+
+TEST_F(LinuxCaptureLinksTest, One_that_was_down_and_up_before_anybody_looked_is_captured_from_all_the_same) {
+  RunCommand("ip link set qv0 down && ip link set qv0 up");
+  Settle();
+  ExpectFrames();
+  EXPECT_FALSE(IsGone());
+}
+
+TEST_F(LinuxCaptureLinksTest, One_that_was_made_again_under_its_number_too_is_captured_from_all_the_same) {
+  const std::string number = std::to_string(if_nametoindex("qv0"));
+  Remove();
+  RunCommand("ip link add qv0 index " + number +
+             " type veth peer name qv1 && ip addr add 10.9.0.1/24 dev qv0 && "
+             "ip link set qv0 up && ip link set qv1 up");
+  Settle();
+  ExpectFrames();
+  EXPECT_FALSE(IsGone());
 }
 
 TEST_F(LinuxCaptureLinksTest, One_that_goes_a_second_time_is_told_of_again) {
