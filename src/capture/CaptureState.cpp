@@ -1,14 +1,17 @@
 #include "capture/CaptureState.h"
 
-#include "runtime/Format.h"
+#include "runtime/Text.h"
 
 namespace quendra::capture {
 
 namespace {
 
+Text TwoDigits(std::int32_t number) { return PaddedLeft(DecimalText(number), 2, u'0'); }
+
 /// As in "14:32".
 Text ClockText(std::int32_t secondOfDay) {
-  return Format(secondOfDay / 3600, u"00") + u":" + Format(secondOfDay / 60 % 60, u"00");
+  const std::int32_t minutes = secondOfDay / 60;
+  return TwoDigits(minutes / 60) + u":" + TwoDigits(minutes % 60);
 }
 
 Text GoneText(std::optional<std::int32_t> since) {
