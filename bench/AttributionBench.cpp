@@ -57,7 +57,7 @@ class OfflineCapture : public platform::simulated::SimulatedCapture {
 };
 
 /// Nothing ever waits in the queue of this desktop.
-class QuietDesktop : public forms::HeadlessDesktop {
+class QuietDesktop : public forms::headless::HeadlessDesktop {
  public:
   void DoEvents() override { benchmark::ClobberMemory(); }
 };

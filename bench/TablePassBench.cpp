@@ -124,7 +124,7 @@ void Measure(const Subject& subject, double first, int passes) {
 
 /// The table alone: no window shows it.
 void MeasureTable(int passes) {
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   platform::linux_::LinuxMachine machine(desktop, desktop);
   const platform::Machine operations = machine.Operations();
   monitor::MonitorControls controls;
@@ -148,7 +148,7 @@ void MeasureTable(int passes) {
 
 /// The whole program with its window on the monitor page; painting counts.
 int MeasureProgram(int passes) {
-  forms::QtDesktop desktop("table_pass_bench");
+  forms::qt::QtDesktop desktop("table_pass_bench");
   platform::linux_::LinuxMachine machine(desktop, desktop);
   app::Program program(machine.Operations(), desktop);
   const Subject subject{program.monitorPage.table.main_ListView1,

@@ -21,7 +21,7 @@ namespace {
 constexpr int kMostMilliseconds = 100'000;
 
 struct Download {
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   platform::linux_::ProcFolder folder{"/proc"};
   platform::linux_::LinuxHostNames hostNames{folder};
   platform::linux_::LinuxSockets library{desktop, desktop, hostNames};

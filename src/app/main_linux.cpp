@@ -3,7 +3,7 @@
 #include "platform/linux/LinuxMachine.h"
 
 int main(int argc, char** argv) {
-  quendra::forms::QtDesktop desktop(argc > 0 ? argv[0] : "quendra");
+  quendra::forms::qt::QtDesktop desktop(argc > 0 ? argv[0] : "quendra");
   quendra::platform::linux_::LinuxMachine machine(desktop, desktop);
   quendra::app::Program program(machine.Operations(), desktop);
   return desktop.Run([&] { program.Start(); });

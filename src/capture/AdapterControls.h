@@ -1,7 +1,7 @@
 #pragma once
 
-#include "forms/ComboBox.h"
-#include "forms/Controls.h"
+#include "forms/controls/ComboBox.h"
+#include "forms/controls/Controls.h"
 
 namespace quendra::capture {
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Event.h"
+#include "forms/controls/Event.h"
 #include "platform/capture/Capture.h"
 
 #include <memory>

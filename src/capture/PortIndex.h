@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/ListView.h"
+#include "forms/controls/ListView.h"
 
 #include <vector>
 

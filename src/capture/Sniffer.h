@@ -1,8 +1,8 @@
 #pragma once
 
 #include "capture/OwnAddresses.h"
-#include "forms/Controls.h"
-#include "forms/ListView.h"
+#include "forms/controls/Controls.h"
+#include "forms/controls/ListView.h"
 #include "platform/net/Sockets.h"
 
 #include <functional>

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "forms/Control.h"
+#include "forms/controls/Control.h"
 
 namespace quendra::forms {
 
-class Desktop;
+class FormHost;
 
 enum class BorderStyle { None, FixedSingle, FixedDialog, Sizable };
 
@@ -17,6 +17,9 @@ enum ShiftState : int { kNoShift = 0, kShift = 1, kCtrl = 2, kAlt = 4 };
 class Form : public Container {
  public:
   explicit Form(Text name) : Container(std::move(name)) { Visible = false; }
+
+  /// Nothing: a form stands in no container, visits start with what it holds.
+  void Accept(ControlVisitor& /*visitor*/) override {}
 
   Property<Text, Aspect::Caption> Caption{*this};
   BorderStyle Border = BorderStyle::FixedSingle;
@@ -43,7 +46,7 @@ class Form : public Container {
   bool IsLoaded() const { return loaded_; }
 
  private:
-  friend class Desktop;
+  friend class FormHost;
   bool loaded_ = false;
   bool unloading_ = false;
 };

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "forms/Controls.h"
 #include "forms/Form.h"
+#include "forms/controls/Controls.h"
 #include "runtime/Integers.h"
 
 namespace quendra::forms {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Event.h"
+#include "forms/controls/Event.h"
 #include "foundation/SocketRecord.h"
 #include "foundation/modSocketPlus.h"
 

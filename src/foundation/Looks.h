@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Controls.h"
+#include "forms/controls/Controls.h"
 #include "foundation/Twips.h"
 
 /// Colours and letter sizes that the forms share.

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "forms/Controls.h"
-#include "forms/ListView.h"
+#include "forms/controls/Controls.h"
+#include "forms/controls/ListView.h"
 
 namespace quendra::monitor {
 

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "forms/Desktop.h"
-#include "forms/ListView.h"
+#include "forms/controls/ListView.h"
 #include "monitor/SocketHandleScan.h"
 #include "monitor/TcpOwnerEntry.h"
 #include "monitor/mdlFileInfo.h"

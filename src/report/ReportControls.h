@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Controls.h"
+#include "forms/controls/Controls.h"
 
 namespace quendra::report {
 

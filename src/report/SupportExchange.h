@@ -1,7 +1,7 @@
 #pragma once
 
-#include "forms/Controls.h"
 #include "forms/Desktop.h"
+#include "forms/controls/Controls.h"
 #include "foundation/CSocketPlus.h"
 #include "monitor/ProcessTable.h"
 #include "report/ReportControls.h"

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Control.h"
+#include "forms/controls/Control.h"
 
 #include <array>
 #include <utility>

@@ -47,7 +47,7 @@ struct CaptureProgram : testing::Test {
   static double Download(const forms::ListRow& row) { return row.CellTag(monitor::kDownloadCell).Number(); }
 
   platform::simulated::SimulatedMachine machine;
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   monitor::MonitorControls form;
   AdapterControls adapters{form.frameMain};
   monitor::SystemVersion version{machine.system, desktop};

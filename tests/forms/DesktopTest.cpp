@@ -40,7 +40,7 @@ using Trace = std::vector<std::string>;
 
 struct DesktopTest : testing::Test {
   Trace trace;
-  HeadlessDesktop desktop;
+  headless::HeadlessDesktop desktop;
   TracedForm form{u"frmOne", trace};
   TracedForm other{u"frmTwo", trace};
 };

@@ -358,7 +358,7 @@ TEST_F(SocketFailures, A_handler_that_clears_CancelDisplay_has_the_error_shown_w
   Server.Refuse();
   Object->Connect(1, Text(u"10.1.1.1"), 80);
   Settle();
-  const forms::HeadlessDesktop::Box box{u"Connection refused.", 0, u"CSocketPlus.PostSocket"};
+  const forms::headless::HeadlessDesktop::Box box{u"Connection refused.", 0, u"CSocketPlus.PostSocket"};
   EXPECT_EQ(World.Desktop.Boxes, std::vector{box});
 }
 

@@ -101,7 +101,7 @@ TEST_P(HandlerSuite, A_handler_may_end_the_object_in_Error_even_if_it_asks_for_t
   program->ArrayAdd(1);
   program->Connect(1, Text(u"127.0.0.1"), world->ClosedPort());
   ASSERT_TRUE(world->Until([&] { return ended; }));
-  const forms::HeadlessDesktop::Box box{u"Connection refused.", 0, u"CSocketPlus.PostSocket"};
+  const forms::headless::HeadlessDesktop::Box box{u"Connection refused.", 0, u"CSocketPlus.PostSocket"};
   EXPECT_EQ(world->Desktop.Boxes, std::vector{box});
 }
 

@@ -117,7 +117,7 @@ class RealFarDatagrams : public FarDatagrams {
 
 class RealWorld : public World {
  public:
-  RealWorld() : World(std::make_unique<forms::PolledDesktop>()) {}
+  RealWorld() : World(std::make_unique<forms::headless::PolledDesktop>()) {}
 
   platform::Sockets& Sockets() override { return sockets_; }
   platform::HostNames& Names() override { return names_; }
@@ -136,7 +136,7 @@ class RealWorld : public World {
   }
 
  private:
-  forms::PolledDesktop& desktop_ = static_cast<forms::PolledDesktop&>(Desktop);
+  forms::headless::PolledDesktop& desktop_ = static_cast<forms::headless::PolledDesktop&>(Desktop);
   const platform::linux_::ProcFolder folder_;
   platform::linux_::LinuxHostNames names_{folder_};
   platform::linux_::LinuxSockets sockets_{desktop_, desktop_, names_};

@@ -63,7 +63,7 @@ class SimulatedFarDatagrams : public FarDatagrams {
 
 } // namespace
 
-SimulatedWorld::SimulatedWorld() : World(std::make_unique<forms::HeadlessDesktop>()) {
+SimulatedWorld::SimulatedWorld() : World(std::make_unique<forms::headless::HeadlessDesktop>()) {
   Machine.hostNames.Addresses = {"127.0.0.1"};
   Machine.hostNames.Add("localhost", {"127.0.0.1"});
 }

@@ -44,7 +44,7 @@ class FarDatagrams {
 /// A network that the program's sockets live in: a simulated one, or this machine's loopback.
 class World {
  public:
-  explicit World(std::unique_ptr<forms::HeadlessDesktop> desktop)
+  explicit World(std::unique_ptr<forms::headless::HeadlessDesktop> desktop)
       : desktop_(std::move(desktop)), Desktop(*desktop_) {}
   virtual ~World() = default;
 
@@ -61,10 +61,10 @@ class World {
   virtual void Settle() = 0;
 
  private:
-  std::unique_ptr<forms::HeadlessDesktop> desktop_;
+  std::unique_ptr<forms::headless::HeadlessDesktop> desktop_;
 
  public:
-  forms::HeadlessDesktop& Desktop;
+  forms::headless::HeadlessDesktop& Desktop;
 };
 
 using MakeWorld = std::unique_ptr<World> (*)();

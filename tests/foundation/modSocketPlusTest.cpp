@@ -25,7 +25,7 @@ class SocketModule : public testing::Test {
   }
   platform::simulated::SimulatedSockets& Net() { return Machine.sockets; }
 
-  forms::HeadlessDesktop Desktop;
+  forms::headless::HeadlessDesktop Desktop;
   platform::simulated::SimulatedMachine Machine{Desktop};
   StubbornWindows Windows;
   modSocketPlus Module{Machine.sockets, Machine.hostNames, Desktop, Windows};

@@ -192,7 +192,7 @@ class Exactness : public testing::Test {
   Worker* datagrams = nullptr;
   std::map<std::uint16_t, pid_t> owners;
 
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   std::optional<FrameLedger> ledger;
   std::optional<platform::linux_::LinuxMachine> machine;
   std::optional<app::Program> program;

@@ -17,14 +17,14 @@ namespace {
 constexpr int kBoxStands = 2500;
 
 /// A desktop whose boxes stand for a while before they are answered.
-class HeadlessWithSlowBoxes : public forms::PolledDesktop {
+class HeadlessWithSlowBoxes : public forms::headless::PolledDesktop {
  public:
   HeadlessWithSlowBoxes() {
     OnBox = [this] { WaitFor([] { return false; }, kBoxStands); };
   }
 };
 
-class QtWithSlowBoxes : public forms::QtDesktop {
+class QtWithSlowBoxes : public forms::qt::QtDesktop {
  public:
   QtWithSlowBoxes() : QtDesktop("integration_test") {}
 

@@ -74,7 +74,7 @@ class LostLink : public testing::Test {
   std::optional<LinkedNamespaces> hosts;
   std::optional<Worker> server;
   std::optional<Worker> client;
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   std::optional<platform::linux_::LinuxMachine> machine;
   std::optional<app::Program> program;
 };

@@ -73,7 +73,7 @@ class OtherTraffic : public MonitoredDownload, public testing::WithParamInterfac
     Settle();
   }
 
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   std::vector<Pass> passes{1};
   std::int32_t tick = 0;
   std::chrono::steady_clock::time_point passEnd;

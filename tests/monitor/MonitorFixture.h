@@ -14,7 +14,7 @@ namespace quendra::monitor {
 /// otherwise.
 struct MonitorFixture : testing::Test {
   platform::simulated::SimulatedMachine machine;
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   MonitorControls controls;
   SystemVersion version{machine.system, desktop};
   mdlFileInfo fileInfo{machine.processes, machine.tokens, machine.versionInfo, desktop};

@@ -111,7 +111,7 @@ TEST_F(SocketHandles, The_table_is_asked_for_again_when_handles_were_added_in_be
 
 TEST(SocketHandlesOfABareMachine, A_table_that_fits_in_20_bytes_is_not_looked_at) {
   platform::simulated::SimulatedMachine machine;
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   MonitorControls controls;
   mdlFileInfo fileInfo{machine.processes, machine.tokens, machine.versionInfo, desktop};
   modProcPort procPort{

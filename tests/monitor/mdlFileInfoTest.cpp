@@ -4,7 +4,7 @@ namespace quendra::monitor {
 
 namespace {
 
-using Box = forms::HeadlessDesktop::Box;
+using Box = forms::headless::HeadlessDesktop::Box;
 
 struct Privilege : MonitorFixture {
   /// The one box that stood, which has neither flags nor a title.

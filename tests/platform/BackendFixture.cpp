@@ -62,7 +62,7 @@ class SimulatedBackend : public Backend {
                               .owner = OwnId()});
     return 1026;
   }
-  forms::HeadlessDesktop& Desktop() override { return desktop_; }
+  forms::headless::HeadlessDesktop& Desktop() override { return desktop_; }
   SocketAddress Outside() override {
     // As on loopback: a sender that is faster than its reader has to wait now and then.
     server_.TakeAtMost(100'000);
@@ -82,7 +82,7 @@ class SimulatedBackend : public Backend {
   void Settle() override { desktop_.RunUntilIdle(); }
 
  private:
-  forms::HeadlessDesktop desktop_;
+  forms::headless::HeadlessDesktop desktop_;
   simulated::SimulatedMachine machine_{desktop_};
   simulated::SimulatedServer& server_ = machine_.sockets.Listen("10.1.1.1", 80);
   std::size_t taken_ = 0;
@@ -149,7 +149,7 @@ class LinuxBackend : public Backend {
     Check(sockets_.back());
     return PortOf(socket);
   }
-  forms::HeadlessDesktop& Desktop() override { return loop_; }
+  forms::headless::HeadlessDesktop& Desktop() override { return loop_; }
   SocketAddress Outside() override {
     const std::uint16_t port = Listen();
     Check(fcntl(sockets_.back(), F_SETFL, O_NONBLOCK));
@@ -184,7 +184,7 @@ class LinuxBackend : public Backend {
     return ntohs(address.sin_port);
   }
 
-  forms::PolledDesktop loop_;
+  forms::headless::PolledDesktop loop_;
   linux_::LinuxMachine machine_;
   std::vector<int> sockets_;
 };

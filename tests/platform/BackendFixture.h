@@ -45,7 +45,7 @@ class Backend {
 
   // The network, for the machine's sockets. Their messages go to the desktop's windows.
 
-  virtual forms::HeadlessDesktop& Desktop() = 0;
+  virtual forms::headless::HeadlessDesktop& Desktop() = 0;
   /// Where somebody outside listens.
   virtual SocketAddress Outside() = 0;
   /// The next connection that came there; nullptr while there is none.

@@ -10,7 +10,7 @@
 int main() {
   using namespace quendra;
   platform::simulated::SimulatedMachine machine;
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   app::Program program(machine.Operations(), desktop);
   program.Start();
   std::puts(desktop.Render(program.frmSplash).c_str());

@@ -12,7 +12,7 @@
 namespace quendra::report {
 
 /// A desktop whose boxes stand until what the test has planned for that time has happened.
-class DesktopWithStandingBoxes : public forms::HeadlessDesktop {
+class DesktopWithStandingBoxes : public forms::headless::HeadlessDesktop {
  public:
   /// What happens while the next boxes stand, one step a box.
   std::deque<std::function<void()>> WhileBoxStands;
@@ -31,7 +31,7 @@ class DesktopWithStandingBoxes : public forms::HeadlessDesktop {
 /// A whole program on a network with a support server whose part the test plays.
 class ReportTest : public testing::Test {
  protected:
-  using Box = forms::HeadlessDesktop::Box;
+  using Box = forms::headless::HeadlessDesktop::Box;
   using Boxes = std::vector<Box>;
 
   ReportTest() {
@@ -125,10 +125,10 @@ class ReportTest : public testing::Test {
 
 } // namespace quendra::report
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 inline void PrintTo(const HeadlessDesktop::Box& box, std::ostream* out) {
   *out << '"' << ToUtf8(box.text) << "\" flags " << box.flags << " title \"" << ToUtf8(box.title) << '"';
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

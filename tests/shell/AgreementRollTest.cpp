@@ -44,7 +44,7 @@ class AgreementRollTest : public testing::Test {
     return prints;
   }
 
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   RollForm form;
   AgreementWrap lines;
   AgreementRoll roll{desktop, {form.picOut, form.picBuffer, form.picBackBuffer}, form.ReDrawTimer, lines};

@@ -1,5 +1,5 @@
-#include "forms/FormPlacement.h"
-#include "forms/ListLayout.h"
+#include "forms/view/FormPlacement.h"
+#include "forms/view/ListLayout.h"
 #include "shell/ProgramFixture.h"
 
 #include <functional>

@@ -31,7 +31,7 @@ class ProgramTest : public testing::Test {
   }
 
   platform::simulated::SimulatedMachine machine;
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   app::Program program{machine.Operations(), desktop};
 };
 

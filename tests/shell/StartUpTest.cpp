@@ -12,7 +12,7 @@ class StartUp : public ProgramTest {
 /// Writes down when the load asks for what, in one order with the desktop's calls.
 class RecordingSystem : public platform::System {
  public:
-  RecordingSystem(platform::System& system, forms::HeadlessDesktop& desktop)
+  RecordingSystem(platform::System& system, forms::headless::HeadlessDesktop& desktop)
       : system_(system), desktop_(desktop) {}
   std::uint32_t GetTickCount() override { return system_.GetTickCount(); }
   bool GetVersionExA(platform::OsVersion& version) override {
@@ -25,7 +25,7 @@ class RecordingSystem : public platform::System {
 
  private:
   platform::System& system_;
-  forms::HeadlessDesktop& desktop_;
+  forms::headless::HeadlessDesktop& desktop_;
 };
 
 TEST_F(StartUp, The_main_window_comes_up_without_a_page) {
@@ -214,7 +214,7 @@ TEST_F(StartUp, A_main_window_tagged_not_close_stops_its_monitor_page_all_the_sa
 TEST_F(StartUp, Two_programs_live_side_by_side) {
   platform::simulated::SimulatedMachine otherMachine;
   otherMachine.system.Version = {1, 4, 10};
-  forms::HeadlessDesktop otherDesktop;
+  forms::headless::HeadlessDesktop otherDesktop;
   app::Program other(otherMachine.Operations(), otherDesktop);
   ComeHome();
   other.Start();

@@ -32,7 +32,7 @@ class UnavailableMachineTest : public testing::Test {
 
   platform::unavailable::UnavailableMachine machine;
   platform::simulated::SimulatedMachine other;
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   std::optional<app::Program> program;
 };
 

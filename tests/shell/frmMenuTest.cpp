@@ -1,6 +1,6 @@
 #include "shell/frmMenu.h"
 
-#include "forms/Keyboard.h"
+#include "forms/view/Keyboard.h"
 #include "shell/MenuFixture.h"
 
 namespace quendra::shell {

@@ -1,6 +1,6 @@
 #include "shell/frmSplash.h"
 
-#include "forms/Keyboard.h"
+#include "forms/view/Keyboard.h"
 #include "shell/ProgramFixture.h"
 
 namespace quendra::shell {

@@ -4,7 +4,7 @@
 
 #include <algorithm>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 /// Keeps the alarm of a Timer control in step with its properties.
 class HeadlessDesktop::TimerView : public ControlView {
@@ -31,11 +31,11 @@ class HeadlessDesktop::TimerView : public ControlView {
   std::shared_ptr<Alarm> alarm_;
 };
 
-class HeadlessDesktop::FormView : public ControlView {
+class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
  public:
   FormView(HeadlessDesktop& desktop, Form& form) : desktop_(desktop), form_(&form) {
     form.Attach(this);
-    AddControlsOf(form);
+    for (Control* control : ControlsIn(form)) control->Accept(*this);
   }
   ~FormView() override {
     for (const PictureBox* box : boxes_) desktop_.drawings_.erase(box);
@@ -46,14 +46,15 @@ class HeadlessDesktop::FormView : public ControlView {
   void ControlGone() override { desktop_.Forget(*std::exchange(form_, nullptr)); }
 
  private:
-  void AddControlsOf(Container& container) {
-    for (Control* child : container.Children()) {
-      if (auto* timer = dynamic_cast<Timer*>(child))
-        timers_.push_back(std::make_unique<TimerView>(desktop_, *timer));
-      if (auto* box = dynamic_cast<PictureBox*>(child)) boxes_.push_back(box);
-      if (auto* inner = dynamic_cast<Container*>(child)) AddControlsOf(*inner);
-    }
-  }
+  void Visit(ComboBox& /*combo*/) override {}
+  void Visit(Frame& /*frame*/) override {}
+  void Visit(Image& /*image*/) override {}
+  void Visit(ImageList& /*images*/) override {}
+  void Visit(Label& /*label*/) override {}
+  void Visit(Line& /*line*/) override {}
+  void Visit(ListView& /*list*/) override {}
+  void Visit(PictureBox& box) override { boxes_.push_back(&box); }
+  void Visit(Timer& timer) override { timers_.push_back(std::make_unique<TimerView>(desktop_, timer)); }
 
   HeadlessDesktop& desktop_;
   Form* form_;
@@ -179,4 +180,4 @@ void HeadlessDesktop::ShowView(Form& form, Modality modality, Form* owner) {
   if (modality == Modality::Modal && OnModal) OnModal(form);
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

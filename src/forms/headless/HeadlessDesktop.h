@@ -1,14 +1,14 @@
 #pragma once
 
-#include "forms/ComboBox.h"
 #include "forms/Desktop.h"
-#include "forms/ListView.h"
+#include "forms/controls/ComboBox.h"
+#include "forms/controls/ListView.h"
 #include "forms/headless/HeadlessLoop.h"
 
 #include <map>
 #include <unordered_map>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 /// A desktop without a screen, for tests: boxes answer as scripted, what the program asks for is recorded,
 /// time moves when the test says so, and the user's actions are calls.
@@ -153,4 +153,4 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
       views_; // last: a view that goes drops its drawings
 };
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

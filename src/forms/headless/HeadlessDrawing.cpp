@@ -2,7 +2,7 @@
 
 #include <cstdio>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 namespace {
 
@@ -113,4 +113,4 @@ const std::vector<std::string>& HeadlessDesktop::DrawingOf(const PictureBox& box
   return found == drawings_.end() ? kNothing : found->second;
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

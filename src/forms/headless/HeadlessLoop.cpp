@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <stdexcept>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 std::unique_ptr<platform::EventLoop::Subscription> HeadlessLoop::StartTimer(int milliseconds,
                                                                             std::function<void()> tick) {
@@ -77,4 +77,4 @@ std::shared_ptr<HeadlessLoop::Alarm> HeadlessLoop::NextAlarm(std::int64_t until)
   return next;
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

@@ -6,7 +6,7 @@
 #include <deque>
 #include <vector>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 /// The loop of a program under test, on any system: posted work waits until it is pumped and timers follow a
 /// clock that the test moves. One thread.
@@ -71,4 +71,4 @@ class HeadlessLoop : public platform::EventLoop {
   std::uint64_t sequence_ = 0;
 };
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

@@ -1,6 +1,6 @@
 #include "forms/headless/HeadlessDesktop.h"
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 namespace {
 
@@ -24,26 +24,6 @@ std::string ItemsOf(const ComboBox& combo) {
     items += ToUtf8(combo.List(i));
   }
   return items + "]";
-}
-
-std::string Described(const Control& control) {
-  const std::string name = " " + ToUtf8(control.Name());
-  if (const auto* label = dynamic_cast<const Label*>(&control))
-    return "Label" + name + Quoted(label->Caption) + ColourState(*label);
-  if (const auto* frame = dynamic_cast<const Frame*>(&control))
-    return "Frame" + name + Quoted(frame->Caption);
-  if (const auto* box = dynamic_cast<const PictureBox*>(&control))
-    return "PictureBox" + name + PictureText(box->Contents);
-  if (const auto* image = dynamic_cast<const Image*>(&control))
-    return "Image" + name + PictureText(image->Contents);
-  if (const auto* combo = dynamic_cast<const ComboBox*>(&control)) return "ComboBox" + name + ItemsOf(*combo);
-  if (dynamic_cast<const ListView*>(&control)) return "ListView" + name;
-  if (dynamic_cast<const Line*>(&control)) return "Line" + name;
-  return "Control" + name;
-}
-
-bool HasNoFace(const Control& control) {
-  return dynamic_cast<const Timer*>(&control) || dynamic_cast<const ImageList*>(&control);
 }
 
 std::string HeadersOf(const ListView& list) {
@@ -72,15 +52,42 @@ void AppendTable(std::string& text, const ListView& list, const std::string& mar
   }
 }
 
-void AppendChildren(std::string& text, const Container& container, const std::string& margin) {
-  for (const Control* child : container.Children()) {
-    if (!child->Visible() || HasNoFace(*child)) continue;
-    text += margin + Described(*child) + (child->Enabled() ? "" : " disabled") + "\n";
-    if (const auto* list = dynamic_cast<const ListView*>(child)) AppendTable(text, *list, margin + "  ");
-    if (const auto* inner = dynamic_cast<const Container*>(child))
-      AppendChildren(text, *inner, margin + "  ");
+/// Writes a control and what it holds, each line after a margin.
+class Renderer : public ControlVisitor {
+ public:
+  explicit Renderer(std::string& text) : text_(text) {}
+
+  void RenderIn(const Container& container, const std::string& margin) {
+    for (Control* child : container.Children()) {
+      if (!child->Visible()) continue;
+      margin_ = margin;
+      child->Accept(*this);
+      if (const Container* inner = child->AsContainer()) RenderIn(*inner, margin + "  ");
+    }
   }
-}
+
+  void Visit(ComboBox& combo) override { Write("ComboBox", combo, ItemsOf(combo)); }
+  void Visit(Frame& frame) override { Write("Frame", frame, Quoted(frame.Caption)); }
+  void Visit(Image& image) override { Write("Image", image, PictureText(image.Contents)); }
+  void Visit(ImageList& /*images*/) override {}
+  void Visit(Label& label) override { Write("Label", label, Quoted(label.Caption) + ColourState(label)); }
+  void Visit(Line& line) override { Write("Line", line); }
+  void Visit(ListView& list) override {
+    Write("ListView", list);
+    AppendTable(text_, list, margin_ + "  ");
+  }
+  void Visit(PictureBox& box) override { Write("PictureBox", box, PictureText(box.Contents)); }
+  void Visit(Timer& /*timer*/) override {}
+
+ private:
+  void Write(const char* kind, const Control& control, const std::string& state = {}) {
+    text_ +=
+        margin_ + kind + " " + ToUtf8(control.Name()) + state + (control.Enabled() ? "" : " disabled") + "\n";
+  }
+
+  std::string& text_;
+  std::string margin_;
+};
 
 } // namespace
 
@@ -88,8 +95,8 @@ std::string HeadlessDesktop::Render(Form& form) const {
   std::string text = "Form " + ToUtf8(form.Name()) + Quoted(form.Caption);
   if (!form.Visible()) return text + " hidden\n";
   text += "\n";
-  AppendChildren(text, form, "  ");
+  Renderer(text).RenderIn(form, "  ");
   return text;
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

@@ -1,7 +1,7 @@
-#include "forms/Keyboard.h"
 #include "forms/headless/HeadlessDesktop.h"
+#include "forms/view/Keyboard.h"
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 bool HeadlessDesktop::Act(Control& control, const std::function<void()>& action) {
   if (Ended || !control.IsUsable()) return false;
@@ -69,4 +69,4 @@ bool HeadlessDesktop::Deactivate(Form& form) {
   });
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

@@ -6,7 +6,7 @@
 #include <QImageReader>
 #include <QScreen>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 namespace {
 
@@ -32,11 +32,11 @@ std::unique_ptr<QApplication> MakeApplication(int& argc, char** argv) {
 QtDesktop::QtDesktop(std::string programName)
     : programName_(std::move(programName)), arguments_{programName_.data(), nullptr},
       application_(MakeApplication(argumentCount_, arguments_.data())),
-      dispatcher_([](const Text& text) { qt::ShowBox(FrontWindow(), text, kCritical, u"Quendra"); }),
+      dispatcher_([](const Text& text) { ShowBox(FrontWindow(), text, kCritical, u"Quendra"); }),
       mouse_(dispatcher_), keys_(dispatcher_), context_{*this, dispatcher_, scale_, pictures_, mouse_},
       drawing_(scale_), loop_(dispatcher_) {
-  qt::DressApplication(*qApp);
-  qt::InstallAccessibility();
+  DressApplication(*qApp);
+  InstallAccessibility();
   const QScreen* screen = QGuiApplication::primaryScreen();
   scale_ = {1440 / screen->logicalDotsPerInchX(), 1440 / screen->logicalDotsPerInchY()};
   constexpr int kMostImageMegabytes = 32;
@@ -66,13 +66,13 @@ QWidget* QtDesktop::FrontWindow() {
   if (QWidget* active = QApplication::activeWindow()) return active;
   // Without a window manager no window is the active one.
   for (QWidget* window : QApplication::topLevelWidgets())
-    if (window->isVisible() && dynamic_cast<qt::FormView*>(window)) return window;
+    if (window->isVisible() && dynamic_cast<FormView*>(window)) return window;
   return nullptr;
 }
 
 int QtDesktop::MessageBox(const Text& text, int flags, const Text& title) {
   const Standing box(*this);
-  const int answer = qt::ShowBox(FrontWindow(), text, flags, title);
+  const int answer = ShowBox(FrontWindow(), text, flags, title);
   dispatcher_.UnwindIfEnded();
   return answer;
 }
@@ -87,11 +87,11 @@ void QtDesktop::SetCursor(CursorHandle cursor) {
 }
 
 WindowHandle QtDesktop::HandleOf(Form& form) {
-  const qt::FormView* view = ViewOf(form);
+  const FormView* view = ViewOf(form);
   return view ? view->Handle() : kNoWindow;
 }
 
-qt::FormView* QtDesktop::ViewOf(WindowHandle window) const {
+FormView* QtDesktop::ViewOf(WindowHandle window) const {
   const auto found = windows_.find(window);
   return found == windows_.end() ? nullptr : found->second;
 }
@@ -100,7 +100,7 @@ std::int32_t QtDesktop::SendMessage(WindowHandle window, std::uint32_t message, 
                                     std::uint32_t /*lParam*/) {
   constexpr std::uint32_t kNonClientLeftButtonDown = 0xA1;
   constexpr std::uint32_t kCaption = 2;
-  qt::FormView* view = ViewOf(window);
+  FormView* view = ViewOf(window);
   if (!view || message != kNonClientLeftButtonDown || wParam != kCaption) return 0;
   mouse_.DragWindow(*view);
   return 0;
@@ -114,7 +114,7 @@ RegionHandle QtDesktop::CreateRoundRectRgn(int left, int top, int right, int bot
 }
 
 void QtDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) {
-  qt::FormView* view = ViewOf(window);
+  FormView* view = ViewOf(window);
   if (!view) return;
   // A window owns the region that it was given, so the handle ends here; none takes the shape away.
   const auto found = regions_.extract(region);
@@ -123,16 +123,16 @@ void QtDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, bool redr
 }
 
 void QtDesktop::CreateView(Form& form) {
-  auto* view = new qt::FormView(context_, form, WindowHandle(++lastWindow_));
+  auto* view = new FormView(context_, form, WindowHandle(++lastWindow_));
   windows_[view->Handle()] = view;
   form.Attach(view);
 }
 
 void QtDesktop::DestroyView(Form& form) {
-  if (qt::FormView* view = ViewOf(form)) Close(*view);
+  if (FormView* view = ViewOf(form)) Close(*view);
 }
 
-void QtDesktop::Close(qt::FormView& view) {
+void QtDesktop::Close(FormView& view) {
   windows_.erase(view.Handle());
   view.Release();
   // Later: an event of this window may be what led here.
@@ -140,7 +140,7 @@ void QtDesktop::Close(qt::FormView& view) {
 }
 
 void QtDesktop::ShowView(Form& form, Modality modality, Form* owner) {
-  qt::FormView* view = ViewOf(form);
+  FormView* view = ViewOf(form);
   if (!view) return;
   QWidget* over = owner ? ViewOf(*owner) : nullptr;
   if (modality == Modality::Modeless) return view->ShowOver(over);
@@ -155,4 +155,4 @@ void QtDesktop::LastFormGone() {
   });
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -14,7 +14,7 @@
 #include <map>
 #include <string>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 /// The desktop of the Linux edition. Its window toolkit is Qt 6 Widgets.
 class QtDesktop : public Desktop, public platform::EventLoop, public platform::DescriptorWatch {
@@ -91,29 +91,29 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   void LastFormGone() override;
 
  private:
-  void Close(qt::FormView& view);
+  void Close(FormView& view);
   /// The window that a box stands over, nullptr for none.
   static QWidget* FrontWindow();
-  qt::FormView* ViewOf(WindowHandle window) const;
-  static qt::FormView* ViewOf(const Form& form) { return static_cast<qt::FormView*>(form.View()); }
+  FormView* ViewOf(WindowHandle window) const;
+  static FormView* ViewOf(const Form& form) { return static_cast<FormView*>(form.View()); }
 
   // The toolkit keeps pointers to all three.
   std::string programName_;
   std::array<char*, 2> arguments_{};
   int argumentCount_ = 1;
   std::unique_ptr<QApplication> application_;
-  qt::Dispatcher dispatcher_;
-  qt::Scale scale_; ///< the screen's
-  qt::PictureStore pictures_;
-  qt::MouseEvents mouse_;
-  qt::KeyEvents keys_;
-  qt::ViewContext context_;
-  qt::QtDrawing drawing_;
-  qt::QtEventLoop loop_;
-  std::map<WindowHandle, qt::FormView*> windows_;
+  Dispatcher dispatcher_;
+  Scale scale_; ///< the screen's
+  PictureStore pictures_;
+  MouseEvents mouse_;
+  KeyEvents keys_;
+  ViewContext context_;
+  QtDrawing drawing_;
+  QtEventLoop loop_;
+  std::map<WindowHandle, FormView*> windows_;
   std::uint32_t lastWindow_ = 0;
-  std::map<RegionHandle, qt::RoundRect> regions_;
+  std::map<RegionHandle, RoundRect> regions_;
   std::uint32_t lastRegion_ = 0;
 };
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -3,7 +3,7 @@
 #include <QAbstractItemView>
 #include <QAccessible>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 class Accessibility : public QtFixture {
  protected:
@@ -151,4 +151,4 @@ TEST_F(Accessibility, A_table_gives_its_rows_and_headers) {
       QStringLiteral("קצב העלאה"));
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -7,7 +7,7 @@
 #include <QScrollBar>
 #include <QTimer>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 /// How message boxes lie on the screen, whatever their text.
 class Boxes : public QtFixture {
@@ -122,4 +122,4 @@ TEST_F(Boxes, Give_the_focus_to_their_button_and_not_to_the_text) {
   EXPECT_TRUE(Show(Text(500, u'\n')).buttonHasFocus);
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -4,7 +4,7 @@
 
 #include <QBuffer>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 namespace {
 
@@ -274,4 +274,4 @@ TEST_F(Drawing, A_picture_with_fewer_pixels_than_it_says_is_no_picture) {
   EXPECT_TRUE(pictures.PixmapOf(Picture::Of({-1, 2, {1, 2, 3}})).isNull());
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -7,7 +7,7 @@
 
 #include <unistd.h>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 namespace {
 
@@ -227,4 +227,4 @@ TEST_F(EventLoop, A_subscription_may_outlive_its_desktop) {
   timer.reset();
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -9,7 +9,7 @@
 
 #include <cmath>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 /// A form without a frame that the screen shows at four fifths: five quarters as wide as the screen.
 class FormOnSmallScreen : public QtFixture {
@@ -284,4 +284,4 @@ TEST_F(FormOnSmallScreen, Brings_what_the_Tab_key_finds_into_view) {
   EXPECT_TRUE(WidgetOf(form).rect().contains(WidgetOf(far).mapTo(&WidgetOf(form), QPoint(1, 1))));
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

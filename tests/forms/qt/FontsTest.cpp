@@ -7,7 +7,7 @@
 #include <QTemporaryDir>
 #include <QTextLayout>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 namespace {
 
@@ -113,4 +113,4 @@ TEST_F(Fonts, A_system_with_fonts_for_both_scripts_keeps_its_own) {
   EXPECT_EQ(Styles("Noto Sans Hebrew"), kRegular);
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -5,7 +5,7 @@
 #include <QKeyEvent>
 #include <QTreeView>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 class Keyboard : public QtFixture {
  protected:
@@ -359,4 +359,4 @@ TEST_F(Keyboard, A_form_where_nothing_takes_the_focus_comes_up_all_the_same) {
   EXPECT_FALSE(WidgetOf(first).hasFocus());
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -2,7 +2,7 @@
 
 #include <QAccessible>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 /// Labels that act as buttons: what they look like, and when they can't be pressed.
 class LabelButton : public QtFixture {
@@ -168,4 +168,4 @@ TEST_F(LinkRing, Has_its_room_also_when_a_label_becomes_a_link_later) {
   EXPECT_EQ(WidgetOf(button).geometry(), asLink);
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

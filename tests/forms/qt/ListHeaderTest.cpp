@@ -3,7 +3,7 @@
 #include <QHeaderView>
 #include <QTreeView>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 class Header : public QtFixture {
  protected:
@@ -43,4 +43,4 @@ TEST_F(Header, In_a_form_that_reads_from_left_to_right_it_does_so_too) {
   EXPECT_EQ(clicked, (std::vector{1, 2, 3}));
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -7,7 +7,7 @@
 #include <QScrollBar>
 #include <QTreeView>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 class TableView : public QtFixture {
  protected:
@@ -335,4 +335,4 @@ TEST_F(TableView, A_row_of_5000_that_changes_out_of_sight_paints_nothing) {
   EXPECT_EQ(paints, 0);
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -1,6 +1,6 @@
 #include "forms/qt/QtFixture.h"
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 class Mouse : public QtFixture {
  protected:
@@ -195,4 +195,4 @@ TEST_F(Mouse, A_click_that_unloads_its_own_form_does_no_harm) {
   EXPECT_FALSE(form.IsLoaded());
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

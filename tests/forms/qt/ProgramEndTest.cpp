@@ -4,7 +4,7 @@
 
 #include <QMessageBox>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 class ProgramEnd : public QtFixture {
  protected:
@@ -277,4 +277,4 @@ TEST_F(ProgramEnd, The_end_behind_a_message_box_unwinds_its_caller) {
   EXPECT_FALSE(wentOn);
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -8,7 +8,7 @@
 
 #include <memory>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 namespace {
 
@@ -101,4 +101,4 @@ void QtFixture::AnswerBox(Box& answered) {
   });
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

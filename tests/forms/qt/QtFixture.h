@@ -1,8 +1,8 @@
 #pragma once
 
-#include "forms/ComboBox.h"
-#include "forms/Controls.h"
-#include "forms/ListView.h"
+#include "forms/controls/ComboBox.h"
+#include "forms/controls/Controls.h"
+#include "forms/controls/ListView.h"
 #include "forms/qt/QtDesktop.h"
 
 #include <gtest/gtest.h>
@@ -10,7 +10,7 @@
 #include <QImage>
 #include <QWidget>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 /// A form of 400 by 300 pixels, at 96 DPI 15 twips each, whose handlers are told by the test.
 struct TestForm : Form {
@@ -77,4 +77,4 @@ class QtFixture : public testing::Test {
 
 inline constexpr int kPixel = 15;
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -2,7 +2,7 @@
 
 #include <QComboBox>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 class Views : public QtFixture {};
 
@@ -274,4 +274,4 @@ TEST_F(Views, A_form_can_go_before_its_desktop_without_having_been_unloaded) {
   for (const QWidget* window : QApplication::topLevelWidgets()) EXPECT_FALSE(window->isVisible());
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -4,7 +4,7 @@
 
 #include <cstdlib>
 
-namespace quendra::forms {
+namespace quendra::forms::qt {
 
 class Window : public QtFixture {};
 
@@ -146,4 +146,4 @@ TEST_F(Window, A_form_can_be_shown_again_after_it_was_unloaded) {
   EXPECT_NE(label.View(), nullptr);
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::qt

@@ -123,7 +123,7 @@ TEST(LinuxShellStartTest, Signs_that_a_shell_would_understand_are_plain_words) {
 }
 
 struct LinuxMachineTest : testing::Test {
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   LinuxMachine machine{desktop, desktop};
   Machine operations = machine.Operations();
 };
@@ -160,7 +160,7 @@ TEST_F(LinuxMachineTest, A_user_without_rights_gets_snapshot_table_and_host_addr
   if (::geteuid() != 0) GTEST_SKIP() << "needs the administrator to become another user";
   const Child user([] {
     if (::setgid(65534) != 0 || ::setuid(65534) != 0) return std::string("no other user");
-    forms::PolledDesktop loop;
+    forms::headless::PolledDesktop loop;
     LinuxMachine limited(loop, loop);
     const Machine machine = limited.Operations();
     std::string text;

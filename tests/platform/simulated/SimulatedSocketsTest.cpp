@@ -45,7 +45,7 @@ class SimulatedSocketsTest : public testing::Test {
     return std::to_string(socket.Value()) + " " + std::to_string(event) + " " + std::to_string(error);
   }
 
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   SimulatedMachine machine{desktop};
   SimulatedSockets& net = machine.sockets;
   SimulatedServer& server = net.Listen("10.1.1.1", 80);
@@ -185,7 +185,7 @@ TEST(SimulatedSocketsWithoutALoop, Any_handle_is_taken_and_the_library_starts_an
 }
 
 TEST(SimulatedSocketsWithoutALoop, Work_that_waits_in_the_loop_outlives_the_machine) {
-  forms::HeadlessDesktop desktop;
+  forms::headless::HeadlessDesktop desktop;
   {
     SimulatedMachine machine(desktop);
     machine.sockets.WSAStartup(257);

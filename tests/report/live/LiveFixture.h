@@ -95,7 +95,7 @@ class LiveReportTest : public testing::Test {
  protected:
   std::string folder;
   std::string bodySent;
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   std::unique_ptr<platform::linux_::LinuxMachine> machine;
   std::unique_ptr<app::Program> program;
 };

@@ -5,7 +5,7 @@
 #include <algorithm>
 #include <chrono>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 void PolledDesktop::Post(std::function<void()> work) {
   const std::lock_guard guard(arrivedLock_);
@@ -57,4 +57,4 @@ bool PolledDesktop::PumpDescriptors(int realMilliseconds) {
   return any;
 }
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

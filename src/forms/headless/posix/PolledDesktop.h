@@ -5,7 +5,7 @@
 
 #include <mutex>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 
 /// A headless desktop over a real machine, on systems with descriptors: it also watches descriptors, takes
 /// what other threads post and can let real time pass.
@@ -37,4 +37,4 @@ class PolledDesktop : public HeadlessDesktop, public platform::DescriptorWatch {
   std::vector<std::weak_ptr<Watch>> watches_;
 };
 
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "forms/Colour.h"
-#include "forms/Control.h"
-#include "forms/Controls.h"
+#include "forms/controls/Colour.h"
+#include "forms/controls/Control.h"
+#include "forms/controls/Controls.h"
 #include "runtime/Text.h"
 
 #include <QColor>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Picture.h"
+#include "forms/controls/Picture.h"
 
 #include <QPixmap>
 

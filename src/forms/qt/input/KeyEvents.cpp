@@ -1,8 +1,8 @@
 #include "forms/qt/input/KeyEvents.h"
 
-#include "forms/Keyboard.h"
 #include "forms/qt/input/MouseEvents.h"
 #include "forms/qt/views/FormView.h"
+#include "forms/view/Keyboard.h"
 
 #include <QCoreApplication>
 #include <QKeyEvent>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/ComboBox.h"
+#include "forms/controls/ComboBox.h"
 #include "forms/qt/views/WidgetView.h"
 
 #include <QComboBox>

@@ -1,8 +1,8 @@
 #include "forms/qt/views/FormView.h"
 
-#include "forms/Keyboard.h"
 #include "forms/qt/views/FrameView.h"
 #include "forms/qt/views/ViewFactory.h"
+#include "forms/view/Keyboard.h"
 
 #include <QCloseEvent>
 #include <QEventLoop>

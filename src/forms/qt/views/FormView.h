@@ -1,8 +1,8 @@
 #pragma once
 
-#include "forms/FormPlacement.h"
 #include "forms/qt/drawing/Shapes.h"
 #include "forms/qt/views/WidgetView.h"
+#include "forms/view/FormPlacement.h"
 
 #include <QScrollArea>
 

@@ -1,10 +1,10 @@
 #include "forms/qt/views/ListViewView.h"
 
-#include "forms/ListLayout.h"
 #include "forms/qt/drawing/Palette.h"
 #include "forms/qt/input/MouseEvents.h"
 #include "forms/qt/views/ListDelegate.h"
 #include "forms/qt/views/ListHeader.h"
+#include "forms/view/ListLayout.h"
 
 #include <QKeyEvent>
 #include <QPainter>

@@ -13,28 +13,38 @@ namespace quendra::forms::qt {
 
 namespace {
 
-template <typename Kind, typename KindView>
-bool MakeIf(ViewContext& context, Control& control, QWidget& parent, MadeView& made) {
-  auto* kind = dynamic_cast<Kind*>(&control);
-  if (!kind) return false;
-  auto* view = new KindView(context, *kind, &parent);
-  made = {view, view};
-  return true;
-}
+/// Makes the view of the control that it visits.
+class ViewMaker : public ControlVisitor {
+ public:
+  ViewMaker(ViewContext& context, QWidget& parent) : context_(context), parent_(parent) {}
+  MadeView Made;
+
+  void Visit(ComboBox& combo) override { Make<ComboBoxView>(combo); }
+  void Visit(Frame& frame) override { Make<FrameView>(frame); }
+  void Visit(Image& image) override { Make<ImageView>(image); }
+  void Visit(ImageList& /*images*/) override {} // lists show its pictures
+  void Visit(Label& label) override { Make<LabelView>(label); }
+  void Visit(Line& line) override { Make<LineView>(line); }
+  void Visit(ListView& list) override { Make<ListViewView>(list); }
+  void Visit(PictureBox& box) override { Make<PictureBoxView>(box); }
+  void Visit(Timer& timer) override { Made = {new TimerView(context_, timer), nullptr}; }
+
+ private:
+  template <typename KindView, typename Kind> void Make(Kind& control) {
+    auto* view = new KindView(context_, control, &parent_);
+    Made = {view, view};
+  }
+
+  ViewContext& context_;
+  QWidget& parent_;
+};
 
 } // namespace
 
 MadeView MakeView(ViewContext& context, Control& control, QWidget& parent) {
-  MadeView made;
-  if (auto* timer = dynamic_cast<Timer*>(&control)) return {new TimerView(context, *timer), nullptr};
-  static_cast<void>(MakeIf<Label, LabelView>(context, control, parent, made) ||
-                    MakeIf<Frame, FrameView>(context, control, parent, made) ||
-                    MakeIf<Line, LineView>(context, control, parent, made) ||
-                    MakeIf<Image, ImageView>(context, control, parent, made) ||
-                    MakeIf<PictureBox, PictureBoxView>(context, control, parent, made) ||
-                    MakeIf<ComboBox, ComboBoxView>(context, control, parent, made) ||
-                    MakeIf<ListView, ListViewView>(context, control, parent, made));
-  return made;
+  ViewMaker maker(context, parent);
+  control.Accept(maker);
+  return maker.Made;
 }
 
 } // namespace quendra::forms::qt

@@ -6,7 +6,7 @@
 
 #include <thread>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 namespace {
 
 struct PolledDesktopTest : testing::Test {
@@ -90,4 +90,4 @@ TEST_F(PolledDesktopTest, A_descriptor_that_can_be_read_is_served_after_what_was
 }
 
 } // namespace
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

@@ -41,7 +41,7 @@ class LinuxCaptureFixture : public testing::Test {
   }
 
   std::unique_ptr<integration::NetworkNamespace> network;
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   std::optional<LinuxCapture> capture;
   std::int32_t lastIndex = -1; ///< as VBPcapInit told
   std::unique_ptr<CaptureControl> control;

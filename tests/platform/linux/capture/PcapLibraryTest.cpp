@@ -16,7 +16,7 @@ constexpr const char* kOtherLibrary[] = {"libc.so.6"};
 struct CaptureOver {
   explicit CaptureOver(std::span<const char* const> names) : capture(desktop, desktop, PcapLibrary(names)) {}
 
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   LinuxCapture capture;
 };
 

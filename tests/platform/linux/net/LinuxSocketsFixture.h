@@ -96,7 +96,7 @@ class LinuxSocketsTest : public testing::Test {
   int LastError() { return sockets.WSAGetLastError(); }
 
  private:
-  forms::PolledDesktop desktop_;
+  forms::headless::PolledDesktop desktop_;
   forms::WindowHandle window_;
   const ProcFolder folder_;
   LinuxHostNames hostNames_{folder_};

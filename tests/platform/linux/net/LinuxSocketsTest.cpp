@@ -356,7 +356,7 @@ TEST_F(LinuxSocketsTest, A_look_up_that_is_cancelled_tells_nothing_and_can_not_b
 
 TEST_F(LinuxSocketsTest, The_sockets_may_go_while_look_ups_run) {
   std::array<std::uint8_t, 64> buffer{};
-  forms::PolledDesktop desktop;
+  forms::headless::PolledDesktop desktop;
   const ProcFolder folder;
   LinuxHostNames hostNames(folder);
   for (int round = 0; round < 20; ++round) {

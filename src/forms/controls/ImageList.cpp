@@ -1,4 +1,4 @@
-#include "forms/ImageList.h"
+#include "forms/controls/ImageList.h"
 
 #include "runtime/Fault.h"
 

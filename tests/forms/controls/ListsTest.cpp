@@ -1,6 +1,6 @@
 #include "RecordingViewFixture.h"
-#include "forms/ComboBox.h"
-#include "forms/ImageList.h"
+#include "forms/controls/ComboBox.h"
+#include "forms/controls/ImageList.h"
 #include "runtime/Fault.h"
 
 #include <gtest/gtest.h>

@@ -1,10 +1,10 @@
-#include "forms/Desktop.h"
+#include "forms/FormHost.h"
 
 #include <optional>
 
 namespace quendra::forms {
 
-void Desktop::Load(Form& form) {
+void FormHost::Load(Form& form) {
   if (form.loaded_) return;
   form.loaded_ = true;
   ++loadedForms_;
@@ -15,7 +15,7 @@ void Desktop::Load(Form& form) {
   form.Form_Load();
 }
 
-void Desktop::Show(Form& form, Modality modality, Form* owner) {
+void FormHost::Show(Form& form, Modality modality, Form* owner) {
   Load(form);
   form.Visible = true;
   std::optional<Standing> standing;
@@ -23,7 +23,7 @@ void Desktop::Show(Form& form, Modality modality, Form* owner) {
   ShowView(form, modality, owner);
 }
 
-void Desktop::Unload(Form& form) {
+void FormHost::Unload(Form& form) {
   if (!form.loaded_ || form.unloading_) return;
   form.unloading_ = true;
   try {

@@ -1,4 +1,4 @@
-#include "forms/ListView.h"
+#include "forms/controls/ListView.h"
 
 #include "runtime/Fault.h"
 

@@ -1,23 +1,11 @@
-#include "forms/Keyboard.h"
+#include "forms/view/Keyboard.h"
 
 #include <algorithm>
 
 namespace quendra::forms {
 
-namespace {
-
-void AddChildren(const Container& container, std::vector<Control*>& controls) {
-  for (Control* child : container.Children()) {
-    controls.push_back(child);
-    if (const auto* inner = dynamic_cast<const Container*>(child)) AddChildren(*inner, controls);
-  }
-}
-
-} // namespace
-
 std::vector<Control*> TabOrder(const Form& form) {
-  std::vector<Control*> controls;
-  AddChildren(form, controls);
+  std::vector<Control*> controls = ControlsIn(form);
   std::stable_sort(controls.begin(), controls.end(), [](const Control* left, const Control* right) {
     return left->TabIndex < right->TabIndex;
   });

@@ -4,7 +4,7 @@
 
 #include <gtest/gtest.h>
 
-namespace quendra::forms {
+namespace quendra::forms::headless {
 namespace {
 
 struct MainForm : Form {
@@ -491,4 +491,4 @@ TEST_F(HeadlessDesktopTest, A_form_is_rendered_as_text_without_what_is_hidden) {
 }
 
 } // namespace
-} // namespace quendra::forms
+} // namespace quendra::forms::headless

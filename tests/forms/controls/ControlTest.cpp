@@ -1,6 +1,6 @@
 #include "RecordingViewFixture.h"
-#include "forms/Controls.h"
 #include "forms/Form.h"
+#include "forms/controls/Controls.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "forms/FormPlacement.h"
+#include "forms/view/FormPlacement.h"
 
 #include <gtest/gtest.h>
 

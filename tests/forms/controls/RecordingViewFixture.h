@@ -1,7 +1,7 @@
 #pragma once
 
 #include "forms/Form.h"
-#include "forms/ListView.h"
+#include "forms/controls/ListView.h"
 
 #include <string>
 #include <vector>

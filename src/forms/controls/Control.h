@@ -1,8 +1,9 @@
 #pragma once
 
-#include "forms/Colour.h"
-#include "forms/Event.h"
-#include "forms/Property.h"
+#include "forms/controls/Colour.h"
+#include "forms/controls/ControlVisitor.h"
+#include "forms/controls/Event.h"
+#include "forms/controls/Property.h"
 #include "runtime/Text.h"
 
 #include <vector>
@@ -86,6 +87,10 @@ class Control {
   bool IsShown() const;
   /// There for the user: shown and enabled, itself and with all its containers.
   bool IsUsable() const;
+  /// Has the visitor's operation for this kind called.
+  virtual void Accept(ControlVisitor& visitor) = 0;
+  /// nullptr for a kind that holds no others.
+  virtual const Container* AsContainer() const { return nullptr; }
   /// Of a kind that the keyboard works on.
   virtual bool TakesFocus() const { return false; }
   void Move(int left, int top, int width, int height) { Position = Geometry{left, top, width, height}; }
@@ -112,11 +117,15 @@ class Control {
 class Container : public Control {
  public:
   using Control::Control;
+  const Container* AsContainer() const override { return this; }
   const std::vector<Control*>& Children() const { return children_; }
 
  private:
   friend class Control;
   std::vector<Control*> children_;
 };
+
+/// All controls in a container and in those inside it, each before what it holds.
+std::vector<Control*> ControlsIn(const Container& container);
 
 } // namespace quendra::forms

@@ -1,4 +1,4 @@
-#include "forms/ComboBox.h"
+#include "forms/controls/ComboBox.h"
 
 #include "runtime/Fault.h"
 

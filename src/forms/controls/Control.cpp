@@ -1,4 +1,4 @@
-#include "forms/Control.h"
+#include "forms/controls/Control.h"
 
 #include "forms/Form.h"
 
@@ -57,6 +57,23 @@ void Control::Attach(ControlView* view) {
   view_ = view;
   if (view_) view_->control_ = this;
   TellChanged(*this, Aspect::All);
+}
+
+namespace {
+
+void AddControlsIn(const Container& container, std::vector<Control*>& controls) {
+  for (Control* child : container.Children()) {
+    controls.push_back(child);
+    if (const Container* inner = child->AsContainer()) AddControlsIn(*inner, controls);
+  }
+}
+
+} // namespace
+
+std::vector<Control*> ControlsIn(const Container& container) {
+  std::vector<Control*> controls;
+  AddControlsIn(container, controls);
+  return controls;
 }
 
 } // namespace quendra::forms

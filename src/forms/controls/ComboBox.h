@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Control.h"
+#include "forms/controls/Control.h"
 
 namespace quendra::forms {
 
@@ -8,6 +8,7 @@ namespace quendra::forms {
 class ComboBox : public Control {
  public:
   using Control::Control;
+  void Accept(ControlVisitor& visitor) override { visitor.Visit(*this); }
   bool TakesFocus() const override { return true; }
 
   void Clear();

@@ -1,4 +1,4 @@
-#include "forms/ListLayout.h"
+#include "forms/view/ListLayout.h"
 
 #include <algorithm>
 #include <cstdint>

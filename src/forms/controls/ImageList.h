@@ -1,7 +1,7 @@
 #pragma once
 
-#include "forms/Control.h"
-#include "forms/Picture.h"
+#include "forms/controls/Control.h"
+#include "forms/controls/Picture.h"
 
 #include <unordered_map>
 
@@ -11,6 +11,7 @@ namespace quendra::forms {
 class ImageList : public Control {
  public:
   using Control::Control;
+  void Accept(ControlVisitor& visitor) override { visitor.Visit(*this); }
 
   struct ListImage {
     Picture picture;

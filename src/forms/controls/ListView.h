@@ -1,8 +1,8 @@
 #pragma once
 
-#include "forms/Control.h"
-#include "forms/Controls.h"
-#include "forms/ImageList.h"
+#include "forms/controls/Alignment.h"
+#include "forms/controls/Control.h"
+#include "forms/controls/ImageList.h"
 #include "runtime/Variant.h"
 
 #include <memory>
@@ -86,6 +86,7 @@ class ListViewObserver {
 class ListView : public Control {
  public:
   using Control::Control;
+  void Accept(ControlVisitor& visitor) override { visitor.Visit(*this); }
   bool TakesFocus() const override { return true; }
 
   void ClearColumns();

@@ -1,4 +1,4 @@
-#include "forms/Keyboard.h"
+#include "forms/view/Keyboard.h"
 
 #include "forms/headless/HeadlessDesktop.h"
 
@@ -32,7 +32,7 @@ struct FormKeys : testing::Test {
     desktop.Show(form);
   }
 
-  HeadlessDesktop desktop;
+  headless::HeadlessDesktop desktop;
   DialogForm form;
 };
 

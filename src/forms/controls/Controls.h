@@ -1,0 +1,12 @@
+#pragma once
+
+// All kinds of controls, for those who lay them out.
+#include "forms/controls/ComboBox.h"
+#include "forms/controls/Frame.h"
+#include "forms/controls/Image.h"
+#include "forms/controls/ImageList.h"
+#include "forms/controls/Label.h"
+#include "forms/controls/Line.h"
+#include "forms/controls/ListView.h"
+#include "forms/controls/PictureBox.h"
+#include "forms/controls/Timer.h"
