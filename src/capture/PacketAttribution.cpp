@@ -11,16 +11,16 @@ namespace quendra::capture {
 
 namespace {} // namespace
 
-PacketAttribution::PacketAttribution(platform::CaptureLibrary& library, forms::Desktop& desktop,
+PacketAttribution::PacketAttribution(platform::CaptureLibrary& library, forms::MessageLoop& loop,
                                      PacketControl& control, const OwnAddresses& addresses,
                                      monitor::ProcessTable& table)
-    : library_(library), desktop_(desktop), control_(control), addresses_(addresses), table_(table),
+    : library_(library), loop_(loop), control_(control), addresses_(addresses), table_(table),
       ports_(table.List()) {
   control_.vpacket_PacketReceived = [this] { vpacket_PacketReceived(); };
 }
 
 void PacketAttribution::vpacket_PacketReceived() {
-  desktop_.DoEvents();
+  loop_.DoEvents();
   if (!table_.PageIsOpen()) return;
   const std::optional<int> newest = PeekProtocol();
   if (newest == kTcp || newest == kGre) Drain(newest == kGre);
@@ -48,7 +48,7 @@ void PacketAttribution::Drain(bool tunnelled) {
   platform::CaptureHeader header{};
   std::int32_t n = 1;
   while (n > 0) {
-    desktop_.DoEvents();
+    loop_.DoEvents();
     n = library_.vpCapture(frame, header);
     const Verdict verdict = Decode(frame, decoders, tunnelled);
     if (verdict == Verdict::Malformed) return;

@@ -7,7 +7,7 @@
 #include "capture/clsEthernet.h"
 #include "capture/clsIP.h"
 #include "capture/clsTCP.h"
-#include "forms/Desktop.h"
+#include "forms/MessageLoop.h"
 #include "platform/capture/Capture.h"
 
 #include <optional>
@@ -28,7 +28,7 @@ struct FrameDecoders {
 /// Charges captured packets to the rows of the process table and drives the table's regular refresh.
 class PacketAttribution {
  public:
-  PacketAttribution(platform::CaptureLibrary& library, forms::Desktop& desktop, PacketControl& control,
+  PacketAttribution(platform::CaptureLibrary& library, forms::MessageLoop& loop, PacketControl& control,
                     const OwnAddresses& addresses, monitor::ProcessTable& table);
 
   /// The event of the capture control: drains the frames that wait, when the newest record is TCP
@@ -54,7 +54,7 @@ class PacketAttribution {
   bool IsOutgoing(const clsIP& ip);
 
   platform::CaptureLibrary& library_;
-  forms::Desktop& desktop_;
+  forms::MessageLoop& loop_;
   PacketControl& control_;
   const OwnAddresses& addresses_;
   monitor::ProcessTable& table_;

@@ -1,6 +1,6 @@
 #include "monitor/ProcessRowAdder.h"
 
-#include "forms/Desktop.h"
+#include "forms/Canvas.h"
 #include "monitor/ProcessRow.h"
 
 namespace quendra::monitor {
@@ -13,7 +13,7 @@ constexpr int kDefaultIcon = 1;
 } // namespace
 
 void ProcessRowAdder::Add(const platform::Processes::Entry& entry, Text ports, Text& classOfRow) {
-  desktop_.Cls(controls_.main_Pic);
+  canvas_.Cls(controls_.main_Pic);
   const Text name = ExeNameOf(entry);
   Text path;
   if (entry.processId > 0) path = fileInfo_.ModulePathOf(entry.processId);
@@ -33,9 +33,9 @@ void ProcessRowAdder::Add(const platform::Processes::Entry& entry, Text ports, T
 void ProcessRowAdder::AddIconOf(const Text& path) {
   const platform::Handle icon = icons_.ExtractIconExA(ToCodePage(path), 0);
   if (icon == platform::kNoHandle) return;
-  desktop_.DrawIconEx(controls_.main_Pic, 0, 0, icons_.ImageOf(icon), kIconSize, kIconSize);
+  canvas_.DrawIconEx(controls_.main_Pic, 0, 0, icons_.ImageOf(icon), kIconSize, kIconSize);
   icons_.DestroyIcon(icon);
-  controls_.main_ImList.Add(desktop_.ImageOf(controls_.main_Pic), path);
+  controls_.main_ImList.Add(canvas_.ImageOf(controls_.main_Pic), path);
 }
 
 int ProcessRowAdder::IconIndexOf(const Text& path) const {

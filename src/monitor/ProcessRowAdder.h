@@ -1,23 +1,20 @@
 #pragma once
 
+#include "forms/Canvas.h"
 #include "monitor/TableControls.h"
 #include "monitor/mdlFileInfo.h"
 #include "platform/process/Icons.h"
 #include "platform/process/Processes.h"
 #include "platform/system/System.h"
 
-namespace quendra::forms {
-class Desktop;
-}
-
 namespace quendra::monitor {
 
 /// Adds the rows of the processes that a pass sees for the first time.
 class ProcessRowAdder {
  public:
-  ProcessRowAdder(platform::Icons& icons, platform::System& system, forms::Desktop& desktop,
+  ProcessRowAdder(platform::Icons& icons, platform::System& system, forms::Canvas& canvas,
                   TableControls& controls, mdlFileInfo& fileInfo)
-      : icons_(icons), system_(system), desktop_(desktop), controls_(controls), fileInfo_(fileInfo) {}
+      : icons_(icons), system_(system), canvas_(canvas), controls_(controls), fileInfo_(fileInfo) {}
 
   /// `classOfRow` is the class of the row added before, and becomes that of this one.
   void Add(const platform::Processes::Entry& entry, Text ports, Text& classOfRow);
@@ -30,7 +27,7 @@ class ProcessRowAdder {
 
   platform::Icons& icons_;
   platform::System& system_;
-  forms::Desktop& desktop_;
+  forms::Canvas& canvas_;
   TableControls& controls_;
   mdlFileInfo& fileInfo_;
 };

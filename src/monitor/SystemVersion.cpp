@@ -11,7 +11,7 @@ void SystemVersion::Read() {
     OsVersionCode = OsVersionCodeOf(version);
     return;
   }
-  desktop_.MessageBox(
+  loop_.MessageBox(
       u"An error occured while trying to get the OS version and information.\r\nClick OK to continue.",
       forms::kExclamation, u"  Error Getting OS Information");
 }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Desktop.h"
+#include "forms/MessageLoop.h"
 #include "platform/system/System.h"
 
 namespace quendra::monitor {
@@ -8,7 +8,7 @@ namespace quendra::monitor {
 /// Which system the program runs on.
 class SystemVersion {
  public:
-  SystemVersion(platform::System& system, forms::Desktop& desktop) : system_(system), desktop_(desktop) {}
+  SystemVersion(platform::System& system, forms::MessageLoop& loop) : system_(system), loop_(loop) {}
 
   /// Part of the main window's load. A version that can't be read is told in a box and counts as 0.
   void Read();
@@ -17,7 +17,7 @@ class SystemVersion {
 
  private:
   platform::System& system_;
-  forms::Desktop& desktop_;
+  forms::MessageLoop& loop_;
 };
 
 } // namespace quendra::monitor

@@ -31,7 +31,7 @@ Text FirstModulePath(platform::Processes& processes, platform::Handle process) {
 /// first step. Says so in a box.
 bool mdlFileInfo::LeftAnError(TextView step) {
   const auto error = static_cast<std::int32_t>(processes_.GetLastError());
-  if (error != 0) desktop_.MessageBox(Text(step) + u", Error: " + DecimalText(error), 0, {});
+  if (error != 0) loop_.MessageBox(Text(step) + u", Error: " + DecimalText(error), 0, {});
   return error != 0;
 }
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Desktop.h"
+#include "forms/MessageLoop.h"
 #include "platform/process/Processes.h"
 #include "platform/process/Tokens.h"
 #include "platform/process/VersionInfo.h"
@@ -27,8 +27,8 @@ struct FileVersionInfo {
 class mdlFileInfo {
  public:
   mdlFileInfo(platform::Processes& processes, platform::Tokens& tokens, platform::VersionInfo& versions,
-              forms::Desktop& desktop)
-      : processes_(processes), tokens_(tokens), versions_(versions), desktop_(desktop) {}
+              forms::MessageLoop& loop)
+      : processes_(processes), tokens_(tokens), versions_(versions), loop_(loop) {}
 
   /// True when no step left an error. A step that left one says so in a message box.
   Boolean16 EnablePrivilege(TextView name, std::uint32_t attributes = platform::Tokens::kEnabled);
@@ -61,7 +61,7 @@ class mdlFileInfo {
   platform::Processes& processes_;
   platform::Tokens& tokens_;
   platform::VersionInfo& versions_;
-  forms::Desktop& desktop_;
+  forms::MessageLoop& loop_;
 };
 
 /// A snapshot entry's executable name, cut at its first NUL; the whole field when it holds none.

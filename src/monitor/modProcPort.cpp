@@ -20,8 +20,8 @@ constexpr std::array<TextView, 12> kStateNames{
 } // namespace
 
 modProcPort::modProcPort(platform::IpHelper& ipHelper, const SocketHandleScan& handleScan,
-                         forms::Desktop& desktop, forms::ListView& main_ListView1, mdlFileInfo& fileInfo)
-    : PortOwnerTable(kPorts), ipHelper_(ipHelper), handleScan_(handleScan), desktop_(desktop),
+                         forms::MessageLoop& loop, forms::ListView& main_ListView1, mdlFileInfo& fileInfo)
+    : PortOwnerTable(kPorts), ipHelper_(ipHelper), handleScan_(handleScan), loop_(loop),
       main_ListView1_(main_ListView1), fileInfo_(fileInfo) {}
 
 bool modProcPort::ScanSocketHandles() {
@@ -67,12 +67,12 @@ void modProcPort::MergeCurrentEntry(PortsCells& cells) {
 
 void modProcPort::ReadEntry() {
   currentEntry_ = TcpEntryAt(TcpOwnerSnapshot_, walkOffset_);
-  desktop_.DoEvents();
+  loop_.DoEvents();
 }
 
 void modProcPort::NextEntry() {
   walkOffset_ += static_cast<std::int32_t>(TcpOwnerEntry::kBytes);
-  desktop_.DoEvents();
+  loop_.DoEvents();
 }
 
 Text modProcPort::IpAddressText(std::uint32_t address) {

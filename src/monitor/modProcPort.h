@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Desktop.h"
+#include "forms/MessageLoop.h"
 #include "forms/controls/ListView.h"
 #include "monitor/SocketHandleScan.h"
 #include "monitor/TcpOwnerEntry.h"
@@ -19,7 +19,7 @@ class modProcPort {
  public:
   using PortOwner = monitor::PortOwner;
 
-  modProcPort(platform::IpHelper& ipHelper, const SocketHandleScan& handleScan, forms::Desktop& desktop,
+  modProcPort(platform::IpHelper& ipHelper, const SocketHandleScan& handleScan, forms::MessageLoop& loop,
               forms::ListView& main_ListView1, mdlFileInfo& fileInfo);
 
   /// Brings PortOwnerTable up to date from the handles of all processes. True when the walk has finished.
@@ -59,7 +59,7 @@ class modProcPort {
 
   platform::IpHelper& ipHelper_;
   SocketHandleScan handleScan_;
-  forms::Desktop& desktop_;
+  forms::MessageLoop& loop_;
   forms::ListView& main_ListView1_;
   mdlFileInfo& fileInfo_;
   platform::IpHelper::TcpTable TcpOwnerSnapshot_;

@@ -8,7 +8,6 @@ namespace quendra::report {
 
 namespace {
 
-constexpr std::int16_t kProcsPage = 1;
 constexpr std::int16_t kNumber = 2;
 constexpr std::int16_t kReport = 3;
 constexpr std::int16_t kLoad = 4;
@@ -27,10 +26,10 @@ std::int32_t NumberOfIndex(const Variant& index) {
 
 } // namespace
 
-SupportExchange::SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop,
+SupportExchange::SupportExchange(foundation::modSocketPlus& module, forms::MessageLoop& loop,
                                  ReportControls& controls, monitor::ProcessTable& table,
                                  forms::Timer& main_Timer1)
-    : module_(module), desktop_(desktop), controls_(controls), table_(table), main_Timer1_(main_Timer1) {
+    : module_(module), loop_(loop), controls_(controls), table_(table), main_Timer1_(main_Timer1) {
   controls_.main_cmdRpt.Click = [this] { main_cmdRpt_Click(); };
   controls_.main_Label2.DoubleClick = [this] { main_Label2_DblClick(); };
   controls_.main_Label3.DoubleClick = [this] { main_Label3_DblClick(); };
@@ -101,8 +100,8 @@ void SupportExchange::main_spSockets_Error(Index index, std::int16_t number, con
   const std::int32_t socket = NumberOfIndex(index);
   if (socket < kProcsPage || socket > kLoad) return;
   OfferReport(); // a connection that fails at once shows its box before Connect returns
-  desktop_.MessageBox(u"winsock error: " + DecimalText(number) + u" - " + description, 0,
-                      socket == kProcsPage ? foundation::kTitle : kDefaultTitle);
+  loop_.MessageBox(u"winsock error: " + DecimalText(number) + u" - " + description, 0,
+                   socket == kProcsPage ? foundation::kTitle : kDefaultTitle);
 }
 
 foundation::CSocketPlus& SupportExchange::OpenSockets() {
@@ -160,19 +159,9 @@ void SupportExchange::ReportClosed() {
   if (goesOn) Close(kReport);
 }
 
-void SupportExchange::ProcsPageClosed() {
-  ReadProcsPage();
-  Close(kProcsPage);
-  table_.RefreshProcessTable({});
-  main_Timer1_.Enabled = true;
-}
-
-/// Reserved for reading the page into a table of 3 by 3 texts, which is made and dropped.
-void SupportExchange::ReadProcsPage() { const Text table[3][3]; }
-
 bool SupportExchange::ShowHebrewBox(const Text& text, int icon) {
   const std::weak_ptr<foundation::CSocketPlus> page = main_spSockets_;
-  desktop_.MessageBox(text, icon | forms::kHebrewBox, foundation::kTitle);
+  loop_.MessageBox(text, icon | forms::kHebrewBox, foundation::kTitle);
   return !page.expired();
 }
 

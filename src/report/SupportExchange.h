@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/Desktop.h"
+#include "forms/MessageLoop.h"
 #include "forms/controls/Controls.h"
 #include "foundation/CSocketPlus.h"
 #include "monitor/ProcessTable.h"
@@ -15,7 +15,7 @@ namespace quendra::report {
 /// is the order of the events; leaving the page ends it without a word.
 class SupportExchange {
  public:
-  SupportExchange(foundation::modSocketPlus& module, forms::Desktop& desktop, ReportControls& controls,
+  SupportExchange(foundation::modSocketPlus& module, forms::MessageLoop& loop, ReportControls& controls,
                   monitor::ProcessTable& table, forms::Timer& main_Timer1);
 
   /// The sockets' half of the page's start.
@@ -55,11 +55,13 @@ class SupportExchange {
   /// Both are false when the page was left behind the box: the exchange has ended with it.
   bool ShowNumber(const Text& number);
   bool ShowHebrewBox(const Text& text, int icon);
+
+  static constexpr std::int16_t kProcsPage = 1;
   void ProcsPageClosed();
   void ReadProcsPage();
 
   foundation::modSocketPlus& module_;
-  forms::Desktop& desktop_;
+  forms::MessageLoop& loop_;
   ReportControls& controls_;
   monitor::ProcessTable& table_;
   forms::Timer& main_Timer1_;

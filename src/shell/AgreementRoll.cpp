@@ -23,8 +23,8 @@ void AgreementRoll::Show() {
   pictures_.picBuffer.Visible = true;
   reDrawTimer_.Interval = kRollInterval;
   reDrawTimer_.Enabled = true;
-  bufferWidth_ = desktop_.ScaleWidth(pictures_.picBuffer);
-  bufferHeight_ = desktop_.ScaleHeight(pictures_.picBuffer);
+  bufferWidth_ = canvas_.ScaleWidth(pictures_.picBuffer);
+  bufferHeight_ = canvas_.ScaleHeight(pictures_.picBuffer);
   scrollOffset_ = bufferHeight_;
   PaintBackground(bufferHeight_);
 }
@@ -37,10 +37,10 @@ void AgreementRoll::Hide() {
 }
 
 void AgreementRoll::Tick() {
-  desktop_.BitBlt(pictures_.picBuffer, 0, 0, bufferWidth_, bufferHeight_, pictures_.picBackBuffer, 0, 0);
+  canvas_.BitBlt(pictures_.picBuffer, 0, 0, bufferWidth_, bufferHeight_, pictures_.picBackBuffer, 0, 0);
   for (int number = 1; number <= lines_.LineCount(); ++number) PrintLine(number);
-  desktop_.BitBlt(pictures_.picOut, 0, 0, bufferWidth_, bufferHeight_, pictures_.picBuffer, 0, 0);
-  desktop_.Refresh(pictures_.picOut);
+  canvas_.BitBlt(pictures_.picOut, 0, 0, bufferWidth_, bufferHeight_, pictures_.picBuffer, 0, 0);
+  canvas_.Refresh(pictures_.picOut);
   --scrollOffset_;
 }
 
@@ -50,19 +50,19 @@ void AgreementRoll::PaintBackground(int height) {
   double level = 0;
   for (int y = 0; y <= height; y += kBandHeight, level += step) {
     const auto grey = static_cast<unsigned>(RoundToInt32(level));
-    desktop_.FillBox(pictures_.picBackBuffer, 0, y - 1, bufferWidth_, y + kBandHeight,
-                     forms::Rgb(grey, grey, grey));
+    canvas_.FillBox(pictures_.picBackBuffer, 0, y - 1, bufferWidth_, y + kBandHeight,
+                    forms::Rgb(grey, grey, grey));
   }
 }
 
 void AgreementRoll::PrintLine(int number) {
   forms::PictureBox& buffer = pictures_.picBuffer;
   const Text& line = lines_.Line(number);
-  const int y = number * desktop_.TextHeight(buffer, line) + number * kLineGap + scrollOffset_;
+  const int y = number * canvas_.TextHeight(buffer, line) + number * kLineGap + scrollOffset_;
   buffer.CurrentX = 0;
   buffer.CurrentY = y;
   buffer.ForeColour = forms::kWhite;
-  desktop_.Print(buffer, line);
+  canvas_.Print(buffer, line);
   if (y < kTop) reDrawTimer_.Enabled = false;
 }
 

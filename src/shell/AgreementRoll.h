@@ -1,6 +1,7 @@
 #pragma once
 
-#include "forms/Desktop.h"
+#include "forms/Canvas.h"
+#include "forms/controls/Timer.h"
 #include "shell/AgreementWrap.h"
 
 namespace quendra::shell {
@@ -15,9 +16,9 @@ class AgreementRoll {
     forms::PictureBox& picBackBuffer;
   };
 
-  AgreementRoll(forms::Desktop& desktop, Pictures pictures, forms::Timer& reDrawTimer,
+  AgreementRoll(forms::Canvas& canvas, Pictures pictures, forms::Timer& reDrawTimer,
                 const AgreementWrap& lines)
-      : desktop_(desktop), pictures_(pictures), reDrawTimer_(reDrawTimer), lines_(lines) {}
+      : canvas_(canvas), pictures_(pictures), reDrawTimer_(reDrawTimer), lines_(lines) {}
 
   /// From the lower edge, also while a roll is on.
   void Show();
@@ -31,7 +32,7 @@ class AgreementRoll {
   void PaintBackground(int height);
   void PrintLine(int number);
 
-  forms::Desktop& desktop_;
+  forms::Canvas& canvas_;
   Pictures pictures_;
   forms::Timer& reDrawTimer_;
   const AgreementWrap& lines_;

@@ -1,11 +1,11 @@
 #include "shell/HandCursor.h"
 
+#include "forms/controls/Label.h"
 namespace quendra::shell {
 
 void HandCursor::ShowOverButtons(const forms::Container& container) {
-  for (forms::Control* child : container.Children()) {
-    if (const auto* inner = dynamic_cast<const forms::Container*>(child)) ShowOverButtons(*inner);
-    auto* label = dynamic_cast<forms::Label*>(child);
+  for (forms::Control* control : forms::ControlsIn(container)) {
+    auto* label = dynamic_cast<forms::Label*>(control);
     if (label && label->Style() != forms::Label::Look::Plain && !label->MouseMove)
       label->MouseMove = [this](int, int, int, int) { Show(); };
   }

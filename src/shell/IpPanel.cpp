@@ -1,5 +1,6 @@
 #include "shell/IpPanel.h"
 
+#include "forms/Form.h"
 #include "foundation/Wording.h"
 
 namespace quendra::shell {
@@ -13,7 +14,7 @@ void IpPanel::Show() const {
   text += u"\r\n1: " + addresses_.LocalHostAddress(capture::HostAddress::Last);
   text += u"\r\n2: " + addresses_.GatewayAddress();
   text += u"\r\n3: " + addresses_.LocalHostAddress(capture::HostAddress::BeforeLast);
-  desktop_.MessageBox(text, forms::kInformation | forms::kHebrewBox, foundation::kTitle);
+  loop_.MessageBox(text, forms::kInformation | forms::kHebrewBox, foundation::kTitle);
 }
 
 } // namespace quendra::shell

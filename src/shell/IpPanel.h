@@ -1,22 +1,22 @@
 #pragma once
 
 #include "capture/HostAddresses.h"
-#include "forms/Desktop.h"
+#include "forms/MessageLoop.h"
 
 namespace quendra::shell {
 
 /// The box that tells a support agent the machine's addresses.
 class IpPanel {
  public:
-  IpPanel(forms::Desktop& desktop, const capture::HostAddresses& addresses)
-      : desktop_(desktop), addresses_(addresses) {}
+  IpPanel(forms::MessageLoop& loop, const capture::HostAddresses& addresses)
+      : loop_(loop), addresses_(addresses) {}
 
   /// Ctrl alone with the key that bears I, in either layout.
   static bool IsItsKey(int keyCode, int shift);
   void Show() const;
 
  private:
-  forms::Desktop& desktop_;
+  forms::MessageLoop& loop_;
   const capture::HostAddresses& addresses_;
 };
 

@@ -6,8 +6,8 @@ namespace quendra::shell {
 
 using foundation::Px;
 
-frmAbout::frmAbout(forms::Desktop& desktop) : Form(u"frmAbout"), desktop_(desktop) {
-  Image1.Click = [this] { desktop_.Unload(*this); };
+frmAbout::frmAbout(forms::FormHost& forms) : Form(u"frmAbout"), forms_(forms) {
+  Image1.Click = [this] { forms_.Unload(*this); };
   Default = Cancel = &Image1;
 }
 

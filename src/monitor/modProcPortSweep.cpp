@@ -49,7 +49,7 @@ void modProcPort::DeleteConnection(std::uint32_t localAddress, std::uint32_t loc
     fileInfo_.LoadSystemPids(u"");
     SystemPidsLoaded = kTrue16;
   }
-  desktop_.DoEvents();
+  loop_.DoEvents();
   const platform::TcpTableEntry entry{platform::kTcpDelete, localAddress, localPort,
                                       remoteAddress,        remotePort,   0};
   std::array<std::uint8_t, platform::TcpTableEntry::kBytes> record{};

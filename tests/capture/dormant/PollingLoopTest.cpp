@@ -1,4 +1,4 @@
-#include "capture/PollingLoop.h"
+#include "capture/dormant/PollingLoop.h"
 
 #include "capture/CaptureProgram.h"
 

@@ -2,6 +2,7 @@
 
 #include "capture/CaptureSession.h"
 #include "capture/PacketAttribution.h"
+#include "forms/Desktop.h"
 #include "monitor/ProcessTable.h"
 
 #include <functional>

@@ -1,4 +1,4 @@
-#include "capture/PollingLoop.h"
+#include "capture/dormant/PollingLoop.h"
 
 namespace quendra::capture {
 

@@ -1,4 +1,4 @@
-#include "capture/Sniffer.h"
+#include "capture/dormant/Sniffer.h"
 
 #include "capture/CaptureProgram.h"
 
