@@ -2,9 +2,15 @@
 
 #include "platform/Machine.h"
 #include "platform/simulated/capture/SimulatedCapture.h"
-#include "platform/simulated/net/SimulatedNetwork.h"
+#include "platform/simulated/net/SimulatedHostNames.h"
+#include "platform/simulated/net/SimulatedIpHelper.h"
 #include "platform/simulated/net/SimulatedSockets.h"
+#include "platform/simulated/process/SimulatedHandles.h"
+#include "platform/simulated/process/SimulatedIcons.h"
 #include "platform/simulated/process/SimulatedProcesses.h"
+#include "platform/simulated/process/SimulatedTokens.h"
+#include "platform/simulated/process/SimulatedVersionInfo.h"
+#include "platform/simulated/system/SimulatedShellStart.h"
 #include "platform/simulated/system/SimulatedSystem.h"
 
 namespace quendra::platform::simulated {

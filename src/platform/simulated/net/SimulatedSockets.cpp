@@ -1,6 +1,6 @@
 #include "platform/simulated/net/SimulatedSockets.h"
 
-#include "platform/simulated/net/SimulatedNetwork.h"
+#include "platform/simulated/net/SimulatedHostNames.h"
 
 #include <algorithm>
 

@@ -3,7 +3,7 @@
 #include "platform/EventLoop.h"
 #include "platform/net/HostNames.h"
 #include "platform/simulated/SimulatedCore.h"
-#include "platform/simulated/net/SimulatedServer.h"
+#include "platform/simulated/net/ScriptedPeer.h"
 
 #include <map>
 #include <optional>

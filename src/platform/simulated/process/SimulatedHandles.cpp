@@ -1,4 +1,4 @@
-#include "platform/simulated/net/SimulatedNetwork.h"
+#include "platform/simulated/process/SimulatedHandles.h"
 
 #include <algorithm>
 

@@ -1,8 +1,6 @@
-#include "platform/simulated/process/SimulatedProcesses.h"
+#include "platform/simulated/process/SimulatedTokens.h"
 
 #include "platform/process/SystemErrors.h"
-
-#include <algorithm>
 
 namespace quendra::platform::simulated {
 

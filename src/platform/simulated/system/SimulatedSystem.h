@@ -1,7 +1,6 @@
 #pragma once
 
 #include "platform/simulated/SimulatedCore.h"
-#include "platform/system/ShellStart.h"
 #include "platform/system/System.h"
 
 namespace quendra::platform::simulated {
@@ -30,22 +29,6 @@ class SimulatedSystem : public System {
   }
   std::int32_t DayNumber() override { return Day; }
   std::int32_t SecondOfDay() override { return Second; }
-
- private:
-  Core& core_;
-};
-
-/// Started command lines stand in the machine's Calls, as in "Shell 1 regsvr32.exe -s file.dll", style first.
-class SimulatedShellStart : public ShellStart {
- public:
-  explicit SimulatedShellStart(Core& core) : core_(core) {}
-
-  bool Fail = false;
-
-  bool Shell(const std::string& commandLine, int windowStyle) override {
-    core_.calls.push_back("Shell " + std::to_string(windowStyle) + " " + CutText(commandLine));
-    return !Fail;
-  }
 
  private:
   Core& core_;

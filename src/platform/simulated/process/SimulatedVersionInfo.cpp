@@ -1,4 +1,6 @@
-#include "platform/simulated/process/SimulatedProcesses.h"
+#include "platform/simulated/process/SimulatedVersionInfo.h"
+
+#include "platform/simulated/SimulatedCore.h"
 
 #include <cstdio>
 
@@ -62,26 +64,6 @@ SimulatedVersionInfo::VerQueryValueA(std::span<const std::uint8_t> block, const 
   const auto text = found.texts.find(subBlock.substr(prefix.size()));
   if (text == found.texts.end()) return {};
   return WithNul(text->second);
-}
-
-Handle SimulatedIcons::ExtractIconExA(const std::string& path, int index) {
-  const auto found = images_.find(CutText(path));
-  if (found == images_.end() || index != 0) return kNoHandle;
-  const auto icon = Handle(static_cast<std::uint32_t>(++Extracted));
-  live_[icon] = found->second;
-  return icon;
-}
-
-const std::vector<std::uint8_t>& SimulatedIcons::ImageOf(Handle icon) {
-  static const std::vector<std::uint8_t> kNone;
-  const auto found = live_.find(icon);
-  return found == live_.end() ? kNone : found->second;
-}
-
-bool SimulatedIcons::DestroyIcon(Handle icon) {
-  if (live_.erase(icon) == 0) return false;
-  ++Destroyed;
-  return true;
 }
 
 } // namespace quendra::platform::simulated

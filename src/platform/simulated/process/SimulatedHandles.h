@@ -1,14 +1,9 @@
 #pragma once
 
-#include "platform/net/HostNames.h"
-#include "platform/net/IpHelper.h"
-#include "platform/net/SocketNumbers.h"
 #include "platform/process/Handles.h"
 #include "platform/simulated/SimulatedCore.h"
 
-#include <array>
 #include <deque>
-#include <optional>
 
 namespace quendra::platform::simulated {
 
@@ -51,57 +46,6 @@ class SimulatedHandles : public Handles {
   Core& core_;
   std::vector<SystemHandle> handles_;
   std::deque<std::vector<SystemHandle>> appearing_;
-};
-
-/// A TCP connection: addresses are dotted texts, ports plain numbers.
-struct Connection {
-  std::uint32_t state = kTcpEstablished;
-  std::string localAddress{};
-  std::uint16_t localPort = 0;
-  std::string remoteAddress = "0.0.0.0";
-  std::uint16_t remotePort = 0;
-  std::uint32_t owner = 0;
-};
-
-class SimulatedIpHelper : public IpHelper {
- public:
-  std::vector<Connection> Connections;
-  /// Other than 0: what AllocateAndGetTcpExTableFromStack fails with.
-  std::uint32_t TableError = 0;
-  int TablesFetched = 0;
-  /// The records that SetTcpEntry was given.
-  std::vector<std::array<std::uint8_t, 20>> Deleted;
-  std::uint32_t SetTcpEntryResult = 0;
-  std::vector<AdapterRecord> Adapters;
-  /// Other than 0: what GetAdaptersInfo fails with.
-  std::uint32_t AdaptersError = 0;
-
-  std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) override;
-  std::uint32_t SetTcpEntry(std::span<const std::uint8_t, 20> record) override;
-  std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
-};
-
-/// The host's own name is known, and those that were added.
-class SimulatedHostNames : public HostNames {
- public:
-  std::string Name = "subscriber";
-  std::vector<std::string> Addresses;
-  /// Another name and its addresses.
-  void Add(const std::string& name, std::vector<std::string> addresses) {
-    others_[name] = std::move(addresses);
-  }
-  bool FailName = false;
-  bool FailAddresses = false;
-  /// What a question fails with.
-  std::int32_t Error = kHostNotFound;
-
-  std::optional<std::string> gethostname() override;
-  std::optional<std::vector<Ipv4Address>> gethostbyname(const std::string& name) override;
-  std::int32_t LastError() override { return lastError_; }
-
- private:
-  std::int32_t lastError_ = 0;
-  std::map<std::string, std::vector<std::string>> others_;
 };
 
 } // namespace quendra::platform::simulated

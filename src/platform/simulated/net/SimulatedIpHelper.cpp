@@ -1,4 +1,6 @@
-#include "platform/simulated/net/SimulatedNetwork.h"
+#include "platform/simulated/net/SimulatedIpHelper.h"
+
+#include "platform/simulated/SimulatedCore.h"
 
 #include <algorithm>
 
@@ -38,24 +40,6 @@ std::uint32_t SimulatedIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& ada
   }
   adapters = Adapters;
   return 0;
-}
-
-std::optional<std::string> SimulatedHostNames::gethostname() {
-  lastError_ = FailName ? Error : 0;
-  if (FailName) return {};
-  return Name;
-}
-
-std::optional<std::vector<Ipv4Address>> SimulatedHostNames::gethostbyname(const std::string& name) {
-  const auto other = others_.find(CutText(name));
-  const bool isKnown = !FailAddresses && (other != others_.end() || CutText(name) == Name);
-  std::vector<Ipv4Address> addresses;
-  if (isKnown)
-    for (const auto& address : other == others_.end() ? Addresses : other->second)
-      addresses.push_back(AddressOf(address));
-  lastError_ = addresses.empty() ? Error : 0;
-  if (addresses.empty()) return {};
-  return addresses;
 }
 
 } // namespace quendra::platform::simulated

@@ -1,0 +1,37 @@
+#pragma once
+
+#include "platform/net/IpHelper.h"
+
+#include <array>
+
+namespace quendra::platform::simulated {
+
+/// A TCP connection: addresses are dotted texts, ports plain numbers.
+struct Connection {
+  std::uint32_t state = kTcpEstablished;
+  std::string localAddress{};
+  std::uint16_t localPort = 0;
+  std::string remoteAddress = "0.0.0.0";
+  std::uint16_t remotePort = 0;
+  std::uint32_t owner = 0;
+};
+
+class SimulatedIpHelper : public IpHelper {
+ public:
+  std::vector<Connection> Connections;
+  /// Other than 0: what AllocateAndGetTcpExTableFromStack fails with.
+  std::uint32_t TableError = 0;
+  int TablesFetched = 0;
+  /// The records that SetTcpEntry was given.
+  std::vector<std::array<std::uint8_t, 20>> Deleted;
+  std::uint32_t SetTcpEntryResult = 0;
+  std::vector<AdapterRecord> Adapters;
+  /// Other than 0: what GetAdaptersInfo fails with.
+  std::uint32_t AdaptersError = 0;
+
+  std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) override;
+  std::uint32_t SetTcpEntry(std::span<const std::uint8_t, 20> record) override;
+  std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
+};
+
+} // namespace quendra::platform::simulated
