@@ -2,8 +2,8 @@
 #include "foundation/SocketErrors.h"
 #include "foundation/SocketTexts.h"
 
+#include "platform/net/AddressList.h"
 #include "platform/net/IpProtocols.h"
-#include "runtime/ByteFields.h"
 
 #include <algorithm>
 #include <new>
@@ -161,10 +161,11 @@ void CSocketPlus::PostResolution(platform::LookUpHandle handle, std::int32_t err
   module_.UnregisterResolve(handle);
   if (At(slot).State != sckResolvingHost) return;
   const auto buffer = std::exchange(At(slot).LookUpBuffer, nullptr);
-  if (error == 0 && (!buffer || Little32(*buffer, 0) == 0)) error = platform::kHostNotFound;
+  const auto address = buffer ? platform::FirstOfAddressList(*buffer) : std::nullopt;
+  if (error == 0 && !address) error = platform::kHostNotFound;
   if (error != 0) return ConnectToIP(slot, kLookUpRunning, error);
   At(slot).State = sckHostResolved;
-  ConnectToIP(slot, platform::Ipv4Address::FromMemory(Little32(*buffer, sizeof(std::uint32_t))), 0);
+  ConnectToIP(slot, *address, 0);
 }
 
 void CSocketPlus::ConnectToIP(Slot slot, platform::Ipv4Address address, std::int32_t error) {

@@ -253,7 +253,7 @@ TEST_F(SocketFailures, A_datagram_whose_socket_can_not_be_made_is_not_sent) {
   Net().Fail("socket", 10024);
   Object->SendData(1, Text(u"data"));
   EXPECT_EQ(Object.Events, Events{"Error 1 10024 CSocketPlus.SocketExists"});
-  EXPECT_TRUE(Net().Datagrams.empty());
+  EXPECT_TRUE(Net().Datagrams().empty());
 }
 
 TEST_F(SocketFailures, A_close_that_fails_is_raised_and_leaves_the_error_state_and_the_socket) {

@@ -113,8 +113,8 @@ TEST_F(SocketMisuses, A_datagram_to_a_host_that_can_not_be_found_is_an_invalid_a
   Object->SetRemoteHost(1, u"10.1.1.1");
   Object->SetRemotePort(1, 53);
   Object->SendData(1, Text(u"y"));
-  ASSERT_EQ(Net().Datagrams.size(), 1u);
-  EXPECT_EQ(Net().Datagrams[0].bytes, "y");
+  ASSERT_EQ(Net().Datagrams().size(), 1u);
+  EXPECT_EQ(Net().Datagrams()[0].bytes, "y");
 }
 
 TEST_F(SocketMisuses, A_datagram_to_a_host_of_another_family_raises_that_error_itself) {

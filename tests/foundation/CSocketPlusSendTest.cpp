@@ -105,9 +105,9 @@ TEST_F(SocketSends, A_datagram_goes_out_whole_whatever_the_size_of_the_send_buff
   Object->SetRemoteHost(1, u"10.1.1.1");
   Object->SetRemotePort(1, 53);
   Object->SendData(1, Text(1000, u'd'));
-  ASSERT_EQ(Net().Datagrams.size(), 1u);
-  EXPECT_EQ(Net().Datagrams[0].bytes.size(), 1000u);
-  EXPECT_EQ(Net().Datagrams[0].to.port, 53);
+  ASSERT_EQ(Net().Datagrams().size(), 1u);
+  EXPECT_EQ(Net().Datagrams()[0].bytes.size(), 1000u);
+  EXPECT_EQ(Net().Datagrams()[0].to.port, 53);
   EXPECT_TRUE(Object.Events.empty());
 }
 
@@ -117,7 +117,7 @@ TEST_F(SocketSends, A_datagram_goes_to_a_name_by_the_blocking_resolver) {
   Object->SetRemoteHost(1, u"dns");
   Object->SendData(1, Text(u"q"));
   EXPECT_EQ(Net().Count("WSAAsyncGetHostByName"), 0);
-  EXPECT_EQ(Net().Datagrams.at(0).to.address, platform::simulated::AddressOf("10.1.1.53"));
+  EXPECT_EQ(Net().Datagrams().at(0).to.address, platform::simulated::AddressOf("10.1.1.53"));
 }
 
 TEST_F(SocketSends, An_echoed_datagram_comes_back) {

@@ -50,7 +50,7 @@ class SimulatedFarDatagrams : public FarDatagrams {
   }
   const std::vector<std::string>& Received() override {
     received_.clear();
-    for (const auto& sent : machine_.sockets.Datagrams)
+    for (const auto& sent : machine_.sockets.Datagrams())
       if (sent.to.port == port_) received_.push_back(sent.bytes);
     return received_;
   }

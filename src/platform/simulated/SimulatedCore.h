@@ -5,6 +5,7 @@
 #include "runtime/ByteFields.h"
 
 #include <map>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -39,6 +40,9 @@ struct Core {
 
 /// A text as the system takes it: it ends at the first NUL.
 inline std::string CutText(const std::string& text) { return text.substr(0, text.find('\0')); }
+
+/// Bytes as a test reads them.
+inline std::string TextOf(std::span<const std::uint8_t> bytes) { return {bytes.begin(), bytes.end()}; }
 
 /// The address of a dotted text; 0.0.0.0 for a text that is none.
 inline Ipv4Address AddressOf(const std::string& dotted) {

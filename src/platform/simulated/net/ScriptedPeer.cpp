@@ -1,12 +1,12 @@
 #include "platform/simulated/net/ScriptedPeer.h"
 
-#include "platform/simulated/net/SimulatedSockets.h"
+#include "platform/simulated/net/SimulatedStreams.h"
 
 namespace quendra::platform::simulated {
 
-ScriptedPeer::ScriptedPeer(SimulatedSockets& sockets, std::weak_ptr<SocketEnd> near,
+ScriptedPeer::ScriptedPeer(SimulatedStreams& streams, std::weak_ptr<SocketEnd> near,
                            const SimulatedServer& server)
-    : SimulatedPeer(sockets, std::move(near)), server_(server) {}
+    : SimulatedPeer(streams, std::move(near)), server_(server) {}
 
 void ScriptedPeer::Begin() {
   if (server_.room_ != SocketEnd::kNoLimit) TakeAtMost(server_.room_);
@@ -27,7 +27,7 @@ bool ScriptedPeer::CanAct() const {
 void ScriptedPeer::Schedule() {
   if (server_.slow_ || scheduled_ || !CanAct()) return;
   scheduled_ = true;
-  Network().Later([self = weak_from_this()] {
+  Streams().Later([self = weak_from_this()] {
     const auto peer = std::static_pointer_cast<ScriptedPeer>(self.lock());
     if (!peer) return;
     peer->scheduled_ = false;

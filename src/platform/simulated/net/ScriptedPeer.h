@@ -7,7 +7,7 @@ namespace quendra::platform::simulated {
 /// A connection to a server: plays the server's script.
 class ScriptedPeer : public SimulatedPeer {
  public:
-  ScriptedPeer(SimulatedSockets& sockets, std::weak_ptr<SocketEnd> near, const SimulatedServer& server);
+  ScriptedPeer(SimulatedStreams& streams, std::weak_ptr<SocketEnd> near, const SimulatedServer& server);
 
   /// The connection stands.
   void Begin();

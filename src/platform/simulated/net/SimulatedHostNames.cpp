@@ -2,7 +2,20 @@
 
 #include "platform/simulated/SimulatedCore.h"
 
+#include <algorithm>
+
 namespace quendra::platform::simulated {
+
+bool SimulatedHostNames::IsOwn(Ipv4Address address) const {
+  if (address.IsAny() || address.IsLoopback()) return true;
+  return std::any_of(Addresses.begin(), Addresses.end(),
+                     [&](const std::string& own) { return AddressOf(own) == address; });
+}
+
+Ipv4Address SimulatedHostNames::OwnAddressTowards(Ipv4Address address) const {
+  if (IsOwn(address)) return address;
+  return Addresses.empty() ? AddressOf("10.0.0.7") : AddressOf(Addresses.back());
+}
 
 std::optional<std::string> SimulatedHostNames::gethostname() {
   lastError_ = FailName ? Error : 0;

@@ -21,6 +21,11 @@ class SimulatedHostNames : public HostNames {
   /// What a question fails with.
   std::int32_t Error = kHostNotFound;
 
+  /// Any address, loopback or one of the host's own.
+  bool IsOwn(Ipv4Address address) const;
+  /// From which of the own addresses traffic to that one comes.
+  Ipv4Address OwnAddressTowards(Ipv4Address address) const;
+
   std::optional<std::string> gethostname() override;
   std::optional<std::vector<Ipv4Address>> gethostbyname(const std::string& name) override;
   std::int32_t LastError() override { return lastError_; }

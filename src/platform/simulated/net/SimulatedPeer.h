@@ -4,14 +4,14 @@
 
 namespace quendra::platform::simulated {
 
-class SimulatedSockets;
+class SimulatedStreams;
 
 /// The far end of a connection, as a test plays it. What it does is seen by the program at once, save for the
 /// message that tells of it.
 class SimulatedPeer : public std::enable_shared_from_this<SimulatedPeer> {
  public:
-  SimulatedPeer(SimulatedSockets& sockets, std::weak_ptr<SocketEnd> near)
-      : sockets_(sockets), near_(std::move(near)) {}
+  SimulatedPeer(SimulatedStreams& streams, std::weak_ptr<SocketEnd> near)
+      : streams_(streams), near_(std::move(near)) {}
   virtual ~SimulatedPeer() = default;
 
   void Send(const std::string& bytes);
@@ -31,10 +31,10 @@ class SimulatedPeer : public std::enable_shared_from_this<SimulatedPeer> {
   virtual void OnReceived() {}
 
  protected:
-  SimulatedSockets& Network() { return sockets_; }
+  SimulatedStreams& Streams() { return streams_; }
 
  private:
-  SimulatedSockets& sockets_;
+  SimulatedStreams& streams_;
   std::weak_ptr<SocketEnd> near_;
 };
 

@@ -37,7 +37,7 @@ class SimulatedServer {
   };
 
  private:
-  friend class SimulatedSockets;
+  friend class SimulatedConnections;
   friend class ScriptedPeer;
 
   SimulatedServer& Add(Action action);

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/net/Sockets.h"
+#include "platform/net/SocketSelection.h"
 
 #include <deque>
 #include <memory>
@@ -24,11 +24,7 @@ struct SocketEnd {
   SocketAddress local;
   SocketAddress remote;
 
-  // What WSAAsyncSelect asked for, and which events may be announced now.
-  WindowHandle window;
-  std::uint32_t message = 0;
-  std::int32_t mask = 0;
-  std::int32_t enabled = kFdRead | kFdWrite | kFdAccept | kFdConnect | kFdClose;
+  SocketSelection selection;
 
   std::string arrived;             ///< TCP
   std::deque<Datagram> datagrams;  ///< UDP
@@ -42,6 +38,12 @@ struct SocketEnd {
   // The far end is one of these, or nothing.
   std::weak_ptr<SocketEnd> partner;
   std::shared_ptr<SimulatedPeer> peer;
+
+  /// Of the stream, or of the next datagram.
+  std::size_t BytesWaiting() const {
+    if (stage != Stage::Datagram) return arrived.size();
+    return datagrams.empty() ? 0 : datagrams.front().bytes.size();
+  }
 };
 
 } // namespace quendra::platform::simulated
