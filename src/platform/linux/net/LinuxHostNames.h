@@ -5,14 +5,6 @@
 
 namespace quendra::platform::linux_ {
 
-/// What a name server says: addresses, or an error number of the socket library.
-struct NameAnswer {
-  std::int32_t error = 0;
-  std::vector<Ipv4Address> addresses;
-};
-/// May wait for a name server; callable from any thread.
-NameAnswer LookUpName(const std::string& name);
-
 /// The own name stands for the addresses of the interfaces that are up, whatever the hosts file says: its
 /// line for the own name is often a made-up loopback address. Other names are looked up, which may wait for a
 /// name server.

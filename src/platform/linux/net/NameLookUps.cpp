@@ -1,6 +1,6 @@
 #include "platform/linux/net/NameLookUps.h"
 
-#include "platform/linux/net/LinuxHostNames.h"
+#include "platform/linux/net/NameAnswer.h"
 
 #include <strings.h>
 

@@ -1,11 +1,9 @@
 #pragma once
 
-#include "platform/linux/process/ProcFolder.h"
-#include "platform/net/Ipv4Address.h"
+#include "platform/linux/net/DefaultRoute.h"
 
 #include <cstdint>
 #include <string>
-#include <string_view>
 #include <vector>
 
 namespace quendra::platform::linux_ {
@@ -19,17 +17,6 @@ struct NetworkInterface {
   std::vector<Ipv4Address> gateways;  ///< of default routes, the preferred one first
   std::uint32_t metric = 0;           ///< of the preferred default route
 };
-
-/// A default route as the kernel lists it.
-struct DefaultRoute {
-  std::string interface;
-  Ipv4Address gateway; ///< 0.0.0.0 for a route without one
-  std::uint32_t metric = 0;
-};
-
-/// The default routes in a text such as that of /proc/net/route, the preferred one first. Lines that are no
-/// such lines are left out.
-std::vector<DefaultRoute> ParseDefaultRoutes(std::string_view text);
 
 /// Of this network namespace, in the kernel's order.
 std::vector<NetworkInterface> ReadNetworkInterfaces(const ProcFolder& folder);

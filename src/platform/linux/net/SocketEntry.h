@@ -1,11 +1,11 @@
 #pragma once
 
 #include "platform/linux/system/Descriptor.h"
-#include "platform/net/Sockets.h"
+#include "platform/net/SocketSelection.h"
 
 namespace quendra::platform::linux_ {
 
-/// One socket: where it stands, and which of its events may be announced now.
+/// One socket: where it stands, and what of it is to be told.
 struct SocketEntry {
   enum class Stage { Fresh, Connecting, Connected, Listening, Datagram };
 
@@ -14,13 +14,7 @@ struct SocketEntry {
   SocketAddress peer{};      ///< of a stream, kept when the connection has gone
   std::int32_t endError = 0; ///< what ended a stream, as the library numbers it; 0 for an orderly end
 
-  // What WSAAsyncSelect asked for.
-  WindowHandle window;
-  std::uint32_t message = 0;
-  std::int32_t mask = 0;
-
-  /// Events that may be announced; one leaves when it is and comes back with the call that re-enables it.
-  std::int32_t enabled = kFdRead | kFdWrite | kFdAccept | kFdConnect | kFdClose;
+  SocketSelection selection;
   /// What the kernel watches for now; it stops with what it tells.
   std::uint32_t watched = 0;
   bool knownToKernel = false;

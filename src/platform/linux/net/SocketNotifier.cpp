@@ -37,7 +37,7 @@ bool HasData(SocketEntry& entry) {
 }
 
 std::uint32_t InterestOf(const SocketEntry& entry) {
-  const auto wants = [&](SocketEvent event) { return (entry.mask & entry.enabled & event) != 0; };
+  const auto wants = [&](SocketEvent event) { return entry.selection.Wants(event); };
   switch (entry.stage) {
   case SocketEntry::Stage::Fresh: return 0;
   case SocketEntry::Stage::Connecting: return wants(kFdConnect) ? kWritable : 0;
@@ -45,8 +45,8 @@ std::uint32_t InterestOf(const SocketEntry& entry) {
   case SocketEntry::Stage::Connected:
   case SocketEntry::Stage::Datagram: break;
   }
-  // The end of a stream is told behind its last data, so it is looked for together with data.
-  const bool reads = wants(kFdRead) && (entry.enabled & kFdClose) != 0;
+  // The end of a stream is told after its last data, so it is looked for together with data.
+  const bool reads = wants(kFdRead) && (entry.selection.enabled & kFdClose) != 0;
   return (reads ? kReadable | kEnded : 0) | (wants(kFdWrite) ? kWritable : 0);
 }
 
@@ -84,7 +84,7 @@ bool SocketNotifier::Open() {
 }
 
 bool SocketNotifier::Watch(SocketHandle socket, SocketEntry& entry) {
-  const bool wanted = entry.mask != 0;
+  const bool wanted = entry.selection.mask != 0;
   if (wanted && !Open()) return false;
   if (wanted != entry.knownToKernel) {
     epoll_event event = EventFor(socket, 0);
@@ -107,15 +107,13 @@ void SocketNotifier::Rearm(SocketHandle socket, SocketEntry& entry) {
 }
 
 void SocketNotifier::Enable(SocketHandle socket, SocketEntry& entry, std::int32_t events) {
-  entry.enabled |= events;
+  entry.selection.enabled |= events;
   Rearm(socket, entry);
 }
 
 void SocketNotifier::Announce(SocketHandle socket, SocketEntry& entry, SocketEvent event,
                               std::int32_t error) {
-  if ((entry.mask & entry.enabled & event) == 0) return;
-  entry.enabled &= ~event;
-  loop_.PostMessage(entry.window, entry.message, socket.Value(), SocketMessageWord(event, error));
+  entry.selection.Announce(loop_, socket, event, error);
 }
 
 void SocketNotifier::Serve() {
@@ -137,7 +135,7 @@ void SocketNotifier::OnReady(SocketHandle socket, SocketEntry& entry, std::uint3
   case SocketEntry::Stage::Connecting: return OnConnectionReady(socket, entry);
   case SocketEntry::Stage::Listening: return Announce(socket, entry, kFdAccept);
   case SocketEntry::Stage::Datagram:
-    // An answer that nobody listens there leaves an error behind; a datagram socket goes on.
+    // An answer that nobody listens there leaves an error on the socket; a datagram socket goes on.
     if ((ready & EPOLLERR) != 0) TakeError(entry.descriptor.Number());
     if ((ready & EPOLLIN) != 0) Announce(socket, entry, kFdRead);
     break;
@@ -150,7 +148,7 @@ void SocketNotifier::OnReady(SocketHandle socket, SocketEntry& entry, std::uint3
 
 void SocketNotifier::OnConnectionReady(SocketHandle socket, SocketEntry& entry) {
   const int error = TakeError(entry.descriptor.Number());
-  // A peer may have ended a connection that stood: that is told like any other, and its end behind it.
+  // A peer may have ended a connection that stood: that is told like any other, and its end after it.
   const bool stood = error == 0 || error == ECONNRESET || error == EPIPE;
   entry.stage = stood ? SocketEntry::Stage::Connected : SocketEntry::Stage::Fresh;
   if (stood) entry.endError = SocketErrorOf(error);
@@ -159,13 +157,13 @@ void SocketNotifier::OnConnectionReady(SocketHandle socket, SocketEntry& entry) 
 }
 
 void SocketNotifier::OnStreamReadable(SocketHandle socket, SocketEntry& entry, std::uint32_t ready) {
-  if ((entry.enabled & kFdRead) == 0) return;
+  if ((entry.selection.enabled & kFdRead) == 0) return;
   // Readable and not at its end, a stream has data; at its end it may have some left.
   if ((ready & kAtEnd) == 0 || HasData(entry)) return Announce(socket, entry, kFdRead);
   Announce(socket, entry, kFdClose, entry.endError);
-  entry.enabled &= ~kFdClose;
+  entry.selection.enabled &= ~kFdClose;
   // A peer that sends no more may still read.
-  if (entry.endError != 0) entry.enabled &= ~kFdWrite;
+  if (entry.endError != 0) entry.selection.enabled &= ~kFdWrite;
 }
 
 } // namespace quendra::platform::linux_
