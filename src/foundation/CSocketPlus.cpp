@@ -1,7 +1,6 @@
 #include "foundation/CSocketPlus.h"
 
 #include "foundation/SocketErrors.h"
-#include "foundation/SocketTexts.h"
 
 #include <exception>
 

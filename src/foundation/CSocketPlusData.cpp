@@ -1,7 +1,6 @@
 #include "foundation/CSocketPlus.h"
 #include "foundation/DataBytes.h"
 #include "foundation/SocketErrors.h"
-#include "foundation/SocketTexts.h"
 
 #include "runtime/Integers.h"
 
@@ -42,14 +41,13 @@ void CSocketPlus::SendBufferedData(Slot slot) {
       const std::int32_t reason = module_.Library().WSAGetLastError();
       if (reason != platform::kWouldBlock) return Fail(slot, reason, u"CSocketPlus.SendBufferedData");
       if (total >= 1)
-        Events.SendProgress(index, ::quendra::ToInt32(total),
-                            ::quendra::ToInt32(static_cast<std::int64_t>(buffer.Size())));
+        Events.SendProgress(index, ToInt32(total), ToInt32(static_cast<std::int64_t>(buffer.Size())));
       return;
     }
     total += sent;
     buffer.DropFirst(static_cast<std::size_t>(sent));
     if (!buffer.IsEmpty()) continue;
-    Events.SendProgress(index, ::quendra::ToInt32(total), 0);
+    Events.SendProgress(index, ToInt32(total), 0);
     if (!life.expired()) Events.SendComplete(index);
   }
 }
@@ -78,8 +76,7 @@ std::int32_t CSocketPlus::RecvDataToBuffer(Slot slot) {
 
 std::int32_t CSocketPlus::AmountWaiting(Slot slot) {
   SocketRecord& record = At(slot);
-  if (record.Protocol == sckTCPProtocol)
-    return ::quendra::ToInt32(static_cast<std::int64_t>(record.RecvBuffer.Size()));
+  if (record.Protocol == sckTCPProtocol) return ToInt32(static_cast<std::int64_t>(record.RecvBuffer.Size()));
   std::uint32_t amount = 0;
   if (module_.Library().ioctlsocket(record.SocketHandle, platform::kBytesWaiting, amount) ==
       platform::kSocketError)

@@ -1,6 +1,5 @@
 #include "foundation/CSocketPlus.h"
 #include "foundation/SocketErrors.h"
-#include "foundation/SocketTexts.h"
 
 #include "runtime/Integers.h"
 
@@ -36,7 +35,7 @@ void CSocketPlus::OnRead(Slot slot) {
   }
   if (At(slot).State != sckConnected || RecvDataToBuffer(slot) <= 0) return;
   const Variant index = At(slot).Index;
-  Events.DataArrival(index, ::quendra::ToInt32(static_cast<std::int64_t>(At(slot).RecvBuffer.Size())));
+  Events.DataArrival(index, ToInt32(static_cast<std::int64_t>(At(slot).RecvBuffer.Size())));
 }
 
 void CSocketPlus::OnReadUDP(Slot slot) {
@@ -143,7 +142,7 @@ void CSocketPlus::TakePending(Slot slot, platform::SocketHandle requestID) {
 
   const Variant index = At(slot).Index;
   if (!At(slot).RecvBuffer.IsEmpty())
-    Events.DataArrival(index, ::quendra::ToInt32(static_cast<std::int64_t>(At(slot).RecvBuffer.Size())));
+    Events.DataArrival(index, ToInt32(static_cast<std::int64_t>(At(slot).RecvBuffer.Size())));
   if (!peerClosed || !StillHolds(life, slot, requestID)) return;
   At(slot).State = sckClosing;
   Events.CloseSck(index);

@@ -1,6 +1,6 @@
 #include "foundation/CSocketPlus.h"
+#include "foundation/LibraryName.h"
 #include "foundation/SocketErrors.h"
-#include "foundation/SocketTexts.h"
 
 #include "platform/net/AddressList.h"
 #include "platform/net/IpProtocols.h"

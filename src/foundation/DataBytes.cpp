@@ -8,21 +8,21 @@ namespace quendra::foundation {
 
 namespace {
 
-/// The pattern of a number as wide as the number.
+/// The unsigned number of the same width, which has the same bits.
 template <typename Number>
-using Pattern = std::conditional_t<
+using BitsOf = std::conditional_t<
     sizeof(Number) == 8, std::uint64_t,
     std::conditional_t<sizeof(Number) == 4, std::uint32_t,
                        std::conditional_t<sizeof(Number) == 2, std::uint16_t, std::uint8_t>>>;
 
 template <typename Number> ByteArray Raw(Number number) {
   ByteArray bytes(sizeof number);
-  PutLittleField(bytes, 0, std::bit_cast<Pattern<Number>>(number));
+  PutLittleField(bytes, 0, std::bit_cast<BitsOf<Number>>(number));
   return bytes;
 }
 
 template <typename Number> Number FromRaw(const ByteArray& bytes) {
-  return std::bit_cast<Number>(LittleField<Pattern<Number>>(bytes, 0));
+  return std::bit_cast<Number>(LittleField<BitsOf<Number>>(bytes, 0));
 }
 
 struct ByteWriter {

@@ -1,8 +1,8 @@
 #include "foundation/modSocketPlus.h"
 
 #include "foundation/CSocketPlus.h"
+#include "foundation/LibraryName.h"
 #include "foundation/SocketErrors.h"
-#include "foundation/SocketTexts.h"
 
 namespace quendra::foundation {
 
@@ -15,7 +15,7 @@ modSocketPlus::modSocketPlus(platform::Sockets& sockets, platform::HostNames& ho
     : sockets_(sockets), hostNames_(hostNames), desktop_(desktop), windows_(windows) {}
 
 modSocketPlus::~modSocketPlus() {
-  // Each leaves the module as it ends, so the tables must still be there.
+  // Objects use the module's tables when they end, so the pending ones end before the tables do.
   while (!pendingAccepts_.empty()) UnregisterAccept(pendingAccepts_.begin()->first);
   DetachDispatcher();
 }
@@ -92,7 +92,7 @@ bool modSocketPlus::IsAcceptRegistered(platform::SocketHandle socket) const {
 }
 
 void modSocketPlus::UnregisterAccept(platform::SocketHandle socket) {
-  // Out of the list before it ends: ending it comes back here by way of the class count.
+  // Taken out of the list first: an object that ends calls this module again, which must not find it then.
   const auto ended = pendingAccepts_.extract(socket);
 }
 

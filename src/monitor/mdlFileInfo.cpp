@@ -16,7 +16,7 @@ constexpr std::uint32_t kStatedPathSize = 500;
 constexpr std::array<TextView, 5> kSystemNames{u"system", u"smss.exe", u"winlogon.exe", u"csrss.exe",
                                                u"lsass.exe"};
 
-/// Makes room for `kPathRoom` characters and states more, as the program always has.
+/// The text has room for `kPathRoom` characters; the size that is stated is a larger one, as it always was.
 Text FirstModulePath(platform::Processes& processes, platform::Handle process) {
   std::array<platform::ModuleHandle, kModuleTableBytes / sizeof(platform::ModuleHandle)> modules{};
   if (!processes.EnumProcessModules(process, modules)) return {};

@@ -120,7 +120,7 @@ void SupportExchange::Close(std::int16_t index) {
 }
 
 void SupportExchange::OfferReport() {
-  if (!main_spSockets_) return; // the page was left behind the box of an error
+  if (!main_spSockets_) return; // the page was left while the box of an error stood
   const auto isClosed = [this](std::int16_t index) {
     return main_spSockets_->State(index) == foundation::sckClosed;
   };

@@ -11,8 +11,8 @@
 namespace quendra::report {
 
 /// The exchange with the support server over the sockets of the monitor page: 1 fetches a page that nobody
-/// reads and is never connected, 2 fetches a report number, 3 posts the report, 4 downloads a load. Its state
-/// is the order of the events; leaving the page ends it without a word.
+/// reads and is never connected, 2 fetches a report number, 3 posts the report, 4 downloads a load. What
+/// comes next follows from the order of their events; leaving the page ends the exchange without a message.
 class SupportExchange {
  public:
   SupportExchange(foundation::modSocketPlus& module, forms::MessageLoop& loop, ReportControls& controls,
@@ -46,13 +46,13 @@ class SupportExchange {
   // A socket leaves its closed state and comes back to it by these two alone.
   void Connect(std::int16_t index, TextView host);
   void Close(std::int16_t index);
-  /// The button is enabled while a press can be taken: one while socket 2 or 3 is in use, failed ones
-  /// included, or before a number that was shown is posted would end the program.
+  /// Enables the button while a press can be taken. A press would end the program while socket 2 or 3 is in
+  /// use, failed ones included, and from the showing of a number until its report is posted.
   void OfferReport();
   Text TakeText(Index index);
   void NumberArrived();
   void ReportClosed();
-  /// Both are false when the page was left behind the box: the exchange has ended with it.
+  /// Both are false when the page was left while the box stood: the exchange has ended with it.
   bool ShowNumber(const Text& number);
   bool ShowHebrewBox(const Text& text, int icon);
 

@@ -61,16 +61,16 @@ Text Format(double value, TextView format) {
   const std::string digits = RoundedDigits(decimal, static_cast<int>(places));
 
   std::string before = digits.substr(0, digits.size() - places);
-  std::string behind = digits.substr(digits.size() - places);
+  std::string after = digits.substr(digits.size() - places);
   before.erase(0, std::min(before.find_first_not_of('0'), before.size()));
   const auto firstZero = std::min(whole.find(u'0'), whole.size());
   const auto needed = whole.size() - firstZero;
   if (before.size() < needed) before.insert(0, needed - before.size(), '0');
-  while (!behind.empty() && behind.back() == '0' && fraction[behind.size() - 1] == u'#') behind.pop_back();
+  while (!after.empty() && after.back() == '0' && fraction[after.size() - 1] == u'#') after.pop_back();
 
   const bool zero = digits.find_first_not_of('0') == std::string::npos;
   std::string text = (decimal.negative && !zero ? "-" : "") + before;
-  if (point != TextView::npos) text += "." + behind;
+  if (point != TextView::npos) text += "." + after;
   return Text(text.begin(), text.end());
 }
 

@@ -20,7 +20,7 @@ struct Paragraph {
     rest.erase(0, 1);
   }
 
-  /// Everything behind the line's last blank goes back; the blank itself belongs to neither.
+  /// Everything after the line's last blank goes back to the rest; the blank itself belongs to neither.
   void CutAtLastBlank() {
     const std::size_t blank = line.rfind(u' ');
     if (blank == Text::npos) return;

@@ -16,7 +16,8 @@ class MonitorWork {
 
   void main_StartPage();
   void main_StopPage();
-  /// Stamps the time. A pass would come first, behind a gate that nothing opens.
+  /// Stores the time as that of the last pass. It would make a pass first if TimerRefreshGate were set, which
+  /// nothing does.
   void main_Timer1_Timer();
 
   Boolean16 TimerRefreshGate = kFalse16;

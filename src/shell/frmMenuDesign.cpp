@@ -62,7 +62,7 @@ void frmMenu::DesignEntry(std::size_t entry) {
   looks::PlainText(caption, kPageTable[PageOfEntry(entry)].caption, isButton ? looks::kEntry : looks::kSmall,
                    looks::kForest);
   caption.Align = forms::Alignment::Centre;
-  // The second row stands at the foot of the window, behind the pages.
+  // The second row stands at the foot of the window, and Tab comes to it after the pages.
   caption.TabIndex = isButton ? 0 : 1;
   caption.Move(0, 0, Px(width), Px(height));
 }

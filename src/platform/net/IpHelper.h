@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/net/TcpTable.h"
+#include "platform/net/TcpTableEntry.h"
 
 #include <cstdint>
 #include <memory>

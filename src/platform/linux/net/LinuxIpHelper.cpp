@@ -13,10 +13,10 @@ std::uint32_t LinuxIpHelper::AllocateAndGetTcpExTableFromStack(TcpTable& table) 
   if (!diagnostics_.Read(sockets_)) return kErrorNotSupported;
   owners_.Update(sockets_);
 
-  auto bytes = std::make_shared<std::vector<std::uint8_t>>(TcpTableEntry::kFirst +
+  auto bytes = std::make_shared<std::vector<std::uint8_t>>(TcpTableEntry::kFirstOffset +
                                                            TcpTableEntry::kBytes * sockets_.size());
   PutLittle32(*bytes, 0, static_cast<std::uint32_t>(sockets_.size()));
-  std::size_t at = TcpTableEntry::kFirst;
+  std::size_t at = TcpTableEntry::kFirstOffset;
   for (const TcpSocket& socket : sockets_) {
     const TcpTableEntry entry{socket.state,         socket.localAddress, socket.localPort,
                               socket.remoteAddress, socket.remotePort,   owners_.OwnerOf(socket.node)};

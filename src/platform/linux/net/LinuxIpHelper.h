@@ -14,7 +14,9 @@ class LinuxIpHelper : public IpHelper {
 
   std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) override;
   /// Connections of others aren't ended on this system.
-  std::uint32_t SetTcpEntry(std::span<const std::uint8_t, 20>) override { return kErrorNotSupported; }
+  std::uint32_t SetTcpEntry(std::span<const std::uint8_t, TcpTableEntry::kBytesWithoutOwner>) override {
+    return kErrorNotSupported;
+  }
   std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
 
  private:

@@ -69,7 +69,7 @@ LookUpHandle NameLookUps::Start(const std::string& name, Done done) {
     std::thread([shared = shared_] { Work(shared); }).detach();
     ++shared_->threads;
   } catch (const std::system_error&) {
-    // Those that run already will come to it; without any there is no look-up.
+    // The threads that run already will take it up; without any there is no look-up.
     if (shared_->threads > 0) return handle;
     shared_->jobs.clear();
     shared_->underWay.erase(handle);

@@ -21,7 +21,7 @@ class NameLookUps {
   using Done = std::function<void(std::int32_t error, const std::vector<Ipv4Address>& addresses)>;
 
   NameLookUps(EventLoop& loop, HostNames& hostNames);
-  /// Look-ups under way end without a word.
+  /// Look-ups under way end without a call of `done`.
   ~NameLookUps();
 
   /// The look-up's handle, kNoLookUp when the system has no thread for it. `done` runs from the loop, never

@@ -9,8 +9,8 @@
 
 namespace quendra::platform::simulated {
 
-/// Dormant: what a test puts before the reads of handles that no network stands behind. Only the capture's
-/// second way to the packets reads such, and nothing opens it.
+/// Dormant: what a test puts before the reads of handles that belong to no simulated network. Only the
+/// capture's second way to the packets reads such handles, and nothing opens it.
 class DormantReads {
  public:
   void Put(SocketHandle socket, std::vector<std::uint8_t> bytes) {

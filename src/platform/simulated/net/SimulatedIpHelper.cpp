@@ -9,9 +9,9 @@ namespace quendra::platform::simulated {
 std::uint32_t SimulatedIpHelper::AllocateAndGetTcpExTableFromStack(TcpTable& table) {
   if (TableError != 0) return TableError;
   ++TablesFetched;
-  std::vector<std::uint8_t> bytes(TcpTableEntry::kFirst + TcpTableEntry::kBytes * Connections.size());
+  std::vector<std::uint8_t> bytes(TcpTableEntry::kFirstOffset + TcpTableEntry::kBytes * Connections.size());
   PutLittle32(bytes, 0, static_cast<std::uint32_t>(Connections.size()));
-  std::size_t at = TcpTableEntry::kFirst;
+  std::size_t at = TcpTableEntry::kFirstOffset;
   for (const Connection& connection : Connections) {
     const TcpTableEntry entry{connection.state,
                               AddressOf(connection.localAddress).InMemory(),
@@ -26,7 +26,8 @@ std::uint32_t SimulatedIpHelper::AllocateAndGetTcpExTableFromStack(TcpTable& tab
   return 0;
 }
 
-std::uint32_t SimulatedIpHelper::SetTcpEntry(std::span<const std::uint8_t, 20> record) {
+std::uint32_t
+SimulatedIpHelper::SetTcpEntry(std::span<const std::uint8_t, TcpTableEntry::kBytesWithoutOwner> record) {
   std::copy(record.begin(), record.end(), Deleted.emplace_back().begin());
   return SetTcpEntryResult;
 }

@@ -1,4 +1,4 @@
-#include "foundation/SocketTexts.h"
+#include "foundation/LibraryName.h"
 
 namespace quendra::foundation {
 

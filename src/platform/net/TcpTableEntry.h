@@ -28,8 +28,8 @@ enum TcpState : std::uint32_t {
 /// One entry. Addresses and ports (low 16 bits) are in network order as they lie in memory.
 struct TcpTableEntry {
   static constexpr std::size_t kBytes = 24;
-  /// Where the first entry stands, behind the count.
-  static constexpr std::size_t kFirst = 4;
+  /// Where the first entry stands in a table, after the count.
+  static constexpr std::size_t kFirstOffset = 4;
   /// Without the owner it is the record that SetTcpEntry takes.
   static constexpr std::size_t kBytesWithoutOwner = 20;
 
