@@ -1,0 +1,111 @@
+#include "platform/unavailable/UnavailableMachine.h"
+
+#include "platform/process/SystemErrors.h"
+
+#include <gtest/gtest.h>
+
+#include <array>
+
+namespace quendra::platform::unavailable {
+
+namespace {
+
+/// Each family by itself: it answers as on a system that lacks it, and leaves alone what it was given to
+/// fill.
+class UnavailableFamilies : public testing::Test {
+ protected:
+  UnavailableMachine machine;
+};
+
+TEST_F(UnavailableFamilies, Processes_cannot_be_listed_nor_opened_and_the_error_is_that_of_a_missing_call) {
+  Processes::Entry entry;
+  EXPECT_EQ(machine.processes.CreateToolhelp32Snapshot(Processes::kSnapProcess, 0), kInvalidHandle);
+  EXPECT_FALSE(machine.processes.Process32First(kInvalidHandle, entry));
+  EXPECT_FALSE(machine.processes.Process32Next(kInvalidHandle, entry));
+  EXPECT_EQ(machine.processes.OpenProcess(0, false, 1), kNoHandle);
+  EXPECT_EQ(machine.processes.GetLastError(), kCallNotImplemented);
+}
+
+TEST_F(UnavailableFamilies, A_process_has_no_modules) {
+  std::array<ModuleHandle, 2> modules{};
+  std::string path = "before";
+  EXPECT_FALSE(machine.processes.EnumProcessModules(kOwnProcess, modules));
+  EXPECT_EQ(machine.processes.GetModuleFileNameExA(kOwnProcess, modules[0], path, 500), 0u);
+  EXPECT_EQ(path, "before");
+}
+
+TEST_F(UnavailableFamilies, No_step_of_a_privilege_succeeds) {
+  Handle token = kNoHandle;
+  std::uint64_t luid = 0;
+  std::array<std::uint8_t, 16> previous{};
+  EXPECT_FALSE(machine.tokens.OpenProcessToken(kOwnProcess, 40, token));
+  EXPECT_FALSE(machine.tokens.LookupPrivilegeValueA("", "SeDebugPrivilege", luid));
+  EXPECT_FALSE(machine.tokens.AdjustTokenPrivileges(token, false, luid, Tokens::kEnabled, previous));
+}
+
+TEST_F(UnavailableFamilies, Files_have_neither_version_block_nor_icon) {
+  EXPECT_EQ(machine.versionInfo.GetFileVersionInfoSizeA("C:\\a.exe"), 0u);
+  EXPECT_FALSE(machine.versionInfo.VerQueryValueA({}, std::string(VersionInfo::kTranslation)));
+  EXPECT_EQ(machine.icons.ExtractIconExA("C:\\a.exe", 0), kNoHandle);
+  EXPECT_TRUE(machine.icons.ImageOf(kNoHandle).empty());
+  EXPECT_FALSE(machine.icons.DestroyIcon(kNoHandle));
+}
+
+TEST_F(UnavailableFamilies, Native_queries_end_with_the_status_of_what_does_not_exist) {
+  std::array<std::uint8_t, 64> buffer{};
+  std::uint32_t returned = 77;
+  EXPECT_EQ(machine.handles.NtQuerySystemInformation(Handles::kHandleTable, buffer, returned),
+            Handles::kStatusNotImplemented);
+  EXPECT_EQ(returned, 0u);
+  returned = 77;
+  EXPECT_EQ(machine.handles.NtQueryObject(kNoHandle, Handles::kObjectName, buffer, returned),
+            Handles::kStatusNotImplemented);
+  EXPECT_EQ(returned, 0u);
+  EXPECT_EQ(
+      machine.handles.NtDeviceIoControlFile(kNoHandle, kNoHandle, Handles::kQueryInformation, buffer, buffer),
+      Handles::kStatusNotImplemented);
+}
+
+TEST_F(UnavailableFamilies, The_tables_of_the_network_are_not_supported_and_stay_as_they_were) {
+  IpHelper::TcpTable table;
+  std::vector<AdapterRecord> adapters(1);
+  std::uint32_t size = 640;
+  const std::array<std::uint8_t, TcpTableEntry::kBytesWithoutOwner> record{};
+  EXPECT_EQ(machine.ipHelper.AllocateAndGetTcpExTableFromStack(table), IpHelper::kErrorNotSupported);
+  EXPECT_FALSE(table);
+  EXPECT_EQ(machine.ipHelper.GetAdaptersInfo(adapters, size), IpHelper::kErrorNotSupported);
+  EXPECT_EQ(adapters.size(), 1u);
+  EXPECT_EQ(size, 640u);
+  EXPECT_EQ(machine.ipHelper.SetTcpEntry(record), IpHelper::kErrorNotSupported);
+}
+
+TEST_F(UnavailableFamilies, Names_fail_for_want_of_a_network) {
+  EXPECT_FALSE(machine.hostNames.gethostname());
+  EXPECT_FALSE(machine.hostNames.gethostbyname("localhost"));
+  EXPECT_EQ(machine.hostNames.LastError(), kSubsystemUnavailable);
+}
+
+TEST_F(UnavailableFamilies, The_socket_library_does_not_start_and_makes_no_socket) {
+  EXPECT_EQ(machine.sockets.WSAStartup(257), kSubsystemUnavailable);
+  EXPECT_EQ(machine.sockets.socket(kInternetFamily, kStreamSocket, 6), kNoSocket);
+  EXPECT_EQ(machine.sockets.WSAGetLastError(), kSubsystemUnavailable);
+}
+
+TEST_F(UnavailableFamilies, A_look_up_is_not_begun_and_leaves_its_buffer) {
+  std::array<std::uint8_t, 8> buffer{};
+  buffer.fill(0xEE);
+  const auto before = buffer;
+  EXPECT_EQ(machine.sockets.WSAAsyncGetHostByName(WindowHandle(1), 32768, "localhost", buffer), kNoLookUp);
+  EXPECT_EQ(buffer, before);
+}
+
+TEST_F(UnavailableFamilies, The_system_tells_no_version_and_starts_no_program) {
+  OsVersion version{7, 8, 9};
+  EXPECT_FALSE(machine.system.GetVersionExA(version));
+  EXPECT_EQ(version.platformId, 7u);
+  EXPECT_FALSE(machine.shellStart.Shell("calc.exe", ShellStart::kNormalWindow));
+}
+
+} // namespace
+
+} // namespace quendra::platform::unavailable
