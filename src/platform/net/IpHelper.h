@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/net/TcpTableEntry.h"
+#include "platform/net/DormantConnectionEnd.h"
 
 #include <cstdint>
 #include <memory>
@@ -19,10 +19,8 @@ struct AdapterRecord {
 };
 
 /// Tables of the IP helper library.
-class IpHelper {
+class IpHelper : public DormantConnectionEnd {
  public:
-  virtual ~IpHelper() = default;
-
   using TcpTable = std::shared_ptr<const std::vector<std::uint8_t>>;
 
   /// What GetAdaptersInfo needs for one adapter.
@@ -33,9 +31,6 @@ class IpHelper {
   /// The IPv4 TCP connections with their owners: a 32-bit count in host order, then the entries
   /// (TcpTableEntry). 0 on success; on failure `table` stays as it was.
   virtual std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) = 0;
-  /// A TcpTableEntry without its owner, with the state kTcpDelete. 0 on success.
-  virtual std::uint32_t
-  SetTcpEntry(std::span<const std::uint8_t, TcpTableEntry::kBytesWithoutOwner> record) = 0;
   /// `size` counts bytes of room, kAdapterBytes an adapter. With less room than needed it gives
   /// kErrorBufferOverflow and puts the needed size in `size`; otherwise it gives 0 and fills `adapters`.
   virtual std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) = 0;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/net/DormantSocketCalls.h"
 #include "platform/net/Ipv4Address.h"
 #include "platform/net/SocketNumbers.h"
 #include "runtime/OpaqueHandle.h"
@@ -36,10 +37,8 @@ struct SocketAddress {
 /// data remains), FD_WRITE after the connection and after a send that was refused with kWouldBlock, FD_ACCEPT
 /// until accept (again while connections wait), FD_CONNECT once, FD_CLOSE once, after the last data was read.
 /// An accepted socket has its listener's selection.
-class Sockets {
+class Sockets : public DormantSocketCalls {
  public:
-  virtual ~Sockets() = default;
-
   /// 0, or the reason itself. `version` is the minor version in the high byte and the major one in the low.
   virtual std::int32_t WSAStartup(std::uint16_t version) = 0;
   virtual std::int32_t WSACleanup() = 0;
@@ -80,9 +79,6 @@ class Sockets {
                                              const std::string& name, std::span<std::uint8_t> buffer) = 0;
   /// 0 when the look-up was under way: its message will not come and its buffer is not touched any more.
   virtual std::int32_t WSACancelAsyncRequest(LookUpHandle lookUp) = 0;
-
-  virtual bool WSAIsBlocking() = 0;
-  virtual std::int32_t WSACancelBlockingCall() = 0;
 
   /// The address of a dotted text, kNoAddress for any other text. The library's own rules: one to four parts,
   /// the last of which fills what is left, each in decimal, octal (leading 0) or hexadecimal (leading 0x).

@@ -13,11 +13,12 @@ class LinuxIpHelper : public IpHelper {
   LinuxIpHelper(const ProcFolder& folder, SocketOwners::Rights rights, Clock clock = CoarseMilliseconds);
 
   std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) override;
-  /// Connections of others aren't ended on this system.
+  std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
+
+  /// Dormant. Connections of others aren't ended on this system.
   std::uint32_t SetTcpEntry(std::span<const std::uint8_t, TcpTableEntry::kBytesWithoutOwner>) override {
     return kErrorNotSupported;
   }
-  std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
 
  private:
   const ProcFolder& folder_;

@@ -41,7 +41,9 @@ class LinuxSockets : public Sockets {
   LookUpHandle WSAAsyncGetHostByName(WindowHandle window, std::uint32_t message, const std::string& name,
                                      std::span<std::uint8_t> buffer) override;
   std::int32_t WSACancelAsyncRequest(LookUpHandle lookUp) override;
-  /// No call blocks here.
+
+  // Dormant. No call blocks here.
+
   bool WSAIsBlocking() override { return false; }
   std::int32_t WSACancelBlockingCall() override { return Fail(kInvalidArgument); }
 

@@ -22,12 +22,13 @@ class SimulatedIpHelper : public IpHelper {
   /// Other than 0: what AllocateAndGetTcpExTableFromStack fails with.
   std::uint32_t TableError = 0;
   int TablesFetched = 0;
-  /// The records that SetTcpEntry was given.
-  std::vector<std::array<std::uint8_t, TcpTableEntry::kBytesWithoutOwner>> Deleted;
-  std::uint32_t SetTcpEntryResult = 0;
   std::vector<AdapterRecord> Adapters;
   /// Other than 0: what GetAdaptersInfo fails with.
   std::uint32_t AdaptersError = 0;
+
+  // Dormant: the records that SetTcpEntry was given, and what it gives.
+  std::vector<std::array<std::uint8_t, TcpTableEntry::kBytesWithoutOwner>> Deleted;
+  std::uint32_t SetTcpEntryResult = 0;
 
   std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) override;
   std::uint32_t SetTcpEntry(std::span<const std::uint8_t, TcpTableEntry::kBytesWithoutOwner> record) override;

@@ -1,0 +1,17 @@
+#pragma once
+
+#include <cstdint>
+
+namespace quendra::platform {
+
+/// Dormant: what of the socket library only the capture's second way to the packets asks, and nothing opens
+/// that.
+class DormantSocketCalls {
+ public:
+  virtual ~DormantSocketCalls() = default;
+
+  virtual bool WSAIsBlocking() = 0;
+  virtual std::int32_t WSACancelBlockingCall() = 0;
+};
+
+} // namespace quendra::platform
