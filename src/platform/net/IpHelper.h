@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/net/DormantConnectionEnd.h"
+#include "platform/net/dormant/TcpEntryChange.h"
 
 #include <cstdint>
 #include <memory>
@@ -19,7 +19,7 @@ struct AdapterRecord {
 };
 
 /// Tables of the IP helper library.
-class IpHelper : public DormantConnectionEnd {
+class IpHelper : public TcpEntryChange {
  public:
   using TcpTable = std::shared_ptr<const std::vector<std::uint8_t>>;
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "platform/net/DormantSocketCalls.h"
 #include "platform/net/Ipv4Address.h"
 #include "platform/net/SocketNumbers.h"
+#include "platform/net/dormant/BlockingCalls.h"
 #include "runtime/OpaqueHandle.h"
 
 #include <cstdint>
@@ -37,7 +37,7 @@ struct SocketAddress {
 /// data remains), FD_WRITE after the connection and after a send that was refused with kWouldBlock, FD_ACCEPT
 /// until accept (again while connections wait), FD_CONNECT once, FD_CLOSE once, after the last data was read.
 /// An accepted socket has its listener's selection.
-class Sockets : public DormantSocketCalls {
+class Sockets : public BlockingCalls {
  public:
   /// 0, or the reason itself. `version` is the minor version in the high byte and the major one in the low.
   virtual std::int32_t WSAStartup(std::uint16_t version) = 0;

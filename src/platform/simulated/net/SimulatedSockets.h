@@ -1,10 +1,10 @@
 #pragma once
 
 #include "platform/simulated/SimulatedCore.h"
-#include "platform/simulated/net/DormantReads.h"
 #include "platform/simulated/net/SimulatedConnections.h"
 #include "platform/simulated/net/SimulatedDatagrams.h"
 #include "platform/simulated/net/SimulatedLookUps.h"
+#include "platform/simulated/net/dormant/ScriptedReads.h"
 
 namespace quendra::platform::simulated {
 
@@ -66,15 +66,15 @@ class SimulatedSockets : public Sockets {
   std::int32_t SendBufferSize = 8192;
   std::int32_t ReceiveBufferSize = 8192;
 
-  // Dormant, as DormantReads says.
+  // Dormant, as ScriptedReads says.
 
   /// What the next reads of a socket give; a read takes at most one of them. A socket with nothing left is at
   /// its end.
   void Receive(SocketHandle socket, std::vector<std::uint8_t> bytes) {
-    dormantReads_.Put(socket, std::move(bytes));
+    scriptedReads_.Put(socket, std::move(bytes));
   }
   /// A read that fails, after those that wait already.
-  void FailReceive(SocketHandle socket) { dormantReads_.PutFailure(socket); }
+  void FailReceive(SocketHandle socket) { scriptedReads_.PutFailure(socket); }
   bool Blocking = false;
 
   // Sockets.
@@ -128,7 +128,7 @@ class SimulatedSockets : public Sockets {
   SimulatedConnections connections_;
   SimulatedDatagrams datagrams_;
   SimulatedLookUps lookUps_;
-  DormantReads dormantReads_;
+  ScriptedReads scriptedReads_;
 };
 
 } // namespace quendra::platform::simulated

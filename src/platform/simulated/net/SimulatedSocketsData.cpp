@@ -25,8 +25,8 @@ std::int32_t SimulatedSockets::sendto(SocketHandle socket, std::span<const std::
 
 std::int32_t SimulatedSockets::recv(SocketHandle socket, std::span<std::uint8_t> buffer, std::int32_t flags) {
   core_.calls.push_back("recv " + std::to_string(socket.Value()) + " " + std::to_string(buffer.size()));
-  if (dormantReads_.Knows(socket) || (!messages_.HasLoop() && !table_.Has(socket)))
-    return dormantReads_.Read(socket, buffer);
+  if (scriptedReads_.Knows(socket) || (!messages_.HasLoop() && !table_.Has(socket)))
+    return scriptedReads_.Read(socket, buffer);
   if (Scripted("recv")) return kSocketError;
   SocketAddress from;
   return recvfrom(socket, buffer, flags, from);

@@ -5,9 +5,9 @@
 namespace quendra::platform {
 
 /// Dormant: what of the IP helper library only the sweep of connections asks, and nothing starts that.
-class DormantConnectionEnd {
+class TcpEntryChange {
  public:
-  virtual ~DormantConnectionEnd() = default;
+  virtual ~TcpEntryChange() = default;
 
   /// A TcpTableEntry without its owner, with the state kTcpDelete. 0 on success.
   virtual std::uint32_t

@@ -6,9 +6,9 @@ namespace quendra::platform {
 
 /// Dormant: what of the socket library only the capture's second way to the packets asks, and nothing opens
 /// that.
-class DormantSocketCalls {
+class BlockingCalls {
  public:
-  virtual ~DormantSocketCalls() = default;
+  virtual ~BlockingCalls() = default;
 
   virtual bool WSAIsBlocking() = 0;
   virtual std::int32_t WSACancelBlockingCall() = 0;

@@ -1,10 +1,10 @@
-#include "platform/simulated/net/DormantReads.h"
+#include "platform/simulated/net/dormant/ScriptedReads.h"
 
 #include <algorithm>
 
 namespace quendra::platform::simulated {
 
-std::int32_t DormantReads::Read(SocketHandle socket, std::span<std::uint8_t> buffer) {
+std::int32_t ScriptedReads::Read(SocketHandle socket, std::span<std::uint8_t> buffer) {
   auto& waiting = waiting_[socket];
   if (waiting.empty()) return 0;
   if (!waiting.front()) {

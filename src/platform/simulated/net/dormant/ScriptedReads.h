@@ -11,7 +11,7 @@ namespace quendra::platform::simulated {
 
 /// Dormant: what a test puts before the reads of handles that belong to no simulated network. Only the
 /// capture's second way to the packets reads such handles, and nothing opens it.
-class DormantReads {
+class ScriptedReads {
  public:
   void Put(SocketHandle socket, std::vector<std::uint8_t> bytes) {
     waiting_[socket].push_back(std::move(bytes));
