@@ -1,7 +1,8 @@
 #pragma once
 
 #include "platform/DescriptorWatch.h"
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureControls.h"
+#include "platform/capture/CaptureLibrary.h"
 #include "platform/linux/capture/PcapLibrary.h"
 
 #include <memory>

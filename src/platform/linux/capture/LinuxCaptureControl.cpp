@@ -1,5 +1,6 @@
 #include "platform/linux/capture/LinuxCaptureControl.h"
 
+#include "platform/capture/CaptureRecordHeader.h"
 #include "runtime/Text.h"
 
 #include <algorithm>

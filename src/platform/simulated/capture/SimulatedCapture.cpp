@@ -1,5 +1,6 @@
 #include "platform/simulated/capture/SimulatedCapture.h"
 
+#include "platform/capture/CaptureRecordHeader.h"
 #include "runtime/Text.h"
 
 #include <algorithm>
