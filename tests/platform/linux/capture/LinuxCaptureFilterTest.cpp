@@ -108,16 +108,17 @@ class CookedCaptureTest : public LinuxCaptureFixture {
   void SetUp() override {
     LinuxCaptureFixture::SetUp();
     if (IsSkipped()) return;
-    session = PcapSession::Open(library, "any", queue);
+    session = PcapSession::Open(library, desktop, "any", shaper);
     ASSERT_NE(session, nullptr);
   }
-  const PcapRecord* Next() {
+  const FrameRecord* Next() {
     desktop.WaitFor([&] { return session->Fill() > 0 || !queue.Empty(); }, 1000);
     return queue.Pop();
   }
 
   PcapLibrary library;
-  PcapFrameQueue queue;
+  FrameQueue queue;
+  FrameShaper shaper{queue};
   std::unique_ptr<PcapSession> session;
 };
 
@@ -125,7 +126,7 @@ TEST_F(CookedCaptureTest, A_decoder_sees_as_many_bytes_as_on_a_link_with_Etherne
   Bytes packet = PacketOf(47, 200);
   for (std::size_t i = 20; i < packet.size(); ++i) packet[i] = static_cast<std::uint8_t>(i);
   RawLink("qv1").Send(EthernetFrame(packet));
-  const PcapRecord* record = Next();
+  const FrameRecord* record = Next();
   ASSERT_NE(record, nullptr);
   EXPECT_EQ(record->captured, 96u);
   EXPECT_EQ(record->wire, 214u);
@@ -137,7 +138,7 @@ TEST_F(CookedCaptureTest, Nothing_but_TCP_and_tunnels_over_IPv4_is_delivered) {
   far.Send(UdpFrame(1025, 53));
   far.Send(EthernetFrame(Bytes(46, 6), kTypeArp));
   far.Send(TcpFrame(4711, 80));
-  const PcapRecord* record = Next();
+  const FrameRecord* record = Next();
   ASSERT_NE(record, nullptr);
   EXPECT_EQ(record->bytes[34] * 256 + record->bytes[35], 4711);
 }
