@@ -1,6 +1,6 @@
-// The whole program on the simulated machine and the headless desktop: prints the splash as text, and what the
-// capture that backends share delivers of a packet on a line made up here. It links when no portable layer
-// needs anything of a backend of one system.
+// The whole program on the simulated machine and the headless desktop: prints the splash as text, and what
+// the capture that backends share delivers of a packet on a line made up here. It links when no portable
+// layer needs anything of a backend of one system.
 
 #include "app/Program.h"
 #include "forms/headless/HeadlessDesktop.h"

@@ -30,7 +30,7 @@ class LinuxCaptureFilterTest : public LinuxCaptureFixture {
     LinuxCaptureFixture::SetUp();
     if (!IsSkipped()) Start("qv0");
   }
-  /// The frames that are delivered of those that are sent, the last of which is.
+  /// Sends these frames and one more that is certain to be delivered, and gives those that came before it.
   std::vector<Bytes> Delivered(const std::vector<Bytes>& sent) {
     RawLink far("qv1");
     for (const Bytes& frame : sent) far.Send(frame);
@@ -89,7 +89,8 @@ TEST_F(LinuxCaptureFilterTest, A_TCP_packet_with_options_is_delivered) {
   EXPECT_EQ(Delivered({options}), std::vector<Bytes>{options});
 }
 
-// Its type, which the tag takes the place of, would end a drain; its owner has another adapter to follow.
+// The tag stands where the type of a frame is looked for, and would end a drain. Who wants such frames
+// follows the adapter of the virtual network.
 TEST_F(LinuxCaptureFilterTest, A_tagged_frame_is_not_delivered) {
   EXPECT_TRUE(Delivered({Tagged(PacketOf(6)), Tagged(PacketOf(47)), Tagged(PacketOf(17))}).empty());
 }
