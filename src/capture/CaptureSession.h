@@ -3,7 +3,7 @@
 #include "capture/AdapterControls.h"
 #include "capture/OwnAddresses.h"
 #include "capture/PacketControl.h"
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureLibrary.h"
 #include "platform/system/System.h"
 
 #include <optional>

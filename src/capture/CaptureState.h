@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureLibrary.h"
 #include "runtime/Text.h"
 
 #include <cstdint>

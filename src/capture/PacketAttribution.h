@@ -8,7 +8,7 @@
 #include "capture/clsIP.h"
 #include "capture/clsTCP.h"
 #include "forms/MessageLoop.h"
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureLibrary.h"
 
 #include <optional>
 

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "forms/controls/Event.h"
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureControls.h"
 
 #include <memory>
 #include <vector>

@@ -1,6 +1,7 @@
 #pragma once
 
-#include "platform/capture/Capture.h"
+#include "platform/capture/FrameBytes.h"
+#include "platform/net/Ipv4Address.h"
 #include "runtime/Text.h"
 
 #include <optional>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/capture/Capture.h"
+#include "platform/capture/FrameBytes.h"
 #include "runtime/ByteFields.h"
 #include "runtime/Text.h"
 

@@ -1,5 +1,6 @@
 #include "capture/mod_functions.h"
 
+#include "platform/net/Ipv4Address.h"
 #include "runtime/ByteFields.h"
 
 #include <algorithm>

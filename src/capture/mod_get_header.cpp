@@ -1,6 +1,7 @@
 #include "capture/mod_get_header.h"
 
 #include "capture/mod_functions.h"
+#include "platform/capture/CaptureRecordHeader.h"
 
 namespace quendra::capture::mod_get_header {
 

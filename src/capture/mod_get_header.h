@@ -1,7 +1,9 @@
 #pragma once
 
-#include "platform/capture/Capture.h"
+#include "platform/capture/FrameBytes.h"
 #include "runtime/Text.h"
+
+#include <array>
 
 /// Reads the headers that stand before the packet in a capture record.
 namespace quendra::capture::mod_get_header {

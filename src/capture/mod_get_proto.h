@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/capture/Capture.h"
+#include "platform/capture/FrameBytes.h"
 
 /// Reads the IPv4 header of a capture record. Only its protocol is ever consumed.
 namespace quendra::capture::mod_get_proto {

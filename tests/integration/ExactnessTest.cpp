@@ -99,7 +99,7 @@ class Exactness : public testing::Test {
     AwaitAll(all);
   }
 
-  platform::linux_::CaptureCounters Counters() { return machine->Capture().Counters(); }
+  platform::CaptureCounters Counters() { return machine->Capture().Counters(); }
 
   /// Both captures have seen the same TCP frames, and no more come.
   void AwaitSilence() {

@@ -1,11 +1,7 @@
 #pragma once
 
-#include "runtime/ByteFields.h"
+#include "integration/Packets.h"
 
-#include <algorithm>
-#include <arpa/inet.h>
-#include <cstdint>
-#include <cstring>
 #include <linux/if_packet.h>
 #include <net/ethernet.h>
 #include <net/if.h>
@@ -16,50 +12,6 @@
 #include <vector>
 
 namespace quendra::integration {
-
-using Bytes = std::vector<std::uint8_t>;
-
-/// An IPv4 packet of `total` bytes with the two ports after its header; the payload is zeros.
-inline Bytes Ipv4Packet(int protocol, const char* source, unsigned sourcePort, const char* target,
-                        unsigned targetPort, std::size_t total = 40) {
-  Bytes packet(total);
-  packet[0] = 0x45;
-  PutBig16(packet, 2, static_cast<unsigned>(total));
-  packet[8] = 64;
-  packet[9] = static_cast<std::uint8_t>(protocol);
-  inet_pton(AF_INET, source, &packet[12]);
-  inet_pton(AF_INET, target, &packet[16]);
-  if (total >= 24) {
-    PutBig16(packet, 20, sourcePort);
-    PutBig16(packet, 22, targetPort);
-  }
-  if (protocol == 6 && total >= 40) {
-    packet[32] = 0x50;
-    packet[33] = 0x10;
-  }
-  return packet;
-}
-
-inline Bytes Joined(const Bytes& front, const Bytes& back) {
-  Bytes all(front.size() + back.size());
-  std::copy(front.begin(), front.end(), all.begin());
-  std::copy(back.begin(), back.end(), all.begin() + static_cast<std::ptrdiff_t>(front.size()));
-  return all;
-}
-
-/// With an Ethernet header of made-up addresses.
-inline Bytes EthernetFrame(const Bytes& packet, unsigned type = 0x0800) {
-  Bytes header = {2, 0, 0, 0, 0, 1, 2, 0, 0, 0, 0, 2, 0, 0};
-  PutBig16(header, 12, type);
-  return Joined(header, packet);
-}
-
-inline Bytes TcpFrame(unsigned sourcePort, unsigned targetPort, std::size_t total = 40) {
-  return EthernetFrame(Ipv4Packet(6, "10.9.0.2", sourcePort, "10.9.0.1", targetPort, total));
-}
-inline Bytes UdpFrame(unsigned sourcePort, unsigned targetPort, std::size_t total = 40) {
-  return EthernetFrame(Ipv4Packet(17, "10.9.0.2", sourcePort, "10.9.0.1", targetPort, total));
-}
 
 /// One end of a link, through which frames are sent as they are.
 class RawLink {

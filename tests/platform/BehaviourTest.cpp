@@ -1,5 +1,6 @@
 #include "platform/BackendFixture.h"
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureControls.h"
+#include "platform/capture/CaptureLibrary.h"
 #include "platform/net/HostNames.h"
 #include "platform/net/IpHelper.h"
 #include "platform/process/Handles.h"

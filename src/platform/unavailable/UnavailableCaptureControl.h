@@ -1,6 +1,7 @@
 #pragma once
 
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureControl.h"
+#include "platform/capture/CaptureRecordHeader.h"
 
 #include <algorithm>
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/capture/CaptureControls.h"
 #include "platform/unavailable/UnavailableCaptureControl.h"
 
 namespace quendra::platform::unavailable {

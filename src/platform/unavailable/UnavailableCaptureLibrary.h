@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureLibrary.h"
 
 namespace quendra::platform::unavailable {
 

@@ -11,7 +11,7 @@ namespace quendra::platform::linux_ {
 /// Tells through the loop that an interface of this network namespace may have come, gone or changed, or its
 /// IPv4 address. What exactly isn't told: whoever is told looks for itself, so that no message that the
 /// kernel had no room for is missed. Without the means to watch it stays silent.
-class LinkWatch {
+class LinkWatch : public EventLoop::Subscription {
  public:
   LinkWatch(DescriptorWatch& descriptors, std::function<void()> changed);
 

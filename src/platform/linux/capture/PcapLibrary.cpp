@@ -27,12 +27,11 @@ bool PcapLibrary::FindFunctions(void* library) {
          Find(library, "pcap_datalink", datalink) && Find(library, "pcap_dispatch", dispatch) &&
          Find(library, "pcap_findalldevs", findalldevs) && Find(library, "pcap_freealldevs", freealldevs) &&
          Find(library, "pcap_freecode", freecode) &&
-         Find(library, "pcap_get_selectable_fd", get_selectable_fd) && Find(library, "pcap_geterr", geterr) &&
+         Find(library, "pcap_get_selectable_fd", get_selectable_fd) &&
          Find(library, "pcap_set_buffer_size", set_buffer_size) &&
          Find(library, "pcap_set_promisc", set_promisc) && Find(library, "pcap_set_snaplen", set_snaplen) &&
          Find(library, "pcap_set_timeout", set_timeout) && Find(library, "pcap_setfilter", setfilter) &&
-         Find(library, "pcap_setnonblock", setnonblock) && Find(library, "pcap_stats", stats) &&
-         Find(library, "pcap_statustostr", statustostr);
+         Find(library, "pcap_setnonblock", setnonblock) && Find(library, "pcap_stats", stats);
 }
 
 } // namespace quendra::platform::linux_

@@ -28,7 +28,6 @@ class PcapLibrary {
   decltype(&::pcap_freealldevs) freealldevs = nullptr;
   decltype(&::pcap_freecode) freecode = nullptr;
   decltype(&::pcap_get_selectable_fd) get_selectable_fd = nullptr;
-  decltype(&::pcap_geterr) geterr = nullptr;
   decltype(&::pcap_set_buffer_size) set_buffer_size = nullptr;
   decltype(&::pcap_set_promisc) set_promisc = nullptr;
   decltype(&::pcap_set_snaplen) set_snaplen = nullptr;
@@ -36,7 +35,6 @@ class PcapLibrary {
   decltype(&::pcap_setfilter) setfilter = nullptr;
   decltype(&::pcap_setnonblock) setnonblock = nullptr;
   decltype(&::pcap_stats) stats = nullptr;
-  decltype(&::pcap_statustostr) statustostr = nullptr;
 
  private:
   bool FindFunctions(void* library);

@@ -11,7 +11,8 @@
 
 namespace quendra::platform::linux_ {
 
-/// A process that was opened: its folder, which goes with the process.
+/// A process that was opened, by its folder, which answers nothing more once the process has ended, also when
+/// another one takes over its id.
 struct OpenedProcess {
   Descriptor folder;
 };

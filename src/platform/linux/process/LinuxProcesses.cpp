@@ -75,7 +75,8 @@ std::optional<std::string> LinuxProcesses::ExecutableOf(Handle process) {
     return {};
   }
   auto executable = ProcFolder::Executable(opened->folder);
-  // Under the path of a file elsewhere it would pass for the program that has this path here.
+  // A process with folders of its own runs another file than the one that has this path here, and would pass
+  // for it.
   if (!executable || !executable->isHere) {
     Fail(kPartialCopy);
     return {};

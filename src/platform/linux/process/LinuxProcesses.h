@@ -2,7 +2,7 @@
 
 #include "platform/linux/process/HandleTable.h"
 #include "platform/linux/process/ProcessList.h"
-#include "platform/linux/process/SystemNames.h"
+#include "platform/linux/system/SystemPaths.h"
 #include "platform/process/Processes.h"
 
 namespace quendra::platform::linux_ {

@@ -111,8 +111,8 @@ std::vector<std::string> ThreadsOf(int folder, const std::string& process) {
   return names;
 }
 
-/// A process whose first thread has ended lives on in its others, and what the kernel no longer tells of the
-/// process it tells of them. Gives the first answer that is one.
+/// A process whose first thread has ended lives on in its others. The kernel then answers for each of them
+/// but no longer for the process. Gives the first answer that isn't empty.
 template <typename Ask> auto AskThreads(int folder, const std::string& process, Ask ask) {
   decltype(ask(process)) answer{};
   for (const std::string& thread : ThreadsOf(folder, process))

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/linux/programs/ExecutableFile.h"
+#include "platform/linux/process/ExecutableFile.h"
 #include "platform/linux/system/Descriptor.h"
 
 #include <cstdint>

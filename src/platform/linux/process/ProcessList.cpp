@@ -1,7 +1,7 @@
 #include "platform/linux/process/ProcessList.h"
 
-#include "platform/linux/process/SystemNames.h"
 #include "platform/linux/system/Files.h"
+#include "platform/linux/system/SystemNames.h"
 
 #include <algorithm>
 #include <array>
@@ -136,9 +136,9 @@ void ProcessList::NameDesktopShell(std::vector<Row>& rows) const {
   if (shell != nullptr) shell->name = "explorer.exe";
 }
 
-/// A process comes behind the one that started it, whatever the ids, which begin anew when they run out. What
-/// the kernel started has "System" above it, which is the kernel and so comes first and is its own parent: 0
-/// would be the parent of all that isn't known yet.
+/// A process comes after the one that started it. Their ids don't tell, as they begin anew when they run out.
+/// "System" is the kernel, so it comes first, and is the parent of what the kernel started and of itself: the
+/// parent 0 stands for whatever isn't known yet.
 void ProcessList::PutInOrder(std::vector<Row>& rows) const {
   std::stable_sort(rows.begin(), rows.end(),
                    [](const Row& left, const Row& right) { return left.startTime < right.startTime; });

@@ -25,9 +25,9 @@ class ProcessList {
   };
 
   /// The processes of this moment, "System" first, then in the order in which they were started; false when
-  /// they can't be listed. No parent is 0: that of "System" and of process 1 is "System", one that can't be
-  /// seen an id that no process has. A process known from before is looked at again while it is young, since
-  /// it may yet become another program, and from time to time later.
+  /// they can't be listed. No parent is 0: that of "System" and of process 1 is "System", and for one that
+  /// can't be seen there is an id that no process has. A process known from before is looked at again while
+  /// it is young, since it may yet become another program, and from time to time later.
   bool Read(std::vector<Row>& rows);
 
   static constexpr std::uint64_t kYoungMilliseconds = 3000;
@@ -41,7 +41,7 @@ class ProcessList {
     std::uint64_t readAt = 0;
     std::uint64_t startTime = 0;
     std::uint32_t parent = 0;
-    int shellRank = 0; ///< 0 for no desktop shell, else the better the lower
+    int shellRank = 0; ///< 0 for no desktop shell; of the others the lowest is the best
     bool ended = false;
     bool isSystem = false;
     std::string comm;

@@ -1,7 +1,7 @@
 #include "platform/linux/programs/DesktopEntry.h"
 
-#include "platform/linux/process/SystemNames.h"
 #include "platform/linux/programs/KeyFile.h"
+#include "platform/linux/system/SystemNames.h"
 
 #include <array>
 

@@ -16,7 +16,7 @@ struct DesktopEntry {
   std::string icon;
   std::string program;         ///< the first word of the command line: a name or a path
   std::string requiredProgram; ///< the program without which the entry doesn't hold; may be empty
-  bool hasArguments = false;   ///< the command line has words beside the program and the places for files
+  bool hasArguments = false;   ///< the command line has more than the program and the places for files
   bool isShown = true;         ///< menus show it
 };
 

@@ -2,7 +2,7 @@
 
 #include "platform/linux/programs/DesktopEntry.h"
 #include "platform/linux/programs/FolderWatch.h"
-#include "platform/linux/programs/UserFolders.h"
+#include "platform/linux/system/UserFolders.h"
 
 #include <string>
 #include <unordered_map>

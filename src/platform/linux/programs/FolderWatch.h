@@ -13,9 +13,9 @@ class FolderWatch {
   explicit FolderWatch(Clock clock) : clock_(std::move(clock)) {}
 
   void Clear() { folders_.clear(); }
-  /// A folder that doesn't exist is watched for its coming.
+  /// A folder that doesn't exist has changed when it comes.
   void Add(const std::string& path);
-  /// True when a folder changed since it was added. Starts the time to the next look.
+  /// True when a folder changed since it was added. The time to the next look starts here.
   bool HasChanged();
 
   static constexpr std::uint64_t kLookMilliseconds = 3000;

@@ -25,7 +25,7 @@ bool IsFolder(const std::string& path) {
   return ::stat(path.c_str(), &file) == 0 && S_ISDIR(file.st_mode);
 }
 
-/// Names go into paths, so they may not lead anywhere else.
+/// Names become parts of paths: none may lead out of its folder.
 bool IsPlainName(const std::string& name) {
   return !name.empty() && name.size() <= 255 && name != "." && name != ".." &&
          name.find_first_of(std::string_view("/\0", 2)) == std::string::npos;
@@ -98,7 +98,7 @@ std::optional<std::string> IconTheme::Find(const std::string& icon) {
 
 std::optional<std::string> IconTheme::FindIn(const std::vector<std::string>& folders,
                                              const std::string& name) const {
-  // Entries name a picture of no theme with its ending at times.
+  // Some entries name a picture that belongs to no theme by its whole file name.
   const bool hasEnding = std::any_of(std::begin(kExtensions), std::end(kExtensions),
                                      [&](const char* extension) { return name.ends_with(extension); });
   for (const auto& folder : folders) {

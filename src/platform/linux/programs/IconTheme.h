@@ -1,7 +1,7 @@
 #pragma once
 
 #include "platform/linux/programs/FolderWatch.h"
-#include "platform/linux/programs/UserFolders.h"
+#include "platform/linux/system/UserFolders.h"
 
 #include <optional>
 #include <string>

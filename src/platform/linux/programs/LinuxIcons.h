@@ -1,8 +1,8 @@
 #pragma once
 
-#include "platform/linux/process/SystemNames.h"
 #include "platform/linux/programs/DesktopIndex.h"
 #include "platform/linux/programs/IconTheme.h"
+#include "platform/linux/system/SystemPaths.h"
 #include "platform/process/Icons.h"
 
 #include <map>

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/linux/process/SystemNames.h"
 #include "platform/linux/programs/DesktopIndex.h"
+#include "platform/linux/system/SystemPaths.h"
 #include "platform/process/VersionInfo.h"
 
 namespace quendra::platform::linux_ {

@@ -25,8 +25,8 @@ std::optional<std::string> ReadFile(const std::string& path, std::size_t limit) 
   const Descriptor descriptor(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
   if (!descriptor || ::fstat(descriptor.Number(), &file) != 0 || !IsReadable(file, limit)) return {};
 
-  // One byte of room more than allowed tells a file that grows, or one of /proc, whose size is 0, from one
-  // that fits.
+  // The size told before need not hold: a file may grow, and files of /proc tell 0. So it is read until it
+  // ends or has one byte more than is allowed.
   std::string content;
   char buffer[16384];
   while (content.size() <= limit) {

@@ -13,7 +13,7 @@ namespace quendra::platform::linux_ {
 /// more than `limit` bytes. Never waits on a pipe or a device.
 std::optional<std::string> ReadFile(const std::string& path, std::size_t limit);
 
-/// The number that all of `text` is, in decimal; nothing for any other text.
+/// The decimal number that `text` is as a whole; nothing for any other text.
 std::optional<std::uint32_t> WholeNumber(std::string_view text);
 
 /// The parts between the separators, empty ones left out.

@@ -1,7 +1,7 @@
 #include "platform/linux/system/LinuxShellStart.h"
 
-#include "platform/linux/programs/UserFolders.h"
 #include "platform/linux/system/Descriptor.h"
+#include "platform/linux/system/UserFolders.h"
 #include "runtime/Text.h"
 
 #include <fcntl.h>
@@ -38,7 +38,8 @@ std::vector<std::string> FilesOf(const std::string& program) {
   return files;
 }
 
-/// True when the other end went without a word, as it does when the program takes its process over.
+/// True when the other end was closed with nothing written, as happens when the program takes its process
+/// over.
 bool StaysSilent(int report) {
   int error = 0;
   ssize_t count = 0;

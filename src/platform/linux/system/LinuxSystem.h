@@ -13,9 +13,9 @@ class LinuxSystem : public System {
   /// The clock that ticks are taken from, in milliseconds.
   explicit LinuxSystem(Clock clock = CoarseMilliseconds) : clock_(std::move(clock)), start_(clock_()) {}
 
-  /// Counts from the program's start, as on a machine that was up for some hours then. Uptime itself would
-  /// say at the wrong times that no second has passed: the program takes a day number for a tick long gone,
-  /// and differences of ticks as signed numbers.
+  /// Counts from the program's start, as on a machine that was up for some hours then. The real uptime would
+  /// not do: the program compares ticks as signed numbers, and uses a day number as a tick of long ago. On
+  /// some machines it would then find that no second has passed.
   std::uint32_t GetTickCount() override;
   bool GetVersionExA(OsVersion& version) override;
   void Sleep(std::uint32_t milliseconds) override;

@@ -1,12 +1,13 @@
 #include "platform/simulated/capture/SimulatedCapture.h"
 
+#include "platform/capture/CaptureRecordHeader.h"
 #include "runtime/Text.h"
 
 #include <algorithm>
 
 namespace quendra::platform::simulated {
 
-/// The last control made is the live one; a control that goes before says so in the record of calls.
+/// The last control made is the live one. When a control goes, that stands in the record of calls.
 class SimulatedCapture::Control : public CaptureControl {
  public:
   explicit Control(SimulatedCapture& capture) : capture_(&capture) {}

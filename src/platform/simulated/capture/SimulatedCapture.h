@@ -1,6 +1,7 @@
 #pragma once
 
-#include "platform/capture/Capture.h"
+#include "platform/capture/CaptureControls.h"
+#include "platform/capture/CaptureLibrary.h"
 #include "platform/simulated/SimulatedCore.h"
 
 #include <deque>

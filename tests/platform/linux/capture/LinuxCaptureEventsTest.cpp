@@ -1,5 +1,4 @@
 #include "platform/linux/capture/LinuxCaptureFixture.h"
-#include "platform/linux/capture/PcapFrameQueue.h"
 
 #include <cstring>
 
@@ -287,7 +286,7 @@ TEST_F(LinuxCaptureEventsTest, A_fault_of_a_handler_goes_to_the_dispatcher_whate
 
 TEST_F(LinuxCaptureEventsTest, When_events_take_nothing_the_oldest_frames_go_first_and_are_counted) {
   RawLink far("qv1");
-  constexpr std::uint64_t kFrames = PcapFrameQueue::kCapacity + 50000;
+  constexpr std::uint64_t kFrames = FrameQueue::kUsualCapacity + 50000;
   for (std::uint64_t sent = 0; sent < kFrames; ++sent) {
     far.Send(TcpFrame(1025, 53));
     if (sent % 2000 == 0) desktop.Advance(100);

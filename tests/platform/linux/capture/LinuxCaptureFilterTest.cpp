@@ -30,7 +30,7 @@ class LinuxCaptureFilterTest : public LinuxCaptureFixture {
     LinuxCaptureFixture::SetUp();
     if (!IsSkipped()) Start("qv0");
   }
-  /// The frames that are delivered of those that are sent, the last of which is.
+  /// Sends these frames and one more that is certain to be delivered, and gives those that came before it.
   std::vector<Bytes> Delivered(const std::vector<Bytes>& sent) {
     RawLink far("qv1");
     for (const Bytes& frame : sent) far.Send(frame);
@@ -89,7 +89,8 @@ TEST_F(LinuxCaptureFilterTest, A_TCP_packet_with_options_is_delivered) {
   EXPECT_EQ(Delivered({options}), std::vector<Bytes>{options});
 }
 
-// Its type, which the tag takes the place of, would end a drain; its owner has another adapter to follow.
+// The tag stands where the type of a frame is looked for, and would end a drain. Who wants such frames
+// follows the adapter of the virtual network.
 TEST_F(LinuxCaptureFilterTest, A_tagged_frame_is_not_delivered) {
   EXPECT_TRUE(Delivered({Tagged(PacketOf(6)), Tagged(PacketOf(47)), Tagged(PacketOf(17))}).empty());
 }
@@ -108,16 +109,17 @@ class CookedCaptureTest : public LinuxCaptureFixture {
   void SetUp() override {
     LinuxCaptureFixture::SetUp();
     if (IsSkipped()) return;
-    session = PcapSession::Open(library, "any", queue);
+    session = PcapSession::Open(library, desktop, "any", shaper);
     ASSERT_NE(session, nullptr);
   }
-  const PcapRecord* Next() {
+  const FrameRecord* Next() {
     desktop.WaitFor([&] { return session->Fill() > 0 || !queue.Empty(); }, 1000);
     return queue.Pop();
   }
 
   PcapLibrary library;
-  PcapFrameQueue queue;
+  FrameQueue queue;
+  FrameShaper shaper{queue};
   std::unique_ptr<PcapSession> session;
 };
 
@@ -125,7 +127,7 @@ TEST_F(CookedCaptureTest, A_decoder_sees_as_many_bytes_as_on_a_link_with_Etherne
   Bytes packet = PacketOf(47, 200);
   for (std::size_t i = 20; i < packet.size(); ++i) packet[i] = static_cast<std::uint8_t>(i);
   RawLink("qv1").Send(EthernetFrame(packet));
-  const PcapRecord* record = Next();
+  const FrameRecord* record = Next();
   ASSERT_NE(record, nullptr);
   EXPECT_EQ(record->captured, 96u);
   EXPECT_EQ(record->wire, 214u);
@@ -137,7 +139,7 @@ TEST_F(CookedCaptureTest, Nothing_but_TCP_and_tunnels_over_IPv4_is_delivered) {
   far.Send(UdpFrame(1025, 53));
   far.Send(EthernetFrame(Bytes(46, 6), kTypeArp));
   far.Send(TcpFrame(4711, 80));
-  const PcapRecord* record = Next();
+  const FrameRecord* record = Next();
   ASSERT_NE(record, nullptr);
   EXPECT_EQ(record->bytes[34] * 256 + record->bytes[35], 4711);
 }

@@ -21,7 +21,7 @@ class LinuxCaptureFixture : public testing::Test {
   void AddLink(const std::string& near, const std::string& far, const std::string& address);
   /// The index of an adapter by its name, -1 for none. VBPcapInit comes first.
   int IndexOf(const std::string& name);
-  /// The same, of the list that stands.
+  /// The same, without VBPcapInit before it.
   int IndexAmongListed(const std::string& name);
   AdapterInfo InfoOf(int adapter);
   /// What the page does when it opens: a session on the adapter and a control that listens to it.

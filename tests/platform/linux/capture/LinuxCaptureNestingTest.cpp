@@ -185,7 +185,7 @@ class HeldFrameTest : public LinuxCaptureNestingTest {
     EXPECT_EQ(Bytes(frame.Data(), frame.Data() + frame.UpperBound() + 1), before);
     frame = {};
   }
-  /// Checks behind `work`, inside the event that took the frame.
+  /// Checks after `work`, inside the event that took the frame.
   void While(std::function<void()> work) {
     meanwhile = [this, work = std::move(work)] {
       work();

@@ -98,7 +98,7 @@ TEST_F(LinuxCapturePaceTest, A_busy_line_rings_once_in_50_milliseconds_however_m
   };
   SendOneAndWait();
   sendMany();
-  // The timer runs since some moment of the wait: from here on since its first tick.
+  // The timer was started at some moment of the wait. After its first tick its time is known.
   for (int i = 0; i < 50 && events < 2; ++i) desktop.Advance(1);
   const int before = events;
   sendMany();

@@ -2,6 +2,7 @@
 
 #include "runtime/Text.h"
 
+#include <arpa/inet.h>
 #include <cstring>
 #include <fcntl.h>
 #include <linux/if_tun.h>
@@ -285,7 +286,7 @@ TEST_F(LinuxCaptureTest, An_interface_that_goes_down_and_comes_up_is_heard_again
         far.Send(TcpFrame(1, 80));
         return events > 0;
       },
-      "a frame behind the break");
+      "a frame after the break");
   EXPECT_GE(Drain(), 1);
 }
 

@@ -1,6 +1,7 @@
 #include "platform/linux/process/LinuxProcesses.h"
 #include "platform/linux/LinuxFixture.h"
 #include "platform/linux/process/LinuxTokens.h"
+#include "runtime/Text.h"
 
 #include <gtest/gtest.h>
 

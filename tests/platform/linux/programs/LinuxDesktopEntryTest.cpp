@@ -1,6 +1,6 @@
-#include "platform/linux/process/SystemNames.h"
 #include "platform/linux/programs/DesktopEntry.h"
 #include "platform/linux/programs/KeyFile.h"
+#include "platform/linux/system/SystemNames.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "platform/linux/programs/ExecutableFile.h"
+#include "platform/linux/process/ExecutableFile.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -12,7 +12,7 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-/// What the kernel writes behind the path of a file that has no name any more.
+/// What the kernel writes after the path of a file that has no name any more.
 constexpr std::string_view kDeleted = " (deleted)";
 
 std::optional<std::string> TargetOf(int folder, const std::string& link) {
@@ -46,7 +46,7 @@ std::optional<ExecutableFile> ReadExecutableFile(int folder, const std::string& 
   if (file.isHere || !file.path.ends_with(kDeleted)) return file;
   file.path.resize(file.path.size() - kDeleted.size());
   const auto successor = FileAt(AT_FDCWD, file.path);
-  // An update leaves the owner; another user's file was never here.
+  // An update keeps the owner; a file of another user is not the program in a new version.
   file.isHere = running && (!successor || successor->st_uid == running->st_uid);
   return file;
 }

@@ -1,11 +1,10 @@
-#include "platform/linux/capture/PcapFrameShaper.h"
+#include "platform/capture/FrameShaper.h"
 
-#include "integration/RawFrames.h"
+#include "integration/Packets.h"
 
 #include <gtest/gtest.h>
-#include <pcap/dlt.h>
 
-namespace quendra::platform::linux_ {
+namespace quendra::platform {
 
 using integration::Bytes;
 using integration::EthernetFrame;
@@ -21,7 +20,7 @@ class PcapFrameShaperTest : public testing::Test {
     shaper.Deliver({7, 8}, packet, wire != 0 ? wire : static_cast<std::uint32_t>(packet.size()));
   }
   Bytes Next() {
-    const PcapRecord* record = queue.Pop();
+    const FrameRecord* record = queue.Pop();
     if (record == nullptr) return {};
     return {record->bytes.begin(), record->bytes.begin() + record->captured};
   }
@@ -32,8 +31,8 @@ class PcapFrameShaperTest : public testing::Test {
     return lengths;
   }
 
-  PcapFrameQueue queue;
-  PcapFrameShaper shaper{queue};
+  FrameQueue queue;
+  FrameShaper shaper{queue};
 };
 
 Bytes TruncatedTcp(unsigned total) {
@@ -53,7 +52,7 @@ TEST_F(PcapFrameShaperTest, An_Ethernet_frame_stays_as_it_is) {
 
 TEST_F(PcapFrameShaperTest, A_record_tells_when_the_frame_came_and_how_long_it_was) {
   Deliver(TcpFrame(1025, 80, 80), 1514);
-  const PcapRecord* record = queue.Newest();
+  const FrameRecord* record = queue.Newest();
   EXPECT_EQ(record->seconds, 7u);
   EXPECT_EQ(record->microseconds, 8u);
   EXPECT_EQ(record->captured, 94u);
@@ -76,7 +75,7 @@ TEST_F(PcapFrameShaperTest, A_frame_without_bytes_becomes_60_zero_bytes) {
 
 TEST_F(PcapFrameShaperTest, A_frame_longer_than_its_record_is_cut) {
   Deliver(TcpFrame(1025, 80, 1000));
-  EXPECT_EQ(Next().size(), PcapRecord::kRoom);
+  EXPECT_EQ(Next().size(), FrameRecord::kRoom);
 }
 
 TEST_F(PcapFrameShaperTest, A_VLAN_tag_is_left_where_it_is) {
@@ -147,7 +146,7 @@ TEST_F(PcapFrameShaperTest, A_long_packet_shows_as_many_bytes_whatever_the_heade
   for (const auto& [form, header] : links) {
     shaper.SetForm(form);
     Bytes captured = Joined(header, packet);
-    captured.resize(PcapRecord::kRoom + PcapFrameShaper::kMostHeaderLost);
+    captured.resize(FrameShaper::kMostBytes);
     Deliver(captured);
     const Bytes frame = Next();
     EXPECT_EQ(frame.size(), 96u) << static_cast<int>(form);
@@ -168,12 +167,13 @@ TEST_F(PcapFrameShaperTest, Packets_shorter_than_their_links_header_become_blank
 }
 
 TEST_F(PcapFrameShaperTest, Links_are_known_by_their_types) {
-  EXPECT_EQ(LinkFormOf(DLT_EN10MB), LinkForm::Ethernet);
-  EXPECT_EQ(LinkFormOf(DLT_RAW), LinkForm::RawIp);
-  EXPECT_EQ(LinkFormOf(DLT_LINUX_SLL2), LinkForm::LinuxCooked2);
-  EXPECT_EQ(LinkFormOf(DLT_PPP), LinkForm::Ppp);
-  EXPECT_EQ(LinkFormOf(DLT_NULL), LinkForm::Family);
-  EXPECT_EQ(LinkFormOf(DLT_IEEE802_11), std::nullopt);
+  constexpr int kWirelessFrames = 105;
+  EXPECT_EQ(LinkFormOf(link_type::kEthernet), LinkForm::Ethernet);
+  EXPECT_EQ(LinkFormOf(link_type::kRawIp), LinkForm::RawIp);
+  EXPECT_EQ(LinkFormOf(link_type::kLinuxCooked2), LinkForm::LinuxCooked2);
+  EXPECT_EQ(LinkFormOf(link_type::kPpp), LinkForm::Ppp);
+  EXPECT_EQ(LinkFormOf(link_type::kFamily), LinkForm::Family);
+  EXPECT_EQ(LinkFormOf(kWirelessFrames), std::nullopt);
 }
 
 TEST_F(PcapFrameShaperTest, A_total_length_of_32767_stays_one_frame) {
@@ -207,7 +207,7 @@ TEST_F(PcapFrameShaperTest, A_packet_beyond_64_KB_is_measured_on_the_link) {
 TEST_F(PcapFrameShaperTest, The_largest_packet_of_a_host_fits_in_the_pieces_that_are_allowed) {
   Deliver(TruncatedTcp(0), 14 + 8 * 65535);
   const auto lengths = TotalLengths();
-  EXPECT_EQ(lengths.size(), PcapFrameShaper::kMostPieces);
+  EXPECT_EQ(lengths.size(), FrameShaper::kMostPieces);
   unsigned sum = 0;
   for (const unsigned length : lengths) sum += length;
   EXPECT_EQ(sum, 8u * 65535);
@@ -238,40 +238,4 @@ TEST_F(PcapFrameShaperTest, A_long_packet_of_a_link_without_Ethernet_is_split_to
   EXPECT_EQ(TotalLengths(), (std::vector<unsigned>{32767, 7233}));
 }
 
-TEST(PcapFrameQueue, Frames_come_out_in_the_order_they_went_in_also_around_its_end) {
-  PcapFrameQueue queue;
-  std::uint32_t expected = 0;
-  for (std::uint32_t pushed = 0; pushed < 3 * PcapFrameQueue::kCapacity;) {
-    for (int i = 0; i < 50000; ++i) queue.Push().wire = pushed++;
-    for (int i = 0; i < 50000; ++i) ASSERT_EQ(queue.Pop()->wire, expected++);
-  }
-  EXPECT_EQ(queue.Pop(), nullptr);
-}
-
-TEST(PcapFrameQueue, The_frame_popped_last_stays_until_the_queue_is_full) {
-  PcapFrameQueue queue;
-  queue.Push().wire = 4711;
-  const PcapRecord* popped = queue.Pop();
-  while (queue.Room() > 0) queue.Push().wire = 1;
-  EXPECT_EQ(popped->wire, 4711u);
-}
-
-TEST(PcapFrameQueue, The_newest_record_is_the_one_pushed_last_also_when_it_has_been_popped) {
-  PcapFrameQueue queue;
-  EXPECT_EQ(queue.Newest(), nullptr);
-  queue.Push().wire = 1;
-  queue.Push().wire = 2;
-  queue.Pop();
-  queue.Pop();
-  EXPECT_EQ(queue.Newest()->wire, 2u);
-}
-
-TEST(PcapFrameQueue, The_oldest_frames_can_be_discarded) {
-  PcapFrameQueue queue;
-  for (std::uint32_t i = 0; i < 5; ++i) queue.Push().wire = i;
-  queue.DiscardOldest(3);
-  EXPECT_EQ(queue.Size(), 2u);
-  EXPECT_EQ(queue.Pop()->wire, 3u);
-}
-
-} // namespace quendra::platform::linux_
+} // namespace quendra::platform

@@ -1,4 +1,4 @@
-#include "platform/linux/capture/PcapFrameShaper.h"
+#include "platform/capture/FrameShaper.h"
 
 #include "platform/capture/CaptureNumbers.h"
 #include "platform/net/IpProtocols.h"
@@ -6,9 +6,8 @@
 
 #include <algorithm>
 #include <cstring>
-#include <pcap/dlt.h>
 
-namespace quendra::platform::linux_ {
+namespace quendra::platform {
 
 namespace {
 
@@ -29,7 +28,7 @@ std::uint16_t TypeByVersion(std::span<const std::uint8_t> packet) {
   return version == 4 ? kTypeIpv4 : version == 6 ? kTypeIpv6 : 0;
 }
 
-/// Where the packet begins behind its link's own header, and what it is.
+/// Where the packet begins after its link's own header, and what it is.
 struct Payload {
   std::size_t offset = 0;
   std::uint16_t type = 0;
@@ -53,18 +52,18 @@ Payload PayloadOf(LinkForm form, std::span<const std::uint8_t> packet) {
   }
 }
 
-void FillEthernet(PcapRecord& record, std::span<const std::uint8_t> packet, std::uint32_t wire) {
-  record.captured = static_cast<std::uint32_t>(std::min<std::size_t>(packet.size(), PcapRecord::kRoom));
+void FillEthernet(FrameRecord& record, std::span<const std::uint8_t> packet, std::uint32_t wire) {
+  record.captured = static_cast<std::uint32_t>(std::min<std::size_t>(packet.size(), FrameRecord::kRoom));
   record.wire = wire;
   std::copy_n(packet.begin(), record.captured, record.bytes.begin());
 }
 
 /// The link's own header gives way to an Ethernet header without addresses.
-void FillOther(PcapRecord& record, LinkForm form, std::span<const std::uint8_t> packet, std::uint32_t wire) {
+void FillOther(FrameRecord& record, LinkForm form, std::span<const std::uint8_t> packet, std::uint32_t wire) {
   const Payload payload = PayloadOf(form, packet);
   const std::size_t skipped = std::min(payload.offset, packet.size());
   const std::size_t length =
-      std::min<std::size_t>(packet.size() - skipped, PcapRecord::kRoom - kEthernetHeader);
+      std::min<std::size_t>(packet.size() - skipped, FrameRecord::kRoom - kEthernetHeader);
   std::memset(record.bytes.data(), 0, 12);
   PutBig16(record.bytes, 12, payload.type);
   const auto payloadBytes = packet.subspan(skipped, length);
@@ -76,7 +75,7 @@ void FillOther(PcapRecord& record, LinkForm form, std::span<const std::uint8_t> 
 
 /// What the packet's frames have to add up to; 0 when it can stay one frame. A total length that the frame
 /// doesn't have is a lie of the sender and stays one frame too.
-std::uint32_t OversizedTotal(const PcapRecord& record) {
+std::uint32_t OversizedTotal(const FrameRecord& record) {
   const auto& bytes = record.bytes;
   if (Big16(bytes, 12) != kIpv4Frame || bytes[14] >> 4 != 4 || bytes[23] != kTcp) return 0;
   const std::uint32_t present = record.wire - kEthernetHeader;
@@ -86,31 +85,15 @@ std::uint32_t OversizedTotal(const PcapRecord& record) {
   return told > kLargestTotal && told <= present ? told : 0;
 }
 
-void SetTotalLength(PcapRecord& record, std::uint32_t total) {
+void SetTotalLength(FrameRecord& record, std::uint32_t total) {
   PutBig16(record.bytes, 16, static_cast<std::uint16_t>(total));
   record.wire = kEthernetHeader + total;
 }
 
 } // namespace
 
-std::optional<LinkForm> LinkFormOf(int dataLinkType) {
-  switch (dataLinkType) {
-  case DLT_EN10MB: return LinkForm::Ethernet;
-  case DLT_RAW:
-  case DLT_IPV4:
-  case DLT_IPV6: return LinkForm::RawIp;
-  case DLT_NULL:
-  case DLT_LOOP: return LinkForm::Family;
-  case DLT_LINUX_SLL: return LinkForm::LinuxCooked;
-  case DLT_LINUX_SLL2: return LinkForm::LinuxCooked2;
-  case DLT_PPP:
-  case DLT_PPP_SERIAL: return LinkForm::Ppp;
-  default: return std::nullopt;
-  }
-}
-
-void PcapFrameShaper::Deliver(PacketTimes times, std::span<const std::uint8_t> packet, std::uint32_t wire) {
-  PcapRecord& record = queue_.Push();
+void FrameShaper::Deliver(PacketTimes times, std::span<const std::uint8_t> packet, std::uint32_t wire) {
+  FrameRecord& record = queue_.Push();
   record.seconds = times.seconds;
   record.microseconds = times.microseconds;
   if (form_ == LinkForm::Ethernet)
@@ -124,16 +107,16 @@ void PcapFrameShaper::Deliver(PacketTimes times, std::span<const std::uint8_t> p
   if (record.wire > kEthernetHeader + kLargestTotal) SplitOversized(record);
 }
 
-void PcapFrameShaper::SplitOversized(PcapRecord& first) {
+void FrameShaper::SplitOversized(FrameRecord& first) {
   std::uint32_t left = OversizedTotal(first);
   if (left == 0 || left > kMostPieces * kLargestTotal) return;
-  const PcapRecord whole = first;
+  const FrameRecord whole = first;
   SetTotalLength(first, std::min(left, kLargestTotal));
   for (left -= std::min(left, kLargestTotal); left > 0; left -= std::min(left, kLargestTotal)) {
-    PcapRecord& next = queue_.Push();
+    FrameRecord& next = queue_.Push();
     next = whole;
     SetTotalLength(next, std::min(left, kLargestTotal));
   }
 }
 
-} // namespace quendra::platform::linux_
+} // namespace quendra::platform

@@ -1,15 +1,15 @@
 #pragma once
 
-#include "platform/linux/capture/LinuxCaptureCore.h"
+#include "platform/capture/CaptureCore.h"
 
-namespace quendra::platform::linux_ {
+namespace quendra::platform {
 
 /// The capture control: rings for the session of the adapter it is bound to. Results are 0 on success, -1
 /// otherwise.
-class LinuxCaptureControl : public CaptureControl {
+class LiveCaptureControl : public CaptureControl {
  public:
-  explicit LinuxCaptureControl(std::shared_ptr<LinuxCaptureCore> core) : core_(std::move(core)) {}
-  ~LinuxCaptureControl() override { core_->StopListening(*this); }
+  explicit LiveCaptureControl(std::shared_ptr<CaptureCore> core) : core_(std::move(core)) {}
+  ~LiveCaptureControl() override { core_->StopListening(*this); }
 
   void BindAdapter(const std::string& adapterName, std::int32_t& result) override;
   void OpenChannel(std::int32_t& result) override;
@@ -25,9 +25,9 @@ class LinuxCaptureControl : public CaptureControl {
   void SetValueC(std::int32_t) override {}
 
  private:
-  std::shared_ptr<LinuxCaptureCore> core_;
+  std::shared_ptr<CaptureCore> core_;
   std::string adapter_;
   bool channelOpen_ = false;
 };
 
-} // namespace quendra::platform::linux_
+} // namespace quendra::platform

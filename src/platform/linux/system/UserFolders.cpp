@@ -1,4 +1,4 @@
-#include "platform/linux/programs/UserFolders.h"
+#include "platform/linux/system/UserFolders.h"
 
 #include "platform/linux/system/Files.h"
 
