@@ -3,6 +3,7 @@
 #include "platform/linux/capture/InterfaceQuestions.h"
 #include "platform/linux/capture/LinkWatch.h"
 #include "platform/linux/capture/PcapSession.h"
+#include "platform/linux/net/DefaultRoute.h"
 #include "platform/linux/net/NetworkInterfaces.h"
 
 #include <ifaddrs.h>
