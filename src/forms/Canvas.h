@@ -1,6 +1,7 @@
 #pragma once
 
 #include "forms/controls/PictureBox.h"
+#include "forms/view/Scale.h"
 
 namespace quendra::forms {
 
@@ -9,16 +10,17 @@ class Canvas {
  public:
   virtual ~Canvas() = default;
 
-  virtual int ScaleWidth(const PictureBox& box) const = 0;
-  virtual int ScaleHeight(const PictureBox& box) const = 0;
-  virtual int TextWidth(const PictureBox& box, TextView text) const = 0;
-  virtual int TextHeight(const PictureBox& box, TextView text) const = 0;
-  virtual void Cls(PictureBox& box) = 0;
+  int ScaleWidth(const PictureBox& box) const;
+  int ScaleHeight(const PictureBox& box) const;
+  int TextWidth(const PictureBox& box, TextView text) const;
+  int TextHeight(const PictureBox& box, TextView text) const;
+  /// Leaves the box as it is without drawings and goes to its start.
+  void Cls(PictureBox& box);
   /// A filled box with both corners in it.
   virtual void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) = 0;
   /// Prints at CurrentX and CurrentY in ForeColour and moves to the start of the next line. A box of a form
   /// that reads from right to left prints from its right edge.
-  virtual void Print(PictureBox& box, TextView text) = 0;
+  void Print(PictureBox& box, TextView text);
   /// Copies in pixels, as SRCCOPY does.
   virtual void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source,
                       int sourceX, int sourceY) = 0;
@@ -30,6 +32,16 @@ class Canvas {
                           int height) = 0;
   /// What the box holds now, drawings included.
   virtual Picture ImageOf(const PictureBox& box) const = 0;
+
+ protected:
+  /// The scale of the screen, in which a form is laid out.
+  virtual const Scale& ScreenScale() const = 0;
+  /// Pixels that the text takes on one line.
+  virtual int WidthInPixels(const PictureBox& box, TextView text) const = 0;
+  /// Pixels from one line to the next.
+  virtual int LineHeightInPixels(const PictureBox& box) const = 0;
+  virtual void DropDrawings(PictureBox& box) = 0;
+  virtual void PrintLine(PictureBox& box, TextView text) = 0;
 };
 
 } // namespace quendra::forms

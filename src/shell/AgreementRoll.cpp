@@ -6,7 +6,6 @@ namespace quendra::shell {
 
 namespace {
 
-constexpr int kPixels = 3;
 constexpr int kRollInterval = 5;
 constexpr int kBandHeight = 5;
 /// Three times white, spread over the height in bands of five pixels: the lower edge has a fifth of it, 153.
@@ -17,7 +16,7 @@ constexpr int kTop = 5;
 } // namespace
 
 void AgreementRoll::Show() {
-  pictures_.picBuffer.ScaleMode = kPixels;
+  pictures_.picBuffer.ScaleMode = forms::ScaleMode::Pixels;
   pictures_.picOut.Visible = true;
   pictures_.picBackBuffer.Visible = true;
   pictures_.picBuffer.Visible = true;

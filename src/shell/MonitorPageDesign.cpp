@@ -67,7 +67,7 @@ void MonitorPage::DesignTable() {
   table.main_headersIL.Add(forms::Picture::Artwork("header_upload"));
   table.main_headersIL.Add(forms::Picture::Artwork("header_download"));
   table.main_Pic.Visible = false;
-  table.main_Pic.ScaleMode = 3;
+  table.main_Pic.ScaleMode = forms::ScaleMode::Pixels;
   table.main_Pic.BackColour = forms::kWhite;
   table.main_Pic.Move(0, 0, Px(32), Px(32));
 }

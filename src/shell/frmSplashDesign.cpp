@@ -54,7 +54,7 @@ void frmSplash::DesignTexts() {
 
 void frmSplash::DesignPictures() {
   for (forms::PictureBox* picture : {&picBackBuffer, &picBuffer, &picOut}) {
-    picture->ScaleMode = 3;
+    picture->ScaleMode = forms::ScaleMode::Pixels;
     picture->TextFont = looks::kBody;
     picture->BackColour = forms::kBlack;
     picture->Visible = false;

@@ -9,7 +9,7 @@ namespace quendra::monitor {
 struct MonitorControls : forms::Form {
   MonitorControls() : Form(u"frmTest") {
     main_ImList.Add(forms::Picture::Artwork("default"));
-    table.main_Pic.ScaleMode = 3;
+    table.main_Pic.ScaleMode = forms::ScaleMode::Pixels;
   }
   void Design() override {}
 

@@ -13,7 +13,7 @@ class RollForm : public forms::Form {
   RollForm() : Form(u"RollForm") {}
   void Design() override {
     for (forms::PictureBox* picture : {&picBackBuffer, &picBuffer, &picOut}) {
-      picture->ScaleMode = 3;
+      picture->ScaleMode = forms::ScaleMode::Pixels;
       picture->Visible = false;
       picture->Move(0, 0, 100 * 15, 250 * 15);
     }
@@ -64,9 +64,9 @@ TEST_F(AgreementRollTest, Showing_makes_the_three_pictures_visible_and_ticks_eve
 }
 
 TEST_F(AgreementRollTest, Showing_works_in_pixels_whatever_the_buffer_was_set_to) {
-  form.picBuffer.ScaleMode = 1;
+  form.picBuffer.ScaleMode = forms::ScaleMode::Twips;
   roll.Show();
-  EXPECT_EQ(form.picBuffer.ScaleMode, 3);
+  EXPECT_EQ(form.picBuffer.ScaleMode, forms::ScaleMode::Pixels);
   EXPECT_EQ(roll.ScrollOffset(), 250);
 }
 

@@ -49,9 +49,9 @@ TEST_F(Splash, Has_its_timer_enabled_with_1_ms_at_design_time) {
 TEST_F(Splash, Has_its_pictures_hidden_and_in_pixels_at_design_time) {
   splash.Design();
   EXPECT_TRUE(AgreementHidden());
-  EXPECT_EQ(splash.picOut.ScaleMode, 3);
-  EXPECT_EQ(splash.picBuffer.ScaleMode, 3);
-  EXPECT_EQ(splash.picBackBuffer.ScaleMode, 3);
+  EXPECT_EQ(splash.picOut.ScaleMode, forms::ScaleMode::Pixels);
+  EXPECT_EQ(splash.picBuffer.ScaleMode, forms::ScaleMode::Pixels);
+  EXPECT_EQ(splash.picBackBuffer.ScaleMode, forms::ScaleMode::Pixels);
 }
 
 TEST_F(Splash, Hides_the_agreement_at_its_load_so_that_the_timer_never_ticks_before_it_is_shown) {

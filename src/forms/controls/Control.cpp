@@ -3,6 +3,7 @@
 #include "forms/Form.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace quendra::forms {
 
@@ -22,11 +23,13 @@ Control::~Control() {
   if (parent_) std::erase(parent_->children_, this);
 }
 
-Form& Control::OwnerForm() {
-  Control* top = this;
+const Form& Control::OwnerForm() const {
+  const Control* top = this;
   while (top->parent_) top = top->parent_;
-  return static_cast<Form&>(*top);
+  return static_cast<const Form&>(*top);
 }
+
+Form& Control::OwnerForm() { return const_cast<Form&>(std::as_const(*this).OwnerForm()); }
 
 bool Control::IsShown() const {
   for (const Control* control = this; control; control = control->parent_)

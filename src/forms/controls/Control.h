@@ -64,6 +64,7 @@ class Control {
   /// nullptr for a form.
   Container* Parent() const { return parent_; }
   Form& OwnerForm();
+  const Form& OwnerForm() const;
 
   Property<bool, Aspect::Visible> Visible{*this, true};
   Property<bool, Aspect::Enabled> Enabled{*this, true};

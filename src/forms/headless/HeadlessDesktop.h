@@ -26,7 +26,6 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   /// Pixels: how wide each character and how high each line is in any font.
   static constexpr int CharacterWidth = 8;
   static constexpr int LineHeight = 16;
-  static constexpr double TwipsPerPixel = 15;
 
   // What the program showed and asked for.
 
@@ -104,18 +103,12 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   void ReleaseCapture() override;
   std::int32_t SendMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
                            std::uint32_t lParam) override;
-  double TwipsPerPixelX() const override { return TwipsPerPixel; }
-  double TwipsPerPixelY() const override { return TwipsPerPixel; }
+  double TwipsPerPixelX() const override { return scale_.twipsPerPixelX; }
+  double TwipsPerPixelY() const override { return scale_.twipsPerPixelY; }
   RegionHandle CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
                                   int ellipseHeight) override;
   void SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) override;
-  int ScaleWidth(const PictureBox& box) const override;
-  int ScaleHeight(const PictureBox& box) const override;
-  int TextWidth(const PictureBox& box, TextView text) const override;
-  int TextHeight(const PictureBox& box, TextView text) const override;
-  void Cls(PictureBox& box) override;
   void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) override;
-  void Print(PictureBox& box, TextView text) override;
   void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
               int sourceY) override;
   void Refresh(PictureBox& box) override;
@@ -131,6 +124,12 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   void ShowView(Form& form, Modality modality, Form* owner) override;
   void LastFormGone() override { End(0); }
 
+  const Scale& ScreenScale() const override { return scale_; }
+  int WidthInPixels(const PictureBox& box, TextView text) const override;
+  int LineHeightInPixels(const PictureBox& box) const override;
+  void DropDrawings(PictureBox& box) override;
+  void PrintLine(PictureBox& box, TextView text) override;
+
  private:
   class FormView;
   class TimerView;
@@ -141,6 +140,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   std::string NameOfWindow(WindowHandle window) const;
   void Forget(const Form& form);
 
+  const Scale scale_{};
   std::deque<int> answers_;
   bool yielding_ = false;
   Form* active_ = nullptr;

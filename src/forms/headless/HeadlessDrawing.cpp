@@ -1,21 +1,11 @@
 #include "forms/headless/HeadlessDesktop.h"
+#include "forms/view/ControlPlacement.h"
 
 #include <cstdio>
 
 namespace quendra::forms::headless {
 
 namespace {
-
-/// Units of the box's ScaleMode for a distance in pixels.
-int FromPixels(const PictureBox& box, int pixels) {
-  return box.ScaleMode == 3 ? pixels : static_cast<int>(pixels * HeadlessDesktop::TwipsPerPixel);
-}
-
-int FromTwips(const PictureBox& box, int twips) {
-  return box.ScaleMode == 3 ? static_cast<int>(twips / HeadlessDesktop::TwipsPerPixel) : twips;
-}
-
-int PixelsOf(int twips) { return static_cast<int>(twips / HeadlessDesktop::TwipsPerPixel); }
 
 std::string Place(int x, int y) { return std::to_string(x) + "," + std::to_string(y); }
 
@@ -34,26 +24,19 @@ std::uint64_t HashOf(std::string_view bytes) {
 
 } // namespace
 
-int HeadlessDesktop::ScaleWidth(const PictureBox& box) const { return FromTwips(box, box.Position().width); }
-
-int HeadlessDesktop::ScaleHeight(const PictureBox& box) const {
-  return FromTwips(box, box.Position().height);
+int HeadlessDesktop::WidthInPixels(const PictureBox& /*box*/, TextView text) const {
+  return CharacterWidth * static_cast<int>(text.size());
 }
 
-int HeadlessDesktop::TextWidth(const PictureBox& box, TextView text) const {
-  return FromPixels(box, CharacterWidth * static_cast<int>(text.size()));
-}
-
-int HeadlessDesktop::TextHeight(const PictureBox& box, TextView) const { return FromPixels(box, LineHeight); }
+int HeadlessDesktop::LineHeightInPixels(const PictureBox& /*box*/) const { return LineHeight; }
 
 void HeadlessDesktop::Draw(PictureBox& box, const std::string& drawing) {
   drawings_[&box].push_back(drawing);
   Record(ToUtf8(box.Name()) + " " + drawing);
 }
 
-void HeadlessDesktop::Cls(PictureBox& box) {
+void HeadlessDesktop::DropDrawings(PictureBox& box) {
   drawings_[&box].clear();
-  box.CurrentX = box.CurrentY = 0;
   Record("Cls " + ToUtf8(box.Name()));
 }
 
@@ -61,11 +44,9 @@ void HeadlessDesktop::FillBox(PictureBox& box, int x1, int y1, int x2, int y2, C
   Draw(box, "Box " + Place(x1, y1) + " " + Place(x2, y2) + " " + ColourText(colour));
 }
 
-void HeadlessDesktop::Print(PictureBox& box, TextView text) {
+void HeadlessDesktop::PrintLine(PictureBox& box, TextView text) {
   Draw(box, "Print " + Place(box.CurrentX, box.CurrentY) + " " + ColourText(box.ForeColour()) + " " +
                 ToUtf8(text));
-  box.CurrentX = 0;
-  box.CurrentY += TextHeight(box, text);
 }
 
 void HeadlessDesktop::BitBlt(PictureBox& target, int x, int y, int width, int height,
@@ -76,8 +57,8 @@ void HeadlessDesktop::BitBlt(PictureBox& target, int x, int y, int width, int he
   Record(ToUtf8(target.Name()) + " " + copy);
   const std::vector<std::string> copied = DrawingOf(source);
   auto& drawing = drawings_[&target];
-  const bool whole = x <= 0 && y <= 0 && x + width >= PixelsOf(target.Position().width) &&
-                     y + height >= PixelsOf(target.Position().height);
+  const Extent room = ExtentOf(target.Position(), scale_);
+  const bool whole = x <= 0 && y <= 0 && x + width >= room.width && y + height >= room.height;
   if (whole)
     drawing.clear();
   else

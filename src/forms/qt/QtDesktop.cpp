@@ -1,7 +1,7 @@
 #include "forms/qt/QtDesktop.h"
 
 #include "forms/qt/boxes/Boxes.h"
-#include "forms/qt/drawing/Palette.h"
+#include "forms/qt/drawing/Dress.h"
 
 #include <QImageReader>
 #include <QScreen>

@@ -44,17 +44,9 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
                                   int ellipseHeight) override;
   void SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) override;
 
-  int ScaleWidth(const PictureBox& box) const override { return drawing_.ScaleWidth(box); }
-  int ScaleHeight(const PictureBox& box) const override { return drawing_.ScaleHeight(box); }
-  int TextWidth(const PictureBox& box, TextView text) const override { return drawing_.TextWidth(box, text); }
-  int TextHeight(const PictureBox& box, TextView text) const override {
-    return drawing_.TextHeight(box, text);
-  }
-  void Cls(PictureBox& box) override { drawing_.Cls(box); }
   void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) override {
     drawing_.FillBox(box, x1, y1, x2, y2, colour);
   }
-  void Print(PictureBox& box, TextView text) override { drawing_.Print(box, text); }
   void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
               int sourceY) override {
     drawing_.BitBlt(target, x, y, width, height, source, sourceX, sourceY);
@@ -89,6 +81,14 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   void DestroyView(Form& form) override;
   void ShowView(Form& form, Modality modality, Form* owner) override;
   void LastFormGone() override;
+
+  const Scale& ScreenScale() const override { return scale_; }
+  int WidthInPixels(const PictureBox& box, TextView text) const override {
+    return drawing_.WidthInPixels(box, text);
+  }
+  int LineHeightInPixels(const PictureBox& box) const override { return drawing_.LineHeight(box); }
+  void DropDrawings(PictureBox& box) override { drawing_.DropDrawings(box); }
+  void PrintLine(PictureBox& box, TextView text) override { drawing_.PrintLine(box, text); }
 
  private:
   void Close(FormView& view);

@@ -1,25 +1,10 @@
 #pragma once
 
+#include "forms/view/Area.h"
+
 namespace quendra::forms {
 
 // How large a form is shown and where its window comes to lie. All numbers are pixels of the screen.
-
-struct Extent {
-  int width = 0;
-  int height = 0;
-  friend bool operator==(const Extent&, const Extent&) = default;
-};
-
-struct Spot {
-  int left = 0;
-  int top = 0;
-  friend bool operator==(const Spot&, const Spot&) = default;
-};
-
-struct Area {
-  Spot corner{};
-  Extent extent{};
-};
 
 /// Below this nobody reads the letters any more.
 inline constexpr double kLeastScale = 0.7;

@@ -13,7 +13,7 @@ struct MainForm : Form {
     Move(0, 0, 6000, 3000);
     picture.Move(0, 0, 1500, 750);
     buffer.Move(0, 0, 1500, 750);
-    buffer.ScaleMode = 3;
+    buffer.ScaleMode = ScaleMode::Pixels;
   }
   void Form_KeyDown(int keyCode, int shift) override { keys.push_back(keyCode * 10 + shift); }
 

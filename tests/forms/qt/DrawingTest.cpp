@@ -28,7 +28,7 @@ class Drawing : public QtFixture {
     form.design = [this] {
       for (PictureBox* picture : {&box, &other}) {
         picture->Move(0, 0, 1500, 1500);
-        picture->ScaleMode = 3;
+        picture->ScaleMode = ScaleMode::Pixels;
       }
     };
     desktop.Load(form);
@@ -79,7 +79,7 @@ TEST_F(Drawing, A_gradient_in_bands_has_the_last_bands_colour_in_every_row) {
 TEST_F(Drawing, Measures_are_in_the_unit_of_the_scale_mode) {
   EXPECT_EQ(desktop.ScaleWidth(box), 100);
   const int pixels = desktop.TextHeight(box, u"א");
-  box.ScaleMode = 1;
+  box.ScaleMode = ScaleMode::Twips;
 
   EXPECT_EQ(desktop.ScaleWidth(box), 1500);
   EXPECT_EQ(desktop.TextHeight(box, u"א"), pixels * kPixel);
@@ -159,7 +159,7 @@ TEST_F(Drawing, A_moved_container_keeps_the_drawings_of_what_is_in_it) {
     inner.Move(0, 0, 480, 480);
   };
   desktop.Load(form);
-  inner.ScaleMode = 3;
+  inner.ScaleMode = ScaleMode::Pixels;
   desktop.FillBox(inner, 0, 0, 31, 31, kRed);
 
   frame.Move(0, 300, 4500, 3000);

@@ -22,7 +22,7 @@ class FormOnSmallScreen : public QtFixture {
       label.Move(100 * kPixel, 40 * kPixel, 200 * kPixel, 20 * kPixel);
       label.TextFont = Font{12, false, false};
       box.Move(0, 100 * kPixel, 100 * kPixel, 100 * kPixel);
-      box.ScaleMode = 3;
+      box.ScaleMode = ScaleMode::Pixels;
       list.Move(0, 220 * kPixel, 400 * kPixel, 300 * kPixel);
       if (alter) alter();
     };
@@ -179,7 +179,7 @@ TEST_F(FormOnSmallScreen, Copies_between_picture_boxes_to_their_last_row) {
   PictureBox other(form, u"other");
   alter = [&] {
     other.Move(0, 0, 100 * kPixel, 100 * kPixel);
-    other.ScaleMode = 3;
+    other.ScaleMode = ScaleMode::Pixels;
     other.BackColour = kBlack;
   };
   desktop.Show(form);

@@ -245,9 +245,9 @@ TEST_F(TableView, A_text_of_4_KB_is_cut_and_its_tip_is_plain_text) {
 }
 
 TEST_F(TableView, Texts_with_Hebrew_read_from_right_to_left_and_others_keep_their_own_order) {
-  EXPECT_EQ(qt::DirectionOf(u"C:\\Program Files (x86)"), Qt::LeftToRight);
-  EXPECT_EQ(qt::DirectionOf(u".80.1025."), Qt::LeftToRight);
-  EXPECT_EQ(qt::DirectionOf(u"file שלום.exe"), Qt::RightToLeft);
+  EXPECT_EQ(ToQt(DirectionOf(u"C:\\Program Files (x86)")), Qt::LeftToRight);
+  EXPECT_EQ(ToQt(DirectionOf(u".80.1025.")), Qt::LeftToRight);
+  EXPECT_EQ(ToQt(DirectionOf(u"file שלום.exe")), Qt::RightToLeft);
 }
 
 TEST_F(TableView, A_leading_cell_stands_at_the_right_edge_of_a_mirrored_form) {

@@ -3,7 +3,7 @@
 #include "forms/qt/boxes/BoxIcons.h"
 #include "forms/qt/boxes/BoxText.h"
 #include "forms/qt/drawing/Conversion.h"
-#include "forms/qt/drawing/Palette.h"
+#include "forms/view/Palette.h"
 
 #include <QGridLayout>
 #include <QGuiApplication>
@@ -19,7 +19,7 @@ namespace quendra::forms::qt {
 namespace {
 
 constexpr int kOkPressed = 1;
-constexpr qsizetype kMostText = 4096;
+constexpr std::size_t kMostText = 4096;
 /// Pixels: room for the title of a short box.
 constexpr int kLeastWidth = 320;
 constexpr int kIconSide = 40;
@@ -47,7 +47,7 @@ QString MarkedRightToLeft(QString text) {
 
 void LayOut(QMessageBox& box) {
   QPalette page = box.palette();
-  page.setColor(QPalette::Window, palette::kPage);
+  page.setColor(QPalette::Window, ToQColor(Palette::Page));
   box.setPalette(page);
   if (auto* grid = qobject_cast<QGridLayout*>(box.layout())) {
     grid->setContentsMargins(20, 18, 20, 16);
@@ -89,8 +89,8 @@ int ShowBox(QWidget* owner, const Text& text, int flags, const Text& title) {
   if (sign && box.icon() != QMessageBox::NoIcon)
     sign->setPixmap(BoxIcon(flags, kIconSide, box.devicePixelRatioF()));
   box.setTextFormat(Qt::PlainText);
-  box.setWindowTitle(VisibleText(title));
-  const QString shown = VisibleText(text, LineBreaks::Keep, kMostText);
+  box.setWindowTitle(ShownText(title));
+  const QString shown = ToQString(VisibleText(text, LineBreaks::Keep, kMostText));
   const QScreen* screen = owner ? owner->screen() : QGuiApplication::primaryScreen();
   PutText(box, rightToLeft ? MarkedRightToLeft(shown) : shown, screen->availableSize());
   QPushButton* ok =

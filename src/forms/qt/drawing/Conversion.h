@@ -2,11 +2,12 @@
 
 #include "forms/controls/Colour.h"
 #include "forms/controls/Control.h"
-#include "forms/controls/Controls.h"
-#include "runtime/Text.h"
+#include "forms/view/ControlPlacement.h"
+#include "forms/view/VisibleText.h"
 
 #include <QColor>
 #include <QFont>
+#include <QRect>
 #include <QString>
 
 namespace quendra::forms::qt {
@@ -19,23 +20,23 @@ inline QColor ToQColor(Colour colour) {
   return QColor(static_cast<int>(colour & 0xFF), static_cast<int>(colour >> 8 & 0xFF),
                 static_cast<int>(colour >> 16 & 0xFF));
 }
-QFont ToQFont(const Font& font, double zoom = 1);
+inline QRect ToQRect(const Area& area) {
+  return {area.corner.left, area.corner.top, area.extent.width, area.extent.height};
+}
+inline Extent ToExtent(QSize size) { return {size.width(), size.height()}; }
+inline Area ToArea(const QRect& area) { return {{area.x(), area.y()}, ToExtent(area.size())}; }
+inline Spot ToSpot(QPoint point) { return {point.x(), point.y()}; }
+inline QPoint ToQPoint(Spot spot) { return {spot.left, spot.top}; }
+QFont ToQFont(const Font& font, const Scale& scale = {});
 
-enum class LineBreaks { Keep, Show };
+inline Qt::LayoutDirection ToQt(Direction direction) {
+  return direction == Direction::RightToLeft ? Qt::RightToLeft : Qt::LeftToRight;
+}
+Qt::Alignment ToQt(Side side);
 
-/// The text as it can be shown without harm: control characters, direction marks and broken code units become
-/// visible signs, and what goes beyond `limit` code units is cut with an ellipsis. Line breaks stay or are
-/// made visible too.
-QString VisibleText(TextView text, LineBreaks lineBreaks = LineBreaks::Show, qsizetype limit = 1024);
-
-/// Right to left for a text that holds Hebrew, left to right for any other: addresses, paths and names keep
-/// their order.
-Qt::LayoutDirection DirectionOf(QStringView text);
-/// The text set apart from its surroundings when it reads from left to right, for widgets that lay out by
-/// themselves.
-QString Isolated(const QString& text);
-
-/// The side that an alignment means in a form that reads in this direction.
-Qt::Alignment SideOf(Alignment alignment, bool rightToLeft);
+/// VisibleText as the toolkit takes it.
+inline QString ShownText(TextView text, LineBreaks lineBreaks = LineBreaks::Show) {
+  return ToQString(VisibleText(text, lineBreaks));
+}
 
 } // namespace quendra::forms::qt

@@ -1,6 +1,8 @@
 #include "forms/qt/drawing/PictureStore.h"
 
+#include "forms/qt/drawing/Conversion.h"
 #include "forms/qt/drawing/Resources.h"
+#include "forms/view/Palette.h"
 
 #include <QFile>
 #include <QGuiApplication>
@@ -15,9 +17,9 @@ namespace {
 
 QPixmap Placeholder() {
   QPixmap pixmap(32, 32);
-  pixmap.fill(QColor(0xE4, 0xE7, 0xEB));
+  pixmap.fill(ToQColor(Palette::Placeholder));
   QPainter painter(&pixmap);
-  painter.setPen(QColor(0x9A, 0xA5, 0xB1));
+  painter.setPen(ToQColor(Palette::PlaceholderBorder));
   painter.drawRect(0, 0, 31, 31);
   return pixmap;
 }

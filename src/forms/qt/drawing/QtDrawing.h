@@ -11,13 +11,11 @@ class QtDrawing {
  public:
   explicit QtDrawing(const Scale& scale) : scale_(scale) {}
 
-  int ScaleWidth(const PictureBox& box) const;
-  int ScaleHeight(const PictureBox& box) const;
-  int TextWidth(const PictureBox& box, TextView text) const;
-  int TextHeight(const PictureBox& box, TextView text) const;
-  void Cls(PictureBox& box);
+  int WidthInPixels(const PictureBox& box, TextView text) const;
+  int LineHeight(const PictureBox& box) const;
+  void DropDrawings(PictureBox& box);
   void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour);
-  void Print(PictureBox& box, TextView text);
+  void PrintLine(PictureBox& box, TextView text);
   void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
               int sourceY);
   void Refresh(PictureBox& box);
@@ -26,11 +24,6 @@ class QtDrawing {
   Picture ImageOf(const PictureBox& box) const;
 
  private:
-  int PixelsX(const PictureBox& box, int units) const;
-  int PixelsY(const PictureBox& box, int units) const;
-  int UnitsX(const PictureBox& box, double pixels) const;
-  int UnitsY(const PictureBox& box, double pixels) const;
-
   const Scale& scale_;
 };
 

@@ -85,11 +85,9 @@ void MouseEvents::Raise(WidgetView& view, const Event<int, int, int, int>& raise
                         const QMouseEvent& event) {
   if (!raised) return;
   const QPointF place = view.Body().mapFromGlobal(event.globalPosition());
-  const double fromLeading = view.ReadsFromRightToLeft() ? view.Body().width() - place.x() : place.x();
-  const Scale& scale = view.Context().scale;
-  dispatcher_.Dispatch([&] {
-    raised(button, ShiftStateOf(event.modifiers()), scale.TwipsX(fromLeading), scale.TwipsY(place.y()));
-  });
+  const Spot twips =
+      TwipsAt(place.x(), place.y(), view.Body().width(), view.Context().scale, view.ReadingDirection());
+  dispatcher_.Dispatch([&] { raised(button, ShiftStateOf(event.modifiers()), twips.left, twips.top); });
 }
 
 void MouseEvents::Pressed(WidgetView& view, const QMouseEvent& event) {

@@ -24,15 +24,16 @@ void ComboBoxView::Apply(Aspect aspect) {
 // It has no caption of its own; that of the frame around it tells what is chosen here.
 QString ComboBoxView::AccessibleName() const {
   const auto* frame = dynamic_cast<const Frame*>(Combo().Parent());
-  return frame ? VisibleText(frame->Caption()).trimmed() : QString();
+  return frame ? ShownText(frame->Caption()).trimmed() : QString();
 }
 
 void ComboBoxView::FillItems() {
   // Items only grow until they are cleared, so the ones that stand here already are right.
   if (count() > Combo().ListCount() || Combo().ListCount() == 0) clear();
   for (int i = count(); i < Combo().ListCount(); ++i) {
-    const QString text = VisibleText(Combo().List(i));
-    addItem(Isolated(text));
+    const Text visible = VisibleText(Combo().List(i));
+    const QString text = ToQString(visible);
+    addItem(ToQString(Isolated(visible)));
     setItemData(i, text.toHtmlEscaped(), Qt::ToolTipRole);
     setItemData(i, text, Qt::AccessibleTextRole);
   }

@@ -23,10 +23,6 @@ namespace {
 /// What a window manager puts round a window, until it has told so itself; rather too much than too little.
 constexpr QMargins kLikelyFrame{4, 36, 4, 4};
 
-Extent ExtentOf(QSize size) { return {size.width(), size.height()}; }
-
-Area AreaOf(const QRect& rectangle) { return {{rectangle.x(), rectangle.y()}, ExtentOf(rectangle.size())}; }
-
 QRect UsableScreen(const QWidget& window) { return window.screen()->availableGeometry(); }
 
 Qt::WindowFlags WindowFlagsOf(const Form& form) {
@@ -44,7 +40,7 @@ Qt::WindowFlags WindowFlagsOf(const Form& form) {
 FormView::FormView(ViewContext& context, Form& form, WindowHandle handle)
     : FormContext(context), WidgetView(shared_, form, *this), handle_(handle), page_(new QWidget) {
   setWindowFlags(WindowFlagsOf(form));
-  setLayoutDirection(form.RightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
+  setLayoutDirection(ToQt(ReadingDirection()));
   setFrameShape(QFrame::NoFrame);
   setFocusPolicy(Qt::NoFocus);
   viewport()->setAttribute(Qt::WA_OpaquePaintEvent);
@@ -97,7 +93,7 @@ void FormView::ControlGone() {
 }
 
 void FormView::Apply(Aspect aspect) {
-  if (Concerns(aspect, Aspect::Caption)) setWindowTitle(VisibleText(TheForm()->Caption()));
+  if (Concerns(aspect, Aspect::Caption)) setWindowTitle(ShownText(TheForm()->Caption()));
   if (aspect == Aspect::Geometry) {
     PlaceChildren(*TheForm());
     if (isVisible()) ComeOnScreen();
@@ -115,7 +111,7 @@ void FormView::Place() {
   const Qt::ScrollBarPolicy bars = fitting.scrolls ? Qt::ScrollBarAsNeeded : Qt::ScrollBarAlwaysOff;
   setHorizontalScrollBarPolicy(bars);
   setVerticalScrollBarPolicy(bars);
-  const Extent inside = WindowExtent(ExtentOf(page_->size()), room, verticalScrollBar()->sizeHint().width());
+  const Extent inside = WindowExtent(ToExtent(page_->size()), room, verticalScrollBar()->sizeHint().width());
   if (TheForm()->Border == BorderStyle::Sizable)
     resize(inside.width, inside.height);
   else
@@ -150,7 +146,7 @@ QMargins FormView::Frame() const {
   return known.isNull() ? kLikelyFrame : known;
 }
 
-Extent FormView::Room() const { return ExtentOf(UsableScreen(*this).marginsRemoved(Frame()).size()); }
+Extent FormView::Room() const { return ToExtent(UsableScreen(*this).marginsRemoved(Frame()).size()); }
 
 // The window manager tells its frame once the window is up.
 void FormView::SettleFrame() {
@@ -164,14 +160,14 @@ void FormView::SettleFrame() {
 
 void FormView::CentreOver(const QRect& over) {
   const Spot corner =
-      CornerOver(ExtentOf(size().grownBy(Frame())), AreaOf(over), AreaOf(UsableScreen(*this)));
+      CornerOver(ToExtent(size().grownBy(Frame())), ToArea(over), ToArea(UsableScreen(*this)));
   move(corner.left, corner.top);
 }
 
 void FormView::ComeOnScreen() {
   const QRect window = geometry().marginsAdded(Frame());
-  const Spot corner = CornerOnScreen(AreaOf(window), AreaOf(UsableScreen(*this)));
-  const QPoint there(corner.left, corner.top);
+  const Spot corner = CornerOnScreen(ToArea(window), ToArea(UsableScreen(*this)));
+  const QPoint there = ToQPoint(corner);
   if (there != window.topLeft()) move(there);
 }
 
@@ -182,7 +178,7 @@ void FormView::Show() {
   if (modalLoop_) modalLoop_->quit();
 }
 
-QString FormView::AccessibleName() const { return VisibleText(TheForm()->Caption()); }
+QString FormView::AccessibleName() const { return ShownText(TheForm()->Caption()); }
 
 void FormView::ShowOver(const QWidget* owner) {
   if (!std::exchange(wasPlaced_, true)) {

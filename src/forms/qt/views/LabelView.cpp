@@ -1,6 +1,6 @@
 #include "forms/qt/views/LabelView.h"
 
-#include "forms/qt/drawing/Palette.h"
+#include "forms/view/Palette.h"
 
 #include <QApplication>
 #include <QKeyEvent>
@@ -36,7 +36,7 @@ void LabelView::Place() {
 
 QString LabelView::AccessibleName() const {
   const Text& caption = TheLabel()->Caption();
-  return VisibleText(caption.empty() ? TheLabel()->Description : caption, LineBreaks::Keep);
+  return ShownText(caption.empty() ? TheLabel()->Description : caption, LineBreaks::Keep);
 }
 
 bool LabelView::event(QEvent* event) {
@@ -74,22 +74,23 @@ void LabelView::PaintFace(QPainter& painter) const {
     if (!TheLabel()->Transparent()) painter.fillRect(LabelRect(), ToQColor(TheLabel()->BackColour()));
     return;
   }
-  painter.setPen(QPen(isEnabled() ? palette::kStrongBorder : palette::kBorder, 1));
+  painter.setPen(QPen(isEnabled() ? ToQColor(Palette::StrongBorder) : ToQColor(Palette::Border), 1));
   painter.setBrush(FaceColour());
   painter.drawRoundedRect(QRectF(rect()).adjusted(0.5, 0.5, -0.5, -0.5), 6, 6);
 }
 
 QColor LabelView::FaceColour() const {
-  if (!isEnabled()) return palette::kQuietPage;
-  const QColor face = TheLabel()->Transparent() ? palette::kPage : ToQColor(TheLabel()->BackColour());
+  if (!isEnabled()) return ToQColor(Palette::QuietPage);
+  const QColor face =
+      TheLabel()->Transparent() ? ToQColor(Palette::Page) : ToQColor(TheLabel()->BackColour());
   return underMouse() ? face.darker(IsHeldDown() ? 115 : 105) : face;
 }
 
 QColor LabelView::InkColour() const {
-  if (!isEnabled()) return palette::kQuietInk;
+  if (!isEnabled()) return ToQColor(Palette::QuietInk);
   const Colour colour = TheLabel()->ForeColour();
   if (colour != kBlack) return ToQColor(colour);
-  return TheLabel()->Style() == Label::Look::Link ? palette::kLink : palette::kInk;
+  return TheLabel()->Style() == Label::Look::Link ? ToQColor(Palette::Link) : ToQColor(Palette::Ink);
 }
 
 int LabelView::RingRoom() const { return TheLabel()->Style() == Label::Look::Link ? kRingRoom : 0; }
@@ -99,19 +100,19 @@ QRect LabelView::LabelRect() const {
 }
 
 void LabelView::PaintText(QPainter& painter) const {
-  const QString text = VisibleText(TheLabel()->Caption(), LineBreaks::Keep);
+  const QString text = ShownText(TheLabel()->Caption(), LineBreaks::Keep);
   if (text.isEmpty()) return;
   const Label::Look look = TheLabel()->Style();
   QFont drawn = font();
   if (look == Label::Look::Link) drawn.setUnderline(true);
   painter.setFont(drawn);
   painter.setPen(InkColour());
-  painter.setLayoutDirection(DirectionOf(text));
+  painter.setLayoutDirection(ToQt(DirectionOf(TheLabel()->Caption())));
   const QRect place = LabelRect();
   const bool wraps = TheLabel()->WordWrap() || text.contains(u'\n');
   const Alignment align = look == Label::Look::Button ? Alignment::Centre : TheLabel()->Align();
   const bool top = wraps && look != Label::Look::Button;
-  const auto flags = SideOf(align, ReadsFromRightToLeft()) | (top ? Qt::AlignTop : Qt::AlignVCenter);
+  const auto flags = ToQt(SideOf(align, ReadingDirection())) | (top ? Qt::AlignTop : Qt::AlignVCenter);
   if (wraps) return painter.drawText(place, static_cast<int>(flags) | Qt::TextWordWrap, text);
   painter.drawText(place, static_cast<int>(flags) | Qt::TextSingleLine,
                    painter.fontMetrics().elidedText(text, Qt::ElideRight, place.width()));
@@ -120,15 +121,15 @@ void LabelView::PaintText(QPainter& painter) const {
 /// Round its letters, which may take up a small part of the label.
 QRectF LabelView::RingOfLink() const {
   const QFontMetrics metrics(font());
-  const int width = metrics.horizontalAdvance(VisibleText(TheLabel()->Caption(), LineBreaks::Keep));
+  const int width = metrics.horizontalAdvance(ShownText(TheLabel()->Caption(), LineBreaks::Keep));
   const QRect label = LabelRect();
   const QSize letters(std::min(width, label.width()), std::min(metrics.height(), label.height()));
-  const auto flags = SideOf(TheLabel()->Align(), ReadsFromRightToLeft()) | Qt::AlignVCenter;
+  const auto flags = ToQt(SideOf(TheLabel()->Align(), ReadingDirection())) | Qt::AlignVCenter;
   return QRectF(QStyle::alignedRect(Qt::LeftToRight, flags, letters, label)).adjusted(-2, -2, 2, 2);
 }
 
 void LabelView::PaintFocus(QPainter& painter) const {
-  painter.setPen(QPen(palette::kFocus, 2));
+  painter.setPen(QPen(ToQColor(Palette::Focus), 2));
   painter.setBrush(Qt::NoBrush);
   if (TheLabel()->Style() == Label::Look::Link) {
     painter.drawRoundedRect(RingOfLink(), 4, 4);
@@ -136,7 +137,7 @@ void LabelView::PaintFocus(QPainter& painter) const {
   }
   painter.drawRoundedRect(QRectF(rect()).adjusted(1, 1, -1, -1), 5, 5);
   // The light line within sets the ring off from dark faces and pictures.
-  painter.setPen(QPen(palette::kPage, 1));
+  painter.setPen(QPen(ToQColor(Palette::Page), 1));
   painter.drawRoundedRect(QRectF(rect()).adjusted(2.5, 2.5, -2.5, -2.5), 4, 4);
 }
 

@@ -2,9 +2,6 @@
 
 #include <QPainter>
 
-#include <algorithm>
-#include <cstdlib>
-
 namespace quendra::forms::qt {
 
 LineView::LineView(ViewContext& context, Line& line, QWidget* parent)
@@ -12,34 +9,26 @@ LineView::LineView(ViewContext& context, Line& line, QWidget* parent)
   setAttribute(Qt::WA_TransparentForMouseEvents);
 }
 
-/// Room around the ends for half of a thick stroke.
-int LineView::Margin() const { return std::clamp(TheLine().BorderWidth(), 1, 32); }
-
 void LineView::Place() {
-  const LineEnds ends = TheLine().Ends();
-  PlaceAt({std::min(ends.x1, ends.x2), std::min(ends.y1, ends.y2), std::abs(ends.x2 - ends.x1),
-           std::abs(ends.y2 - ends.y1)});
-  const int margin = Margin();
+  PlaceAt(BoundsOf(TheLine().Ends()));
+  const int margin = StrokeRoom(TheLine().BorderWidth());
   setGeometry(geometry().adjusted(-margin, -margin, margin, margin));
 }
 
 void LineView::paintEvent(QPaintEvent* /*event*/) {
   if (!TheControl()) return;
-  const LineEnds ends = TheLine().Ends();
-  const int margin = Margin();
+  const int margin = StrokeRoom(TheLine().BorderWidth());
   const QRect box = rect().adjusted(margin, margin, -margin, -margin);
   const int right = box.left() + box.width();
   const int bottom = box.top() + box.height();
-  bool falls = (ends.x1 < ends.x2) == (ends.y1 < ends.y2);
-  if (ReadsFromRightToLeft()) falls = !falls;
+  const Stroke stroke = StrokeOf(TheLine().Ends(), ReadingDirection());
   QPainter painter(this);
   painter.setPen(QPen(ToQColor(TheLine().ForeColour()), TheLine().BorderWidth()));
-  const bool straight = ends.x1 == ends.x2 || ends.y1 == ends.y2;
-  painter.setRenderHint(QPainter::Antialiasing, !straight);
-  if (straight || falls)
-    painter.drawLine(box.left(), box.top(), right, bottom);
-  else
+  painter.setRenderHint(QPainter::Antialiasing, stroke != Stroke::Straight);
+  if (stroke == Stroke::Rising)
     painter.drawLine(box.left(), bottom, right, box.top());
+  else
+    painter.drawLine(box.left(), box.top(), right, bottom);
 }
 
 } // namespace quendra::forms::qt

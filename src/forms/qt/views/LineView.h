@@ -15,7 +15,6 @@ class LineView : public QWidget, public WidgetView {
 
  private:
   const Line& TheLine() const { return static_cast<const Line&>(*TheControl()); }
-  int Margin() const;
 };
 
 } // namespace quendra::forms::qt

@@ -1,7 +1,8 @@
 #pragma once
 
-#include "forms/qt/Scale.h"
 #include "forms/qt/views/ListModel.h"
+#include "forms/view/Direction.h"
+#include "forms/view/Scale.h"
 
 #include <QStyledItemDelegate>
 
@@ -11,8 +12,8 @@ namespace quendra::forms::qt {
 /// second.
 class ListDelegate : public QStyledItemDelegate {
  public:
-  ListDelegate(const ListModel& model, const Scale& scale, bool rightToLeft, QObject* parent)
-      : QStyledItemDelegate(parent), model_(model), scale_(scale), rightToLeft_(rightToLeft) {}
+  ListDelegate(const ListModel& model, const Scale& scale, Direction direction, QObject* parent)
+      : QStyledItemDelegate(parent), model_(model), scale_(scale), direction_(direction) {}
 
   void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
   QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
@@ -24,7 +25,7 @@ class ListDelegate : public QStyledItemDelegate {
 
   const ListModel& model_;
   const Scale& scale_;
-  bool rightToLeft_;
+  Direction direction_;
 };
 
 } // namespace quendra::forms::qt

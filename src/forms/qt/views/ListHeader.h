@@ -1,7 +1,8 @@
 #pragma once
 
-#include "forms/qt/Scale.h"
 #include "forms/qt/views/ListModel.h"
+#include "forms/view/Direction.h"
+#include "forms/view/Scale.h"
 
 #include <QHeaderView>
 
@@ -10,7 +11,7 @@ namespace quendra::forms::qt {
 /// The header of a list: captions or icons, and an arrow on the column that the rows are sorted by.
 class ListHeader : public QHeaderView {
  public:
-  ListHeader(const ListModel& model, const Scale& scale, bool rightToLeft, QWidget* parent);
+  ListHeader(const ListModel& model, const Scale& scale, Direction direction, QWidget* parent);
   QSize sizeHint() const override;
 
  protected:
@@ -21,7 +22,7 @@ class ListHeader : public QHeaderView {
 
   const ListModel& model_;
   const Scale& scale_;
-  bool rightToLeft_;
+  Direction direction_;
 };
 
 } // namespace quendra::forms::qt

@@ -32,9 +32,9 @@ QVariant ListModel::data(const QModelIndex& index, int role) const {
   if (!row || index.column() > row->CellCount()) return {};
   switch (role) {
   case Qt::DisplayRole:
-  case Qt::AccessibleTextRole: return VisibleText(row->CellText(index.column()));
+  case Qt::AccessibleTextRole: return ShownText(row->CellText(index.column()));
   case Qt::ToolTipRole: {
-    const QString text = VisibleText(row->CellText(index.column()));
+    const QString text = ShownText(row->CellText(index.column()));
     return text.isEmpty() ? QVariant() : TipOf(text);
   }
   default: return {};
@@ -45,10 +45,9 @@ QVariant ListModel::headerData(int section, Qt::Orientation orientation, int rol
   if (orientation != Qt::Horizontal || section < 0 || section >= columnCount()) return {};
   const ColumnHeader& column = list_->Columns()[static_cast<std::size_t>(section)];
   switch (role) {
-  case Qt::DisplayRole: return VisibleText(column.caption);
+  case Qt::DisplayRole: return ShownText(column.caption);
   case Qt::ToolTipRole: return column.caption.empty() ? QVariant(ToQString(column.description)) : QVariant();
-  case Qt::AccessibleTextRole:
-    return VisibleText(column.caption.empty() ? column.description : column.caption);
+  case Qt::AccessibleTextRole: return ShownText(column.caption.empty() ? column.description : column.caption);
   default: return {};
   }
 }

@@ -1,10 +1,10 @@
 #include "forms/qt/views/ListViewView.h"
 
-#include "forms/qt/drawing/Palette.h"
 #include "forms/qt/input/MouseEvents.h"
 #include "forms/qt/views/ListDelegate.h"
 #include "forms/qt/views/ListHeader.h"
 #include "forms/view/ListLayout.h"
+#include "forms/view/Palette.h"
 
 #include <QKeyEvent>
 #include <QPainter>
@@ -25,13 +25,13 @@ ListViewView::ListViewView(ViewContext& context, ListView& list, QWidget* parent
   setVerticalScrollMode(QAbstractItemView::ScrollPerItem);
   setHorizontalScrollMode(QAbstractItemView::ScrollPerPixel);
   setTextElideMode(Qt::ElideRight);
-  auto* header = new ListHeader(model_, context.scale, ReadsFromRightToLeft(), this);
+  auto* header = new ListHeader(model_, context.scale, ReadingDirection(), this);
   setHeader(header);
   header->setSectionsClickable(true); // setHeader takes it away
   connect(header, &QHeaderView::sectionClicked, this, [this](int section) { HeaderClicked(section); });
   connect(header, &QHeaderView::sectionResized, this,
           [this] { sizedByHand_ = sizedByHand_ || !(sizing_ || quiet_); });
-  setItemDelegate(new ListDelegate(model_, context.scale, ReadsFromRightToLeft(), this));
+  setItemDelegate(new ListDelegate(model_, context.scale, ReadingDirection(), this));
   setModel(&model_);
   Context().mouse.Watch(*viewport(), *this);
   list.Observe(this);
@@ -121,8 +121,7 @@ int ListViewView::RowHeight() const { return ListDelegate::RowHeight(fontMetrics
 
 void ListViewView::FitRows() {
   if (!TheControl()) return;
-  const Geometry place = List().Position();
-  const int room = Context().scale.PixelsY(place.top + place.height) - Context().scale.PixelsY(place.top);
+  const int room = ExtentOf(List().Position(), Context().scale).height;
   // Frame, header and a scroll bar below the rows.
   const int around = height() - viewport()->height();
   resize(width(), around + WholeRows(room - around, RowHeight()));
@@ -169,7 +168,7 @@ void ListViewView::paintEvent(QPaintEvent* event) {
   QTreeView::paintEvent(event);
   if (!hasFocus() || !window()->testAttribute(Qt::WA_KeyboardFocusChange)) return;
   QPainter painter(viewport());
-  painter.setPen(QPen(palette::kFocus, 2));
+  painter.setPen(QPen(ToQColor(Palette::Focus), 2));
   painter.drawRect(viewport()->rect().adjusted(1, 1, -1, -1));
 }
 

@@ -1,8 +1,8 @@
 #include "forms/qt/views/PictureBoxView.h"
 
-#include "forms/qt/drawing/Palette.h"
 #include "forms/qt/views/FrameView.h"
 #include "forms/qt/views/ImageView.h"
+#include "forms/view/Palette.h"
 
 #include <QPainter>
 
@@ -15,10 +15,8 @@ PictureBoxView::PictureBoxView(ViewContext& context, PictureBox& box, QWidget* p
 
 QSize PictureBoxView::LaidOutSize() const {
   if (!TheControl()) return {};
-  const Scale scale = Context().scale.Unzoomed();
-  const Geometry place = Box().Position();
-  return {scale.PixelsX(place.left + place.width) - scale.PixelsX(place.left),
-          scale.PixelsY(place.top + place.height) - scale.PixelsY(place.top)};
+  const Extent extent = ExtentOf(Box().Position(), Context().scale.Unzoomed());
+  return {extent.width, extent.height};
 }
 
 QSize PictureBoxView::SurfaceSize() const {
@@ -54,7 +52,7 @@ void PictureBoxView::paintEvent(QPaintEvent* /*event*/) {
   if (!TheControl()) return;
   PaintLayers(painter, size(), Ground::Drawn);
   if (!Box().Border()) return;
-  painter.setPen(palette::kBorder);
+  painter.setPen(ToQColor(Palette::Border));
   painter.drawRect(rect().adjusted(0, 0, -1, -1));
 }
 

@@ -2,12 +2,10 @@
 
 #include "forms/qt/input/MouseEvents.h"
 
-#include <algorithm>
-
 namespace quendra::forms::qt {
 
 WidgetView::WidgetView(ViewContext& context, Control& control, QWidget& widget)
-    : context_(context), control_(&control), widget_(widget), rightToLeft_(control.OwnerForm().RightToLeft) {
+    : context_(context), control_(&control), widget_(widget), direction_(DirectionOf(control.OwnerForm())) {
   context_.mouse.Watch(widget_, *this);
 }
 
@@ -26,7 +24,7 @@ void WidgetView::Changed(Aspect aspect) {
   if (!control_) return;
   if (aspect == Aspect::All) Identify();
   if (Concerns(aspect, Aspect::Geometry)) Place();
-  if (Concerns(aspect, Aspect::Font)) widget_.setFont(ToQFont(control_->TextFont(), context_.scale.zoom));
+  if (Concerns(aspect, Aspect::Font)) widget_.setFont(ToQFont(control_->TextFont(), context_.scale));
   if (Concerns(aspect, Aspect::Enabled)) Enable();
   if (aspect == Aspect::Order) widget_.raise();
   Apply(aspect);
@@ -53,17 +51,8 @@ void WidgetView::Place() { PlaceAt(control_->Position()); }
 void WidgetView::Show() { widget_.setVisible(control_->Visible()); }
 
 void WidgetView::PlaceAt(const Geometry& geometry) {
-  const Scale& scale = context_.scale;
-  // Both edges are rounded, not the width: controls that touch in twips touch in pixels.
-  int left = scale.PixelsX(geometry.left);
-  int right = scale.PixelsX(geometry.left + geometry.width);
-  if (rightToLeft_ && control_->Parent()) {
-    const int container = scale.PixelsX(control_->Parent()->Position().width);
-    left = container - std::exchange(right, container - left);
-  }
-  const int top = scale.PixelsY(geometry.top);
-  const int bottom = scale.PixelsY(geometry.top + geometry.height);
-  widget_.setGeometry(left, top, std::max(0, right - left), std::max(0, bottom - top));
+  const int container = control_->Parent()->Position().width;
+  widget_.setGeometry(ToQRect(PlaceOf(geometry, container, context_.scale, direction_)));
 }
 
 void WidgetView::Press() {

@@ -1,7 +1,6 @@
 #pragma once
 
 #include "forms/Desktop.h"
-#include "forms/qt/Scale.h"
 #include "forms/qt/drawing/Conversion.h"
 #include "forms/qt/drawing/PictureStore.h"
 #include "forms/qt/loop/Dispatcher.h"
@@ -45,7 +44,7 @@ class WidgetView : public View {
   /// The widget in which places in the control are told.
   virtual QWidget& Body() const { return widget_; }
   ViewContext& Context() const { return context_; }
-  bool ReadsFromRightToLeft() const { return rightToLeft_; }
+  Direction ReadingDirection() const { return direction_; }
 
   /// A press by the mouse, a key or assistive technology.
   void Press();
@@ -71,7 +70,7 @@ class WidgetView : public View {
   ViewContext& context_;
   Control* control_;
   QWidget& widget_;
-  bool rightToLeft_;
+  Direction direction_;
 };
 
 /// Gives the names and roles of the views to assistive technology. Once a process.

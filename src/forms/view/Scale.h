@@ -1,8 +1,9 @@
 #pragma once
 
+#include <algorithm>
 #include <cmath>
 
-namespace quendra::forms::qt {
+namespace quendra::forms {
 
 /// Twips to logical pixels of the screen and back.
 struct Scale {
@@ -17,6 +18,8 @@ struct Scale {
   int TwipsY(double pixels) const { return static_cast<int>(std::lround(pixels * twipsPerPixelY)); }
   /// A length that the look of a control has in pixels.
   int Pixels(int length) const { return static_cast<int>(std::lround(length * zoom)); }
+  /// The size in points that letters are shown in; none vanish.
+  double Points(int size) const { return std::max(1.0, size * zoom); }
 
   /// This scale of a screen for a form that is shown in another size.
   Scale Zoomed(double factor) const { return {twipsPerPixelX / factor, twipsPerPixelY / factor, factor}; }
@@ -24,4 +27,4 @@ struct Scale {
   Scale Unzoomed() const { return {twipsPerPixelX * zoom, twipsPerPixelY * zoom, 1}; }
 };
 
-} // namespace quendra::forms::qt
+} // namespace quendra::forms

@@ -1,6 +1,8 @@
-#include "forms/qt/drawing/Palette.h"
+#include "forms/qt/drawing/Dress.h"
 
+#include "forms/qt/drawing/Conversion.h"
 #include "forms/qt/drawing/Fonts.h"
+#include "forms/view/Palette.h"
 
 #include <QApplication>
 #include <QFont>
@@ -13,18 +15,18 @@ namespace {
 
 QPalette HousePalette() {
   QPalette house;
-  house.setColor(QPalette::Window, palette::kQuietPage);
-  house.setColor(QPalette::Base, palette::kPage);
-  house.setColor(QPalette::AlternateBase, palette::kQuietPage);
-  house.setColor(QPalette::Button, QColor(0xFB, 0xFC, 0xFD));
+  house.setColor(QPalette::Window, ToQColor(Palette::QuietPage));
+  house.setColor(QPalette::Base, ToQColor(Palette::Page));
+  house.setColor(QPalette::AlternateBase, ToQColor(Palette::QuietPage));
+  house.setColor(QPalette::Button, ToQColor(Palette::Button));
   for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText, QPalette::ToolTipText})
-    house.setColor(role, palette::kInk);
+    house.setColor(role, ToQColor(Palette::Ink));
   for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
-    house.setColor(QPalette::Disabled, role, palette::kQuietInk);
-  house.setColor(QPalette::ToolTipBase, palette::kPage);
-  house.setColor(QPalette::Highlight, palette::kSelection);
-  house.setColor(QPalette::HighlightedText, palette::kInk);
-  house.setColor(QPalette::Link, palette::kLink);
+    house.setColor(QPalette::Disabled, role, ToQColor(Palette::QuietInk));
+  house.setColor(QPalette::ToolTipBase, ToQColor(Palette::Page));
+  house.setColor(QPalette::Highlight, ToQColor(Palette::Selection));
+  house.setColor(QPalette::HighlightedText, ToQColor(Palette::Ink));
+  house.setColor(QPalette::Link, ToQColor(Palette::Link));
   return house;
 }
 
