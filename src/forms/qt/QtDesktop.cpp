@@ -148,7 +148,7 @@ void QtDesktop::ShowView(Form& form, Modality modality, Form* owner) {
   dispatcher_.UnwindIfEnded();
 }
 
-// Behind what the handler does next: a program that shows another form at once goes on.
+// After what the handler does next: a program that shows another form at once goes on.
 void QtDesktop::LastFormGone() {
   Post([this] {
     if (windows_.empty()) dispatcher_.Quit(0);

@@ -4,6 +4,10 @@
 
 namespace quendra::forms {
 
+int CodeOfCharacter(char16_t character) {
+  return character >= u'a' && character <= u'z' ? character - u'a' + u'A' : character;
+}
+
 std::vector<Control*> TabOrder(const Form& form) {
   std::vector<Control*> controls = ControlsIn(form);
   std::stable_sort(controls.begin(), controls.end(), [](const Control* left, const Control* right) {
@@ -18,12 +22,26 @@ Control* FirstFocus(const Form& form) {
   return nullptr;
 }
 
+bool HearsOf(const Form& form, const KeyPress& key, bool aControlHasFocus) {
+  return key.code != 0 && (form.KeyPreview || !aControlHasFocus);
+}
+
+bool PressesLabel(const Label& label, const KeyPress& key) {
+  return label.IsButton() && !key.repeated && (key.code == kEnterKey || key.code == kSpaceKey);
+}
+
+bool PassesList(int shift, bool givesCharacter) { return (shift & (kCtrl | kAlt)) != 0 && givesCharacter; }
+
 Control* ControlPressedBy(const Form& form, int keyCode, int shift) {
   if (shift != kNoShift) return nullptr;
   Control* const control = keyCode == kEnterKey    ? form.Default
                            : keyCode == kEscapeKey ? form.Cancel
                                                    : nullptr;
   return control && control->IsUsable() ? control : nullptr;
+}
+
+Control* ControlPressedBy(const Form& form, const KeyPress& key) {
+  return key.repeated ? nullptr : ControlPressedBy(form, key.code, key.shift);
 }
 
 } // namespace quendra::forms

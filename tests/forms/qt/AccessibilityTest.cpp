@@ -117,7 +117,7 @@ TEST_F(Accessibility, A_label_behind_a_modal_form_takes_no_press) {
   TestForm dialog;
   Label ok(dialog, u"ok");
   std::string pressed;
-  button.Click = [&] { pressed += "behind "; };
+  button.Click = [&] { pressed += "covered "; };
   ok.Click = [&] { pressed += "ok "; };
   desktop.Show(form);
   desktop.Post([&] {

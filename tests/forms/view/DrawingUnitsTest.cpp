@@ -1,23 +1,18 @@
 #include "forms/view/DrawingUnits.h"
 
-#include "forms/Form.h"
+#include "forms/view/BareForm.h"
 
 #include <gtest/gtest.h>
 
 namespace quendra::forms {
 namespace {
 
-struct BoxForm : Form {
-  BoxForm() : Form(u"frmBox") {}
-  void Design() override {}
-};
-
 /// A box of 100 by 50 pixels of 10 by 20 twips.
 struct DrawingUnitsTest : testing::Test {
   DrawingUnitsTest() { box.Move(0, 0, 1000, 1000); }
 
   Scale screen{10, 20};
-  BoxForm form;
+  BareForm form;
   PictureBox box{form, u"picBuffer"};
   DrawingUnits units{box, screen};
 };

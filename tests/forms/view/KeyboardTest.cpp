@@ -120,6 +120,58 @@ TEST_F(FormKeys, The_first_focus_goes_to_lists_too) {
   EXPECT_EQ(FirstFocus(form), &combo);
 }
 
+TEST(KeyCodes, Are_those_of_characters_with_Latin_letters_as_upper_case) {
+  EXPECT_EQ(CodeOfCharacter(u'a'), 'A');
+  EXPECT_EQ(CodeOfCharacter(u'z'), 'Z');
+  EXPECT_EQ(CodeOfCharacter(u'A'), 'A');
+  EXPECT_EQ(CodeOfCharacter(u'5'), '5');
+  EXPECT_EQ(CodeOfCharacter(u'ן'), 0x05DF);
+}
+
+TEST(KeyCodes, Come_with_the_sum_of_the_keys_that_modify_them) {
+  EXPECT_EQ(ShiftSum(false, false, false), 0);
+  EXPECT_EQ(ShiftSum(true, false, false), 1);
+  EXPECT_EQ(ShiftSum(false, true, false), 2);
+  EXPECT_EQ(ShiftSum(false, false, true), 4);
+  EXPECT_EQ(ShiftSum(true, true, true), 7);
+}
+
+TEST_F(FormKeys, A_form_without_a_preview_hears_of_the_keys_that_come_to_no_control) {
+  EXPECT_FALSE(HearsOf(form, {'A'}, true));
+  EXPECT_TRUE(HearsOf(form, {'A'}, false));
+  form.KeyPreview = true;
+  EXPECT_TRUE(HearsOf(form, {'A'}, true));
+}
+
+TEST_F(FormKeys, A_key_without_a_code_is_heard_of_by_nobody) {
+  form.KeyPreview = true;
+
+  EXPECT_FALSE(HearsOf(form, {0}, false));
+}
+
+TEST_F(FormKeys, A_key_held_down_clicks_no_further_control) {
+  EXPECT_EQ(ControlPressedBy(form, {kEscapeKey, kNoShift, false}), &form.close);
+  EXPECT_EQ(ControlPressedBy(form, {kEscapeKey, kNoShift, true}), nullptr);
+}
+
+TEST_F(FormKeys, Enter_and_Space_press_a_label_that_is_a_button_once) {
+  for (const int key : {kEnterKey, kSpaceKey}) {
+    EXPECT_TRUE(PressesLabel(form.ok, {key}));
+    EXPECT_FALSE(PressesLabel(form.ok, {key, kNoShift, true}));
+  }
+  EXPECT_FALSE(PressesLabel(form.ok, {'A'}));
+  Label text(form, u"text");
+  EXPECT_FALSE(PressesLabel(text, {kEnterKey}));
+}
+
+TEST(ListKeys, With_Ctrl_or_Alt_and_a_character_belong_to_the_form) {
+  EXPECT_TRUE(PassesList(kCtrl, true));
+  EXPECT_TRUE(PassesList(kAlt | kShift, true));
+  EXPECT_FALSE(PassesList(kShift, true));
+  EXPECT_FALSE(PassesList(kNoShift, true));
+  EXPECT_FALSE(PassesList(kCtrl, false));
+}
+
 TEST(LabelAsButton, Has_a_handler_or_the_face_of_a_button) {
   DialogForm form;
   Label text(form, u"text");

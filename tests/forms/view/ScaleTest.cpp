@@ -1,4 +1,5 @@
 #include "forms/view/Scale.h"
+#include "forms/view/RoundRect.h"
 
 #include <gtest/gtest.h>
 
@@ -39,6 +40,13 @@ TEST(Scale, Makes_letters_smaller_but_never_smaller_than_a_point) {
   EXPECT_DOUBLE_EQ(Scale().Points(12), 12);
   EXPECT_DOUBLE_EQ(Scale().Zoomed(0.8).Points(12), 9.6);
   EXPECT_DOUBLE_EQ(Scale().Points(0), 1);
+}
+
+TEST(RoundRect, Is_as_much_smaller_as_its_form) {
+  const RoundRect shape{0, 10, 400, 300, 21, 20};
+
+  EXPECT_EQ(shape.In(Scale().Zoomed(0.8)), (RoundRect{0, 8, 320, 240, 17, 16}));
+  EXPECT_EQ(shape.In(Scale()), shape);
 }
 
 } // namespace

@@ -2,6 +2,7 @@
 
 #include "forms/qt/drawing/Conversion.h"
 #include "forms/qt/drawing/Fonts.h"
+#include "forms/view/ListLook.h"
 #include "forms/view/Palette.h"
 
 #include <QApplication>
@@ -16,15 +17,15 @@ namespace {
 QPalette HousePalette() {
   QPalette house;
   house.setColor(QPalette::Window, ToQColor(Palette::QuietPage));
-  house.setColor(QPalette::Base, ToQColor(Palette::Page));
-  house.setColor(QPalette::AlternateBase, ToQColor(Palette::QuietPage));
+  house.setColor(QPalette::Base, ToQColor(RowGround(0, false)));
+  house.setColor(QPalette::AlternateBase, ToQColor(RowGround(1, false)));
   house.setColor(QPalette::Button, ToQColor(Palette::Button));
   for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText, QPalette::ToolTipText})
     house.setColor(role, ToQColor(Palette::Ink));
   for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
     house.setColor(QPalette::Disabled, role, ToQColor(Palette::QuietInk));
   house.setColor(QPalette::ToolTipBase, ToQColor(Palette::Page));
-  house.setColor(QPalette::Highlight, ToQColor(Palette::Selection));
+  house.setColor(QPalette::Highlight, ToQColor(RowGround(0, true)));
   house.setColor(QPalette::HighlightedText, ToQColor(Palette::Ink));
   house.setColor(QPalette::Link, ToQColor(Palette::Link));
   return house;

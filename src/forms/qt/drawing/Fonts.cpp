@@ -18,7 +18,7 @@ void AddFamily(const QString& name) {
 }
 
 /// Whether a font of the system is for the script. The toolkit lists its names for the usual kinds of font as
-/// if they were families, also where nothing stands behind them.
+/// if they were families, also where there is no such font.
 bool HasFontFor(QFontDatabase::WritingSystem script) {
   const QStringList families = QFontDatabase::families(script);
   return std::any_of(families.begin(), families.end(), [](const QString& family) {

@@ -1,15 +1,8 @@
 #include "forms/qt/drawing/Shapes.h"
 
 #include <algorithm>
-#include <cmath>
 
 namespace quendra::forms::qt {
-
-RoundRect RoundRect::Zoomed(double factor) const {
-  const auto zoomed = [=](int pixels) { return static_cast<int>(std::lround(pixels * factor)); };
-  return {zoomed(left),   zoomed(top),          zoomed(right),
-          zoomed(bottom), zoomed(ellipseWidth), zoomed(ellipseHeight)};
-}
 
 QRegion RegionOf(const RoundRect& shape) {
   const auto& [left, top, right, bottom, ellipseWidth, ellipseHeight] = shape;

@@ -1,6 +1,8 @@
 #pragma once
 
 #include "forms/qt/loop/Dispatcher.h"
+#include "forms/view/HeldKey.h"
+#include "forms/view/Keyboard.h"
 
 #include <QObject>
 
@@ -13,6 +15,7 @@ class FormView;
 /// The code of the character that the key gives without modifiers in the active layout, upper case for Latin
 /// letters; the platform's codes for Enter, Escape and the like; 0 for a key that has neither.
 int KeyCodeOf(const QKeyEvent& event);
+KeyPress PressOf(const QKeyEvent& event);
 
 /// Gives keys to forms before the control that has the focus, and those that no control took to the form's
 /// Default and Cancel controls.
@@ -24,13 +27,11 @@ class KeyEvents : public QObject {
   bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
-  bool IsUnmarkedRepeat(const QKeyEvent& press) const;
-  void Preview(FormView& view, const QWidget& widget, const QKeyEvent& key);
-  bool Press(FormView& view, const QKeyEvent& key);
+  void Preview(FormView& view, const QWidget& widget, const QKeyEvent& event);
+  bool Press(FormView& view, const QKeyEvent& event);
 
   Dispatcher& dispatcher_;
-  int releasedKey_ = 0;
-  quint64 releasedAt_ = 0;
+  HeldKey held_;
 };
 
 } // namespace quendra::forms::qt

@@ -1,28 +1,37 @@
 #include "forms/qt/input/MouseEvents.h"
 
+#include "forms/view/Keyboard.h"
+
 #include <QApplication>
 #include <QCursor>
 #include <QMouseEvent>
 #include <QWindow>
 
+#include <optional>
+
 namespace quendra::forms::qt {
 
 namespace {
 
-int ButtonOf(Qt::MouseButtons buttons) {
-  return (buttons & Qt::LeftButton ? kLeftButton : 0) | (buttons & Qt::RightButton ? kRightButton : 0);
+int ButtonsOf(Qt::MouseButtons buttons) {
+  return ButtonSum(buttons & Qt::LeftButton, buttons & Qt::RightButton);
 }
 
-bool IsMouseEvent(QEvent::Type type) {
-  return type == QEvent::MouseMove || type == QEvent::MouseButtonPress ||
-         type == QEvent::MouseButtonRelease || type == QEvent::MouseButtonDblClick;
+std::optional<WindowDrag::MouseEvent> KindOf(QEvent::Type type) {
+  switch (type) {
+  case QEvent::MouseMove: return WindowDrag::MouseEvent::Move;
+  case QEvent::MouseButtonPress:
+  case QEvent::MouseButtonDblClick: return WindowDrag::MouseEvent::Press;
+  case QEvent::MouseButtonRelease: return WindowDrag::MouseEvent::Release;
+  default: return std::nullopt;
+  }
 }
 
 } // namespace
 
 int ShiftStateOf(Qt::KeyboardModifiers modifiers) {
-  return (modifiers & Qt::ShiftModifier ? kShift : 0) | (modifiers & Qt::ControlModifier ? kCtrl : 0) |
-         (modifiers & Qt::AltModifier ? kAlt : 0);
+  return ShiftSum(modifiers & Qt::ShiftModifier, modifiers & Qt::ControlModifier,
+                  modifiers & Qt::AltModifier);
 }
 
 void MouseEvents::Watch(QWidget& widget, WidgetView& view) {
@@ -33,36 +42,33 @@ void MouseEvents::Watch(QWidget& widget, WidgetView& view) {
 
 void MouseEvents::Forget(const WidgetView& view) {
   views_.removeIf([&](const auto& entry) { return entry.value() == &view; });
-  if (pressed_ == &view) pressed_ = nullptr;
+  if (view.TheControl()) rules_.Forget(*view.TheControl());
 }
 
 void MouseEvents::SetCursor(Qt::CursorShape shape) {
-  cursorWasSet_ = true;
+  cursor_.Set();
   QWidget* widget = moving_ ? moving_.data() : QApplication::widgetAt(QCursor::pos());
   if (widget) widget->setCursor(shape);
 }
 
 void MouseEvents::DragWindow(QWidget& window) {
   dragged_ = &window;
-  grip_ = QCursor::pos() - window.pos();
+  const Spot mouse = ToSpot(QCursor::pos());
+  const Spot corner = ToSpot(window.pos());
   const bool managed = window.windowHandle() && window.windowHandle()->startSystemMove();
-  drag_ = managed ? Drag::ByWindowManager : Drag::ByDesktop;
+  drag_.Start(managed ? WindowDrag::By::WindowManager : WindowDrag::By::Desktop, mouse, corner);
 }
 
 bool MouseEvents::Dragged(const QMouseEvent& event) {
-  if (drag_ == Drag::None) return false;
-  // A window manager keeps the mouse to itself, but moves from before it took over are still in the queue.
-  // Were the move asked for again by one of them, the manager would go on moving behind the release.
-  if (event.type() == QEvent::MouseMove && event.buttons() & Qt::LeftButton) {
-    if (drag_ == Drag::ByDesktop && dragged_) dragged_->move(event.globalPosition().toPoint() - grip_);
-    return true;
-  }
-  drag_ = Drag::None;
-  return event.type() == QEvent::MouseButtonRelease;
+  const bool held = event.buttons() & Qt::LeftButton;
+  if (!drag_.Takes(*KindOf(event.type()), held)) return false;
+  if (held && drag_.MovesWindow() && dragged_)
+    dragged_->move(ToQPoint(drag_.WindowAt(ToSpot(event.globalPosition().toPoint()))));
+  return true;
 }
 
 bool MouseEvents::eventFilter(QObject* watched, QEvent* event) {
-  if (!IsMouseEvent(event->type())) return false;
+  if (!KindOf(event->type())) return false;
   WidgetView* view = views_.value(watched);
   if (!view) return false;
   const bool takes = view->TakesMouse();
@@ -91,34 +97,48 @@ void MouseEvents::Raise(WidgetView& view, const Event<int, int, int, int>& raise
 }
 
 void MouseEvents::Pressed(WidgetView& view, const QMouseEvent& event) {
-  if (event.button() == Qt::LeftButton) pressed_ = &view;
-  // Who takes the mouse in hand needs no focus ring any more.
-  QWidget* window = view.Widget().window();
-  window->setAttribute(Qt::WA_KeyboardFocusChange, false);
-  if (QWidget* focused = window->focusWidget()) focused->update();
-  view.Widget().update();
-  Raise(view, view.TheControl()->MouseDown, ButtonOf(event.button()), event);
+  Act(view, event, rules_.Pressed(*view.TheControl(), ButtonsOf(event.button())));
 }
 
 void MouseEvents::DoubleClicked(WidgetView& view, const QMouseEvent& event) {
-  // Without a handler the second of two quick clicks is a click like the first.
-  if (!view.TheControl()->DoubleClick || event.button() != Qt::LeftButton) return Pressed(view, event);
-  dispatcher_.Dispatch([&] { view.TheControl()->DoubleClick(); });
+  Act(view, event, rules_.PressedAgain(*view.TheControl(), ButtonsOf(event.button())));
 }
 
 void MouseEvents::Released(WidgetView& view, const QMouseEvent& event) {
   view.Widget().update();
-  if (event.button() != Qt::LeftButton || std::exchange(pressed_, nullptr) != &view) return;
-  if (view.Widget().rect().contains(event.position().toPoint())) view.Press();
+  const bool inside = view.Widget().rect().contains(event.position().toPoint());
+  Act(view, event, rules_.Released(*view.TheControl(), ButtonsOf(event.button()), inside));
+}
+
+void MouseEvents::Act(WidgetView& view, const QMouseEvent& event, MouseRules::Meaning meaning) {
+  switch (meaning) {
+  case MouseRules::Meaning::Nothing: break;
+  case MouseRules::Meaning::Click: view.Press(); break;
+  case MouseRules::Meaning::DoubleClick:
+    dispatcher_.Dispatch([&] { view.TheControl()->DoubleClick(); });
+    break;
+  case MouseRules::Meaning::Press:
+    HideRing(view);
+    Raise(view, view.TheControl()->MouseDown, ButtonsOf(event.button()), event);
+    break;
+  }
+}
+
+// Who takes the mouse in hand needs no focus ring any more.
+void MouseEvents::HideRing(const WidgetView& view) {
+  QWidget* window = view.Widget().window();
+  window->setAttribute(Qt::WA_KeyboardFocusChange, false);
+  if (QWidget* focused = window->focusWidget()) focused->update();
+  view.Widget().update();
 }
 
 void MouseEvents::Moved(WidgetView& view, const QMouseEvent& event) {
   QPointer<QWidget> widget = &view.Widget();
-  cursorWasSet_ = false;
+  cursor_.MoveBegins();
   moving_ = widget;
-  Raise(view, view.TheControl()->MouseMove, ButtonOf(event.buttons()), event);
+  Raise(view, view.TheControl()->MouseMove, ButtonsOf(event.buttons()), event);
   moving_ = nullptr;
-  if (!cursorWasSet_ && widget && widget->testAttribute(Qt::WA_SetCursor)) widget->unsetCursor();
+  if (cursor_.MoveEndsIt() && widget && widget->testAttribute(Qt::WA_SetCursor)) widget->unsetCursor();
 }
 
 } // namespace quendra::forms::qt

@@ -1,6 +1,8 @@
 #pragma once
 
 #include "forms/qt/views/WidgetView.h"
+#include "forms/view/MouseRules.h"
+#include "forms/view/WindowDrag.h"
 
 #include <QHash>
 #include <QObject>
@@ -27,7 +29,7 @@ class MouseEvents : public QObject {
   /// stays until the mouse moves over a control whose handler sets none.
   void SetCursor(Qt::CursorShape shape);
   /// The pressed control gets no click any more.
-  void ReleaseCapture() { pressed_ = nullptr; }
+  void ReleaseCapture() { rules_.ReleaseCapture(); }
   /// Moves the window with the mouse until its button is let go: by the window manager, or by the desktop
   /// itself where none is or it doesn't. Controls hear nothing of the mouse meanwhile.
   void DragWindow(QWidget& window);
@@ -42,18 +44,18 @@ class MouseEvents : public QObject {
   void Pressed(WidgetView& view, const QMouseEvent& event);
   void DoubleClicked(WidgetView& view, const QMouseEvent& event);
   void Released(WidgetView& view, const QMouseEvent& event);
+  void Act(WidgetView& view, const QMouseEvent& event, MouseRules::Meaning meaning);
+  static void HideRing(const WidgetView& view);
   void Moved(WidgetView& view, const QMouseEvent& event);
   void Raise(WidgetView& view, const Event<int, int, int, int>& raised, int button, const QMouseEvent& event);
 
   Dispatcher& dispatcher_;
   QHash<QObject*, WidgetView*> views_;
-  WidgetView* pressed_ = nullptr;
+  MouseRules rules_;
+  CursorRules cursor_;
   QPointer<QWidget> moving_;
-  bool cursorWasSet_ = false;
-  enum class Drag { None, ByWindowManager, ByDesktop };
-  Drag drag_ = Drag::None;
+  WindowDrag drag_;
   QPointer<QWidget> dragged_;
-  QPoint grip_;
 };
 
 } // namespace quendra::forms::qt

@@ -7,13 +7,27 @@ namespace quendra::forms::qt {
 
 namespace {
 
+QAccessible::Role ToQt(forms::Role role) {
+  switch (role) {
+  case forms::Role::Toolkits: break;
+  case forms::Role::Text: return QAccessible::StaticText;
+  case forms::Role::Button: return QAccessible::Button;
+  case forms::Role::Grouping: return QAccessible::Grouping;
+  case forms::Role::Graphic: return QAccessible::Graphic;
+  case forms::Role::Separator: return QAccessible::Separator;
+  case forms::Role::Window: return QAccessible::Window;
+  }
+  return QAccessible::NoRole;
+}
+
 /// What assistive technology sees of a widget that the program draws itself.
 class ControlInterface : public QAccessibleWidget {
  public:
-  ControlInterface(QWidget* widget, WidgetView& view) : QAccessibleWidget(widget, view.Role()), view_(view) {}
+  ControlInterface(QWidget* widget, WidgetView& view)
+      : QAccessibleWidget(widget, ToQt(view.Role())), view_(view) {}
 
   // Asked each time: a label becomes a button with its handler.
-  QAccessible::Role role() const override { return view_.Role(); }
+  QAccessible::Role role() const override { return ToQt(view_.Role()); }
 
   QStringList actionNames() const override {
     QStringList names = QAccessibleWidget::actionNames();
@@ -27,8 +41,8 @@ class ControlInterface : public QAccessibleWidget {
   }
 
  private:
-  bool IsPressable() const { return role() == QAccessible::Button && widget()->isEnabled() && !IsBlocked(); }
-  // Mouse and keys don't reach a window behind a box or a modal form; a request like this one would.
+  bool IsPressable() const { return view_.TheControl() && OffersPress(*view_.TheControl()) && !IsBlocked(); }
+  // Mouse and keys don't reach a window that a box or a modal form covers; a request like this one would.
   bool IsBlocked() const {
     const QWidget* modal = QApplication::activeModalWidget();
     return modal && modal != widget()->window();
@@ -39,7 +53,7 @@ class ControlInterface : public QAccessibleWidget {
 
 QAccessibleInterface* MakeInterface(const QString& /*className*/, QObject* object) {
   auto* view = dynamic_cast<WidgetView*>(object);
-  if (!view || view->Role() == QAccessible::NoRole) return nullptr;
+  if (!view || view->Role() == forms::Role::Toolkits) return nullptr;
   return new ControlInterface(&view->Widget(), *view);
 }
 

@@ -21,12 +21,6 @@ void ComboBoxView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Items) || aspect == Aspect::Selection) setCurrentIndex(Combo().ListIndex());
 }
 
-// It has no caption of its own; that of the frame around it tells what is chosen here.
-QString ComboBoxView::AccessibleName() const {
-  const auto* frame = dynamic_cast<const Frame*>(Combo().Parent());
-  return frame ? ShownText(frame->Caption()).trimmed() : QString();
-}
-
 void ComboBoxView::FillItems() {
   // Items only grow until they are cleared, so the ones that stand here already are right.
   if (count() > Combo().ListCount() || Combo().ListCount() == 0) clear();

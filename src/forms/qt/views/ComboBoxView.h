@@ -14,7 +14,6 @@ class ComboBoxView : public QComboBox, public WidgetView {
 
  protected:
   void Apply(Aspect aspect) override;
-  QString AccessibleName() const override;
   void wheelEvent(QWheelEvent* event) override;
 
  private:

@@ -135,7 +135,7 @@ void FormView::Shape(std::optional<RoundRect> shape) {
 
 void FormView::CutOut() {
   if (shape_)
-    setMask(RegionOf(shape_->Zoomed(scale_.zoom)));
+    setMask(RegionOf(shape_->In(scale_)));
   else
     clearMask();
 }
@@ -177,8 +177,6 @@ void FormView::Show() {
   hide();
   if (modalLoop_) modalLoop_->quit();
 }
-
-QString FormView::AccessibleName() const { return ShownText(TheForm()->Caption()); }
 
 void FormView::ShowOver(const QWidget* owner) {
   if (!std::exchange(wasPlaced_, true)) {

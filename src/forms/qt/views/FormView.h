@@ -34,7 +34,6 @@ class FormView : private FormContext, public QScrollArea, public WidgetView {
 
   void Release() override;
   void ControlGone() override;
-  QAccessible::Role Role() const override { return QAccessible::Window; }
   QWidget& Body() const override { return *page_; }
 
   Form* TheForm() const { return static_cast<Form*>(TheControl()); }
@@ -51,7 +50,6 @@ class FormView : private FormContext, public QScrollArea, public WidgetView {
   void Apply(Aspect aspect) override;
   void Place() override;
   void Show() override;
-  QString AccessibleName() const override;
   void paintEvent(QPaintEvent* event) override;
   void changeEvent(QEvent* event) override;
   void moveEvent(QMoveEvent* event) override;

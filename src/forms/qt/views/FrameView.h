@@ -7,14 +7,13 @@ namespace quendra::forms::qt {
 class FrameView : public QWidget, public WidgetView {
  public:
   FrameView(ViewContext& context, Frame& frame, QWidget* parent);
-  QAccessible::Role Role() const override { return QAccessible::Grouping; }
 
  protected:
   void Apply(Aspect aspect) override;
-  QString AccessibleName() const override;
   void paintEvent(QPaintEvent* event) override;
 
  private:
+  void PaintTitle(QPainter& painter, const Text& title) const;
   const Frame& TheFrame() const { return static_cast<const Frame&>(*TheControl()); }
 };
 

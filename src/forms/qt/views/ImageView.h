@@ -7,7 +7,6 @@ namespace quendra::forms::qt {
 class ImageView : public QWidget, public WidgetView {
  public:
   ImageView(ViewContext& context, Image& image, QWidget* parent);
-  QAccessible::Role Role() const override { return QAccessible::Graphic; }
 
  protected:
   void paintEvent(QPaintEvent* event) override;

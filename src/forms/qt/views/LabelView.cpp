@@ -1,23 +1,13 @@
 #include "forms/qt/views/LabelView.h"
 
-#include "forms/view/Palette.h"
+#include "forms/qt/input/KeyEvents.h"
+#include "forms/view/LabelLook.h"
 
 #include <QApplication>
 #include <QKeyEvent>
 #include <QPainter>
-#include <QStyle>
-
-#include <algorithm>
 
 namespace quendra::forms::qt {
-
-namespace {
-
-/// Pixels that a link's widget reaches beyond its label on each side: a ring within would cover letters,
-/// since a link is as wide as its text.
-constexpr int kRingRoom = 4;
-
-} // namespace
 
 LabelView::LabelView(ViewContext& context, Label& label, QWidget* parent)
     : QWidget(parent), WidgetView(context, label, *this) {
@@ -31,12 +21,7 @@ void LabelView::Apply(Aspect aspect) {
 
 void LabelView::Place() {
   WidgetView::Place();
-  setGeometry(geometry().adjusted(-RingRoom(), -RingRoom(), RingRoom(), RingRoom()));
-}
-
-QString LabelView::AccessibleName() const {
-  const Text& caption = TheLabel()->Caption();
-  return ShownText(caption.empty() ? TheLabel()->Description : caption, LineBreaks::Keep);
+  setGeometry(ToQRect(ToArea(geometry()).GrownBy(RingRoom(*TheLabel()))));
 }
 
 bool LabelView::event(QEvent* event) {
@@ -44,15 +29,13 @@ bool LabelView::event(QEvent* event) {
   // showing on.
   if (event->type() == QEvent::Show && TheControl()) {
     Apply(Aspect::All);
-    setAccessibleName(AccessibleName());
+    TellName();
   }
   return QWidget::event(event);
 }
 
 void LabelView::keyPressEvent(QKeyEvent* event) {
-  const bool presses =
-      event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter || event->key() == Qt::Key_Space;
-  if (!presses || !IsButton() || event->isAutoRepeat()) return event->ignore();
+  if (!TheControl() || !PressesLabel(*TheLabel(), PressOf(*event))) return event->ignore();
   Press();
 }
 
@@ -60,85 +43,63 @@ void LabelView::paintEvent(QPaintEvent* /*event*/) {
   if (!TheControl()) return;
   QPainter painter(this);
   painter.setRenderHint(QPainter::Antialiasing);
-  PaintFace(painter);
-  PaintText(painter);
-  // A window gives the focus to its first control when it comes up; the ring is for those who use the keys.
-  if (hasFocus() && window()->testAttribute(Qt::WA_KeyboardFocusChange)) PaintFocus(painter);
+  const LabelState state = State();
+  PaintFace(painter, state);
+  PaintText(painter, state);
+  PaintRings(painter, state);
 }
 
-bool LabelView::IsHeldDown() const { return underMouse() && QApplication::mouseButtons() & Qt::LeftButton; }
-
-void LabelView::PaintFace(QPainter& painter) const {
-  const bool isFace = TheLabel()->Style() == Label::Look::Button;
-  if (!isFace) {
-    if (!TheLabel()->Transparent()) painter.fillRect(LabelRect(), ToQColor(TheLabel()->BackColour()));
-    return;
-  }
-  painter.setPen(QPen(isEnabled() ? ToQColor(Palette::StrongBorder) : ToQColor(Palette::Border), 1));
-  painter.setBrush(FaceColour());
-  painter.drawRoundedRect(QRectF(rect()).adjusted(0.5, 0.5, -0.5, -0.5), 6, 6);
+LabelState LabelView::State() const {
+  LabelState state;
+  state.enabled = isEnabled();
+  state.underMouse = underMouse();
+  state.heldDown = underMouse() && QApplication::mouseButtons() & Qt::LeftButton;
+  state.hasFocus = hasFocus();
+  state.usesKeys = window()->testAttribute(Qt::WA_KeyboardFocusChange);
+  return state;
 }
 
-QColor LabelView::FaceColour() const {
-  if (!isEnabled()) return ToQColor(Palette::QuietPage);
-  const QColor face =
-      TheLabel()->Transparent() ? ToQColor(Palette::Page) : ToQColor(TheLabel()->BackColour());
-  return underMouse() ? face.darker(IsHeldDown() ? 115 : 105) : face;
+Area LabelView::LabelPlace() const { return ToArea(rect()).GrownBy(-RingRoom(*TheLabel())); }
+
+void LabelView::PaintFace(QPainter& painter, const LabelState& state) const {
+  const LabelFace face = FaceOf(*TheLabel(), state);
+  if (!face.fill) return;
+  if (!face.border) return painter.fillRect(ToQRect(LabelPlace()), ToQColor(*face.fill));
+  painter.setPen(QPen(ToQColor(*face.border), 1));
+  painter.setBrush(ToQColor(*face.fill));
+  painter.drawRoundedRect(QRectF(rect()).adjusted(0.5, 0.5, -0.5, -0.5), face.corner, face.corner);
 }
 
-QColor LabelView::InkColour() const {
-  if (!isEnabled()) return ToQColor(Palette::QuietInk);
-  const Colour colour = TheLabel()->ForeColour();
-  if (colour != kBlack) return ToQColor(colour);
-  return TheLabel()->Style() == Label::Look::Link ? ToQColor(Palette::Link) : ToQColor(Palette::Ink);
-}
-
-int LabelView::RingRoom() const { return TheLabel()->Style() == Label::Look::Link ? kRingRoom : 0; }
-
-QRect LabelView::LabelRect() const {
-  return rect().adjusted(RingRoom(), RingRoom(), -RingRoom(), -RingRoom());
-}
-
-void LabelView::PaintText(QPainter& painter) const {
-  const QString text = ShownText(TheLabel()->Caption(), LineBreaks::Keep);
-  if (text.isEmpty()) return;
-  const Label::Look look = TheLabel()->Style();
+void LabelView::PaintText(QPainter& painter, const LabelState& state) const {
+  const LabelText set = TextOf(*TheLabel());
+  if (set.text.empty()) return;
+  const QString text = ToQString(set.text);
   QFont drawn = font();
-  if (look == Label::Look::Link) drawn.setUnderline(true);
+  drawn.setUnderline(set.underlined);
   painter.setFont(drawn);
-  painter.setPen(InkColour());
-  painter.setLayoutDirection(ToQt(DirectionOf(TheLabel()->Caption())));
-  const QRect place = LabelRect();
-  const bool wraps = TheLabel()->WordWrap() || text.contains(u'\n');
-  const Alignment align = look == Label::Look::Button ? Alignment::Centre : TheLabel()->Align();
-  const bool top = wraps && look != Label::Look::Button;
-  const auto flags = ToQt(SideOf(align, ReadingDirection())) | (top ? Qt::AlignTop : Qt::AlignVCenter);
-  if (wraps) return painter.drawText(place, static_cast<int>(flags) | Qt::TextWordWrap, text);
+  painter.setPen(ToQColor(InkOf(*TheLabel(), state)));
+  painter.setLayoutDirection(ToQt(set.direction));
+  const QRect place = ToQRect(LabelPlace());
+  const auto flags =
+      ToQt(SideOf(set.align, ReadingDirection())) | (set.fromTop ? Qt::AlignTop : Qt::AlignVCenter);
+  if (set.wraps) return painter.drawText(place, static_cast<int>(flags) | Qt::TextWordWrap, text);
   painter.drawText(place, static_cast<int>(flags) | Qt::TextSingleLine,
                    painter.fontMetrics().elidedText(text, Qt::ElideRight, place.width()));
 }
 
-/// Round its letters, which may take up a small part of the label.
-QRectF LabelView::RingOfLink() const {
+void LabelView::PaintRings(QPainter& painter, const LabelState& state) const {
+  const std::vector<Ring> rings = RingsOf(*TheLabel(), state);
+  if (rings.empty()) return;
   const QFontMetrics metrics(font());
-  const int width = metrics.horizontalAdvance(ShownText(TheLabel()->Caption(), LineBreaks::Keep));
-  const QRect label = LabelRect();
-  const QSize letters(std::min(width, label.width()), std::min(metrics.height(), label.height()));
-  const auto flags = ToQt(SideOf(TheLabel()->Align(), ReadingDirection())) | Qt::AlignVCenter;
-  return QRectF(QStyle::alignedRect(Qt::LeftToRight, flags, letters, label)).adjusted(-2, -2, 2, 2);
-}
-
-void LabelView::PaintFocus(QPainter& painter) const {
-  painter.setPen(QPen(ToQColor(Palette::Focus), 2));
+  const Extent letters{metrics.horizontalAdvance(ShownText(TheLabel()->Caption(), LineBreaks::Keep)),
+                       metrics.height()};
+  const QRectF ringed = ToQRect(RingedArea(*TheLabel(), LabelPlace(), letters, ReadingDirection()));
   painter.setBrush(Qt::NoBrush);
-  if (TheLabel()->Style() == Label::Look::Link) {
-    painter.drawRoundedRect(RingOfLink(), 4, 4);
-    return;
+  for (const Ring& ring : rings) {
+    painter.setPen(QPen(ToQColor(ring.colour), ring.width));
+    painter.drawRoundedRect(ringed.adjusted(ring.inset, ring.inset, -ring.inset, -ring.inset), ring.corner,
+                            ring.corner);
   }
-  painter.drawRoundedRect(QRectF(rect()).adjusted(1, 1, -1, -1), 5, 5);
-  // The light line within sets the ring off from dark faces and pictures.
-  painter.setPen(QPen(ToQColor(Palette::Page), 1));
-  painter.drawRoundedRect(QRectF(rect()).adjusted(2.5, 2.5, -2.5, -2.5), 4, 4);
 }
 
 } // namespace quendra::forms::qt

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "forms/qt/views/WidgetView.h"
+#include "forms/view/LabelLook.h"
 
 namespace quendra::forms::qt {
 
@@ -9,13 +10,9 @@ class LabelView : public QWidget, public WidgetView {
   LabelView(ViewContext& context, Label& label, QWidget* parent);
 
   bool IsButton() const { return TheControl() && TheLabel()->IsButton(); }
-  QAccessible::Role Role() const override {
-    return IsButton() ? QAccessible::Button : QAccessible::StaticText;
-  }
 
  protected:
   void Apply(Aspect aspect) override;
-  QString AccessibleName() const override;
   void Place() override;
 
   bool event(QEvent* event) override;
@@ -24,16 +21,12 @@ class LabelView : public QWidget, public WidgetView {
 
  private:
   const Label* TheLabel() const { return static_cast<const Label*>(TheControl()); }
-  void PaintFace(QPainter& painter) const;
-  void PaintText(QPainter& painter) const;
-  void PaintFocus(QPainter& painter) const;
+  LabelState State() const;
   /// Where the control lies. A link's widget reaches beyond it, with room for its ring.
-  QRect LabelRect() const;
-  int RingRoom() const;
-  QRectF RingOfLink() const;
-  QColor FaceColour() const;
-  QColor InkColour() const;
-  bool IsHeldDown() const;
+  Area LabelPlace() const;
+  void PaintFace(QPainter& painter, const LabelState& state) const;
+  void PaintText(QPainter& painter, const LabelState& state) const;
+  void PaintRings(QPainter& painter, const LabelState& state) const;
 };
 
 } // namespace quendra::forms::qt

@@ -7,7 +7,6 @@ namespace quendra::forms::qt {
 class LineView : public QWidget, public WidgetView {
  public:
   LineView(ViewContext& context, Line& line, QWidget* parent);
-  QAccessible::Role Role() const override { return QAccessible::Separator; }
 
  protected:
   void Place() override;

@@ -1,8 +1,7 @@
 #pragma once
 
 #include "forms/qt/views/ListModel.h"
-#include "forms/view/Direction.h"
-#include "forms/view/Scale.h"
+#include "forms/view/ListLook.h"
 
 #include <QStyledItemDelegate>
 
@@ -18,10 +17,9 @@ class ListDelegate : public QStyledItemDelegate {
   void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override;
   QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
 
-  static int RowHeight(const QFontMetrics& metrics, const Scale& scale);
-
  private:
-  QRect DrawIcon(QPainter& painter, const QRect& room, const ListRow& row) const;
+  ListLook Look() const { return {scale_, direction_}; }
+  void DrawIcon(QPainter& painter, const Area& place, const ListRow& row) const;
 
   const ListModel& model_;
   const Scale& scale_;

@@ -1,8 +1,7 @@
 #pragma once
 
 #include "forms/qt/views/ListModel.h"
-#include "forms/view/Direction.h"
-#include "forms/view/Scale.h"
+#include "forms/view/ListLook.h"
 
 #include <QHeaderView>
 
@@ -18,7 +17,10 @@ class ListHeader : public QHeaderView {
   void paintSection(QPainter* painter, const QRect& rect, int section) const override;
 
  private:
-  void DrawArrow(QPainter& painter, const QRect& rect) const;
+  ListLook Look() const { return {scale_, direction_}; }
+  void DrawIcon(QPainter& painter, const Area& header, const QPixmap& icon) const;
+  void DrawCaption(QPainter& painter, const Area& header, const ColumnHeader& column) const;
+  void DrawArrow(QPainter& painter, const Area& header) const;
 
   const ListModel& model_;
   const Scale& scale_;

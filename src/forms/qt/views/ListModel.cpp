@@ -1,6 +1,7 @@
 #include "forms/qt/views/ListModel.h"
 
 #include "forms/qt/drawing/Conversion.h"
+#include "forms/view/Accessible.h"
 
 #include <QGuiApplication>
 
@@ -47,7 +48,7 @@ QVariant ListModel::headerData(int section, Qt::Orientation orientation, int rol
   switch (role) {
   case Qt::DisplayRole: return ShownText(column.caption);
   case Qt::ToolTipRole: return column.caption.empty() ? QVariant(ToQString(column.description)) : QVariant();
-  case Qt::AccessibleTextRole: return ShownText(column.caption.empty() ? column.description : column.caption);
+  case Qt::AccessibleTextRole: return ToQString(AccessibleNameOf(column));
   default: return {};
   }
 }

@@ -3,9 +3,10 @@
 #include "forms/qt/input/MouseEvents.h"
 #include "forms/qt/views/ListDelegate.h"
 #include "forms/qt/views/ListHeader.h"
+#include "forms/view/Keyboard.h"
 #include "forms/view/ListLayout.h"
-#include "forms/view/Palette.h"
 
+#include <QAccessible>
 #include <QKeyEvent>
 #include <QPainter>
 #include <QScrollBar>
@@ -117,7 +118,9 @@ void ListViewView::FitColumns() {
   if (TheControl() && !sizedByHand_) SizeColumns();
 }
 
-int ListViewView::RowHeight() const { return ListDelegate::RowHeight(fontMetrics(), Context().scale); }
+int ListViewView::RowHeight() const {
+  return ListLook(Context().scale, ReadingDirection()).RowHeight(fontMetrics().height());
+}
 
 void ListViewView::FitRows() {
   if (!TheControl()) return;
@@ -166,16 +169,16 @@ void ListViewView::HeaderClicked(int section) {
 
 void ListViewView::paintEvent(QPaintEvent* event) {
   QTreeView::paintEvent(event);
-  if (!hasFocus() || !window()->testAttribute(Qt::WA_KeyboardFocusChange)) return;
+  const auto ring = RingOfList(hasFocus(), window()->testAttribute(Qt::WA_KeyboardFocusChange));
+  if (!ring) return;
   QPainter painter(viewport());
-  painter.setPen(QPen(ToQColor(Palette::Focus), 2));
-  painter.drawRect(viewport()->rect().adjusted(1, 1, -1, -1));
+  painter.setPen(QPen(ToQColor(ring->colour), ring->width));
+  const int inset = static_cast<int>(ring->inset);
+  painter.drawRect(viewport()->rect().adjusted(inset, inset, -inset, -inset));
 }
 
 void ListViewView::keyPressEvent(QKeyEvent* event) {
-  // Ctrl and a letter belong to the form; the toolkit would take it for the start of a search in the rows.
-  if (event->modifiers() & (Qt::ControlModifier | Qt::AltModifier) && !event->text().isEmpty())
-    return event->ignore();
+  if (PassesList(ShiftStateOf(event->modifiers()), !event->text().isEmpty())) return event->ignore();
   QTreeView::keyPressEvent(event);
 }
 

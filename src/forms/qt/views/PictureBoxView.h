@@ -11,7 +11,6 @@ namespace quendra::forms::qt {
 class PictureBoxView : public QWidget, public WidgetView {
  public:
   PictureBoxView(ViewContext& context, PictureBox& box, QWidget* parent);
-  QAccessible::Role Role() const override { return QAccessible::Graphic; }
 
   /// The box's size as it was laid out, in logical pixels. Drawings are made in this size, whatever size the
   /// form is shown in: what is measured, drawn and copied doesn't depend on the screen.

@@ -28,7 +28,7 @@ void WidgetView::Changed(Aspect aspect) {
   if (Concerns(aspect, Aspect::Enabled)) Enable();
   if (aspect == Aspect::Order) widget_.raise();
   Apply(aspect);
-  if (Concerns(aspect, Aspect::Caption)) widget_.setAccessibleName(AccessibleName());
+  if (Concerns(aspect, Aspect::Caption)) TellName();
   if (Concerns(aspect, Aspect::Visible)) Show();
   if (aspect != Aspect::Tag && aspect != Aspect::Visible) widget_.update();
 }
@@ -38,6 +38,13 @@ void WidgetView::Changed(Aspect aspect) {
 void WidgetView::Identify() {
   widget_.setObjectName(ToQString(control_->Name()));
   widget_.setAccessibleDescription(ToQString(control_->Name()));
+}
+
+void WidgetView::TellName() { widget_.setAccessibleName(ToQString(AccessibleOf(*control_).name)); }
+
+forms::Role WidgetView::Role() {
+  if (control_) role_ = AccessibleOf(*control_).role;
+  return role_;
 }
 
 void WidgetView::Enable() {

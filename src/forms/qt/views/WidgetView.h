@@ -4,8 +4,8 @@
 #include "forms/qt/drawing/Conversion.h"
 #include "forms/qt/drawing/PictureStore.h"
 #include "forms/qt/loop/Dispatcher.h"
+#include "forms/view/Accessible.h"
 
-#include <QAccessible>
 #include <QWidget>
 
 namespace quendra::forms::qt {
@@ -50,15 +50,16 @@ class WidgetView : public View {
   void Press();
   /// False for widgets that need mouse events for themselves, too.
   virtual bool TakesMouse() const { return true; }
-  /// NoRole leaves the widget to the toolkit's own description.
-  virtual QAccessible::Role Role() const { return QAccessible::NoRole; }
+  /// What assistive technology takes the control for; the last one once released.
+  forms::Role Role();
 
  protected:
   /// The parts of the state that only this kind of control has.
   virtual void Apply(Aspect /*aspect*/) {}
   virtual void Place();
   virtual void Show();
-  virtual QString AccessibleName() const { return {}; }
+  /// Gives assistive technology the name that the control has now.
+  void TellName();
   /// Moves the widget to a place in its container, mirrored where the form reads from right to left.
   void PlaceAt(const Geometry& geometry);
   static bool Concerns(Aspect told, Aspect wanted) { return told == wanted || told == Aspect::All; }
@@ -71,6 +72,7 @@ class WidgetView : public View {
   Control* control_;
   QWidget& widget_;
   Direction direction_;
+  forms::Role role_ = forms::Role::Toolkits;
 };
 
 /// Gives the names and roles of the views to assistive technology. Once a process.

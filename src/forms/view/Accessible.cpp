@@ -1,0 +1,63 @@
+#include "forms/view/Accessible.h"
+
+#include "forms/controls/Controls.h"
+#include "forms/view/VisibleText.h"
+
+namespace quendra::forms {
+
+namespace {
+
+Text CaptionOf(const Frame& frame) { return Text(Trimmed(VisibleText(frame.Caption()))); }
+
+bool IsEnabled(const Control& control) {
+  for (const Control* outer = &control; outer; outer = outer->Parent())
+    if (!outer->Enabled()) return false;
+  return true;
+}
+
+/// Gives the control that it visits its role and name.
+class Describer : public ControlVisitor {
+ public:
+  Accessible Description{};
+
+  // It has no caption of its own; that of the frame around it tells what is chosen here.
+  void Visit(ComboBox& combo) override {
+    if (const auto* frame = dynamic_cast<const Frame*>(combo.Parent())) Description.name = CaptionOf(*frame);
+  }
+  void Visit(Frame& frame) override {
+    Description.role = Role::Grouping;
+    Description.name = CaptionOf(frame);
+  }
+  void Visit(Image& /*image*/) override { Description.role = Role::Graphic; }
+  void Visit(ImageList& /*images*/) override {}
+  void Visit(Label& label) override {
+    const Text& caption = label.Caption();
+    Description.role = label.IsButton() ? Role::Button : Role::Text;
+    Description.name = VisibleText(caption.empty() ? label.Description : caption, LineBreaks::Keep);
+  }
+  void Visit(Line& /*line*/) override { Description.role = Role::Separator; }
+  void Visit(ListView& /*list*/) override {}
+  void Visit(PictureBox& /*box*/) override { Description.role = Role::Graphic; }
+  void Visit(Timer& /*timer*/) override {}
+};
+
+} // namespace
+
+Accessible AccessibleOf(Control& control) {
+  Describer describer;
+  control.Accept(describer);
+  Accessible& told = describer.Description;
+  if (!control.Parent()) told = {Role::Window, VisibleText(control.OwnerForm().Caption()), {}};
+  told.description = control.Name();
+  return told;
+}
+
+Text AccessibleNameOf(const ColumnHeader& column) {
+  return VisibleText(column.caption.empty() ? column.description : column.caption);
+}
+
+bool OffersPress(Control& control) {
+  return IsEnabled(control) && AccessibleOf(control).role == Role::Button;
+}
+
+} // namespace quendra::forms
