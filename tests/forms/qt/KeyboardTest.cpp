@@ -21,6 +21,31 @@ class Keyboard : public QtFixture {
   void SendEscape(QEvent::Type type, quint64 moment) {
     SendKey(WidgetOf(form), type, Qt::Key_Escape, moment);
   }
+  static void MakeButtons(std::initializer_list<Label*> labels) {
+    for (Label* label : labels) label->Click = [] {};
+  }
+  /// The names of the next three controls that Tab reaches from one.
+  QStringList ReachedByTab(const Control& from) {
+    ShowActive();
+    WidgetOf(from).setFocus();
+    QStringList reached;
+    for (int i = 0; i < 3; ++i) {
+      PressKey(*QApplication::focusWidget(), Qt::Key_Tab, QStringLiteral("\t"));
+      reached.push_back(QApplication::focusWidget()->objectName());
+    }
+    return reached;
+  }
+};
+
+/// A form with a picture that Escape clicks.
+struct PictureToCancel {
+  explicit PictureToCancel(Form& form) : picture(form, u"picture") {
+    picture.Click = [this] { ++clicks; };
+    form.Cancel = &picture;
+  }
+
+  Image picture;
+  int clicks = 0;
 };
 
 TEST_F(Keyboard, Tab_reaches_every_clickable_label_and_no_other) {
@@ -30,18 +55,10 @@ TEST_F(Keyboard, Tab_reaches_every_clickable_label_and_no_other) {
   Label second(frame, u"second");
   PictureBox box(form, u"box");
   Label third(box, u"third");
-  for (Label* label : {&first, &second, &third}) label->Click = [] {};
-  ShowActive();
-  WidgetOf(first).setFocus();
+  MakeButtons({&first, &second, &third});
 
-  QList<QString> reached;
-  for (int i = 0; i < 3; ++i) {
-    PressKey(*QApplication::focusWidget(), Qt::Key_Tab, QStringLiteral("\t"));
-    reached.push_back(QApplication::focusWidget()->objectName());
-  }
-
-  EXPECT_EQ(reached,
-            QList<QString>({QStringLiteral("second"), QStringLiteral("third"), QStringLiteral("first")}));
+  EXPECT_EQ(ReachedByTab(first),
+            QStringList({QStringLiteral("second"), QStringLiteral("third"), QStringLiteral("first")}));
 }
 
 TEST_F(Keyboard, Tab_follows_the_tab_index_and_then_the_order_in_the_form) {
@@ -50,18 +67,10 @@ TEST_F(Keyboard, Tab_follows_the_tab_index_and_then_the_order_in_the_form) {
   Label first(frame, u"first");
   Label second(form, u"second");
   foot.TabIndex = 1;
-  for (Label* label : {&foot, &first, &second}) label->Click = [] {};
-  ShowActive();
-  WidgetOf(first).setFocus();
+  MakeButtons({&foot, &first, &second});
 
-  QList<QString> reached;
-  for (int i = 0; i < 3; ++i) {
-    PressKey(*QApplication::focusWidget(), Qt::Key_Tab, QStringLiteral("\t"));
-    reached.push_back(QApplication::focusWidget()->objectName());
-  }
-
-  EXPECT_EQ(reached,
-            QList<QString>({QStringLiteral("second"), QStringLiteral("foot"), QStringLiteral("first")}));
+  EXPECT_EQ(ReachedByTab(first),
+            QStringList({QStringLiteral("second"), QStringLiteral("foot"), QStringLiteral("first")}));
 }
 
 TEST_F(Keyboard, Hidden_and_disabled_labels_are_passed_over) {
@@ -69,7 +78,7 @@ TEST_F(Keyboard, Hidden_and_disabled_labels_are_passed_over) {
   Label hidden(form, u"hidden");
   Label disabled(form, u"disabled");
   Label last(form, u"last");
-  for (Label* label : {&first, &hidden, &disabled, &last}) label->Click = [] {};
+  MakeButtons({&first, &hidden, &disabled, &last});
   form.design = [&] {
     hidden.Visible = false;
     disabled.Enabled = false;
@@ -217,11 +226,8 @@ TEST_F(Keyboard, Escape_clicks_the_cancel_control_wherever_the_focus_is) {
   Label label(form, u"label");
   ComboBox combo(form, u"combo");
   ListView list(form, u"list");
-  Image picture(form, u"picture");
-  int clicks = 0;
+  PictureToCancel cancel(form);
   label.Click = [] {};
-  picture.Click = [&] { ++clicks; };
-  form.Cancel = &picture;
   list.AddColumn({u"name", 3000});
   list.Add(u"p1", u"alpha", 0);
   ShowActive();
@@ -231,21 +237,19 @@ TEST_F(Keyboard, Escape_clicks_the_cancel_control_wherever_the_focus_is) {
     PressKey(WidgetOf(*focused), Qt::Key_Escape, QStringLiteral("\x1b"));
   }
 
-  EXPECT_EQ(clicks, 3);
+  EXPECT_EQ(cancel.clicks, 3);
 }
 
 TEST_F(Keyboard, Escape_and_Enter_click_in_a_form_where_nothing_takes_the_focus) {
-  Image picture(form, u"picture");
-  int clicks = 0;
-  picture.Click = [&] { ++clicks; };
-  form.Default = form.Cancel = &picture;
+  PictureToCancel cancel(form);
+  form.Default = form.Cancel;
   ShowActive();
 
   PressKey(WidgetOf(form), Qt::Key_Escape, QStringLiteral("\x1b"));
   PressKey(WidgetOf(form), Qt::Key_Return, QStringLiteral("\r"));
   PressKey(WidgetOf(form), Qt::Key_Enter, QStringLiteral("\r"));
 
-  EXPECT_EQ(clicks, 3);
+  EXPECT_EQ(cancel.clicks, 3);
 }
 
 TEST_F(Keyboard, Enter_presses_the_label_that_has_the_focus_and_not_the_default_one) {
@@ -264,24 +268,18 @@ TEST_F(Keyboard, Enter_presses_the_label_that_has_the_focus_and_not_the_default_
 }
 
 TEST_F(Keyboard, A_key_that_is_held_down_clicks_once) {
-  Image picture(form, u"picture");
-  int clicks = 0;
-  picture.Click = [&] { ++clicks; };
-  form.Cancel = &picture;
+  PictureToCancel cancel(form);
   ShowActive();
 
   PressKey(WidgetOf(form), Qt::Key_Escape);
   QKeyEvent repeated(QEvent::KeyPress, Qt::Key_Escape, Qt::NoModifier, {}, true);
   QCoreApplication::sendEvent(&WidgetOf(form), &repeated);
 
-  EXPECT_EQ(clicks, 1);
+  EXPECT_EQ(cancel.clicks, 1);
 }
 
 TEST_F(Keyboard, A_press_at_the_very_moment_of_the_release_is_the_held_key_again) {
-  Image picture(form, u"picture");
-  int clicks = 0;
-  picture.Click = [&] { ++clicks; };
-  form.Cancel = &picture;
+  PictureToCancel cancel(form);
   ShowActive();
 
   SendEscape(QEvent::KeyPress, 1000);
@@ -290,21 +288,18 @@ TEST_F(Keyboard, A_press_at_the_very_moment_of_the_release_is_the_held_key_again
     SendEscape(QEvent::KeyPress, moment);
   }
 
-  EXPECT_EQ(clicks, 1);
+  EXPECT_EQ(cancel.clicks, 1);
 }
 
 TEST_F(Keyboard, Two_presses_in_quick_succession_click_twice) {
-  Image picture(form, u"picture");
-  int clicks = 0;
-  picture.Click = [&] { ++clicks; };
-  form.Cancel = &picture;
+  PictureToCancel cancel(form);
   ShowActive();
 
   SendEscape(QEvent::KeyPress, 1000);
   SendEscape(QEvent::KeyRelease, 1004);
   SendEscape(QEvent::KeyPress, 1005);
 
-  EXPECT_EQ(clicks, 2);
+  EXPECT_EQ(cancel.clicks, 2);
 }
 
 TEST_F(Keyboard, A_held_key_goes_on_in_a_list) {
