@@ -23,9 +23,11 @@ void Canvas::Cls(PictureBox& box) {
 }
 
 void Canvas::Print(PictureBox& box, TextView text) {
-  PrintLine(box, text);
+  const DrawingUnits units(box, ScreenScale());
+  const int height = LineHeightInPixels(box);
+  PrintLine(box, text, units.PrintedLine(height));
   box.CurrentX = 0;
-  box.CurrentY += TextHeight(box, text);
+  box.CurrentY += units.UnitsY(height);
 }
 
 } // namespace quendra::forms

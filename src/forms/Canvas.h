@@ -1,6 +1,7 @@
 #pragma once
 
 #include "forms/controls/PictureBox.h"
+#include "forms/view/Area.h"
 #include "forms/view/Scale.h"
 
 namespace quendra::forms {
@@ -41,7 +42,8 @@ class Canvas {
   /// Pixels from one line to the next.
   virtual int LineHeightInPixels(const PictureBox& box) const = 0;
   virtual void DropDrawings(PictureBox& box) = 0;
-  virtual void PrintLine(PictureBox& box, TextView text) = 0;
+  /// `place` is in pixels, and the text starts at its leading edge.
+  virtual void PrintLine(PictureBox& box, TextView text, const Area& place) = 0;
 };
 
 } // namespace quendra::forms

@@ -128,7 +128,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   int WidthInPixels(const PictureBox& box, TextView text) const override;
   int LineHeightInPixels(const PictureBox& box) const override;
   void DropDrawings(PictureBox& box) override;
-  void PrintLine(PictureBox& box, TextView text) override;
+  void PrintLine(PictureBox& box, TextView text, const Area& place) override;
 
  private:
   class FormView;

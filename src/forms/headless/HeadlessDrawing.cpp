@@ -44,7 +44,7 @@ void HeadlessDesktop::FillBox(PictureBox& box, int x1, int y1, int x2, int y2, C
   Draw(box, "Box " + Place(x1, y1) + " " + Place(x2, y2) + " " + ColourText(colour));
 }
 
-void HeadlessDesktop::PrintLine(PictureBox& box, TextView text) {
+void HeadlessDesktop::PrintLine(PictureBox& box, TextView text, const Area& /*place*/) {
   Draw(box, "Print " + Place(box.CurrentX, box.CurrentY) + " " + ColourText(box.ForeColour()) + " " +
                 ToUtf8(text));
 }

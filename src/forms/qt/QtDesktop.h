@@ -88,7 +88,9 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   }
   int LineHeightInPixels(const PictureBox& box) const override { return drawing_.LineHeight(box); }
   void DropDrawings(PictureBox& box) override { drawing_.DropDrawings(box); }
-  void PrintLine(PictureBox& box, TextView text) override { drawing_.PrintLine(box, text); }
+  void PrintLine(PictureBox& box, TextView text, const Area& place) override {
+    drawing_.PrintLine(box, text, place);
+  }
 
  private:
   void Close(FormView& view);

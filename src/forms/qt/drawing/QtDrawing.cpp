@@ -37,7 +37,7 @@ void QtDrawing::FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour 
   QPainter(&view->Surface()).fillRect(ToQRect(filled), ToQColor(colour));
 }
 
-void QtDrawing::PrintLine(PictureBox& box, TextView text) {
+void QtDrawing::PrintLine(PictureBox& box, TextView text, const Area& place) {
   PictureBoxView* view = ViewOf(box);
   if (!view) return;
   const Direction direction = DirectionOf(box.OwnerForm());
@@ -46,8 +46,8 @@ void QtDrawing::PrintLine(PictureBox& box, TextView text) {
   painter.setPen(ToQColor(box.ForeColour()));
   painter.setLayoutDirection(ToQt(direction));
   const auto side = static_cast<int>(ToQt(SideOf(Alignment::Leading, direction)));
-  painter.drawText(ToQRect(DrawingUnits(box, scale_).PrintedLine(LineHeight(box))),
-                   side | Qt::AlignTop | Qt::TextSingleLine | Qt::TextDontClip, ShownText(text));
+  painter.drawText(ToQRect(place), side | Qt::AlignTop | Qt::TextSingleLine | Qt::TextDontClip,
+                   ShownText(text));
 }
 
 void QtDrawing::BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source,

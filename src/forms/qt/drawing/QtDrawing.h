@@ -15,7 +15,7 @@ class QtDrawing {
   int LineHeight(const PictureBox& box) const;
   void DropDrawings(PictureBox& box);
   void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour);
-  void PrintLine(PictureBox& box, TextView text);
+  void PrintLine(PictureBox& box, TextView text, const Area& place);
   void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
               int sourceY);
   void Refresh(PictureBox& box);
