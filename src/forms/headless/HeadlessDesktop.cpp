@@ -1,35 +1,10 @@
 #include "forms/headless/HeadlessDesktop.h"
 
-#include "runtime/Fault.h"
+#include "forms/loop/TimerView.h"
 
 #include <algorithm>
 
 namespace quendra::forms::headless {
-
-/// Keeps the alarm of a Timer control in step with its properties.
-class HeadlessDesktop::TimerView : public ControlView {
- public:
-  TimerView(HeadlessDesktop& desktop, Timer& timer)
-      : desktop_(desktop), timer_(&timer), alarm_(desktop.AddAlarm([&timer] { timer.Tick(); })) {
-    timer.Attach(this);
-  }
-  ~TimerView() override {
-    if (timer_) timer_->Attach(nullptr);
-  }
-  void Changed(Aspect aspect) override {
-    if (aspect != Aspect::All && aspect != Aspect::Timer && aspect != Aspect::Enabled) return;
-    desktop_.SetAlarm(*alarm_, timer_->Enabled() ? timer_->Interval() : 0);
-  }
-  void ControlGone() override {
-    timer_ = nullptr;
-    alarm_.reset();
-  }
-
- private:
-  HeadlessDesktop& desktop_;
-  Timer* timer_;
-  std::shared_ptr<Alarm> alarm_;
-};
 
 class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
  public:
@@ -54,7 +29,12 @@ class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
   void Visit(Line& /*line*/) override {}
   void Visit(ListView& /*list*/) override {}
   void Visit(PictureBox& box) override { boxes_.push_back(&box); }
-  void Visit(Timer& timer) override { timers_.push_back(std::make_unique<TimerView>(desktop_, timer)); }
+  void Visit(Timer& timer) override {
+    timers_.push_back(std::make_unique<TimerView>(timer, [this](int milliseconds, auto tick) {
+      return desktop_.StartTimer(milliseconds, std::move(tick));
+    }));
+    timer.Attach(timers_.back().get());
+  }
 
   HeadlessDesktop& desktop_;
   Form* form_;
@@ -62,31 +42,20 @@ class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
   std::vector<const PictureBox*> boxes_;
 };
 
-HeadlessDesktop::HeadlessDesktop() = default;
+HeadlessDesktop::HeadlessDesktop()
+    : dispatcher_(
+          [this](const Text& text) {
+            Boxes.push_back({text, kCritical, u"Quendra"});
+          },
+          [this](int status) {
+            Ended = true;
+            EndStatus = status;
+          }) {}
+
 HeadlessDesktop::~HeadlessDesktop() = default;
 
 int HeadlessDesktop::CountOf(const std::string& call) const {
   return static_cast<int>(std::count(Calls.begin(), Calls.end(), call));
-}
-
-void HeadlessDesktop::Dispatch(const std::function<void()>& work) {
-  if (Ended) return;
-  try {
-    work();
-  } catch (const ProgramEnded&) {
-    // Kept in Ended by End.
-  } catch (const Fault& fault) {
-    Boxes.push_back({u"Run-time error '" + DecimalText(fault.number) + u"':\n\n" + fault.description,
-                     kCritical, u"Quendra"});
-    Ended = true;
-    EndStatus = 1;
-  }
-}
-
-void HeadlessDesktop::End(int status) {
-  if (!Ended) EndStatus = status;
-  Ended = true;
-  throw ProgramEnded{EndStatus};
 }
 
 int HeadlessDesktop::MessageBox(const Text& text, int flags, const Text& title) {
@@ -94,7 +63,7 @@ int HeadlessDesktop::MessageBox(const Text& text, int flags, const Text& title) 
   if (OnBox) {
     const Standing box(*this);
     OnBox();
-    if (Ended) throw ProgramEnded{EndStatus};
+    dispatcher_.UnwindIfEnded();
   }
   if (answers_.empty()) return 1;
   const int answer = answers_.front();
@@ -113,7 +82,7 @@ void HeadlessDesktop::DoEvents() {
     Dispatch(OnYield);
   }
   PumpOnce();
-  if (Ended) throw ProgramEnded{EndStatus};
+  dispatcher_.UnwindIfEnded();
 }
 
 CursorHandle HeadlessDesktop::LoadCursor(int id) {

@@ -4,7 +4,9 @@
 #include "forms/controls/ComboBox.h"
 #include "forms/controls/ListView.h"
 #include "forms/headless/HeadlessLoop.h"
+#include "forms/loop/Dispatcher.h"
 
+#include <deque>
 #include <map>
 #include <unordered_map>
 
@@ -79,7 +81,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
 
   /// Runs work as the dispatcher runs a handler: a fault shows the run-time's message and ends the program
   /// with status 1; the program's end is kept in Ended and EndStatus. After the end nothing is run.
-  void Dispatch(const std::function<void()>& work) override;
+  void Dispatch(const std::function<void()>& work) override { dispatcher_.Dispatch(work); }
 
   // What stands on the screen.
 
@@ -94,7 +96,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
 
   // Desktop.
 
-  [[noreturn]] void End(int status = 0) override;
+  [[noreturn]] void End(int status = 0) override { dispatcher_.End(status); }
   int MessageBox(const Text& text, int flags, const Text& title) override;
   void DoEvents() override;
   CursorHandle LoadCursor(int id) override;
@@ -132,7 +134,6 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
 
  private:
   class FormView;
-  class TimerView;
 
   bool Act(Control& control, const std::function<void()>& action);
   void Record(std::string call) { Calls.push_back(std::move(call)); }
@@ -141,6 +142,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   void Forget(const Form& form);
 
   const Scale scale_{};
+  Dispatcher dispatcher_;
   std::deque<int> answers_;
   bool yielding_ = false;
   Form* active_ = nullptr;

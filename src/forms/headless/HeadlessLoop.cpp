@@ -7,8 +7,13 @@ namespace quendra::forms::headless {
 
 std::unique_ptr<platform::EventLoop::Subscription> HeadlessLoop::StartTimer(int milliseconds,
                                                                             std::function<void()> tick) {
-  auto alarm = AddAlarm(std::move(tick));
-  SetAlarm(*alarm, milliseconds);
+  auto alarm = std::make_shared<Alarm>();
+  alarm->tick = std::move(tick);
+  alarm->period = milliseconds;
+  alarm->due = milliseconds < 1 ? -1 : now_ + milliseconds;
+  alarm->sequence = ++sequence_;
+  std::erase_if(alarms_, [](const auto& old) { return old.expired(); });
+  alarms_.push_back(alarm);
   return std::make_unique<SubscriptionTo<Alarm>>(std::move(alarm));
 }
 
@@ -39,29 +44,9 @@ void HeadlessLoop::Advance(int milliseconds) {
   now_ = std::max(now_, until);
 }
 
-std::shared_ptr<HeadlessLoop::Alarm> HeadlessLoop::AddAlarm(std::function<void()> tick) {
-  auto alarm = std::make_shared<Alarm>();
-  alarm->tick = std::move(tick);
-  std::erase_if(alarms_, [](const auto& old) { return old.expired(); });
-  alarms_.push_back(alarm);
-  return alarm;
-}
-
-void HeadlessLoop::SetAlarm(Alarm& alarm, int period) {
-  alarm.period = period;
-  alarm.due = period < 1 ? -1 : now_ + period;
-  alarm.sequence = ++sequence_;
-}
-
 void HeadlessLoop::PumpPosted() {
   Collect();
-  // Work that a handler posts waits for the next pump; a handler that pumps itself runs those that come after
-  // it.
-  for (std::size_t left = posted_.size(); left > 0 && HasPosted(); --left) {
-    const auto work = std::move(posted_.front());
-    posted_.pop_front();
-    Dispatch(work);
-  }
+  posted_.RunWaiting([this](const PostedWork::Work& work) { Dispatch(work); });
 }
 
 std::shared_ptr<HeadlessLoop::Alarm> HeadlessLoop::NextAlarm(std::int64_t until) {

@@ -1,9 +1,9 @@
 #pragma once
 
+#include "forms/loop/PostedWork.h"
 #include "platform/EventLoop.h"
 
 #include <cstdint>
-#include <deque>
 #include <vector>
 
 namespace quendra::forms::headless {
@@ -29,17 +29,6 @@ class HeadlessLoop : public platform::EventLoop {
   virtual void Dispatch(const std::function<void()>& work) = 0;
 
  protected:
-  /// One timer: `due` below 0 means that it stands still.
-  struct Alarm {
-    std::int64_t due = -1;
-    std::uint64_t sequence = 0;
-    int period = 0;
-    std::function<void()> tick;
-  };
-  std::shared_ptr<Alarm> AddAlarm(std::function<void()> tick);
-  /// A period below 1 stops it.
-  void SetAlarm(Alarm& alarm, int period);
-
   /// Holds what the loop itself only knows weakly.
   template <typename Held> class SubscriptionTo : public Subscription {
    public:
@@ -55,17 +44,25 @@ class HeadlessLoop : public platform::EventLoop {
   virtual void Collect() {}
   /// Handles each other source of events once; true when one had something.
   virtual bool PumpSources() { return false; }
-  void PostHere(std::function<void()> work) { posted_.push_back(std::move(work)); }
+  void PostHere(std::function<void()> work) { posted_.Add(std::move(work)); }
   bool HasPosted() {
     Collect();
-    return !posted_.empty();
+    return !posted_.IsEmpty();
   }
 
  private:
+  /// One timer: `due` below 0 means that it stands still.
+  struct Alarm {
+    std::int64_t due = -1;
+    std::uint64_t sequence = 0;
+    int period = 0;
+    std::function<void()> tick;
+  };
+
   void PumpPosted();
   std::shared_ptr<Alarm> NextAlarm(std::int64_t until);
 
-  std::deque<std::function<void()>> posted_;
+  PostedWork posted_;
   std::vector<std::weak_ptr<Alarm>> alarms_;
   std::int64_t now_ = 0;
   std::uint64_t sequence_ = 0;

@@ -32,9 +32,12 @@ std::unique_ptr<QApplication> MakeApplication(int& argc, char** argv) {
 QtDesktop::QtDesktop(std::string programName)
     : programName_(std::move(programName)), arguments_{programName_.data(), nullptr},
       application_(MakeApplication(argumentCount_, arguments_.data())),
-      dispatcher_([](const Text& text) { ShowBox(FrontWindow(), text, kCritical, u"Quendra"); }),
-      mouse_(dispatcher_), keys_(dispatcher_), context_{*this, dispatcher_, scale_, pictures_, mouse_},
-      drawing_(scale_), loop_(dispatcher_) {
+      dispatcher_([](const Text& text) { ShowBox(FrontWindow(), text, kCritical, u"Quendra"); },
+                  QCoreApplication::exit),
+      mouse_(dispatcher_), keys_(dispatcher_),
+      startTimer_([this](int milliseconds, auto tick) { return StartTimer(milliseconds, std::move(tick)); }),
+      context_{*this, dispatcher_, scale_, pictures_, mouse_, startTimer_}, drawing_(scale_),
+      loop_(dispatcher_) {
   DressApplication(*qApp);
   InstallAccessibility();
   const QScreen* screen = QGuiApplication::primaryScreen();
@@ -55,11 +58,6 @@ int QtDesktop::Run(std::function<void()> start) {
   if (!dispatcher_.Ended()) QApplication::exec();
   while (!windows_.empty()) Close(*windows_.begin()->second);
   return dispatcher_.Status();
-}
-
-void QtDesktop::End(int status) {
-  dispatcher_.Quit(status);
-  throw ProgramEnded{dispatcher_.Status()};
 }
 
 QWidget* QtDesktop::FrontWindow() {

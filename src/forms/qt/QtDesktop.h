@@ -28,7 +28,7 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   /// Gives the exit status. The forms must still be alive; their views go before this returns.
   int Run(std::function<void()> start = {});
 
-  [[noreturn]] void End(int status = 0) override;
+  [[noreturn]] void End(int status = 0) override { dispatcher_.End(status); }
   int MessageBox(const Text& text, int flags, const Text& title) override;
   void DoEvents() override { loop_.PumpIfDue(); }
 
@@ -109,6 +109,7 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   PictureStore pictures_;
   MouseEvents mouse_;
   KeyEvents keys_;
+  TimerStarter startTimer_;
   ViewContext context_;
   QtDrawing drawing_;
   QtEventLoop loop_;

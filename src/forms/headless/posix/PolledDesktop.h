@@ -33,7 +33,7 @@ class PolledDesktop : public HeadlessDesktop, public platform::DescriptorWatch {
   bool PumpDescriptors(int realMilliseconds);
 
   std::mutex arrivedLock_;
-  std::deque<std::function<void()>> arrived_;
+  std::vector<PostedWork::Work> arrived_;
   std::vector<std::weak_ptr<Watch>> watches_;
 };
 

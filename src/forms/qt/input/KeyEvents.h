@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/qt/loop/Dispatcher.h"
+#include "forms/loop/Dispatcher.h"
 #include "forms/view/HeldKey.h"
 #include "forms/view/Keyboard.h"
 

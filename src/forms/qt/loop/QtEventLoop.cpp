@@ -6,6 +6,8 @@
 #include <QSocketNotifier>
 #include <QTimer>
 
+#include <ctime>
+
 namespace quendra::forms::qt {
 
 namespace {
@@ -28,35 +30,40 @@ template <typename Source> class SourceSubscription : public platform::EventLoop
   QPointer<Source> source_;
 };
 
+/// Nanoseconds; moves with the kernel's tick.
+std::int64_t CoarseNow() {
+  timespec now{};
+  clock_gettime(CLOCK_MONOTONIC_COARSE, &now);
+  return now.tv_sec * 1'000'000'000LL + now.tv_nsec;
+}
+
 } // namespace
+
+QtEventLoop::QtEventLoop(Dispatcher& dispatcher) : dispatcher_(dispatcher), gate_(CoarseNow) {}
 
 void QtEventLoop::Post(std::function<void()> work) {
   {
-    const std::scoped_lock lock(mutex_);
-    queue_.push_back(std::move(work));
+    const std::scoped_lock lock(arrivedLock_);
+    arrived_.push_back(std::move(work));
+    workArrived_.store(true, std::memory_order_relaxed);
   }
   // One event for each piece of work: the toolkit keeps their order and gives other events their turn between
   // pumps.
-  posted_.store(true, std::memory_order_relaxed);
   QCoreApplication::postEvent(this, new QEvent(QEvent::User));
+}
+
+void QtEventLoop::Collect() {
+  const std::scoped_lock lock(arrivedLock_);
+  for (PostedWork::Work& work : arrived_) posted_.Add(std::move(work));
+  arrived_.clear();
+  workArrived_.store(false, std::memory_order_relaxed);
 }
 
 bool QtEventLoop::event(QEvent* event) {
   if (event->type() != QEvent::User) return QObject::event(event);
-  RunPosted();
+  Collect();
+  posted_.RunNext([this](const PostedWork::Work& work) { dispatcher_.Dispatch(work); });
   return true;
-}
-
-void QtEventLoop::RunPosted() {
-  std::function<void()> work;
-  {
-    const std::scoped_lock lock(mutex_);
-    if (queue_.empty()) return;
-    work = std::move(queue_.front());
-    queue_.pop_front();
-    posted_.store(!queue_.empty(), std::memory_order_relaxed);
-  }
-  dispatcher_.Dispatch(work);
 }
 
 std::unique_ptr<platform::EventLoop::Subscription> QtEventLoop::WatchDescriptor(int descriptor,
@@ -79,7 +86,7 @@ std::unique_ptr<platform::EventLoop::Subscription> QtEventLoop::StartTimer(int m
 
 void QtEventLoop::PumpOnce() {
   QCoreApplication::processEvents();
-  lastPump_ = CoarseNow();
+  gate_.Pumped();
   dispatcher_.UnwindIfEnded();
 }
 

@@ -18,8 +18,8 @@ namespace quendra::forms::qt {
 class FormContext {
  protected:
   explicit FormContext(const ViewContext& desktops)
-      : scale_(desktops.scale), shared_{desktops.desktop, desktops.dispatcher, scale_, desktops.pictures,
-                                        desktops.mouse} {}
+      : scale_(desktops.scale), shared_{desktops.desktop,  desktops.dispatcher, scale_,
+                                        desktops.pictures, desktops.mouse,      desktops.startTimer} {}
 
   Scale scale_;
   ViewContext shared_;

@@ -7,7 +7,6 @@
 #include "forms/qt/views/LineView.h"
 #include "forms/qt/views/ListViewView.h"
 #include "forms/qt/views/PictureBoxView.h"
-#include "forms/qt/views/TimerView.h"
 
 namespace quendra::forms::qt {
 
@@ -27,7 +26,7 @@ class ViewMaker : public ControlVisitor {
   void Visit(Line& line) override { Make<LineView>(line); }
   void Visit(ListView& list) override { Make<ListViewView>(list); }
   void Visit(PictureBox& box) override { Make<PictureBoxView>(box); }
-  void Visit(Timer& timer) override { Made = {new TimerView(context_, timer), nullptr}; }
+  void Visit(Timer& timer) override { Made = {new TimerView(timer, context_.startTimer), nullptr}; }
 
  private:
   template <typename KindView, typename Kind> void Make(Kind& control) {

@@ -1,10 +1,12 @@
 #pragma once
 
 #include "forms/Desktop.h"
+#include "forms/loop/Dispatcher.h"
+#include "forms/loop/TimerView.h"
 #include "forms/qt/drawing/Conversion.h"
 #include "forms/qt/drawing/PictureStore.h"
-#include "forms/qt/loop/Dispatcher.h"
 #include "forms/view/Accessible.h"
+#include "forms/view/View.h"
 
 #include <QWidget>
 
@@ -20,13 +22,7 @@ struct ViewContext {
   const Scale& scale;
   PictureStore& pictures;
   MouseEvents& mouse;
-};
-
-/// A view that lasts no longer than its form's window and lets go of its control before.
-class View : public ControlView {
- public:
-  /// Lets go of the control; the widget may live on for a while without it.
-  virtual void Release() = 0;
+  const TimerStarter& startTimer;
 };
 
 /// What all widgets that stand for a control have in common. Made as the second base of the widget itself.

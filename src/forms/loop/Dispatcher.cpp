@@ -1,14 +1,17 @@
-#include "forms/qt/loop/Dispatcher.h"
+#include "forms/loop/Dispatcher.h"
 
-#include <QCoreApplication>
-
-namespace quendra::forms::qt {
+namespace quendra::forms {
 
 void Dispatcher::Quit(int status) {
   if (ended_) return;
   ended_ = true;
   status_ = status;
-  QCoreApplication::exit(status);
+  leaveLoops_(status);
+}
+
+void Dispatcher::End(int status) {
+  Quit(status);
+  throw ProgramEnded{status_};
 }
 
 void Dispatcher::Report(int number, const Text& description) {
@@ -16,7 +19,7 @@ void Dispatcher::Report(int number, const Text& description) {
   ended_ = true;
   status_ = 1;
   showFault_(u"Run-time error '" + DecimalText(number) + u"':\n\n" + description);
-  QCoreApplication::exit(status_);
+  leaveLoops_(status_);
 }
 
-} // namespace quendra::forms::qt
+} // namespace quendra::forms
