@@ -12,6 +12,7 @@ struct ProgramEnded {
 
 /// Flags of a message box, as the platform numbers them.
 enum BoxFlags : int {
+  kYesNo = 0x4,
   kCritical = 0x10,
   kExclamation = 0x30,
   kInformation = 0x40,

@@ -1,7 +1,5 @@
 #include "forms/qt/boxes/BoxIcons.h"
 
-#include "forms/Desktop.h"
-
 #include <QPainter>
 #include <QPainterPath>
 
@@ -43,9 +41,8 @@ void DrawInformation(QPainter& painter) {
 
 } // namespace
 
-QPixmap BoxIcon(int flags, int side, qreal pixelRatio) {
-  const int sign = flags & 0x70;
-  if (sign != kCritical && sign != kExclamation && sign != kInformation) return {};
+QPixmap BoxIcon(BoxSign sign, int side, qreal pixelRatio) {
+  if (sign == BoxSign::None) return {};
   QPixmap icon(QSize(side, side) * pixelRatio);
   icon.setDevicePixelRatio(pixelRatio);
   icon.fill(Qt::transparent);
@@ -53,9 +50,9 @@ QPixmap BoxIcon(int flags, int side, qreal pixelRatio) {
   painter.setRenderHint(QPainter::Antialiasing);
   painter.scale(side / 40.0, side / 40.0);
   painter.setPen(Qt::NoPen);
-  if (sign == kCritical) DrawCross(painter);
-  if (sign == kExclamation) DrawWarning(painter);
-  if (sign == kInformation) DrawInformation(painter);
+  if (sign == BoxSign::Critical) DrawCross(painter);
+  if (sign == BoxSign::Exclamation) DrawWarning(painter);
+  if (sign == BoxSign::Information) DrawInformation(painter);
   return icon;
 }
 

@@ -1,10 +1,12 @@
 #pragma once
 
+#include "forms/view/BoxContent.h"
+
 #include <QPixmap>
 
 namespace quendra::forms::qt {
 
-/// The sign of a message box by its flags (kCritical, kExclamation or kInformation); null for any other.
-QPixmap BoxIcon(int flags, int side, qreal pixelRatio);
+/// The sign of a message box as a picture; null for none.
+QPixmap BoxIcon(BoxSign sign, int side, qreal pixelRatio);
 
 } // namespace quendra::forms::qt

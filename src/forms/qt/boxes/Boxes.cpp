@@ -3,6 +3,7 @@
 #include "forms/qt/boxes/BoxIcons.h"
 #include "forms/qt/boxes/BoxText.h"
 #include "forms/qt/drawing/Conversion.h"
+#include "forms/view/BoxContent.h"
 #include "forms/view/Palette.h"
 
 #include <QGridLayout>
@@ -18,11 +19,11 @@ namespace quendra::forms::qt {
 
 namespace {
 
-constexpr int kOkPressed = 1;
-constexpr std::size_t kMostText = 4096;
 /// Pixels: room for the title of a short box.
 constexpr int kLeastWidth = 320;
 constexpr int kIconSide = 40;
+/// Under which name a button keeps the number of its answer.
+constexpr char kNumber[] = "number";
 /// What a box needs beside and above its text: margins, sign and button, and the frame that the window
 /// manager puts round it.
 constexpr QSize kAroundText(140, 180);
@@ -30,19 +31,14 @@ constexpr QSize kAroundText(140, 180);
 constexpr int kToolkitsWidth = 500;
 constexpr int kMostTextWidth = 640;
 
-QMessageBox::Icon KindOf(int flags) {
-  switch (flags & 0x70) {
-  case kCritical: return QMessageBox::Critical;
-  case kExclamation: return QMessageBox::Warning;
-  case kInformation: return QMessageBox::Information;
-  default: return QMessageBox::NoIcon;
+QMessageBox::Icon KindOf(BoxSign sign) {
+  switch (sign) {
+  case BoxSign::Critical: return QMessageBox::Critical;
+  case BoxSign::Exclamation: return QMessageBox::Warning;
+  case BoxSign::Information: return QMessageBox::Information;
+  case BoxSign::None: break;
   }
-}
-
-/// Each line decides by itself how it reads; a mark in front has lines of numbers read with the others.
-QString MarkedRightToLeft(QString text) {
-  const QChar mark(0x200F);
-  return mark + text.replace(u'\n', QStringLiteral("\n") + mark);
+  return QMessageBox::NoIcon;
 }
 
 void LayOut(QMessageBox& box) {
@@ -77,30 +73,43 @@ void PutText(QMessageBox& box, const QString& text, QSize screen) {
   label->hide();
 }
 
+void PutSign(QMessageBox& box, BoxSign sign) {
+  // The kind is what assistive technology hears; the sign is what is seen.
+  box.setIcon(KindOf(sign));
+  auto* place = box.findChild<QLabel*>(QStringLiteral("qt_msgboxex_icon_label"));
+  if (place && sign != BoxSign::None) place->setPixmap(BoxIcon(sign, kIconSide, box.devicePixelRatioF()));
+}
+
+/// Gives the button that has the focus first.
+QPushButton* PutButtons(QMessageBox& box, const BoxContent& content) {
+  QPushButton* first = nullptr;
+  for (const BoxButton& wanted : content.buttons) {
+    QPushButton* button = box.addButton(ToQString(wanted.caption), QMessageBox::AcceptRole);
+    button->setProperty(kNumber, wanted.number);
+    if (wanted.number == content.defaultButton) box.setDefaultButton(first = button);
+    if (wanted.number == content.cancelButton) box.setEscapeButton(button);
+  }
+  return first;
+}
+
 } // namespace
 
 int ShowBox(QWidget* owner, const Text& text, int flags, const Text& title) {
-  const bool rightToLeft = (flags & kRightToLeft) != 0;
+  const BoxContent content = BoxContentOf(text, flags, title);
   QMessageBox box(owner);
-  box.setLayoutDirection(rightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
-  // The kind is what assistive technology hears; the sign is what is seen.
-  box.setIcon(KindOf(flags));
-  auto* sign = box.findChild<QLabel*>(QStringLiteral("qt_msgboxex_icon_label"));
-  if (sign && box.icon() != QMessageBox::NoIcon)
-    sign->setPixmap(BoxIcon(flags, kIconSide, box.devicePixelRatioF()));
+  box.setLayoutDirection(content.rightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
+  PutSign(box, content.sign);
   box.setTextFormat(Qt::PlainText);
-  box.setWindowTitle(ShownText(title));
-  const QString shown = ToQString(VisibleText(text, LineBreaks::Keep, kMostText));
+  box.setWindowTitle(ToQString(content.title));
   const QScreen* screen = owner ? owner->screen() : QGuiApplication::primaryScreen();
-  PutText(box, rightToLeft ? MarkedRightToLeft(shown) : shown, screen->availableSize());
-  QPushButton* ok =
-      box.addButton(rightToLeft ? QStringLiteral("אישור") : QStringLiteral("OK"), QMessageBox::AcceptRole);
-  box.setDefaultButton(ok);
-  box.setEscapeButton(ok);
+  PutText(box, ToQString(content.text), screen->availableSize());
+  QPushButton* first = PutButtons(box, content);
   LayOut(box);
-  ok->setFocus();
+  if (first) first->setFocus();
   box.exec();
-  return kOkPressed;
+  // None is pressed where the program ends behind the box.
+  const QAbstractButton* pressed = box.clickedButton();
+  return pressed ? pressed->property(kNumber).toInt() : content.defaultButton;
 }
 
 } // namespace quendra::forms::qt

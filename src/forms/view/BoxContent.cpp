@@ -1,0 +1,57 @@
+#include "forms/view/BoxContent.h"
+
+#include "forms/MessageLoop.h"
+#include "forms/view/VisibleText.h"
+
+namespace quendra::forms {
+
+namespace {
+
+BoxSign SignOf(int flags) {
+  switch (flags & 0x70) {
+  case kCritical: return BoxSign::Critical;
+  case kExclamation: return BoxSign::Exclamation;
+  case kInformation: return BoxSign::Information;
+  default: return BoxSign::None;
+  }
+}
+
+/// Each line decides by itself how it reads; a mark in front has lines of numbers read with the others.
+Text MarkedRightToLeft(TextView text) {
+  constexpr char16_t kMark = u'\u200F';
+  Text marked(1, kMark);
+  for (const char16_t unit : text) {
+    marked += unit;
+    if (unit == u'\n') marked += kMark;
+  }
+  return marked;
+}
+
+void AddButtons(BoxContent& box, int flags) {
+  constexpr int kOk = 1;
+  constexpr int kYes = 6;
+  constexpr int kNo = 7;
+  if ((flags & 0xF) != kYesNo) {
+    box.buttons = {{kOk, box.rightToLeft ? u"אישור" : u"OK"}};
+    box.defaultButton = box.cancelButton = kOk;
+    return;
+  }
+  // A question wants an answer: nothing but its buttons closes it.
+  box.buttons = {{kYes, box.rightToLeft ? u"כן" : u"Yes"}, {kNo, box.rightToLeft ? u"לא" : u"No"}};
+  box.defaultButton = kYes;
+}
+
+} // namespace
+
+BoxContent BoxContentOf(TextView text, int flags, TextView title) {
+  BoxContent box;
+  box.rightToLeft = (flags & kRightToLeft) != 0;
+  box.title = VisibleText(title);
+  box.text = VisibleText(text, LineBreaks::Keep, kMostBoxText);
+  if (box.rightToLeft) box.text = MarkedRightToLeft(box.text);
+  box.sign = SignOf(flags);
+  AddButtons(box, flags);
+  return box;
+}
+
+} // namespace quendra::forms
