@@ -1,6 +1,7 @@
 #include "forms/headless/HeadlessDesktop.h"
 
 #include "forms/loop/TimerView.h"
+#include "forms/view/FocusOrder.h"
 
 #include <algorithm>
 
@@ -17,6 +18,13 @@ class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
     if (form_) form_->Attach(nullptr);
   }
   void Changed(Aspect) override {}
+  Control* Focused() const {
+    // It may have gone since.
+    const std::vector<Control*> controls = ControlsIn(*form_);
+    const auto found = std::find(controls.begin(), controls.end(), focused_);
+    return found == controls.end() ? nullptr : *found;
+  }
+  void SetFocus(const Control* control) { focused_ = control; }
   /// This object goes too.
   void ControlGone() override { desktop_.Forget(*std::exchange(form_, nullptr)); }
 
@@ -38,19 +46,17 @@ class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
 
   HeadlessDesktop& desktop_;
   Form* form_;
+  const Control* focused_ = nullptr;
   std::vector<std::unique_ptr<TimerView>> timers_;
   std::vector<const PictureBox*> boxes_;
 };
 
 HeadlessDesktop::HeadlessDesktop()
-    : dispatcher_(
-          [this](const Text& text) {
-            Boxes.push_back({text, kCritical, u"Quendra"});
-          },
-          [this](int status) {
-            Ended = true;
-            EndStatus = status;
-          }) {}
+    : dispatcher_([this](const Text& text) { ShowBox(text, kCritical, u"Quendra"); },
+                  [this](int status) {
+                    Ended = true;
+                    EndStatus = status;
+                  }) {}
 
 HeadlessDesktop::~HeadlessDesktop() = default;
 
@@ -58,13 +64,36 @@ int HeadlessDesktop::CountOf(const std::string& call) const {
   return static_cast<int>(std::count(Calls.begin(), Calls.end(), call));
 }
 
-int HeadlessDesktop::MessageBox(const Text& text, int flags, const Text& title) {
-  Boxes.push_back({text, flags, title});
-  if (OnBox) {
-    const Standing box(*this);
-    OnBox();
-    dispatcher_.UnwindIfEnded();
+void HeadlessDesktop::Dispatch(const std::function<void()>& work) {
+  {
+    const Inside handler(handlers_);
+    dispatcher_.Dispatch(work);
   }
+  if (handlers_ == 0) EndWithoutForms();
+}
+
+// After what the handler does next: a program that shows another form at once goes on.
+void HeadlessDesktop::LastFormGone() {
+  if (handlers_ == 0) End(0);
+  lastFormWent_ = true;
+  Post([this] { EndWithoutForms(); });
+}
+
+void HeadlessDesktop::EndWithoutForms() {
+  if (std::exchange(lastFormWent_, false) && views_.empty()) dispatcher_.Quit(0);
+}
+
+void HeadlessDesktop::ShowBox(const Text& text, int flags, const Text& title) {
+  Boxes.push_back({text, flags, title});
+  if (OnBox) OnBox();
+}
+
+int HeadlessDesktop::MessageBox(const Text& text, int flags, const Text& title) {
+  {
+    const Standing box(*this);
+    ShowBox(text, flags, title);
+  }
+  dispatcher_.UnwindIfEnded();
   if (answers_.empty()) return 1;
   const int answer = answers_.front();
   answers_.pop_front();
@@ -74,11 +103,7 @@ int HeadlessDesktop::MessageBox(const Text& text, int flags, const Text& title) 
 void HeadlessDesktop::DoEvents() {
   ++YieldCount;
   if (OnYield && !yielding_) {
-    struct Inside {
-      bool& flag;
-      explicit Inside(bool& yielding) : flag(yielding) { flag = true; }
-      ~Inside() { flag = false; }
-    } inside(yielding_);
+    const Inside script(yielding_);
     Dispatch(OnYield);
   }
   PumpOnce();
@@ -95,6 +120,7 @@ void HeadlessDesktop::SetCursor(CursorHandle cursor) {
 }
 
 WindowHandle HeadlessDesktop::HandleOf(Form& form) {
+  if (!form.IsLoaded()) return kNoWindow;
   const auto [place, isNew] =
       windows_.try_emplace(&form, WindowHandle(static_cast<std::uint32_t>(windowNames_.size() + 1)));
   if (isNew) windowNames_[place->second] = ToUtf8(form.Name());
@@ -134,7 +160,7 @@ void HeadlessDesktop::CreateView(Form& form) { views_[&form] = std::make_unique<
 void HeadlessDesktop::DestroyView(Form& form) { Forget(form); }
 
 void HeadlessDesktop::Forget(const Form& form) {
-  if (active_ == &form) active_ = nullptr;
+  active_.Forget(form);
   windows_.erase(&form);
   const auto view = views_.extract(&form);
 }
@@ -142,11 +168,21 @@ void HeadlessDesktop::Forget(const Form& form) {
 void HeadlessDesktop::ShowView(Form& form, Modality modality, Form* owner) {
   Record("Show " + ToUtf8(form.Name()) + (modality == Modality::Modal ? " modal" : "") +
          (owner ? " owner " + ToUtf8(owner->Name()) : ""));
-  Form* const before = active_;
-  if (before && before != &form) before->Form_Deactivate();
-  active_ = &form;
-  if (before != &form) form.Form_Activate();
-  if (modality == Modality::Modal && OnModal) OnModal(form);
+  if (!Focused(form)) MoveFocus(form, FirstFocus(form));
+  active_.Activate(form);
+  if (modality == Modality::Modeless || !OnModal) return;
+  OnModal(form);
+  dispatcher_.UnwindIfEnded();
+}
+
+Control* HeadlessDesktop::Focused(const Form& form) const {
+  const auto view = views_.find(&form);
+  return view == views_.end() ? nullptr : view->second->Focused();
+}
+
+void HeadlessDesktop::MoveFocus(const Form& form, const Control* to) {
+  const auto view = views_.find(&form);
+  if (view != views_.end()) view->second->SetFocus(to);
 }
 
 } // namespace quendra::forms::headless

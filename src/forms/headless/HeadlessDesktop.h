@@ -5,6 +5,7 @@
 #include "forms/controls/ListView.h"
 #include "forms/headless/HeadlessLoop.h"
 #include "forms/loop/Dispatcher.h"
+#include "forms/view/ActiveForm.h"
 
 #include <deque>
 #include <map>
@@ -68,6 +69,9 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   bool MouseDown(Control& control, int button = kLeftButton, int shift = 0, int x = 0, int y = 0);
   /// A key that no control takes: the form's preview, then its Default or Cancel control.
   bool KeyDown(Form& form, int keyCode, int shift = 0);
+  /// A key that goes to the control with the focus: Tab moves on, Enter and Space press a label, and what it
+  /// doesn't take is the form's.
+  bool PressKey(Form& form, int keyCode, int shift = 0);
   bool CloseBox(Form& form);
   /// An item from 0; one that the list lacks can't be chosen.
   bool ChooseItem(ComboBox& combo, int index);
@@ -81,7 +85,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
 
   /// Runs work as the dispatcher runs a handler: a fault shows the run-time's message and ends the program
   /// with status 1; the program's end is kept in Ended and EndStatus. After the end nothing is run.
-  void Dispatch(const std::function<void()>& work) override { dispatcher_.Dispatch(work); }
+  void Dispatch(const std::function<void()>& work) override;
 
   // What stands on the screen.
 
@@ -92,7 +96,9 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   /// FFFFFF text", "Icon 0,0 32x32 of 12 bytes". A copy that covers the whole box takes the source's drawings
   /// in place of its own.
   const std::vector<std::string>& DrawingOf(const PictureBox& box) const;
-  bool IsActive(const Form& form) const { return active_ == &form; }
+  bool IsActive(const Form& form) const { return active_.Is(form); }
+  /// The control that has the focus in a form, nullptr for none.
+  Control* Focused(const Form& form) const;
 
   // Desktop.
 
@@ -124,7 +130,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   void CreateView(Form& form) override;
   void DestroyView(Form& form) override;
   void ShowView(Form& form, Modality modality, Form* owner) override;
-  void LastFormGone() override { End(0); }
+  void LastFormGone() override;
 
   const Scale& ScreenScale() const override { return scale_; }
   int WidthInPixels(const PictureBox& box, TextView text) const override;
@@ -135,7 +141,23 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
  private:
   class FormView;
 
+  /// Something is under way as long as this lives.
+  class Inside {
+   public:
+    explicit Inside(int& depth) : depth_(depth) { ++depth_; }
+    ~Inside() { --depth_; }
+    Inside(const Inside&) = delete;
+    Inside& operator=(const Inside&) = delete;
+
+   private:
+    int& depth_;
+  };
+
+  void ShowBox(const Text& text, int flags, const Text& title);
+  /// Ends the program unless a form was loaded since the last one went.
+  void EndWithoutForms();
   bool Act(Control& control, const std::function<void()>& action);
+  void MoveFocus(const Form& form, const Control* to);
   void Record(std::string call) { Calls.push_back(std::move(call)); }
   void Draw(PictureBox& box, const std::string& drawing);
   std::string NameOfWindow(WindowHandle window) const;
@@ -144,8 +166,10 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   const Scale scale_{};
   Dispatcher dispatcher_;
   std::deque<int> answers_;
-  bool yielding_ = false;
-  Form* active_ = nullptr;
+  int yielding_ = 0;
+  int handlers_ = 0; ///< how many are under way, one inside the other
+  bool lastFormWent_ = false;
+  ActiveForm active_;
   std::unordered_map<const Form*, WindowHandle> windows_;
   std::map<WindowHandle, std::string> windowNames_;
   std::uint32_t lastRegion_ = 0;

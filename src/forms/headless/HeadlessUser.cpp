@@ -1,5 +1,5 @@
 #include "forms/headless/HeadlessDesktop.h"
-#include "forms/view/Keyboard.h"
+#include "forms/view/FocusOrder.h"
 
 namespace quendra::forms::headless {
 
@@ -33,6 +33,22 @@ bool HeadlessDesktop::KeyDown(Form& form, int keyCode, int shift) {
   });
 }
 
+bool HeadlessDesktop::PressKey(Form& form, int keyCode, int shift) {
+  const KeyPress key{keyCode, shift};
+  const Control* focused = Focused(form);
+  const bool tabs = keyCode == kTabKey && (shift == kNoShift || shift == kShift);
+  const auto* label = dynamic_cast<const Label*>(focused);
+  const bool presses = label && PressesLabel(*label, key);
+  if (!tabs && !presses) return KeyDown(form, keyCode, shift);
+  return Act(form, [&] {
+    if (HearsOf(form, key, focused)) form.Form_KeyDown(keyCode, shift);
+    if (presses && label->IsUsable()) label->Click();
+    if (presses) return;
+    const auto direction = shift == kShift ? TabDirection::Backwards : TabDirection::Forwards;
+    MoveFocus(form, NextFocus(form, focused, direction));
+  });
+}
+
 bool HeadlessDesktop::CloseBox(Form& form) {
   return Act(form, [&] { Unload(form); });
 }
@@ -56,17 +72,11 @@ bool HeadlessDesktop::ClickRow(ListView& list, int row) {
 }
 
 bool HeadlessDesktop::Activate(Form& form) {
-  return Act(form, [&] {
-    active_ = &form;
-    form.Form_Activate();
-  });
+  return Act(form, [&] { active_.Activate(form); });
 }
 
 bool HeadlessDesktop::Deactivate(Form& form) {
-  return Act(form, [&] {
-    if (active_ == &form) active_ = nullptr;
-    form.Form_Deactivate();
-  });
+  return Act(form, [&] { active_.Deactivate(form); });
 }
 
 } // namespace quendra::forms::headless

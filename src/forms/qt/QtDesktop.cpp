@@ -36,7 +36,7 @@ QtDesktop::QtDesktop(std::string programName)
                   QCoreApplication::exit),
       mouse_(dispatcher_), keys_(dispatcher_),
       startTimer_([this](int milliseconds, auto tick) { return StartTimer(milliseconds, std::move(tick)); }),
-      context_{*this, dispatcher_, scale_, pictures_, mouse_, startTimer_}, drawing_(scale_),
+      context_{*this, dispatcher_, scale_, pictures_, mouse_, startTimer_, active_}, drawing_(scale_),
       loop_(dispatcher_) {
   DressApplication(*qApp);
   InstallAccessibility();

@@ -110,6 +110,7 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   MouseEvents mouse_;
   KeyEvents keys_;
   TimerStarter startTimer_;
+  ActiveForm active_;
   ViewContext context_;
   QtDrawing drawing_;
   QtEventLoop loop_;

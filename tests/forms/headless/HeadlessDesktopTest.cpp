@@ -1,7 +1,5 @@
 #include "forms/headless/HeadlessDesktop.h"
 
-#include "runtime/Fault.h"
-
 #include <gtest/gtest.h>
 
 namespace quendra::forms::headless {
@@ -37,17 +35,6 @@ using Lines = std::vector<std::string>;
 
 // The dispatcher.
 
-TEST_F(HeadlessDesktopTest, A_fault_that_nobody_traps_shows_the_run_times_message_and_ends_with_status_1) {
-  form.label.Click = [] { throw Fault(Fault::kOverflow); };
-
-  EXPECT_TRUE(desktop.Click(form.label));
-
-  EXPECT_TRUE(desktop.Ended);
-  EXPECT_EQ(desktop.EndStatus, 1);
-  ASSERT_EQ(desktop.Boxes.size(), 1U);
-  EXPECT_EQ(desktop.Boxes[0], (HeadlessDesktop::Box{u"Run-time error '6':\n\nOverflow", 0x10, u"Quendra"}));
-}
-
 TEST_F(HeadlessDesktopTest, Nothing_is_dispatched_after_the_end) {
   int ran = 0;
   desktop.Dispatch([&] { desktop.End(3); });
@@ -61,32 +48,6 @@ TEST_F(HeadlessDesktopTest, Nothing_is_dispatched_after_the_end) {
 
   EXPECT_EQ(desktop.EndStatus, 3);
   EXPECT_EQ(ran, 0);
-}
-
-TEST_F(HeadlessDesktopTest, An_end_inside_a_yield_unwinds_the_handler_that_yielded) {
-  bool reached = false;
-  form.label.Click = [&] {
-    desktop.Post([&] { desktop.End(); });
-    desktop.DoEvents();
-    reached = true;
-  };
-
-  desktop.Click(form.label);
-
-  EXPECT_TRUE(desktop.Ended);
-  EXPECT_FALSE(reached);
-}
-
-TEST_F(HeadlessDesktopTest, A_fault_inside_a_yield_ends_the_program_once) {
-  form.label.Click = [&] {
-    desktop.Post([] { throw Fault(Fault::kSubscript); });
-    desktop.DoEvents();
-  };
-
-  desktop.Click(form.label);
-
-  EXPECT_EQ(desktop.EndStatus, 1);
-  EXPECT_EQ(desktop.Boxes.size(), 1U);
 }
 
 // Boxes and yields.
@@ -127,30 +88,6 @@ TEST_F(HeadlessDesktopTest, The_yield_script_is_not_run_within_itself) {
 }
 
 // The loop.
-
-TEST_F(HeadlessDesktopTest, One_pump_leaves_what_its_work_posted) {
-  int ran = 0;
-  desktop.Post([&] { desktop.Post([&] { ++ran; }); });
-
-  desktop.PumpOnce();
-  EXPECT_EQ(ran, 0);
-  desktop.PumpOnce();
-
-  EXPECT_EQ(ran, 1);
-}
-
-TEST_F(HeadlessDesktopTest, Work_that_yields_lets_the_work_behind_it_run_first) {
-  Lines order;
-  desktop.Post([&] {
-    desktop.DoEvents();
-    order.push_back("first");
-  });
-  desktop.Post([&] { order.push_back("second"); });
-
-  desktop.RunUntilIdle();
-
-  EXPECT_EQ(order, (Lines{"second", "first"}));
-}
 
 TEST_F(HeadlessDesktopTest, Work_that_posts_itself_for_ever_is_found_out) {
   std::function<void()> again = [&] { desktop.Post(again); };
@@ -198,17 +135,6 @@ TEST_F(HeadlessDesktopTest, A_Timer_ticks_while_it_is_enabled) {
   EXPECT_EQ(ticks, 2);
 }
 
-TEST_F(HeadlessDesktopTest, A_Timer_with_interval_0_never_ticks) {
-  int ticks = 0;
-  form.timer.Tick = [&] { ++ticks; };
-  form.timer.Interval = 0;
-  form.timer.Enabled = true;
-
-  desktop.Advance(100);
-
-  EXPECT_EQ(ticks, 0);
-}
-
 TEST_F(HeadlessDesktopTest, A_Timer_may_change_its_interval_and_stop_itself_inside_a_tick) {
   Lines ticks;
   form.timer.Tick = [&] {
@@ -221,37 +147,6 @@ TEST_F(HeadlessDesktopTest, A_Timer_may_change_its_interval_and_stop_itself_insi
   desktop.Advance(200);
 
   EXPECT_EQ(ticks, (Lines{"10", "35", "60"}));
-}
-
-TEST_F(HeadlessDesktopTest, A_Timer_stops_when_its_form_unloads_and_starts_when_it_loads_again) {
-  MainForm keepsTheProgram;
-  desktop.Load(keepsTheProgram);
-  int ticks = 0;
-  form.timer.Tick = [&] { ++ticks; };
-  form.timer.Enabled = true;
-  desktop.Unload(form);
-
-  desktop.Advance(100);
-  EXPECT_EQ(ticks, 0);
-  desktop.Load(form);
-  desktop.Advance(10);
-
-  EXPECT_EQ(ticks, 1);
-}
-
-TEST_F(HeadlessDesktopTest, A_form_that_goes_while_it_is_loaded_leaves_no_timer_behind) {
-  int ticks = 0;
-  {
-    MainForm shortLived;
-    shortLived.timer.Tick = [&] { ++ticks; };
-    desktop.Show(shortLived);
-    shortLived.timer.Enabled = true;
-  }
-
-  desktop.Advance(100);
-  desktop.Show(form);
-
-  EXPECT_EQ(ticks, 0);
 }
 
 // The user.
@@ -289,13 +184,6 @@ TEST_F(HeadlessDesktopTest, Keys_reach_a_form_that_previews_them) {
   EXPECT_TRUE(desktop.KeyDown(form, 'I', kCtrl));
 
   EXPECT_EQ(form.keys, std::vector<int>{'I' * 10 + 2});
-}
-
-TEST_F(HeadlessDesktopTest, The_close_box_unloads_the_form) {
-  EXPECT_TRUE(desktop.CloseBox(form));
-
-  EXPECT_FALSE(form.IsLoaded());
-  EXPECT_TRUE(desktop.Ended);
 }
 
 TEST_F(HeadlessDesktopTest, Choosing_an_item_clicks_the_list_and_an_item_that_is_not_there_cannot_be_chosen) {
@@ -347,29 +235,6 @@ TEST_F(HeadlessDesktopTest, A_box_stands_as_long_as_its_script_runs) {
   EXPECT_EQ(boxes, 1U);
 }
 
-TEST_F(HeadlessDesktopTest, The_end_of_the_program_unwinds_the_handler_whose_box_stands) {
-  desktop.OnBox = [&] { desktop.Dispatch([&] { desktop.End(3); }); };
-
-  EXPECT_THROW(desktop.MessageBox(u"text", 0, u"title"), ProgramEnded);
-}
-
-TEST_F(HeadlessDesktopTest, The_loop_tells_how_many_boxes_and_modal_forms_stand) {
-  MainForm dialog;
-  std::vector<int> depths;
-  desktop.OnBox = [&] { depths.push_back(desktop.ModalDepth()); };
-  desktop.OnModal = [&](Form&) {
-    depths.push_back(desktop.ModalDepth());
-    desktop.MessageBox(u"text", 0, u"title");
-    depths.push_back(desktop.ModalDepth());
-  };
-
-  desktop.Show(dialog, Modality::Modal);
-  desktop.DoEvents();
-  depths.push_back(desktop.ModalDepth());
-
-  EXPECT_EQ(depths, (std::vector<int>{1, 2, 1, 0}));
-}
-
 // What is recorded.
 
 TEST_F(HeadlessDesktopTest, Window_calls_are_recorded_with_names_and_numbers) {
@@ -383,14 +248,6 @@ TEST_F(HeadlessDesktopTest, Window_calls_are_recorded_with_names_and_numbers) {
   EXPECT_EQ(desktop.Calls,
             (Lines{"LoadCursor 32649", "SetCursor 5", "ReleaseCapture", "SendMessage frmMenu 0xA1 2 0",
                    "CreateRoundRectRgn 0 0 400 300 10 10", "SetWindowRgn frmMenu 1 0"}));
-}
-
-TEST_F(HeadlessDesktopTest, A_window_keeps_its_handle) {
-  MainForm second;
-
-  EXPECT_EQ(desktop.HandleOf(form), desktop.HandleOf(form));
-  EXPECT_NE(desktop.HandleOf(form), desktop.HandleOf(second));
-  EXPECT_NE(desktop.HandleOf(form), kNoWindow);
 }
 
 // Drawing.

@@ -87,12 +87,6 @@ TEST_F(Drawing, Measures_are_in_the_unit_of_the_scale_mode) {
   EXPECT_EQ(PixelIn(box, 10, 10), 0xFFFF0000U);
 }
 
-TEST_F(Drawing, Text_is_wider_the_longer_it_is_and_empty_text_has_no_width) {
-  EXPECT_EQ(desktop.TextWidth(box, u""), 0);
-  EXPECT_GT(desktop.TextWidth(box, u"שלום"), 0);
-  EXPECT_GT(desktop.TextWidth(box, u"שלום שלום"), desktop.TextWidth(box, u"שלום"));
-}
-
 TEST_F(Drawing, A_print_in_a_mirrored_form_stands_at_the_right_and_moves_to_the_next_line) {
   box.ForeColour = kWhite;
   box.CurrentX = 0;

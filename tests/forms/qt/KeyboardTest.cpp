@@ -61,36 +61,6 @@ TEST_F(Keyboard, Tab_reaches_every_clickable_label_and_no_other) {
             QStringList({QStringLiteral("second"), QStringLiteral("third"), QStringLiteral("first")}));
 }
 
-TEST_F(Keyboard, Tab_follows_the_tab_index_and_then_the_order_in_the_form) {
-  Label foot(form, u"foot");
-  Frame frame(form, u"frame");
-  Label first(frame, u"first");
-  Label second(form, u"second");
-  foot.TabIndex = 1;
-  MakeButtons({&foot, &first, &second});
-
-  EXPECT_EQ(ReachedByTab(first),
-            QStringList({QStringLiteral("second"), QStringLiteral("foot"), QStringLiteral("first")}));
-}
-
-TEST_F(Keyboard, Hidden_and_disabled_labels_are_passed_over) {
-  Label first(form, u"first");
-  Label hidden(form, u"hidden");
-  Label disabled(form, u"disabled");
-  Label last(form, u"last");
-  MakeButtons({&first, &hidden, &disabled, &last});
-  form.design = [&] {
-    hidden.Visible = false;
-    disabled.Enabled = false;
-  };
-  ShowActive();
-  WidgetOf(first).setFocus();
-
-  PressKey(WidgetOf(first), Qt::Key_Tab, QStringLiteral("\t"));
-
-  EXPECT_EQ(QApplication::focusWidget()->objectName(), QStringLiteral("last"));
-}
-
 TEST_F(Keyboard, Enter_and_Space_press_a_label) {
   Label label(form, u"label");
   int clicks = 0;
@@ -131,31 +101,6 @@ TEST_F(Keyboard, The_focus_ring_goes_when_the_mouse_is_used) {
   PressMouse(WidgetOf(label), {1, 1});
 
   EXPECT_FALSE(WidgetOf(form).testAttribute(Qt::WA_KeyboardFocusChange));
-}
-
-TEST_F(Keyboard, Keys_reach_a_form_with_a_preview_once_and_before_its_control) {
-  Label label(form, u"label");
-  label.Click = [&] { form.keys.push_back({-1, -1}); };
-  form.KeyPreview = true;
-  ShowActive();
-  WidgetOf(label).setFocus();
-
-  PressKey(WidgetOf(label), Qt::Key_Space, QStringLiteral(" "));
-  PressKey(WidgetOf(label), Qt::Key_A, QStringLiteral("a"));
-
-  const std::vector<std::pair<int, int>> expected{{' ', 0}, {-1, -1}, {'A', 0}};
-  EXPECT_EQ(form.keys, expected);
-}
-
-TEST_F(Keyboard, Keys_of_a_control_pass_a_form_without_a_preview) {
-  Label label(form, u"label");
-  label.Click = [] {};
-  ShowActive();
-  WidgetOf(label).setFocus();
-
-  PressKey(WidgetOf(label), Qt::Key_A, QStringLiteral("a"));
-
-  EXPECT_TRUE(form.keys.empty());
 }
 
 TEST_F(Keyboard, Ctrl_and_I_in_the_Latin_layout_give_an_upper_case_I) {
@@ -222,24 +167,6 @@ TEST_F(Keyboard, Ctrl_and_a_letter_over_a_table_belong_to_the_form) {
   EXPECT_EQ(list.SelectedItem()->Key(), u"p1");
 }
 
-TEST_F(Keyboard, Escape_clicks_the_cancel_control_wherever_the_focus_is) {
-  Label label(form, u"label");
-  ComboBox combo(form, u"combo");
-  ListView list(form, u"list");
-  PictureToCancel cancel(form);
-  label.Click = [] {};
-  list.AddColumn({u"name", 3000});
-  list.Add(u"p1", u"alpha", 0);
-  ShowActive();
-
-  for (const Control* focused : std::initializer_list<const Control*>{&label, &combo, &list}) {
-    WidgetOf(*focused).setFocus();
-    PressKey(WidgetOf(*focused), Qt::Key_Escape, QStringLiteral("\x1b"));
-  }
-
-  EXPECT_EQ(cancel.clicks, 3);
-}
-
 TEST_F(Keyboard, Escape_and_Enter_click_in_a_form_where_nothing_takes_the_focus) {
   PictureToCancel cancel(form);
   form.Default = form.Cancel;
@@ -250,21 +177,6 @@ TEST_F(Keyboard, Escape_and_Enter_click_in_a_form_where_nothing_takes_the_focus)
   PressKey(WidgetOf(form), Qt::Key_Enter, QStringLiteral("\r"));
 
   EXPECT_EQ(cancel.clicks, 3);
-}
-
-TEST_F(Keyboard, Enter_presses_the_label_that_has_the_focus_and_not_the_default_one) {
-  Label ok(form, u"ok");
-  Label other(form, u"other");
-  std::string pressed;
-  ok.Click = [&] { pressed += "ok "; };
-  other.Click = [&] { pressed += "other "; };
-  form.Default = &ok;
-  ShowActive();
-  WidgetOf(other).setFocus();
-
-  PressKey(WidgetOf(other), Qt::Key_Return, QStringLiteral("\r"));
-
-  EXPECT_EQ(pressed, "other ");
 }
 
 TEST_F(Keyboard, A_key_that_is_held_down_clicks_once) {
@@ -316,42 +228,6 @@ TEST_F(Keyboard, A_held_key_goes_on_in_a_list) {
   SendKey(view, QEvent::KeyPress, Qt::Key_Down, 1500);
 
   EXPECT_EQ(view.currentIndex().row(), row + 1);
-}
-
-TEST_F(Keyboard, Escape_may_unload_the_form_that_it_reached) {
-  TestForm other;
-  desktop.Show(other);
-  Image picture(form, u"picture");
-  picture.Click = [&] { desktop.Unload(form); };
-  form.Cancel = &picture;
-  ShowActive();
-
-  PressKey(WidgetOf(form), Qt::Key_Escape);
-
-  EXPECT_FALSE(form.IsLoaded());
-}
-
-TEST_F(Keyboard, The_first_control_of_the_tab_order_has_the_focus_when_a_form_comes_up) {
-  Label link(form, u"link");
-  Label button(form, u"button");
-  link.TabIndex = 1;
-  link.Click = [] {};
-  button.Click = [] {};
-
-  ShowActive();
-
-  EXPECT_TRUE(RunUntil([&] { return QApplication::focusWidget() == &WidgetOf(button); }));
-}
-
-TEST_F(Keyboard, A_form_where_nothing_takes_the_focus_comes_up_all_the_same) {
-  Label first(form, u"first");
-  Label second(form, u"second");
-  second.TabIndex = -1;
-
-  ShowActive();
-
-  EXPECT_TRUE(WidgetOf(form).isVisible());
-  EXPECT_FALSE(WidgetOf(first).hasFocus());
 }
 
 } // namespace quendra::forms::qt

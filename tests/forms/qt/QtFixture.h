@@ -37,12 +37,7 @@ struct TestForm : Form {
 
 /// A desktop on a screen that nobody sees, and a form for it.
 class QtFixture : public testing::Test {
- protected:
-  QtFixture();
-  ~QtFixture() override;
-
-  /// Shows the form and makes its window the active one, as a window manager would.
-  void ShowActive();
+ public:
   /// The widget that shows a control.
   static QWidget& WidgetOf(const Control& control);
   template <typename Kind> static Kind& As(const Control& control) {
@@ -58,6 +53,12 @@ class QtFixture : public testing::Test {
                        Qt::KeyboardModifiers modifiers = {}, quint32 symbol = 0);
   static QColor PixelOf(QWidget& widget, int x, int y);
 
+ protected:
+  QtFixture();
+  ~QtFixture() override;
+
+  /// Shows the form and makes its window the active one, as a window manager would.
+  void ShowActive();
   /// Runs the loop until `done` says so, for five seconds at most; false when the time ran out.
   bool RunUntil(const std::function<bool()>& done);
   /// Answers the next message box by its button as soon as it is up, and keeps what it said.

@@ -212,42 +212,6 @@ TEST_F(Views, Latin_items_of_a_combo_box_are_set_apart_from_the_reading_directio
   EXPECT_EQ(As<QComboBox>(combo).itemText(0), QStringLiteral(u"\u2066eth0 (10.0.0.5)\u2069"));
 }
 
-TEST_F(Views, A_timer_ticks_while_it_is_enabled_and_stops_with_its_form) {
-  Timer timer(form, u"ReDrawTimer", 1, true);
-  int ticks = 0;
-  timer.Tick = [&] { ++ticks; };
-  TestForm other;
-  desktop.Load(other);
-  desktop.Load(form);
-  ASSERT_TRUE(RunUntil([&] { return ticks >= 3; }));
-
-  timer.Enabled = false;
-  const int whenDisabled = ticks;
-  bool passed = false;
-  const auto after = desktop.StartTimer(20, [&] { passed = true; });
-  ASSERT_TRUE(RunUntil([&] { return passed; }));
-  EXPECT_EQ(ticks, whenDisabled);
-
-  timer.Enabled = true;
-  desktop.Unload(form);
-  passed = false;
-  ASSERT_TRUE(RunUntil([&] { return passed; }));
-  EXPECT_EQ(ticks, whenDisabled);
-}
-
-TEST_F(Views, A_timer_without_an_interval_never_ticks) {
-  Timer timer(form, u"timer", 0, true);
-  int ticks = 0;
-  timer.Tick = [&] { ++ticks; };
-  desktop.Load(form);
-  bool passed = false;
-  const auto after = desktop.StartTimer(10, [&] { passed = true; });
-
-  ASSERT_TRUE(RunUntil([&] { return passed; }));
-
-  EXPECT_EQ(ticks, 0);
-}
-
 TEST_F(Views, An_unloaded_form_lets_go_of_its_controls) {
   Label label(form, u"lblText");
   ListView list(form, u"list");

@@ -113,37 +113,9 @@ TEST_F(Window, A_region_belongs_to_the_window_that_took_it) {
   EXPECT_TRUE(WidgetOf(other).mask().isEmpty());
 }
 
-TEST_F(Window, Handles_differ_and_end_with_their_window) {
-  TestForm other;
-  desktop.Load(form);
-  desktop.Load(other);
-  const WindowHandle handle = desktop.HandleOf(form);
-  EXPECT_NE(handle, kNoWindow);
-  EXPECT_NE(handle, desktop.HandleOf(other));
-
-  desktop.Unload(form);
-
-  EXPECT_EQ(desktop.HandleOf(form), kNoWindow);
-  EXPECT_EQ(desktop.SendMessage(handle, 0xA1, 2, 0), 0);
-  desktop.SetWindowRgn(handle, {}, true);
-}
-
 TEST_F(Window, Twips_follow_the_screens_logical_resolution) {
   EXPECT_DOUBLE_EQ(desktop.TwipsPerPixelX(), 1440 / QGuiApplication::primaryScreen()->logicalDotsPerInchX());
   EXPECT_DOUBLE_EQ(desktop.TwipsPerPixelY(), 15);
-}
-
-TEST_F(Window, A_form_can_be_shown_again_after_it_was_unloaded) {
-  Label label(form, u"label");
-  desktop.Show(form);
-  TestForm other;
-  desktop.Load(other);
-  desktop.Unload(form);
-
-  desktop.Show(form);
-
-  EXPECT_TRUE(WidgetOf(form).isVisible());
-  EXPECT_NE(label.View(), nullptr);
 }
 
 } // namespace quendra::forms::qt

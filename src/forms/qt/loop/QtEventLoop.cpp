@@ -1,5 +1,6 @@
 #include "forms/qt/loop/QtEventLoop.h"
 
+#include <QAbstractEventDispatcher>
 #include <QCoreApplication>
 #include <QEvent>
 #include <QPointer>
@@ -85,6 +86,9 @@ std::unique_ptr<platform::EventLoop::Subscription> QtEventLoop::StartTimer(int m
 }
 
 void QtEventLoop::PumpOnce() {
+  // Within a piece of work the toolkit takes those posted before it began for handled, and would pass them
+  // over.
+  if (!posted_.IsEmpty()) QAbstractEventDispatcher::instance()->wakeUp();
   QCoreApplication::processEvents();
   gate_.Pumped();
   dispatcher_.UnwindIfEnded();

@@ -82,11 +82,13 @@ void FormView::OrderTabs() const {
 
 void FormView::Release() {
   if (!TheControl()) return;
+  Context().active.Forget(*TheForm());
   for (View* view : views_) view->Release();
   WidgetView::Release();
 }
 
 void FormView::ControlGone() {
+  Context().active.Forget(*TheForm());
   WidgetView::ControlGone();
   if (modalLoop_) modalLoop_->quit();
   hide();
@@ -223,9 +225,9 @@ void FormView::changeEvent(QEvent* event) {
   if (event->type() != QEvent::ActivationChange || !TheForm()) return;
   Context().dispatcher.Dispatch([this] {
     if (isActiveWindow())
-      TheForm()->Form_Activate();
+      Context().active.Activate(*TheForm());
     else
-      TheForm()->Form_Deactivate();
+      Context().active.Deactivate(*TheForm());
   });
 }
 

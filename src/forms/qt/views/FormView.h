@@ -19,7 +19,8 @@ class FormContext {
  protected:
   explicit FormContext(const ViewContext& desktops)
       : scale_(desktops.scale), shared_{desktops.desktop,  desktops.dispatcher, scale_,
-                                        desktops.pictures, desktops.mouse,      desktops.startTimer} {}
+                                        desktops.pictures, desktops.mouse,      desktops.startTimer,
+                                        desktops.active} {}
 
   Scale scale_;
   ViewContext shared_;

@@ -6,6 +6,7 @@
 #include "forms/qt/drawing/Conversion.h"
 #include "forms/qt/drawing/PictureStore.h"
 #include "forms/view/Accessible.h"
+#include "forms/view/ActiveForm.h"
 #include "forms/view/View.h"
 
 #include <QWidget>
@@ -23,6 +24,7 @@ struct ViewContext {
   PictureStore& pictures;
   MouseEvents& mouse;
   const TimerStarter& startTimer;
+  ActiveForm& active;
 };
 
 /// What all widgets that stand for a control have in common. Made as the second base of the widget itself.
