@@ -1,7 +1,7 @@
 #pragma once
 
 #include <cstdint>
-#include <functional>
+#include <utility>
 
 namespace quendra::forms {
 
@@ -10,17 +10,18 @@ namespace quendra::forms {
 /// program is seen by a flag, and what comes from outside (the user, descriptors, timers) is looked for when
 /// a coarse clock has moved on, every few milliseconds: reading that clock costs some nanoseconds, and nobody
 /// sees the delay.
-class PumpGate {
+///
+/// `Clock` is called for the time of a clock that moves every few milliseconds and is cheap to read.
+template <typename Clock> class PumpGate {
  public:
-  /// `now` reads a clock that moves every few milliseconds and is cheap to read.
-  explicit PumpGate(std::function<std::int64_t()> now) : now_(std::move(now)) {}
+  explicit PumpGate(Clock now = {}) : now_(std::move(now)) {}
 
   bool IsDue(bool workWaits) const { return workWaits || now_() != lastPump_; }
   /// Everything that waited has been handled.
   void Pumped() { lastPump_ = now_(); }
 
  private:
-  std::function<std::int64_t()> now_;
+  Clock now_;
   std::int64_t lastPump_ = 0;
 };
 

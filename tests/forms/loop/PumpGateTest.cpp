@@ -2,12 +2,14 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
+
 namespace quendra::forms {
 namespace {
 
 struct PumpGateTest : testing::Test {
   std::int64_t now = 1;
-  PumpGate gate{[this] { return now; }};
+  PumpGate<std::function<std::int64_t()>> gate{[this] { return now; }};
 };
 
 TEST_F(PumpGateTest, The_first_pump_is_due) { EXPECT_TRUE(gate.IsDue(false)); }

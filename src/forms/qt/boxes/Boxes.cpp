@@ -107,7 +107,7 @@ int ShowBox(QWidget* owner, const Text& text, int flags, const Text& title) {
   LayOut(box);
   if (first) first->setFocus();
   box.exec();
-  // None is pressed where the program ends behind the box.
+  // None is pressed where the program ends while the box stands.
   const QAbstractButton* pressed = box.clickedButton();
   return pressed ? pressed->property(kNumber).toInt() : content.defaultButton;
 }

@@ -7,8 +7,6 @@
 #include <QSocketNotifier>
 #include <QTimer>
 
-#include <ctime>
-
 namespace quendra::forms::qt {
 
 namespace {
@@ -31,16 +29,7 @@ template <typename Source> class SourceSubscription : public platform::EventLoop
   QPointer<Source> source_;
 };
 
-/// Nanoseconds; moves with the kernel's tick.
-std::int64_t CoarseNow() {
-  timespec now{};
-  clock_gettime(CLOCK_MONOTONIC_COARSE, &now);
-  return now.tv_sec * 1'000'000'000LL + now.tv_nsec;
-}
-
 } // namespace
-
-QtEventLoop::QtEventLoop(Dispatcher& dispatcher) : dispatcher_(dispatcher), gate_(CoarseNow) {}
 
 void QtEventLoop::Post(std::function<void()> work) {
   {

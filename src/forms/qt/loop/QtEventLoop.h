@@ -8,6 +8,7 @@
 #include <QObject>
 
 #include <atomic>
+#include <ctime>
 #include <mutex>
 #include <vector>
 
@@ -16,7 +17,7 @@ namespace quendra::forms::qt {
 /// The program's loop over the toolkit's.
 class QtEventLoop : public QObject {
  public:
-  explicit QtEventLoop(Dispatcher& dispatcher);
+  explicit QtEventLoop(Dispatcher& dispatcher) : dispatcher_(dispatcher) {}
 
   /// From any thread.
   void Post(std::function<void()> work);
@@ -34,6 +35,15 @@ class QtEventLoop : public QObject {
   bool event(QEvent* event) override;
 
  private:
+  /// Nanoseconds, moving with the kernel's tick.
+  struct CoarseClock {
+    std::int64_t operator()() const {
+      timespec now{};
+      clock_gettime(CLOCK_MONOTONIC_COARSE, &now);
+      return now.tv_sec * 1'000'000'000LL + now.tv_nsec;
+    }
+  };
+
   void Collect();
 
   Dispatcher& dispatcher_;
@@ -41,7 +51,7 @@ class QtEventLoop : public QObject {
   std::vector<PostedWork::Work> arrived_;
   std::atomic<bool> workArrived_ = false;
   PostedWork posted_;
-  PumpGate gate_;
+  PumpGate<CoarseClock> gate_;
 };
 
 } // namespace quendra::forms::qt
