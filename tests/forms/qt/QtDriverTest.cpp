@@ -47,6 +47,8 @@ BoxSign SignOf(QMessageBox::Icon icon) {
 /// The user of the toolkit's desktop, on a screen that nobody sees.
 class QtDriver : public DesktopDriver {
  public:
+  QtDriver() { ForgetEarlierEnds(); }
+
   Desktop& TheDesktop() override { return desktop_; }
   platform::EventLoop& Loop() override { return desktop_; }
 
@@ -87,7 +89,7 @@ class QtDriver : public DesktopDriver {
   }
   void PressCloseBox(Form& form) override { QtFixture::WidgetOf(form).close(); }
   void AnswerBox(SeenBox& seen, int button) override {
-    QTimer::singleShot(1, qApp, [this, &seen, button] {
+    QTimer::singleShot(1, &answers_, [this, &seen, button] {
       auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
       if (!box || !box->isVisible()) return AnswerBox(seen, button);
       Look(*box, seen);
@@ -122,6 +124,7 @@ class QtDriver : public DesktopDriver {
   }
 
   QtDesktop desktop_{"forms_qt_test"};
+  QObject answers_; ///< what waits for a box goes with the user
 };
 
 std::unique_ptr<DesktopDriver> MakeDriver() { return std::make_unique<QtDriver>(); }

@@ -40,7 +40,12 @@ void SendMouse(QWidget& widget, QEvent::Type type, QPoint place, Qt::MouseButton
 
 } // namespace
 
-QtFixture::QtFixture() : desktop(programName) {}
+void ForgetEarlierEnds() {
+  QTimer::singleShot(0, qApp, &QCoreApplication::quit);
+  QCoreApplication::exec();
+}
+
+QtFixture::QtFixture() : desktop(programName) { ForgetEarlierEnds(); }
 
 QtFixture::~QtFixture() { form.unload = {}; }
 
@@ -89,7 +94,7 @@ bool QtFixture::RunUntil(const std::function<bool()>& done) {
 }
 
 void QtFixture::AnswerBox(Box& answered) {
-  QTimer::singleShot(0, qApp, [this, &answered] {
+  QTimer::singleShot(0, &answers_, [this, &answered] {
     auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
     if (!box) return AnswerBox(answered);
     QAbstractButton* button = box->buttons().constFirst();

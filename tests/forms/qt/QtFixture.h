@@ -35,6 +35,10 @@ struct TestForm : Form {
   int activations = 0;
 };
 
+/// Takes back that a program of an earlier test ended outside of its loop: the toolkit would let no loop of
+/// its process run any more.
+void ForgetEarlierEnds();
+
 /// A desktop on a screen that nobody sees, and a form for it.
 class QtFixture : public testing::Test {
  public:
@@ -74,6 +78,9 @@ class QtFixture : public testing::Test {
 
   QtDesktop desktop;
   TestForm form;
+
+ private:
+  QObject answers_; ///< what waits for a box goes with the test
 };
 
 inline constexpr int kPixel = 15;
