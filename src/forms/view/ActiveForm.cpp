@@ -18,7 +18,7 @@ void ActiveForm::Deactivate(Form& form) {
   form.Form_Deactivate();
 }
 
-void ActiveForm::Forget(const Form& form) {
+void ActiveForm::Forget(const Control& form) {
   if (form_ == &form) form_ = nullptr;
 }
 

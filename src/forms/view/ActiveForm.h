@@ -10,8 +10,8 @@ class ActiveForm {
  public:
   void Activate(Form& form);
   void Deactivate(Form& form);
-  /// The form goes and hears nothing any more.
-  void Forget(const Form& form);
+  /// The form, of which no more than the control may be left, goes and hears nothing any more.
+  void Forget(const Control& form);
   bool Is(const Form& form) const { return form_ == &form; }
 
  private:

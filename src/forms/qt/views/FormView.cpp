@@ -88,7 +88,7 @@ void FormView::Release() {
 }
 
 void FormView::ControlGone() {
-  Context().active.Forget(*TheForm());
+  Context().active.Forget(*TheControl());
   WidgetView::ControlGone();
   if (modalLoop_) modalLoop_->quit();
   hide();
