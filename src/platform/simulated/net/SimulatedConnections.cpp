@@ -46,7 +46,7 @@ std::int32_t SimulatedConnections::Connect(const End& end, const SocketAddress& 
 
 SimulatedConnections::End SimulatedConnections::Accept(SocketEnd& listener) {
   if (listener.backlog.empty()) return nullptr;
-  const End end = listener.backlog.front();
+  End end = listener.backlog.front();
   listener.backlog.pop_front();
   end->selection.Select(listener.selection.window, listener.selection.message, listener.selection.mask);
   return end;
