@@ -116,6 +116,9 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   RegionHandle CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
                                   int ellipseHeight) override;
   void SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) override;
+  bool SetWindowPos(WindowHandle window, InsertAfter insertAfter, int x, int y, int cx, int cy,
+                    unsigned flags) override;
+  void Repaint(Control& control) override;
   void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) override;
   void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
               int sourceY) override;

@@ -24,6 +24,7 @@ class Describer : public ControlVisitor {
   void Visit(ComboBox& combo) override {
     if (const auto* frame = dynamic_cast<const Frame*>(combo.Parent())) Description.name = CaptionOf(*frame);
   }
+  void Visit(CommandButton& button) override { Visit(static_cast<Label&>(button)); }
   void Visit(Frame& frame) override {
     Description.role = Role::Grouping;
     Description.name = CaptionOf(frame);
@@ -38,6 +39,7 @@ class Describer : public ControlVisitor {
   void Visit(Line& /*line*/) override { Description.role = Role::Separator; }
   void Visit(ListView& /*list*/) override {}
   void Visit(PictureBox& /*box*/) override { Description.role = Role::Graphic; }
+  void Visit(TextBox& /*box*/) override {}
   void Visit(Timer& /*timer*/) override {}
 };
 

@@ -62,6 +62,8 @@ void WidgetView::PlaceAt(const Geometry& geometry) {
   widget_.setGeometry(ToQRect(PlaceOf(geometry, container, context_.scale, direction_)));
 }
 
+void WidgetView::Repaint() { widget_.repaint(); }
+
 void WidgetView::Press() {
   context_.dispatcher.Dispatch([this] {
     if (control_ && control_->IsUsable()) control_->Click();
