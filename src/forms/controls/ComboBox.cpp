@@ -8,7 +8,7 @@ void ComboBox::Clear() {
   if (items_.empty()) return;
   items_.clear();
   selected_ = -1;
-  if (!FreeText) ReplaceText({});
+  ReplaceText({});
   TellChanged(*this, Aspect::Items);
 }
 
@@ -27,7 +27,7 @@ void ComboBox::SelectItem(int index) {
   const int selected = there ? index : -1;
   if (selected != selected_) {
     selected_ = selected;
-    if (there || !FreeText) ReplaceText(SelectedText());
+    ReplaceText(SelectedText());
     TellChanged(*this, Aspect::Selection);
   }
   if (there) Click();

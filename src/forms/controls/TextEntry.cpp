@@ -7,15 +7,14 @@ namespace quendra::forms {
 void TextEntry::WriteText(Text text) {
   if (!TakesText() || text == text_) return;
   ReplaceText(std::move(text));
+  TellChanged(owner_, Aspect::Entry);
   TextChanged();
   Change();
 }
 
 void TextEntry::ReplaceText(Text text) {
-  if (text == text_) return;
   text_ = std::move(text);
   Keep(0, 0);
-  TellChanged(owner_, Aspect::Entry);
 }
 
 void TextEntry::Edited(Text text, int caret) {

@@ -38,6 +38,9 @@ class TextEntry {
   /// swallows the key.
   Event<int&> KeyPress;
 
+  /// What assistive technology says of the field. Empty where a label before it says that.
+  Text Description;
+
   // What views tell.
 
   /// The user has edited the text, as the view shows already; the caret stands at `caret`.
@@ -50,7 +53,7 @@ class TextEntry {
   virtual bool TakesText() const { return true; }
   /// The text is not what it was any more.
   virtual void TextChanged() {}
-  /// Another text without Change, as when an item is chosen.
+  /// Another text, of which the view and the handlers hear in another way.
   void ReplaceText(Text text);
 
  private:

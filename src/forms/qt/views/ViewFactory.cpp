@@ -30,8 +30,10 @@ class ViewMaker : public ControlVisitor {
   void Visit(ListView& list) override { Make<ListViewView>(list); }
   void Visit(PictureBox& box) override { Make<PictureBoxView>(box); }
   void Visit(TextBox& box) override {
-    if (box.MultiLine) return Make<TextAreaView>(box);
-    Make<TextLineView>(box);
+    if (box.MultiLine)
+      Make<TextAreaView>(box);
+    else
+      Make<TextLineView>(box);
   }
   void Visit(Timer& timer) override { Made = {new TimerView(timer, context_.startTimer), nullptr}; }
 

@@ -2,6 +2,8 @@
 
 #include "forms/qt/input/MouseEvents.h"
 
+#include <QAbstractScrollArea>
+
 namespace quendra::forms::qt {
 
 WidgetView::WidgetView(ViewContext& context, Control& control, QWidget& widget)
@@ -62,7 +64,11 @@ void WidgetView::PlaceAt(const Geometry& geometry) {
   widget_.setGeometry(ToQRect(PlaceOf(geometry, container, context_.scale, direction_)));
 }
 
-void WidgetView::Repaint() { widget_.repaint(); }
+void WidgetView::Repaint() {
+  // What a scroll area shows is its viewport's.
+  const auto* area = qobject_cast<QAbstractScrollArea*>(&widget_);
+  (area ? *area->viewport() : widget_).repaint();
+}
 
 void WidgetView::Press() {
   context_.dispatcher.Dispatch([this] {

@@ -45,7 +45,7 @@ class WidgetView : public View {
   Direction ReadingDirection() const { return direction_; }
 
   /// Draws the control and what it holds at once.
-  virtual void Repaint();
+  void Repaint();
   /// A press by the mouse, a key or assistive technology.
   void Press();
   /// False for widgets that need mouse events for themselves, too.
