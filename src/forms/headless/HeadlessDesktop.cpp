@@ -2,6 +2,7 @@
 
 #include "forms/loop/TimerView.h"
 #include "forms/view/FocusOrder.h"
+#include "forms/view/Typing.h"
 
 #include <algorithm>
 
@@ -196,9 +197,11 @@ Control* HeadlessDesktop::Focused(const Form& form) const {
   return view == views_.end() ? nullptr : view->second->Focused();
 }
 
-void HeadlessDesktop::MoveFocus(const Form& form, const Control* to) {
+void HeadlessDesktop::MoveFocus(const Form& form, Control* to) {
   const auto view = views_.find(&form);
-  if (view != views_.end()) view->second->SetFocus(to);
+  if (view == views_.end() || view->second->Focused() == to) return;
+  view->second->SetFocus(to);
+  if (TextEntry* field = to ? FieldOf(*to) : nullptr) field->GotFocus();
 }
 
 } // namespace quendra::forms::headless

@@ -1,5 +1,7 @@
 #include "forms/view/Typing.h"
 
+#include "forms/controls/ComboBox.h"
+
 namespace quendra::forms {
 
 namespace {
@@ -18,6 +20,11 @@ Text TextOfCharacter(int character) {
 }
 
 } // namespace
+
+TextEntry* FieldOf(Control& control) {
+  const auto* combo = dynamic_cast<const ComboBox*>(&control);
+  return combo && !combo->FreeText ? nullptr : dynamic_cast<TextEntry*>(&control);
+}
 
 bool IsTyped(const Form& form, const KeyPress& key) {
   const bool usesAlt = (key.shift & kAlt) != 0;

@@ -19,6 +19,9 @@ struct Typing {
   friend bool operator==(const Typing&, const Typing&) = default;
 };
 
+/// What is typed into in this control: nullptr for one without a field.
+TextEntry* FieldOf(Control& control);
+
 /// Whether a key that gives a character is one for the field that has the focus. Tab moves the focus, Alt
 /// belongs to menus, and Enter and Escape press the form's Default and Cancel where it has them.
 bool IsTyped(const Form& form, const KeyPress& key);

@@ -17,8 +17,10 @@ EntryLine::EntryLine(Dispatcher& dispatcher, const Control& control, TextEntry& 
     : QLineEdit(parent),
       keys_(dispatcher, control, entry,
             {false, [this](const QString& text) { insert(text); }, [this] { backspace(); }}) {
-  connect(this, &QLineEdit::textEdited, this,
-          [this](const QString& text) { keys_.Edited(text, cursorPosition()); });
+  connect(this, &QLineEdit::textEdited, this, [this](const QString& text) {
+    setLayoutDirection(ToQt(DirectionOf(ToText(text))));
+    keys_.Edited(text, cursorPosition());
+  });
   connect(this, &QLineEdit::selectionChanged, this, [this] { TellSelection(); });
   connect(this, &QLineEdit::cursorPositionChanged, this, [this] { TellSelection(); });
 }
