@@ -27,11 +27,13 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
       captureSession(machine.captureLibrary, machine.system, monitorPage.adapters, packetControl,
                      ownAddresses),
 
+      sniffer(machine.sockets, monitorPage.table.main_ListView1, monitorPage.main_Timer1, ownAddresses),
+
       modSocketPlus(machine.sockets, machine.hostNames, desktop),
       supportExchange(modSocketPlus, desktop, monitorPage.reporting, processTable, monitorPage.main_Timer1),
 
       captureSetup(machine.shellStart, frmSplash, frmMenu, captureSession, packetControl),
-      monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession) {
+      monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession, sniffer) {
   frmMenu.Add(monitorPage);
   frmMenu.Add(surfPage);
   frmMenu.Add(firstConnectionPage);

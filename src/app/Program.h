@@ -3,6 +3,7 @@
 #include "capture/CaptureSession.h"
 #include "capture/HostAddresses.h"
 #include "capture/PacketAttribution.h"
+#include "capture/dormant/Sniffer.h"
 #include "diagnostics/SurfPage.h"
 #include "forms/Desktop.h"
 #include "foundation/modSocketPlus.h"
@@ -58,6 +59,8 @@ class Program {
   capture::PacketControl packetControl;
   capture::PacketAttribution packetAttribution;
   capture::CaptureSession captureSession;
+
+  capture::Sniffer sniffer;
 
   foundation::modSocketPlus modSocketPlus;
   report::SupportExchange supportExchange;

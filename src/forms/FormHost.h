@@ -22,6 +22,8 @@ class FormHost {
   /// the last form has gone the program ends with status 0.
   void Unload(Form& form);
   virtual WindowHandle HandleOf(Form& form) = 0;
+  /// Shows the control, or the form, as it is now, for whoever holds the thread. Handles no message.
+  virtual void Repaint(Control& control) = 0;
 
  protected:
   /// A message box or a modal form, counted as standing as long as this lives.

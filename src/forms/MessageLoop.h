@@ -14,6 +14,7 @@ struct ProgramEnded {
 enum BoxFlags : int {
   kYesNo = 0x4,
   kCritical = 0x10,
+  kQuestion = 0x20,
   kExclamation = 0x30,
   kInformation = 0x40,
   kRightAligned = 0x80000,

@@ -10,6 +10,10 @@ using RegionHandle = OpaqueHandle<struct RegionKind>;
 using CursorHandle = OpaqueHandle<struct CursorKind>;
 inline constexpr CursorHandle kNoCursor;
 
+/// Where a window comes to stand, and parts of SetWindowPos that are left out, as the platform numbers them.
+enum class InsertAfter : int { NotTopmost = -2, Topmost = -1, Top = 0, Bottom = 1 };
+enum PositionFlags : unsigned { kKeepsSize = 1, kKeepsPlace = 2, kKeepsOrder = 4 };
+
 /// Mouse pointer, shape and messages of windows.
 class WindowOperations {
  public:
@@ -27,6 +31,10 @@ class WindowOperations {
   virtual RegionHandle CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
                                           int ellipseHeight) = 0;
   virtual void SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) = 0;
+  /// Puts a window in front of others or behind them, at a place of the screen in pixels, or only one of
+  /// both. False for a handle that is no form's, and for a new size: a form's size is its own.
+  virtual bool SetWindowPos(WindowHandle window, InsertAfter insertAfter, int x, int y, int cx, int cy,
+                            unsigned flags) = 0;
 };
 
 } // namespace quendra::forms

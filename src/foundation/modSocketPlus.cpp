@@ -128,8 +128,9 @@ void modSocketPlus::AttachDispatcher() {
                                           owner = resolves_.OwnerOf(platform::LookUpHandle(wParam));
                                         if (message == kSocketMessage)
                                           owner = socketOwners_.OwnerOf(platform::SocketHandle(wParam));
-                                        return owner ? owner->WndProc(window, message, wParam, lParam)
-                                                     : (*previous)(window, message, wParam, lParam);
+                                        return owner
+                                                   ? owner->WndProc(window, message, wParam, lParam)
+                                                   : windows_.Call(previous, window, message, wParam, lParam);
                                       }));
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "capture/CaptureSession.h"
+#include "capture/dormant/Sniffer.h"
 #include "monitor/ProcessTable.h"
 #include "report/SupportExchange.h"
 #include "shell/MonitorPage.h"
@@ -12,7 +13,7 @@ namespace quendra::shell {
 class MonitorWork {
  public:
   MonitorWork(MonitorPage& page, monitor::ProcessTable& table, report::SupportExchange& support,
-              capture::OwnAddresses& addresses, capture::CaptureSession& capture);
+              capture::OwnAddresses& addresses, capture::CaptureSession& capture, capture::Sniffer& sniffer);
 
   void main_StartPage();
   void main_StopPage();
@@ -27,6 +28,7 @@ class MonitorWork {
   report::SupportExchange& support_;
   capture::OwnAddresses& addresses_;
   capture::CaptureSession& capture_;
+  capture::Sniffer& sniffer_;
 };
 
 } // namespace quendra::shell

@@ -97,6 +97,21 @@ TEST_F(MonitorPageSwitchTest, The_start_clears_the_pinned_sort) {
   EXPECT_EQ(program.processTable.SortPinned, 0);
 }
 
+TEST_F(MonitorPageSwitchTest, The_stop_tears_the_dormant_sniffer_down_when_its_flag_is_set) {
+  ComeHome();
+  ClickEntry(0);
+  machine.Calls.clear();
+  program.monitorWork.main_StopPage();
+  EXPECT_EQ(std::count(machine.Calls.begin(), machine.Calls.end(), "WSAIsBlocking"), 0);
+
+  ClickEntry(0);
+  program.sniffer.Active = true;
+  program.monitorWork.main_StopPage();
+
+  EXPECT_FALSE(program.sniffer.Active);
+  EXPECT_EQ(std::count(machine.Calls.begin(), machine.Calls.end(), "WSAIsBlocking"), 1);
+}
+
 TEST_F(MonitorPageSwitchTest, The_stop_releases_the_sockets_ends_the_session_pauses_and_stops_the_control) {
   ComeHome();
   ClickEntry(0);

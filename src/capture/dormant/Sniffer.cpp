@@ -53,11 +53,11 @@ SniffedPacket ReadSniffedPacket(std::span<const std::uint8_t, 2000> buffer) {
   return packet;
 }
 
-void Sniffer::iSubCls_Antes(std::int32_t&, std::int32_t&, WindowHandle, std::uint32_t, std::uint32_t,
-                            std::uint32_t) {}
+void Sniffer::Antes(std::int32_t&, std::int32_t&, WindowHandle, std::uint32_t, std::uint32_t, std::uint32_t) {
+}
 
-void Sniffer::iSubCls_Despues(std::int32_t&, WindowHandle, std::uint32_t, std::uint32_t wParam,
-                              std::uint32_t lParam) {
+void Sniffer::Despues(std::int32_t&, WindowHandle, std::uint32_t, std::uint32_t wParam,
+                      std::uint32_t lParam) {
   if (lParam != kReadable) return;
   std::int32_t received = kBufferSize;
   while (received == kBufferSize) {
@@ -104,8 +104,8 @@ void Sniffer::Teardown() {
   if (sockets_.WSAIsBlocking()) sockets_.WSACancelBlockingCall();
   sockets_.WSACleanup();
   DeselectAndCloseSockets();
-  if (UnSubclass) UnSubclass();
-  UnSubclass = nullptr;
+  if (Subclass) Subclass->UnSubclass();
+  Subclass.reset();
   Active = false;
 }
 

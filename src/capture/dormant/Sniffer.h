@@ -3,9 +3,10 @@
 #include "capture/OwnAddresses.h"
 #include "forms/controls/Controls.h"
 #include "forms/controls/ListView.h"
+#include "foundation/cSubCls.h"
 #include "platform/net/Sockets.h"
 
-#include <functional>
+#include <memory>
 #include <optional>
 #include <span>
 
@@ -29,7 +30,7 @@ SniffedPacket ReadSniffedPacket(std::span<const std::uint8_t, 2000> buffer);
 
 /// A second way to the packets, over raw sockets. Complete but never used: nothing opens its sockets or lets
 /// it see window messages, so its flag stays false.
-class Sniffer {
+class Sniffer : public foundation::iSubCls {
  public:
   Sniffer(platform::Sockets& sockets, forms::ListView& main_ListView1, forms::Timer& main_Timer1,
           const OwnAddresses& addresses)
@@ -39,15 +40,15 @@ class Sniffer {
   bool Active = false;
   std::array<platform::SocketHandle, 2> Sockets{};
   WindowHandle Window;
-  /// Releases the window's subclass; dropped after the teardown.
-  std::function<void()> UnSubclass;
+  /// Lets it see the messages of the window; released by the teardown.
+  std::unique_ptr<foundation::cSubCls> Subclass;
 
-  /// Before the window's own procedure: does nothing.
-  void iSubCls_Antes(std::int32_t& bHandled, std::int32_t& lReturn, WindowHandle hWnd, std::uint32_t uMsg,
-                     std::uint32_t wParam, std::uint32_t lParam);
-  /// After it: reads the socket `wParam` to its end when `lParam` tells that it can be read.
-  void iSubCls_Despues(std::int32_t& lReturn, WindowHandle hWnd, std::uint32_t uMsg, std::uint32_t wParam,
-                       std::uint32_t lParam);
+  /// Does nothing.
+  void Antes(std::int32_t& bHandled, std::int32_t& lReturn, WindowHandle hWnd, std::uint32_t uMsg,
+             std::uint32_t wParam, std::uint32_t lParam) override;
+  /// Reads the socket `wParam` to its end when `lParam` tells that it can be read.
+  void Despues(std::int32_t& lReturn, WindowHandle hWnd, std::uint32_t uMsg, std::uint32_t wParam,
+               std::uint32_t lParam) override;
   /// Does nothing unless Active.
   void Teardown();
 

@@ -8,6 +8,7 @@ void ComboBox::Clear() {
   if (items_.empty()) return;
   items_.clear();
   selected_ = -1;
+  ReplaceText({});
   TellChanged(*this, Aspect::Items);
 }
 
@@ -26,9 +27,14 @@ void ComboBox::SelectItem(int index) {
   const int selected = there ? index : -1;
   if (selected != selected_) {
     selected_ = selected;
+    ReplaceText(SelectedText());
     TellChanged(*this, Aspect::Selection);
   }
   if (there) Click();
+}
+
+void ComboBox::TextChanged() {
+  if (std::exchange(selected_, -1) != -1) TellChanged(*this, Aspect::Selection);
 }
 
 Text ComboBox::SelectedText() const { return selected_ < 0 ? Text{} : List(selected_); }

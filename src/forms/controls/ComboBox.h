@@ -1,15 +1,21 @@
 #pragma once
 
-#include "forms/controls/Control.h"
+#include "forms/controls/TextEntry.h"
 
 namespace quendra::forms {
 
-/// A drop-down list of texts with one selected item or none. Items are numbered from 0.
-class ComboBox : public Control {
+/// A drop-down list of texts with one selected item or none, and with a field above it that holds the
+/// selected item's text. Items are numbered from 0.
+class ComboBox : public Control, public TextEntry {
  public:
-  using Control::Control;
+  ComboBox(Container& parent, Text name)
+      : Control(parent, std::move(name)), TextEntry(*static_cast<Control*>(this)) {}
   void Accept(ControlVisitor& visitor) override { visitor.Visit(*this); }
   bool TakesFocus() const override { return true; }
+
+  /// The user, and logic, may put any text into the field. Then no item is the selected one. Read when the
+  /// form is loaded.
+  bool FreeText = false;
 
   void Clear();
   void AddItem(Text item);
@@ -24,6 +30,10 @@ class ComboBox : public Control {
   void SelectItem(int index);
   /// The selected item's text, empty for none.
   Text SelectedText() const;
+
+ protected:
+  bool TakesText() const override { return FreeText; }
+  void TextChanged() override;
 
  private:
   std::vector<Text> items_;

@@ -3,6 +3,7 @@
 namespace quendra::forms {
 
 class ComboBox;
+class CommandButton;
 class Frame;
 class Image;
 class ImageList;
@@ -10,6 +11,7 @@ class Label;
 class Line;
 class ListView;
 class PictureBox;
+class TextBox;
 class Timer;
 
 /// One operation a kind of control. A desktop that renders controls is one, so a kind that it forgets fails
@@ -18,6 +20,7 @@ class ControlVisitor {
  public:
   virtual ~ControlVisitor() = default;
   virtual void Visit(ComboBox& combo) = 0;
+  virtual void Visit(CommandButton& button) = 0;
   virtual void Visit(Frame& frame) = 0;
   virtual void Visit(Image& image) = 0;
   virtual void Visit(ImageList& images) = 0;
@@ -25,6 +28,7 @@ class ControlVisitor {
   virtual void Visit(Line& line) = 0;
   virtual void Visit(ListView& list) = 0;
   virtual void Visit(PictureBox& box) = 0;
+  virtual void Visit(TextBox& box) = 0;
   virtual void Visit(Timer& timer) = 0;
 };
 

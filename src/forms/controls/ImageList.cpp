@@ -10,8 +10,8 @@ void ImageList::Clear() {
   TellChanged(*this, Aspect::Items);
 }
 
-int ImageList::Add(Picture picture, Text tag) {
-  images_.push_back({std::move(picture), std::move(tag)});
+int ImageList::Add(Picture picture, Text tag, Text key) {
+  images_.push_back({std::move(picture), std::move(tag), std::move(key)});
   firstOfTag_.try_emplace(images_.back().Tag, Count());
   TellChanged(*this, Aspect::Items);
   return Count();

@@ -7,7 +7,7 @@
 
 namespace quendra::forms {
 
-/// Pictures by index, from 1, each with a Tag.
+/// Pictures by index, from 1, each with a Tag and a key, by which assistive technology tells it.
 class ImageList : public Control {
  public:
   using Control::Control;
@@ -16,11 +16,12 @@ class ImageList : public Control {
   struct ListImage {
     Picture picture;
     Text Tag;
+    Text Key;
   };
 
   void Clear();
   /// The new image's index.
-  int Add(Picture picture, Text tag = {});
+  int Add(Picture picture, Text tag = {}, Text key = {});
   int Count() const { return static_cast<int>(images_.size()); }
   /// Fault 9 for an index outside the list.
   const ListImage& Item(int index) const;

@@ -39,8 +39,12 @@ void ListRow::SetCellBold(int cell, bool bold) {
   if (std::exchange(At(cell).bold, bold) != bold) list_.CellChanged(*this, cell);
 }
 
-int ListRow::AddCell(Text text, Variant tag) {
-  cells_.push_back({std::move(text), std::move(tag)});
+void ListRow::SetCellIcon(int cell, int icon) {
+  if (std::exchange(At(cell).icon, icon) != icon) list_.CellChanged(*this, cell);
+}
+
+int ListRow::AddCell(Text text, Variant tag, int icon, Text key) {
+  cells_.push_back({std::move(text), std::move(tag), kBlack, false, icon, std::move(key)});
   list_.CellChanged(*this, CellCount());
   return CellCount();
 }

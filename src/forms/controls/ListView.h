@@ -34,8 +34,13 @@ class ListRow {
   bool CellBold(int cell) const { return At(cell).bold; }
   void SetCellBold(int cell, bool bold);
 
+  /// Of the list's small icons, 0 for none. Cell 0 has the row's own.
+  int CellIcon(int cell) const { return At(cell).icon; }
+  void SetCellIcon(int cell, int icon);
+  const Text& CellKey(int cell) const { return At(cell).key; }
+
   /// The new cell's number.
-  int AddCell(Text text, Variant tag);
+  int AddCell(Text text, Variant tag = Text(), int icon = 0, Text key = {});
 
  private:
   friend class ListView;
@@ -45,6 +50,8 @@ class ListRow {
     Variant tag = Text();
     Colour colour = kBlack;
     bool bold = false;
+    int icon = 0;
+    Text key{};
   };
 
   const Cell& At(int cell) const;

@@ -22,6 +22,8 @@ enum class Aspect {
   Order,
   Timer,
   Look,
+  Entry, ///< the text of a control that is typed into
+  Caret,
 };
 
 void TellChanged(Control& owner, Aspect aspect);

@@ -2,6 +2,7 @@
 
 #include "forms/loop/TimerView.h"
 #include "forms/view/FocusOrder.h"
+#include "forms/view/Typing.h"
 
 #include <algorithm>
 
@@ -30,6 +31,7 @@ class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
 
  private:
   void Visit(ComboBox& /*combo*/) override {}
+  void Visit(CommandButton& /*button*/) override {}
   void Visit(Frame& /*frame*/) override {}
   void Visit(Image& /*image*/) override {}
   void Visit(ImageList& /*images*/) override {}
@@ -37,6 +39,7 @@ class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
   void Visit(Line& /*line*/) override {}
   void Visit(ListView& /*list*/) override {}
   void Visit(PictureBox& box) override { boxes_.push_back(&box); }
+  void Visit(TextBox& /*box*/) override {}
   void Visit(Timer& timer) override {
     timers_.push_back(std::make_unique<TimerView>(timer, [this](int milliseconds, auto tick) {
       return desktop_.StartTimer(milliseconds, std::move(tick));
@@ -120,11 +123,8 @@ void HeadlessDesktop::SetCursor(CursorHandle cursor) {
 }
 
 WindowHandle HeadlessDesktop::HandleOf(Form& form) {
-  if (!form.IsLoaded()) return kNoWindow;
-  const auto [place, isNew] =
-      windows_.try_emplace(&form, WindowHandle(static_cast<std::uint32_t>(windowNames_.size() + 1)));
-  if (isNew) windowNames_[place->second] = ToUtf8(form.Name());
-  return place->second;
+  const auto found = windows_.find(&form);
+  return found == windows_.end() ? kNoWindow : found->second;
 }
 
 std::string HeadlessDesktop::NameOfWindow(WindowHandle window) const {
@@ -138,7 +138,7 @@ std::int32_t HeadlessDesktop::SendMessage(WindowHandle window, std::uint32_t mes
                                           std::uint32_t lParam) {
   Record("SendMessage " + NameOfWindow(window) + " 0x" + ToUtf8(HexText(message)) + " " +
          std::to_string(wParam) + " " + std::to_string(lParam));
-  return 0;
+  return Windows.Dispatch(window, message, wParam, lParam);
 }
 
 RegionHandle HeadlessDesktop::CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
@@ -155,13 +155,30 @@ void HeadlessDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, boo
          (redraw ? "1" : "0"));
 }
 
-void HeadlessDesktop::CreateView(Form& form) { views_[&form] = std::make_unique<FormView>(*this, form); }
+bool HeadlessDesktop::SetWindowPos(WindowHandle window, InsertAfter insertAfter, int x, int y, int cx, int cy,
+                                   unsigned flags) {
+  std::string call = "SetWindowPos " + NameOfWindow(window);
+  for (const int number : {static_cast<int>(insertAfter), x, y, cx, cy, static_cast<int>(flags)})
+    call += " " + std::to_string(number);
+  Record(std::move(call));
+  return windowNames_.contains(window) && (flags & kKeepsSize) != 0;
+}
+
+void HeadlessDesktop::Repaint(Control& control) { Record("Repaint " + ToUtf8(control.Name())); }
+
+void HeadlessDesktop::CreateView(Form& form) {
+  using Procedure = WindowProcedure::element_type;
+  const WindowHandle window = Windows.Add(std::make_shared<Procedure>([](auto...) { return 0; }));
+  windows_[&form] = window;
+  windowNames_[window] = ToUtf8(form.Name());
+  views_[&form] = std::make_unique<FormView>(*this, form);
+}
 
 void HeadlessDesktop::DestroyView(Form& form) { Forget(form); }
 
 void HeadlessDesktop::Forget(const Form& form) {
   active_.Forget(form);
-  windows_.erase(&form);
+  if (const auto window = windows_.extract(&form)) Windows.Remove(window.mapped());
   const auto view = views_.extract(&form);
 }
 
@@ -180,9 +197,11 @@ Control* HeadlessDesktop::Focused(const Form& form) const {
   return view == views_.end() ? nullptr : view->second->Focused();
 }
 
-void HeadlessDesktop::MoveFocus(const Form& form, const Control* to) {
+void HeadlessDesktop::MoveFocus(const Form& form, Control* to) {
   const auto view = views_.find(&form);
-  if (view != views_.end()) view->second->SetFocus(to);
+  if (view == views_.end() || view->second->Focused() == to) return;
+  view->second->SetFocus(to);
+  if (TextEntry* field = to ? FieldOf(*to) : nullptr) field->GotFocus();
 }
 
 } // namespace quendra::forms::headless

@@ -72,6 +72,8 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   /// A key that goes to the control with the focus: Tab moves on, Enter and Space press a label, and what it
   /// doesn't take is the form's.
   bool PressKey(Form& form, int keyCode, int shift = 0);
+  /// Puts the focus into a field and types there, character after character; 8 is the backspace, 13 Enter.
+  bool Type(Control& field, TextView text);
   bool CloseBox(Form& form);
   /// An item from 0; one that the list lacks can't be chosen.
   bool ChooseItem(ComboBox& combo, int index);
@@ -116,6 +118,9 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   RegionHandle CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
                                   int ellipseHeight) override;
   void SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) override;
+  bool SetWindowPos(WindowHandle window, InsertAfter insertAfter, int x, int y, int cx, int cy,
+                    unsigned flags) override;
+  void Repaint(Control& control) override;
   void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) override;
   void BitBlt(PictureBox& target, int x, int y, int width, int height, const PictureBox& source, int sourceX,
               int sourceY) override;
@@ -157,7 +162,9 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   /// Ends the program unless a form was loaded since the last one went.
   void EndWithoutForms();
   bool Act(Control& control, const std::function<void()>& action);
-  void MoveFocus(const Form& form, const Control* to);
+  void MoveFocus(const Form& form, Control* to);
+  /// A key that gives this character comes to the field that has the focus.
+  void TypeInto(Control& field, int character);
   void Record(std::string call) { Calls.push_back(std::move(call)); }
   void Draw(PictureBox& box, const std::string& drawing);
   std::string NameOfWindow(WindowHandle window) const;

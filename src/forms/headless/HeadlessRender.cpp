@@ -16,6 +16,10 @@ std::string ColourState(const Control& control) {
   return " colour=" + std::to_string(control.ForeColour());
 }
 
+std::string StateOf(const TextBox& box) {
+  return std::string(box.MultiLine ? " lines" : "") + (box.ReadOnly() ? " read-only" : "");
+}
+
 std::string ItemsOf(const ComboBox& combo) {
   std::string items = " [";
   for (int i = 0; i < combo.ListCount(); ++i) {
@@ -23,7 +27,7 @@ std::string ItemsOf(const ComboBox& combo) {
     if (i == combo.ListIndex()) items += "*";
     items += ToUtf8(combo.List(i));
   }
-  return items + "]";
+  return items + "]" + (combo.FreeText ? Quoted(combo.Value) : "");
 }
 
 std::string HeadersOf(const ListView& list) {
@@ -40,6 +44,7 @@ std::string CellsOf(const ListRow& row) {
   for (int cell = 0; cell <= row.CellCount(); ++cell) {
     if (cell > 0) line += " | ";
     line += ToUtf8(row.CellText(cell));
+    if (row.CellIcon(cell) != 0) line += "{" + std::to_string(row.CellIcon(cell)) + "}";
   }
   return line;
 }
@@ -67,6 +72,9 @@ class Renderer : public ControlVisitor {
   }
 
   void Visit(ComboBox& combo) override { Write("ComboBox", combo, ItemsOf(combo)); }
+  void Visit(CommandButton& button) override {
+    Write("CommandButton", button, Quoted(button.Caption) + ColourState(button));
+  }
   void Visit(Frame& frame) override { Write("Frame", frame, Quoted(frame.Caption)); }
   void Visit(Image& image) override { Write("Image", image, PictureText(image.Contents)); }
   void Visit(ImageList& /*images*/) override {}
@@ -77,6 +85,7 @@ class Renderer : public ControlVisitor {
     AppendTable(text_, list, margin_ + "  ");
   }
   void Visit(PictureBox& box) override { Write("PictureBox", box, PictureText(box.Contents)); }
+  void Visit(TextBox& box) override { Write("TextBox", box, Quoted(box.Value) + StateOf(box)); }
   void Visit(Timer& /*timer*/) override {}
 
  private:

@@ -95,7 +95,11 @@ FormView* QtDesktop::ViewOf(WindowHandle window) const {
 }
 
 std::int32_t QtDesktop::SendMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
-                                    std::uint32_t /*lParam*/) {
+                                    std::uint32_t lParam) {
+  return Windows.Dispatch(window, message, wParam, lParam);
+}
+
+std::int32_t QtDesktop::HandleMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam) {
   constexpr std::uint32_t kNonClientLeftButtonDown = 0xA1;
   constexpr std::uint32_t kCaption = 2;
   FormView* view = ViewOf(window);
@@ -120,8 +124,26 @@ void QtDesktop::SetWindowRgn(WindowHandle window, RegionHandle region, bool redr
   if (redraw) view->update();
 }
 
+bool QtDesktop::SetWindowPos(WindowHandle window, InsertAfter insertAfter, int x, int y, int /*cx*/,
+                             int /*cy*/, unsigned flags) {
+  FormView* view = ViewOf(window);
+  if (!view || !(flags & kKeepsSize)) return false;
+  if (!(flags & kKeepsOrder)) view->PutAfter(insertAfter);
+  if (!(flags & kKeepsPlace)) view->move(x, y);
+  return true;
+}
+
+void QtDesktop::Repaint(Control& control) {
+  if (auto* view = dynamic_cast<WidgetView*>(control.View())) view->Repaint();
+}
+
 void QtDesktop::CreateView(Form& form) {
-  auto* view = new FormView(context_, form, WindowHandle(++lastWindow_));
+  using Procedure = WindowProcedure::element_type;
+  const WindowHandle window = Windows.Add(std::make_shared<Procedure>(
+      [this](WindowHandle sentTo, std::uint32_t message, std::uint32_t wParam, std::uint32_t /*lParam*/) {
+        return HandleMessage(sentTo, message, wParam);
+      }));
+  auto* view = new FormView(context_, form, window);
   windows_[view->Handle()] = view;
   form.Attach(view);
 }
@@ -132,6 +154,7 @@ void QtDesktop::DestroyView(Form& form) {
 
 void QtDesktop::Close(FormView& view) {
   windows_.erase(view.Handle());
+  Windows.Remove(view.Handle());
   view.Release();
   // Later: an event of this window may be what led here.
   view.deleteLater();

@@ -43,6 +43,9 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   RegionHandle CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,
                                   int ellipseHeight) override;
   void SetWindowRgn(WindowHandle window, RegionHandle region, bool redraw) override;
+  bool SetWindowPos(WindowHandle window, InsertAfter insertAfter, int x, int y, int cx, int cy,
+                    unsigned flags) override;
+  void Repaint(Control& control) override;
 
   void FillBox(PictureBox& box, int x1, int y1, int x2, int y2, Colour colour) override {
     drawing_.FillBox(box, x1, y1, x2, y2, colour);
@@ -94,6 +97,8 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
 
  private:
   void Close(FormView& view);
+  /// The own procedure of a form's window.
+  std::int32_t HandleMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam);
   /// The window that a box stands over, nullptr for none.
   static QWidget* FrontWindow();
   FormView* ViewOf(WindowHandle window) const;
@@ -115,7 +120,6 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   QtDrawing drawing_;
   QtEventLoop loop_;
   std::map<WindowHandle, FormView*> windows_;
-  std::uint32_t lastWindow_ = 0;
   std::map<RegionHandle, RoundRect> regions_;
   std::uint32_t lastRegion_ = 0;
 };

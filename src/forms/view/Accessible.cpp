@@ -15,6 +15,28 @@ bool IsEnabled(const Control& control) {
   return true;
 }
 
+Text NameOfFrame(const Control& control) {
+  const auto* frame = dynamic_cast<const Frame*>(control.Parent());
+  return frame ? CaptionOf(*frame) : Text();
+}
+
+/// The text nearest before a control in its container.
+Text LabelBefore(const Control& control) {
+  Text nearest;
+  for (const Control* sibling : control.Parent()->Children()) {
+    if (sibling == &control) break;
+    const auto* label = dynamic_cast<const Label*>(sibling);
+    if (label && !label->IsButton() && !label->Caption().empty()) nearest = VisibleText(label->Caption());
+  }
+  return nearest;
+}
+
+Text NameOfField(const Control& control, const TextEntry& entry) {
+  if (!entry.Description.empty()) return VisibleText(entry.Description);
+  const Text label = LabelBefore(control);
+  return label.empty() ? NameOfFrame(control) : label;
+}
+
 /// Gives the control that it visits its role and name.
 class Describer : public ControlVisitor {
  public:
@@ -22,8 +44,9 @@ class Describer : public ControlVisitor {
 
   // It has no caption of its own; that of the frame around it tells what is chosen here.
   void Visit(ComboBox& combo) override {
-    if (const auto* frame = dynamic_cast<const Frame*>(combo.Parent())) Description.name = CaptionOf(*frame);
+    Description.name = combo.FreeText ? NameOfField(combo, combo) : NameOfFrame(combo);
   }
+  void Visit(CommandButton& button) override { Visit(static_cast<Label&>(button)); }
   void Visit(Frame& frame) override {
     Description.role = Role::Grouping;
     Description.name = CaptionOf(frame);
@@ -38,6 +61,7 @@ class Describer : public ControlVisitor {
   void Visit(Line& /*line*/) override { Description.role = Role::Separator; }
   void Visit(ListView& /*list*/) override {}
   void Visit(PictureBox& /*box*/) override { Description.role = Role::Graphic; }
+  void Visit(TextBox& box) override { Description.name = NameOfField(box, box); }
   void Visit(Timer& /*timer*/) override {}
 };
 

@@ -10,6 +10,7 @@ namespace {
 BoxSign SignOf(int flags) {
   switch (flags & 0x70) {
   case kCritical: return BoxSign::Critical;
+  case kQuestion: return BoxSign::Question;
   case kExclamation: return BoxSign::Exclamation;
   case kInformation: return BoxSign::Information;
   default: return BoxSign::None;

@@ -6,7 +6,7 @@
 
 namespace quendra::forms {
 
-enum class BoxSign { None, Critical, Exclamation, Information };
+enum class BoxSign { None, Critical, Question, Exclamation, Information };
 
 struct BoxButton {
   int number = 0; ///< the answer that it gives

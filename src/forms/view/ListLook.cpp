@@ -36,8 +36,11 @@ Area ListLook::WithoutPadding(Area cell) const {
 }
 
 Area ListLook::TextPlace(Area cell, int number) const {
+  return number == 0 ? TextAfterIcon(cell) : WithoutPadding(cell);
+}
+
+Area ListLook::TextAfterIcon(Area cell) const {
   Area place = WithoutPadding(cell);
-  if (number != 0) return place;
   const int taken = IconSide() + scale_.Pixels(kPadding);
   if (!ReadsFromRightToLeft()) place.corner.left += taken;
   place.extent.width -= taken;
@@ -49,6 +52,12 @@ Area ListLook::IconPlace(Area cell) const {
   const int side = IconSide();
   const int left = ReadsFromRightToLeft() ? room.Right() - side : room.corner.left;
   return {{left, MiddleOf(room) - side / 2 + 1}, {side, side}};
+}
+
+Area ListLook::CellIconPlace(Area cell, bool besideText) const {
+  if (besideText) return IconPlace(cell);
+  const int side = IconSide();
+  return {{cell.corner.left + (cell.extent.width - side) / 2, IconPlace(cell).corner.top}, {side, side}};
 }
 
 Area ListLook::HeaderTextPlace(Area header) const { return WithoutPadding(header); }

@@ -20,8 +20,12 @@ class ListLook {
 
   /// Where a cell has its text; cell 0 has room for the row's icon before it.
   Area TextPlace(Area cell, int number) const;
+  /// Where a cell has its text after an icon.
+  Area TextAfterIcon(Area cell) const;
   /// Where cell 0 has the row's icon.
   Area IconPlace(Area cell) const;
+  /// Where another cell has its icon, beside a text or alone: in the middle then.
+  Area CellIconPlace(Area cell, bool besideText) const;
   Side SideOf(Alignment alignment) const { return forms::SideOf(alignment, direction_); }
 
   Area HeaderTextPlace(Area header) const;

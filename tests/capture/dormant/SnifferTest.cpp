@@ -1,6 +1,7 @@
 #include "capture/dormant/Sniffer.h"
 
 #include "capture/CaptureProgram.h"
+#include "forms/MessageWindows.h"
 
 namespace quendra::capture {
 namespace {
@@ -95,7 +96,7 @@ struct SnifferTest : CaptureProgram {
   }
   void Sniff() {
     std::int32_t result = 0;
-    sniffer.iSubCls_Despues(result, WindowHandle(), 1025, kSocket.Value(), kReadable);
+    sniffer.Despues(result, WindowHandle(), 1025, kSocket.Value(), kReadable);
   }
   forms::ListRow& Row() { return form.main_ListView1.Row(1); }
 
@@ -112,7 +113,7 @@ TEST_F(SnifferTest, A_readable_socket_is_read_and_its_packet_charged_by_its_payl
 TEST_F(SnifferTest, Any_other_event_of_a_socket_is_passed_over) {
   machine.sockets.Receive(kSocket, PacketOf(6, kOwnAddress, 1025, 80));
   std::int32_t result = 5;
-  sniffer.iSubCls_Despues(result, WindowHandle(), 1025, kSocket.Value(), 2);
+  sniffer.Despues(result, WindowHandle(), 1025, kSocket.Value(), 2);
   EXPECT_EQ(Upload(Row()), 0);
   EXPECT_EQ(result, 5);
 }
@@ -121,7 +122,7 @@ TEST_F(SnifferTest, Before_the_windows_procedure_nothing_is_done) {
   machine.sockets.Receive(kSocket, PacketOf(6, kOwnAddress, 1025, 80));
   std::int32_t handled = 0;
   std::int32_t result = 0;
-  sniffer.iSubCls_Antes(handled, result, WindowHandle(), 1025, kSocket.Value(), kReadable);
+  sniffer.Antes(handled, result, WindowHandle(), 1025, kSocket.Value(), kReadable);
   EXPECT_EQ(handled, 0);
   EXPECT_EQ(Upload(Row()), 0);
 }
@@ -186,8 +187,12 @@ TEST_F(SnifferTest, The_teardown_of_a_sleeping_sniffer_does_nothing) {
 }
 
 TEST_F(SnifferTest, The_teardown_goes_in_this_order_and_once) {
+  forms::MessageWindows windows;
+  const WindowHandle window = windows.Create();
+  const auto own = windows.Procedure(window);
   sniffer.Active = true;
-  sniffer.UnSubclass = [this] { machine.Calls.push_back(main_Timer1.Enabled() ? "early" : "UnSubclass"); };
+  sniffer.Subclass = std::make_unique<foundation::cSubCls>(windows);
+  sniffer.Subclass->SubClass(window, sniffer, kTrue16);
   machine.sockets.Blocking = true;
   sniffer.Teardown();
   const Calls selectAndClose{"WSAAsyncSelect 7 9 1025 0", "WSAAsyncSelect 8 9 1025 0", "closesocket 7",
@@ -196,12 +201,25 @@ TEST_F(SnifferTest, The_teardown_goes_in_this_order_and_once) {
   for (const char* call : {"WSAIsBlocking", "WSACancelBlockingCall", "WSACleanup"})
     expected.emplace_back(call);
   expected.insert(expected.end(), selectAndClose.begin(), selectAndClose.end());
-  expected.emplace_back("UnSubclass");
   EXPECT_EQ(machine.Calls, expected);
   EXPECT_FALSE(main_Timer1.Enabled());
-  EXPECT_FALSE(static_cast<bool>(sniffer.UnSubclass));
+  EXPECT_EQ(windows.Procedure(window), own);
+  EXPECT_EQ(sniffer.Subclass, nullptr);
   sniffer.Teardown();
   EXPECT_EQ(machine.Calls, expected);
+}
+
+TEST_F(SnifferTest, A_message_of_the_window_that_it_is_attached_to_reaches_it) {
+  forms::MessageWindows windows;
+  const WindowHandle window = windows.Create();
+  sniffer.Subclass = std::make_unique<foundation::cSubCls>(windows);
+  sniffer.Subclass->AddMsg(1025, kFalse16);
+  sniffer.Subclass->SubClass(window, sniffer, kFalse16);
+  machine.sockets.Receive(kSocket, PacketOf(6, kOwnAddress, 1025, 80));
+
+  windows.Dispatch(window, 1025, kSocket.Value(), kReadable);
+
+  EXPECT_EQ(Upload(Row()), 1);
 }
 
 TEST_F(SnifferTest, The_teardown_cancels_no_blocking_call_when_none_is_under_way) {

@@ -347,5 +347,61 @@ TEST_F(HeadlessDesktopTest, A_form_is_rendered_as_text_without_what_is_hidden) {
                                   "  PictureBox picOut picture=background\n");
 }
 
+// Fields.
+
+TEST_F(HeadlessDesktopTest, A_repaint_and_a_new_place_are_recorded) {
+  desktop.Show(form);
+  desktop.Calls.clear();
+
+  desktop.Repaint(form.label);
+  desktop.SetWindowPos(desktop.HandleOf(form), InsertAfter::NotTopmost, 0, 0, 0, 0, kKeepsSize | kKeepsPlace);
+
+  EXPECT_EQ(desktop.Calls, (Lines{"Repaint " + ToUtf8(form.label.Name()),
+                                  "SetWindowPos " + ToUtf8(form.Name()) + " -2 0 0 0 0 3"}));
+}
+
+TEST_F(HeadlessDesktopTest, Typing_puts_the_focus_there_and_passes_the_handler) {
+  TextBox box(form, u"box");
+  desktop.Show(form);
+  box.KeyPress = [](int& keyCode) { keyCode = keyCode == '!' ? 0 : keyCode; };
+
+  EXPECT_TRUE(desktop.Type(box, u"a!bc\b"));
+
+  EXPECT_EQ(box.Value(), u"ab");
+  EXPECT_EQ(desktop.Focused(form), &box);
+  EXPECT_FALSE(desktop.Type(form.label, u"a"));
+  box.Enabled = false;
+  EXPECT_FALSE(desktop.Type(box, u"a"));
+}
+
+TEST_F(HeadlessDesktopTest, A_backspace_takes_a_whole_line_break) {
+  TextBox box(form, u"box");
+  box.MultiLine = true;
+  desktop.Show(form);
+
+  desktop.Type(box, u"a\rb");
+  EXPECT_EQ(box.Value(), u"a\r\nb");
+  desktop.Type(box, u"\b\b");
+
+  EXPECT_EQ(box.Value(), u"a");
+}
+
+TEST_F(HeadlessDesktopTest, Fields_buttons_and_cell_icons_are_rendered) {
+  TextBox box(form, u"box");
+  CommandButton button(form, u"button");
+  ListView list(form, u"list");
+  box.Value = u"text";
+  box.ReadOnly = true;
+  button.Caption = u"go";
+  list.Add(u"key", u"row", 0).AddCell({}, Text(), 2);
+  desktop.Show(form);
+
+  const std::string shown = desktop.Render(form);
+
+  EXPECT_NE(shown.find("TextBox box \"text\" read-only\n"), std::string::npos) << shown;
+  EXPECT_NE(shown.find("CommandButton button \"go\"\n"), std::string::npos) << shown;
+  EXPECT_NE(shown.find("row | {2}\n"), std::string::npos) << shown;
+}
+
 } // namespace
 } // namespace quendra::forms::headless

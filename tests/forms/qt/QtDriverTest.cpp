@@ -23,6 +23,7 @@ Key KeyOf(int code, int shift) {
   case kTabKey: return {code, shift & kShift ? Qt::Key_Backtab : Qt::Key_Tab, u'\t'};
   case kEnterKey: return {code, Qt::Key_Return, u'\r'};
   case kEscapeKey: return {code, Qt::Key_Escape, u'\x1b'};
+  case kBackspaceKey: return {code, Qt::Key_Backspace, u'\b'};
   default: return {code, static_cast<Qt::Key>(code), static_cast<char16_t>(code)};
   }
 }
@@ -38,6 +39,7 @@ Qt::KeyboardModifiers ModifiersOf(int shift) {
 BoxSign SignOf(QMessageBox::Icon icon) {
   switch (icon) {
   case QMessageBox::Critical: return BoxSign::Critical;
+  case QMessageBox::Question: return BoxSign::Question;
   case QMessageBox::Warning: return BoxSign::Exclamation;
   case QMessageBox::Information: return BoxSign::Information;
   default: return BoxSign::None;

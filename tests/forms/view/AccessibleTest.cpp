@@ -48,6 +48,32 @@ TEST_F(AccessibleTest, A_combo_box_is_named_by_the_frame_around_it) {
   EXPECT_EQ(AccessibleOf(alone).name, u"");
 }
 
+TEST_F(AccessibleTest, A_field_is_named_by_its_description_else_the_label_before_it_else_its_frame) {
+  frame.Caption = Text(u"מסגרת");
+  TextBox first(frame, u"first");
+  Label before(frame, u"before");
+  TextBox second(frame, u"second");
+  before.Caption = Text(u"כתובת:");
+  combo.FreeText = true;
+
+  EXPECT_EQ(AccessibleOf(first).name, u"מסגרת");
+  EXPECT_EQ(AccessibleOf(combo).name, u"מסגרת");
+  EXPECT_EQ(AccessibleOf(second).name, u"כתובת:");
+  second.Description = u"דוח";
+  EXPECT_EQ(AccessibleOf(second).name, u"דוח");
+  before.Click = [] {};
+  second.Description = {};
+  EXPECT_EQ(AccessibleOf(second).name, u"מסגרת");
+}
+
+TEST_F(AccessibleTest, A_command_button_is_a_button) {
+  CommandButton button(form, u"button");
+  button.Caption = Text(u"התחל");
+
+  EXPECT_EQ(AccessibleOf(button).role, Role::Button);
+  EXPECT_EQ(AccessibleOf(button).name, u"התחל");
+}
+
 TEST_F(AccessibleTest, Every_kind_has_its_role) {
   PictureBox box(form, u"box");
   Image image(form, u"image");

@@ -11,7 +11,8 @@ TEST(BoxContentTest, The_sign_follows_the_flags) {
   EXPECT_EQ(BoxContentOf(u"", kCritical, u"").sign, BoxSign::Critical);
   EXPECT_EQ(BoxContentOf(u"", kExclamation | kHebrewBox, u"").sign, BoxSign::Exclamation);
   EXPECT_EQ(BoxContentOf(u"", kInformation, u"").sign, BoxSign::Information);
-  EXPECT_EQ(BoxContentOf(u"", 0x20, u"").sign, BoxSign::None);
+  EXPECT_EQ(BoxContentOf(u"", kQuestion | kYesNo | kHebrewBox, u"").sign, BoxSign::Question);
+  EXPECT_EQ(BoxContentOf(u"", 0x180034, u"").sign, BoxSign::Exclamation);
   EXPECT_EQ(BoxContentOf(u"", 0, u"").sign, BoxSign::None);
 }
 

@@ -31,6 +31,20 @@ void DrawWarning(QPainter& painter) {
   painter.drawPoint(20, 30);
 }
 
+void DrawQuestion(QPainter& painter) {
+  painter.setBrush(QColor(0x1B, 0x6E, 0xC2));
+  painter.drawEllipse(2, 2, 36, 36);
+  painter.setBrush(Qt::NoBrush);
+  painter.setPen(QPen(Qt::white, 4, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
+  // A hook of three quarters of a circle, its stem and the dot.
+  QPainterPath mark;
+  mark.arcMoveTo(14, 9, 12, 12, 170);
+  mark.arcTo(14, 9, 12, 12, 170, -230);
+  mark.lineTo(20, 24);
+  painter.drawPath(mark);
+  painter.drawPoint(20, 30);
+}
+
 void DrawInformation(QPainter& painter) {
   painter.setBrush(QColor(0x1B, 0x6E, 0xC2));
   painter.drawEllipse(2, 2, 36, 36);
@@ -51,6 +65,7 @@ QPixmap BoxIcon(BoxSign sign, int side, qreal pixelRatio) {
   painter.scale(side / 40.0, side / 40.0);
   painter.setPen(Qt::NoPen);
   if (sign == BoxSign::Critical) DrawCross(painter);
+  if (sign == BoxSign::Question) DrawQuestion(painter);
   if (sign == BoxSign::Exclamation) DrawWarning(painter);
   if (sign == BoxSign::Information) DrawInformation(painter);
   return icon;

@@ -34,6 +34,7 @@ constexpr int kMostTextWidth = 640;
 QMessageBox::Icon KindOf(BoxSign sign) {
   switch (sign) {
   case BoxSign::Critical: return QMessageBox::Critical;
+  case BoxSign::Question: return QMessageBox::Question;
   case BoxSign::Exclamation: return QMessageBox::Warning;
   case BoxSign::Information: return QMessageBox::Information;
   case BoxSign::None: break;

@@ -12,13 +12,39 @@ ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, QWidget* paren
     Context().dispatcher.Dispatch([&] {
       if (TheControl()) Combo().SelectItem(index);
     });
+    // The toolkit has put the item there as it stands in the list.
+    if (field_ && TheControl()) field_->ShowText();
   });
+  if (combo.FreeText) TakeFreeText();
+}
+
+void ComboBoxView::TakeFreeText() {
+  field_ = new EntryLine(Context().dispatcher, Combo(), Combo(), this);
+  setEditable(true);
+  setLineEdit(field_);
+  setInsertPolicy(QComboBox::NoInsert);
+  setCompleter(nullptr);
+}
+
+void ComboBoxView::ControlGone() {
+  WidgetView::ControlGone();
+  if (field_) field_->Forget();
+}
+
+bool ComboBoxView::event(QEvent* event) {
+  // A plain member, as with labels: what was set after the view came counts from the first showing on.
+  if (event->type() == QEvent::Show && TheControl()) TellName();
+  return QComboBox::event(event);
 }
 
 void ComboBoxView::Apply(Aspect aspect) {
   const QSignalBlocker silence(this);
   if (Concerns(aspect, Aspect::Items)) FillItems();
   if (Concerns(aspect, Aspect::Items) || aspect == Aspect::Selection) setCurrentIndex(Combo().ListIndex());
+  if (!field_) return;
+  if (Concerns(aspect, Aspect::Items) || aspect == Aspect::Selection || aspect == Aspect::Entry)
+    field_->ShowText();
+  if (aspect == Aspect::Caret) field_->ShowCaret();
 }
 
 void ComboBoxView::FillItems() {

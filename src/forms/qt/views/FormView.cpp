@@ -142,6 +142,19 @@ void FormView::CutOut() {
     clearMask();
 }
 
+void FormView::PutAfter(InsertAfter place) {
+  switch (place) {
+  case InsertAfter::Top: return raise();
+  case InsertAfter::Bottom: return lower();
+  case InsertAfter::Topmost:
+  case InsertAfter::NotTopmost: break;
+  }
+  const bool topmost = place == InsertAfter::Topmost;
+  // By both: the toolkit's own road hides a window whose flags change.
+  overrideWindowFlags(windowFlags().setFlag(Qt::WindowStaysOnTopHint, topmost));
+  if (windowHandle()) windowHandle()->setFlag(Qt::WindowStaysOnTopHint, topmost);
+}
+
 QMargins FormView::Frame() const {
   if (windowFlags() & Qt::FramelessWindowHint) return {};
   const QMargins known = windowHandle() ? windowHandle()->frameMargins() : QMargins();

@@ -42,6 +42,8 @@ class FormView : private FormContext, public QScrollArea, public WidgetView {
   /// Shows the window in the middle of its owner or of the screen, once; a window that was moved stays where
   /// it is.
   void ShowOver(const QWidget* owner);
+  /// Over or under other windows, or in or out of the band above all others.
+  void PutAfter(InsertAfter place);
   /// Cuts the window to a shape, in the pixels of the form as it was laid out; none takes the shape away.
   void Shape(std::optional<RoundRect> shape);
   /// Returns when the form is hidden or released, or the program ends.

@@ -19,9 +19,12 @@ void ListDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
   const int cell = index.column();
   if (!row || cell > row->CellCount()) return;
   const Area place = ToArea(option.rect);
-  if (cell == 0) DrawIcon(*painter, Look().IconPlace(place), *row);
-  const QRect room = ToQRect(Look().TextPlace(place, cell));
-  if (row->CellText(cell).empty() || room.width() <= 0) return;
+  const bool hasText = !row->CellText(cell).empty();
+  const bool hasIcon = row->CellIcon(cell) != 0;
+  if (cell == 0) DrawIcon(*painter, Look().IconPlace(place), row->SmallIcon());
+  if (hasIcon) DrawIcon(*painter, Look().CellIconPlace(place, hasText), row->CellIcon(cell));
+  const QRect room = ToQRect(hasIcon ? Look().TextAfterIcon(place) : Look().TextPlace(place, cell));
+  if (!hasText || room.width() <= 0) return;
 
   const Text visible = VisibleText(row->CellText(cell), LineBreaks::Show, kMostOfCell);
   QFont font = option.font;
@@ -35,8 +38,8 @@ void ListDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
                     painter->fontMetrics().elidedText(ToQString(visible), Qt::ElideRight, room.width()));
 }
 
-void ListDelegate::DrawIcon(QPainter& painter, const Area& place, const ListRow& row) const {
-  const QPixmap icon = model_.SmallIcon(row, place.extent.width);
+void ListDelegate::DrawIcon(QPainter& painter, const Area& place, int number) const {
+  const QPixmap icon = model_.SmallIcon(number, place.extent.width);
   if (icon.isNull()) return;
   const QSizeF beside = QSizeF(place.extent.width, place.extent.height) - icon.deviceIndependentSize();
   painter.drawPixmap(QPointF(place.corner.left + beside.width() / 2, place.corner.top + beside.height() / 2),

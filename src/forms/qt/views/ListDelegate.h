@@ -19,7 +19,7 @@ class ListDelegate : public QStyledItemDelegate {
 
  private:
   ListLook Look() const { return {scale_, direction_}; }
-  void DrawIcon(QPainter& painter, const Area& place, const ListRow& row) const;
+  void DrawIcon(QPainter& painter, const Area& place, int number) const;
 
   const ListModel& model_;
   const Scale& scale_;

@@ -13,6 +13,10 @@ const Picture* PictureIn(const ImageList* images, int index) {
   return images && index >= 1 && index <= images->Count() ? &images->Item(index).picture : nullptr;
 }
 
+Text KeyOfIcon(const ImageList* images, int index) {
+  return PictureIn(images, index) ? images->Item(index).Key : Text();
+}
+
 /// Long texts as plain ones: a tip would take a text with tags in it for a document.
 QString TipOf(const QString& text) {
   return QStringLiteral("<p style='white-space:pre-wrap'>") + text.toHtmlEscaped();
@@ -38,6 +42,8 @@ QVariant ListModel::data(const QModelIndex& index, int role) const {
     const QString text = ShownText(row->CellText(index.column()));
     return text.isEmpty() ? QVariant() : TipOf(text);
   }
+  case Qt::AccessibleDescriptionRole:
+    return ToQString(KeyOfIcon(list_->SmallIcons, row->CellIcon(index.column())));
   default: return {};
   }
 }
@@ -86,10 +92,10 @@ void ListModel::Release() {
   Reset();
 }
 
-QPixmap ListModel::SmallIcon(const ListRow& row, int side) const {
-  const Picture* picture = PictureIn(list_->SmallIcons, row.SmallIcon());
+QPixmap ListModel::SmallIcon(int icon, int side) const {
+  const Picture* picture = PictureIn(list_->SmallIcons, icon);
   if (!picture) return {};
-  const auto place = static_cast<std::size_t>(row.SmallIcon() - 1);
+  const auto place = static_cast<std::size_t>(icon - 1);
   if (icons_.size() <= place) icons_.resize(place + 1);
   CachedIcon& cached = icons_[place];
   if (cached.pixmap.isNull() || cached.picture != *picture || cached.side != side) {

@@ -31,8 +31,8 @@ class ListModel : public QAbstractTableModel {
   /// The row of the list, nullptr where there is none.
   const ListRow* RowAt(int row) const;
   const ListView* List() const { return list_; }
-  /// The row's small icon scaled to `side` pixels, null where it has none.
-  QPixmap SmallIcon(const ListRow& row, int side) const;
+  /// A small icon of the list by its index, scaled to `side` pixels; null for none.
+  QPixmap SmallIcon(int icon, int side) const;
   QPixmap HeaderIcon(int section) const;
 
  private:

@@ -7,6 +7,8 @@
 #include "forms/qt/views/LineView.h"
 #include "forms/qt/views/ListViewView.h"
 #include "forms/qt/views/PictureBoxView.h"
+#include "forms/qt/views/TextAreaView.h"
+#include "forms/qt/views/TextLineView.h"
 
 namespace quendra::forms::qt {
 
@@ -19,6 +21,7 @@ class ViewMaker : public ControlVisitor {
   MadeView Made;
 
   void Visit(ComboBox& combo) override { Make<ComboBoxView>(combo); }
+  void Visit(CommandButton& button) override { Make<LabelView>(button); }
   void Visit(Frame& frame) override { Make<FrameView>(frame); }
   void Visit(Image& image) override { Make<ImageView>(image); }
   void Visit(ImageList& /*images*/) override {} // lists show its pictures
@@ -26,6 +29,12 @@ class ViewMaker : public ControlVisitor {
   void Visit(Line& line) override { Make<LineView>(line); }
   void Visit(ListView& list) override { Make<ListViewView>(list); }
   void Visit(PictureBox& box) override { Make<PictureBoxView>(box); }
+  void Visit(TextBox& box) override {
+    if (box.MultiLine)
+      Make<TextAreaView>(box);
+    else
+      Make<TextLineView>(box);
+  }
   void Visit(Timer& timer) override { Made = {new TimerView(timer, context_.startTimer), nullptr}; }
 
  private:

@@ -2,6 +2,8 @@
 
 #include "forms/qt/input/MouseEvents.h"
 
+#include <QAbstractScrollArea>
+
 namespace quendra::forms::qt {
 
 WidgetView::WidgetView(ViewContext& context, Control& control, QWidget& widget)
@@ -60,6 +62,12 @@ void WidgetView::Show() { widget_.setVisible(control_->Visible()); }
 void WidgetView::PlaceAt(const Geometry& geometry) {
   const int container = control_->Parent()->Position().width;
   widget_.setGeometry(ToQRect(PlaceOf(geometry, container, context_.scale, direction_)));
+}
+
+void WidgetView::Repaint() {
+  // What a scroll area shows is its viewport's.
+  const auto* area = qobject_cast<QAbstractScrollArea*>(&widget_);
+  (area ? *area->viewport() : widget_).repaint();
 }
 
 void WidgetView::Press() {

@@ -44,6 +44,8 @@ class WidgetView : public View {
   ViewContext& Context() const { return context_; }
   Direction ReadingDirection() const { return direction_; }
 
+  /// Draws the control and what it holds at once.
+  void Repaint();
   /// A press by the mouse, a key or assistive technology.
   void Press();
   /// False for widgets that need mouse events for themselves, too.

@@ -1,0 +1,44 @@
+#include "forms/view/Typing.h"
+
+#include "forms/controls/ComboBox.h"
+
+namespace quendra::forms {
+
+namespace {
+
+constexpr int kFirstOutsidePlane = 0x10000;
+constexpr int kLastCharacter = 0x10FFFF;
+
+bool IsControl(int character) { return character < 0x20 || (character >= 0x7F && character < 0xA0); }
+
+bool IsCharacter(int number) { return number <= kLastCharacter && (number < 0xD800 || number > 0xDFFF); }
+
+Text TextOfCharacter(int character) {
+  if (character < kFirstOutsidePlane) return Text(1, static_cast<char16_t>(character));
+  const int beyond = character - kFirstOutsidePlane;
+  return {static_cast<char16_t>(0xD800 + (beyond >> 10)), static_cast<char16_t>(0xDC00 + (beyond & 0x3FF))};
+}
+
+} // namespace
+
+TextEntry* FieldOf(Control& control) {
+  const auto* combo = dynamic_cast<const ComboBox*>(&control);
+  return combo && !combo->FreeText ? nullptr : dynamic_cast<TextEntry*>(&control);
+}
+
+bool IsTyped(const Form& form, const KeyPress& key) {
+  const bool usesAlt = (key.shift & kAlt) != 0;
+  return key.code != kTabKey && !usesAlt && !ControlPressedBy(form, key.code, key.shift);
+}
+
+Typing Type(TextEntry& entry, int character, bool ofManyLines) {
+  int typed = character;
+  entry.KeyPress(typed);
+  if (typed == kBackspaceKey) return {Typing::Act::DeleteBack};
+  if (typed == kEnterKey && ofManyLines) return {Typing::Act::Insert, u"\r\n"};
+  if (typed > 0 && !IsControl(typed) && IsCharacter(typed))
+    return {Typing::Act::Insert, TextOfCharacter(typed)};
+  return {typed != 0 && typed == character ? Typing::Act::Command : Typing::Act::Nothing};
+}
+
+} // namespace quendra::forms
