@@ -26,7 +26,7 @@ MenuHighlight::Lines frmMenu::LinesOnSecondRow(TextView name) {
   const auto holder = [this](std::size_t entry) -> forms::Container& {
     return PicMenu[entry < kPageCount ? entry + kPageCount : entry];
   };
-  return MakeControls<forms::Line>(name, holder, std::make_index_sequence<kEntryCount>());
+  return forms::MakeControls<forms::Line>(name, holder, std::make_index_sequence<kEntryCount>());
 }
 
 void frmMenu::WireMenu() {

@@ -2,8 +2,8 @@
 
 #include "forms/Desktop.h"
 #include "forms/Page.h"
+#include "forms/controls/ControlArray.h"
 #include "monitor/SystemVersion.h"
-#include "shell/ControlArray.h"
 #include "shell/HandCursor.h"
 #include "shell/IpPanel.h"
 #include "shell/MenuHighlight.h"
@@ -40,13 +40,13 @@ class frmMenu : public forms::PageWindow {
   PictureBox picOut{*this, u"picOut"};
   Label lblWelcome{picOut, u"lblWelcome"};
   Label lblWelcomeHint{picOut, u"lblWelcomeHint"};
-  std::array<PictureBox, kEntryCount> PicMenu = ControlArray<PictureBox, kEntryCount>(*this, u"PicMenu");
+  std::array<PictureBox, kEntryCount> PicMenu = forms::ControlArray<PictureBox, kEntryCount>(*this, u"PicMenu");
   MenuHighlight::Lines linMenu1 = LinesOnSecondRow(u"linMenu1");
   MenuHighlight::Lines linMenu2 = LinesOnSecondRow(u"linMenu2");
-  std::array<Label, kEntryCount> lblCaption = ControlArrayOn<Label>(PicMenu, u"lblCaption");
+  std::array<Label, kEntryCount> lblCaption = forms::ControlArrayOn<Label>(PicMenu, u"lblCaption");
   Label Label1{*this, u"Label1"};
-  std::array<PictureBox, kPageCount> picMenu2 = ControlArray<PictureBox, kPageCount>(*this, u"picMenu2");
-  std::array<PictureBox, kPageCount> picMenu3 = ControlArray<PictureBox, kPageCount>(*this, u"picMenu3");
+  std::array<PictureBox, kPageCount> picMenu2 = forms::ControlArray<PictureBox, kPageCount>(*this, u"picMenu2");
+  std::array<PictureBox, kPageCount> picMenu3 = forms::ControlArray<PictureBox, kPageCount>(*this, u"picMenu3");
 
   void resetButtons() override { pages_.resetButtons(); }
   bool PageChosen() const { return pages_.PageChosen; }

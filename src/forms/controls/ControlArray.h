@@ -5,7 +5,7 @@
 #include <array>
 #include <utility>
 
-namespace quendra::shell {
+namespace quendra::forms {
 
 /// "PicMenu(2)": a control array's element is named by array and index.
 inline Text ElementName(TextView array, std::size_t index) {
@@ -20,17 +20,17 @@ std::array<Kind, sizeof...(index)> MakeControls(TextView name, ContainerOf conta
 
 /// A control array in one container.
 template <typename Kind, std::size_t count>
-std::array<Kind, count> ControlArray(forms::Container& container, TextView name) {
+std::array<Kind, count> ControlArray(Container& container, TextView name) {
   return MakeControls<Kind>(
-      name, [&](std::size_t) -> forms::Container& { return container; }, std::make_index_sequence<count>());
+      name, [&](std::size_t) -> Container& { return container; }, std::make_index_sequence<count>());
 }
 
 /// A control array with each element on the element of another array that has the same index.
 template <typename Kind, typename Holder, std::size_t count>
 std::array<Kind, count> ControlArrayOn(std::array<Holder, count>& holders, TextView name) {
   return MakeControls<Kind>(
-      name, [&](std::size_t index) -> forms::Container& { return holders[index]; },
+      name, [&](std::size_t index) -> Container& { return holders[index]; },
       std::make_index_sequence<count>());
 }
 
-} // namespace quendra::shell
+} // namespace quendra::forms
