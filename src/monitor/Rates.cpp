@@ -1,10 +1,8 @@
 #include "monitor/Rates.h"
 
 #include "monitor/ProcessRow.h"
-#include "runtime/Fault.h"
 #include "runtime/Format.h"
-
-#include <cmath>
+#include "runtime/Integers.h"
 
 namespace quendra::monitor {
 
@@ -33,13 +31,6 @@ double UpdateRate(forms::ListRow& row, const Direction& direction, double second
 }
 
 } // namespace
-
-double Quotient(double dividend, double divisor) {
-  if (divisor == 0) throw Fault(dividend == 0 ? Fault::kOverflow : Fault::kDivision);
-  const double quotient = dividend / divisor;
-  if (!std::isfinite(quotient)) throw Fault(Fault::kOverflow);
-  return quotient;
-}
 
 void UpdateRates(forms::ListRow& row, double seconds, TrafficSums& sums) {
   const double upload = UpdateRate(row, kUpload, seconds);

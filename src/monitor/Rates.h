@@ -10,10 +10,6 @@ struct TrafficSums {
   double download = 0;
 };
 
-/// A quotient as the language forms it: fault 11 for a divisor of 0, fault 6 for 0 by 0 and for what no
-/// double holds.
-double Quotient(double dividend, double divisor);
-
 /// Puts the rates since the previous pass, `seconds` ago, into the row's rate cells, adds them to the sums
 /// and keeps the totals for the next pass. A rate that isn't above 0 leaves its cell empty.
 void UpdateRates(forms::ListRow& row, double seconds, TrafficSums& sums);

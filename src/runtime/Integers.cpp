@@ -9,4 +9,11 @@ std::int32_t RoundToInt32(double value) {
   return static_cast<std::int32_t>(std::nearbyint(value));
 }
 
+double Quotient(double dividend, double divisor) {
+  if (divisor == 0) throw Fault(dividend == 0 ? Fault::kOverflow : Fault::kDivision);
+  const double quotient = dividend / divisor;
+  if (!std::isfinite(quotient)) throw Fault(Fault::kOverflow);
+  return quotient;
+}
+
 } // namespace quendra

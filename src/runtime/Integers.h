@@ -25,4 +25,8 @@ constexpr std::int32_t ToInt32(std::int64_t value) { return CheckedTo<std::int32
 /// A double rounded to a whole number as the language does it, half to even; fault 6 when it doesn't fit.
 std::int32_t RoundToInt32(double value);
 
+/// A quotient as the language forms it: fault 11 for a divisor of 0, fault 6 for 0 by 0 and for what no
+/// double holds.
+double Quotient(double dividend, double divisor);
+
 } // namespace quendra

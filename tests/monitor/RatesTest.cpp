@@ -2,22 +2,12 @@
 
 #include "monitor/MonitorControls.h"
 #include "monitor/ProcessRow.h"
-#include "runtime/Fault.h"
 
 #include <gtest/gtest.h>
 
 namespace quendra::monitor {
 
 namespace {
-
-int FaultOf(double dividend, double divisor) {
-  try {
-    Quotient(dividend, divisor);
-  } catch (const Fault& fault) {
-    return fault.number;
-  }
-  return 0;
-}
 
 struct Rates : testing::Test {
   MonitorControls controls;
@@ -123,14 +113,6 @@ TEST_F(Rates, A_total_kept_as_text_counts_as_its_number) {
   UpdateRates(row, 1, sums);
   EXPECT_EQ(row.CellText(kUploadCell), u"02.50");
 }
-
-TEST(Quotient, Division_by_zero_is_fault_11) { EXPECT_EQ(FaultOf(1, 0), Fault::kDivision); }
-
-TEST(Quotient, Zero_by_zero_is_fault_6) { EXPECT_EQ(FaultOf(0, 0), Fault::kOverflow); }
-
-TEST(Quotient, What_no_double_holds_is_fault_6) { EXPECT_EQ(FaultOf(1e308, 1e-3), Fault::kOverflow); }
-
-TEST(Quotient, A_negative_divisor_divides) { EXPECT_DOUBLE_EQ(Quotient(3, -2), -1.5); }
 
 struct MeterCase {
   double sum;
