@@ -9,10 +9,12 @@ class HostNames;
 class Icons;
 class IpHelper;
 class Processes;
+class Registry;
 class ShellStart;
 class Sockets;
 class System;
 class Tokens;
+class UrlCache;
 class VersionInfo;
 
 /// All that the program asks of a machine, by family.
@@ -24,10 +26,12 @@ struct Machine {
   Icons& icons;
   IpHelper& ipHelper;
   Processes& processes;
+  Registry& registry;
   ShellStart& shellStart;
   Sockets& sockets;
   System& system;
   Tokens& tokens;
+  UrlCache& urlCache;
   VersionInfo& versionInfo;
 };
 

@@ -11,6 +11,8 @@
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
 #include "platform/unavailable/UnavailableHandles.h"
+#include "platform/unavailable/UnavailableRegistry.h"
+#include "platform/unavailable/UnavailableUrlCache.h"
 
 namespace quendra::platform::linux_ {
 
@@ -30,10 +32,12 @@ struct LinuxMachine::Parts {
   LinuxIcons icons{desktopIndex, iconTheme, paths};
   LinuxIpHelper ipHelper{folder, {MayTraceEveryProcess(), ::geteuid()}};
   LinuxProcesses processes{folder, handleTable, paths};
+  unavailable::UnavailableRegistry registry;
   LinuxShellStart shellStart;
   LinuxSockets sockets;
   LinuxSystem system;
   LinuxTokens tokens{handleTable};
+  unavailable::UnavailableUrlCache urlCache;
   LinuxVersionInfo versionInfo{desktopIndex, paths};
 };
 
@@ -43,9 +47,9 @@ LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, const 
 LinuxMachine::~LinuxMachine() = default;
 
 Machine LinuxMachine::Operations() {
-  return {parts_->capture, parts_->capture,  parts_->handles,   parts_->hostNames,
-          parts_->icons,   parts_->ipHelper, parts_->processes, parts_->shellStart,
-          parts_->sockets, parts_->system,   parts_->tokens,    parts_->versionInfo};
+  return {parts_->capture,  parts_->capture,   parts_->handles,  parts_->hostNames,  parts_->icons,
+          parts_->ipHelper, parts_->processes, parts_->registry, parts_->shellStart, parts_->sockets,
+          parts_->system,   parts_->tokens,    parts_->urlCache, parts_->versionInfo};
 }
 
 LinuxCapture& LinuxMachine::Capture() { return parts_->capture; }

@@ -2,6 +2,7 @@
 
 #include "platform/Machine.h"
 #include "platform/simulated/capture/SimulatedCapture.h"
+#include "platform/simulated/internet/SimulatedUrlCache.h"
 #include "platform/simulated/net/SimulatedHostNames.h"
 #include "platform/simulated/net/SimulatedIpHelper.h"
 #include "platform/simulated/net/SimulatedSockets.h"
@@ -10,6 +11,7 @@
 #include "platform/simulated/process/SimulatedProcesses.h"
 #include "platform/simulated/process/SimulatedTokens.h"
 #include "platform/simulated/process/SimulatedVersionInfo.h"
+#include "platform/simulated/registry/SimulatedRegistry.h"
 #include "platform/simulated/system/SimulatedShellStart.h"
 #include "platform/simulated/system/SimulatedSystem.h"
 
@@ -27,8 +29,8 @@ class SimulatedMachine {
   SimulatedMachine(const SimulatedMachine&) = delete;
 
   Machine Operations() {
-    return {capture,   capture,    handles, hostNames, icons,  ipHelper,
-            processes, shellStart, sockets, system,    tokens, versionInfo};
+    return {capture,  capture,    handles, hostNames, icons,  ipHelper, processes,
+            registry, shellStart, sockets, system,    tokens, urlCache, versionInfo};
   }
 
  private:
@@ -47,6 +49,8 @@ class SimulatedMachine {
   SimulatedCapture capture;
   SimulatedSystem system;
   SimulatedShellStart shellStart;
+  SimulatedRegistry registry;
+  SimulatedUrlCache urlCache;
 
   /// Calls whose order counts: capture library and control, Sleep, Shell, sockets.
   std::vector<std::string>& Calls = core_.calls;

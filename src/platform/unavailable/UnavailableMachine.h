@@ -8,10 +8,12 @@
 #include "platform/unavailable/UnavailableIcons.h"
 #include "platform/unavailable/UnavailableIpHelper.h"
 #include "platform/unavailable/UnavailableProcesses.h"
+#include "platform/unavailable/UnavailableRegistry.h"
 #include "platform/unavailable/UnavailableShellStart.h"
 #include "platform/unavailable/UnavailableSockets.h"
 #include "platform/unavailable/UnavailableSystem.h"
 #include "platform/unavailable/UnavailableTokens.h"
+#include "platform/unavailable/UnavailableUrlCache.h"
 #include "platform/unavailable/UnavailableVersionInfo.h"
 
 namespace quendra::platform::unavailable {
@@ -24,8 +26,8 @@ class UnavailableMachine {
   UnavailableMachine(const UnavailableMachine&) = delete;
 
   Machine Operations() {
-    return {captureControls, captureLibrary, handles, hostNames, icons,  ipHelper,
-            processes,       shellStart,     sockets, system,    tokens, versionInfo};
+    return {captureControls, captureLibrary, handles, hostNames, icons,  ipHelper, processes,
+            registry,        shellStart,     sockets, system,    tokens, urlCache, versionInfo};
   }
 
   UnavailableCaptureControls captureControls;
@@ -35,10 +37,12 @@ class UnavailableMachine {
   UnavailableIcons icons;
   UnavailableIpHelper ipHelper;
   UnavailableProcesses processes;
+  UnavailableRegistry registry;
   UnavailableShellStart shellStart;
   UnavailableSockets sockets;
   UnavailableSystem system;
   UnavailableTokens tokens;
+  UnavailableUrlCache urlCache;
   UnavailableVersionInfo versionInfo;
 };
 

@@ -106,6 +106,39 @@ TEST_F(UnavailableFamilies, The_system_tells_no_version_and_starts_no_program) {
   EXPECT_FALSE(machine.shellStart.Shell("calc.exe", ShellStart::kNormalWindow));
 }
 
+TEST_F(UnavailableFamilies, No_key_of_a_registry_is_opened_made_written_or_read) {
+  RegistryKey key(77);
+  std::uint32_t number = 77;
+  std::string name = "before";
+  std::array<std::uint8_t, 4> data{};
+  EXPECT_EQ(machine.registry.RegCreateKeyA(kCurrentUser, "Software", key), kRegistryCallNotImplemented);
+  EXPECT_EQ(machine.registry.RegOpenKeyExA(kCurrentUser, "Software", kKeyRead, key),
+            kRegistryCallNotImplemented);
+  EXPECT_EQ(key, RegistryKey(77));
+  EXPECT_EQ(machine.registry.RegSetValueExA(kCurrentUser, "a", kRegBinary, data),
+            kRegistryCallNotImplemented);
+  EXPECT_EQ(machine.registry.RegQueryValueExA(kCurrentUser, "a", number, data, number),
+            kRegistryCallNotImplemented);
+  EXPECT_EQ(machine.registry.RegEnumKeyExA(kCurrentUser, 0, name), kRegistryCallNotImplemented);
+  EXPECT_EQ(machine.registry.RegDeleteKeyA(kCurrentUser, "Software"), kRegistryCallNotImplemented);
+  EXPECT_EQ(machine.registry.RegDeleteValueA(kCurrentUser, "a"), kRegistryCallNotImplemented);
+  EXPECT_EQ(machine.registry.RegCloseKey(kCurrentUser), kRegistryCallNotImplemented);
+  EXPECT_EQ(number, 77u);
+  EXPECT_EQ(name, "before");
+}
+
+TEST_F(UnavailableFamilies, The_internet_cache_has_no_walk_and_deletes_nothing) {
+  UrlCacheEntry entry;
+  std::uint32_t size = 77;
+  EXPECT_EQ(machine.urlCache.FindFirstUrlCacheEntryA("0", nullptr, size), kNoUrlCacheWalk);
+  EXPECT_EQ(machine.urlCache.GetLastError(), UrlCache::kErrorCallNotImplemented);
+  EXPECT_FALSE(machine.urlCache.FindNextUrlCacheEntryA(UrlCacheWalk(4), &entry, size));
+  EXPECT_FALSE(machine.urlCache.LocalAlloc(entry, 80));
+  EXPECT_FALSE(machine.urlCache.FindCloseUrlCache(UrlCacheWalk(4)));
+  EXPECT_FALSE(machine.urlCache.DeleteUrlCacheEntryA("http://www.example.com/"));
+  EXPECT_EQ(size, 77u);
+}
+
 } // namespace
 
 } // namespace quendra::platform::unavailable
