@@ -8,6 +8,7 @@ class Handles;
 class HostNames;
 class Icons;
 class IpHelper;
+class PerformanceData;
 class Processes;
 class Registry;
 class ShellStart;
@@ -25,6 +26,7 @@ struct Machine {
   HostNames& hostNames;
   Icons& icons;
   IpHelper& ipHelper;
+  PerformanceData& performanceData;
   Processes& processes;
   Registry& registry;
   ShellStart& shellStart;

@@ -35,6 +35,13 @@ class Recorder : public forms::ListViewObserver, public platform::HostNames, pub
   std::uint32_t GetTickCount() override { return machine_.system.GetTickCount(); }
   bool GetVersionExA(platform::OsVersion& version) override { return machine_.system.GetVersionExA(version); }
   void Sleep(std::uint32_t milliseconds) override { machine_.system.Sleep(milliseconds); }
+  void GetSystemInfo(platform::SystemInfo& info) override { machine_.system.GetSystemInfo(info); }
+  void GlobalMemoryStatus(platform::MemoryStatus& status) override {
+    machine_.system.GlobalMemoryStatus(status);
+  }
+  bool SystemTimeToFileTime(std::span<const std::uint8_t, 16> systemTime, std::uint64_t& fileTime) override {
+    return machine_.system.SystemTimeToFileTime(systemTime, fileTime);
+  }
   std::int32_t SecondOfDay() override { return machine_.system.SecondOfDay(); }
   std::int32_t DayNumber() override {
     Note("day number");
@@ -64,9 +71,9 @@ TEST_F(MonitorPageSwitchTest,
   Recorder recorder(machine);
   const platform::Machine original = machine.Operations();
   app::Program other({original.captureControls, original.captureLibrary, original.handles, recorder,
-                      original.icons, original.ipHelper, original.processes, original.registry,
-                      original.shellStart, original.sockets, recorder, original.tokens, original.urlCache,
-                      original.versionInfo},
+                      original.icons, original.ipHelper, original.performanceData, original.processes,
+                      original.registry, original.shellStart, original.sockets, recorder, original.tokens,
+                      original.urlCache, original.versionInfo},
                      desktop);
   other.Start();
   desktop.Click(other.frmSplash.Label2);

@@ -20,6 +20,11 @@ class RecordingSystem : public platform::System {
     return system_.GetVersionExA(version);
   }
   void Sleep(std::uint32_t milliseconds) override { system_.Sleep(milliseconds); }
+  void GetSystemInfo(platform::SystemInfo& info) override { system_.GetSystemInfo(info); }
+  void GlobalMemoryStatus(platform::MemoryStatus& status) override { system_.GlobalMemoryStatus(status); }
+  bool SystemTimeToFileTime(std::span<const std::uint8_t, 16> systemTime, std::uint64_t& fileTime) override {
+    return system_.SystemTimeToFileTime(systemTime, fileTime);
+  }
   std::int32_t DayNumber() override { return system_.DayNumber(); }
   std::int32_t SecondOfDay() override { return system_.SecondOfDay(); }
 
@@ -50,20 +55,11 @@ TEST_F(StartUp, The_load_opens_the_capture_library_and_makes_the_control_and_doe
 TEST_F(StartUp, The_load_reads_the_version_before_it_stores_the_cursor_and_starts_no_timer) {
   RecordingSystem system(machine.system, desktop);
   const platform::Machine original = machine.Operations();
-  const platform::Machine recorded{original.captureControls,
-                                   original.captureLibrary,
-                                   original.handles,
-                                   original.hostNames,
-                                   original.icons,
-                                   original.ipHelper,
-                                   original.processes,
-                                   original.registry,
-                                   original.shellStart,
-                                   original.sockets,
-                                   system,
-                                   original.tokens,
-                                   original.urlCache,
-                                   original.versionInfo};
+  const platform::Machine recorded{original.captureControls, original.captureLibrary, original.handles,
+                                   original.hostNames,       original.icons,          original.ipHelper,
+                                   original.performanceData, original.processes,      original.registry,
+                                   original.shellStart,      original.sockets,        system,
+                                   original.tokens,          original.urlCache,       original.versionInfo};
   app::Program other(recorded, desktop);
   other.Start();
   desktop.Calls.clear();

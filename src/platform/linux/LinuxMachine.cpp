@@ -8,6 +8,7 @@
 #include "platform/linux/process/LinuxTokens.h"
 #include "platform/linux/programs/LinuxIcons.h"
 #include "platform/linux/programs/LinuxVersionInfo.h"
+#include "platform/linux/system/LinuxPerformanceData.h"
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
 #include "platform/unavailable/UnavailableHandles.h"
@@ -18,7 +19,8 @@ namespace quendra::platform::linux_ {
 
 struct LinuxMachine::Parts {
   Parts(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot)
-      : folder(procRoot), capture(loop, descriptors), sockets(loop, descriptors, hostNames) {}
+      : folder(procRoot), capture(loop, descriptors), sockets(loop, descriptors, hostNames),
+        system(CoarseMilliseconds, procRoot) {}
 
   ProcFolder folder;
   HandleTable handleTable;
@@ -31,6 +33,7 @@ struct LinuxMachine::Parts {
   LinuxHostNames hostNames{folder};
   LinuxIcons icons{desktopIndex, iconTheme, paths};
   LinuxIpHelper ipHelper{folder, {MayTraceEveryProcess(), ::geteuid()}};
+  LinuxPerformanceData performanceData{folder};
   LinuxProcesses processes{folder, handleTable, paths};
   unavailable::UnavailableRegistry registry;
   LinuxShellStart shellStart;
@@ -47,9 +50,10 @@ LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, const 
 LinuxMachine::~LinuxMachine() = default;
 
 Machine LinuxMachine::Operations() {
-  return {parts_->capture,  parts_->capture,   parts_->handles,  parts_->hostNames,  parts_->icons,
-          parts_->ipHelper, parts_->processes, parts_->registry, parts_->shellStart, parts_->sockets,
-          parts_->system,   parts_->tokens,    parts_->urlCache, parts_->versionInfo};
+  return {parts_->capture,  parts_->capture,    parts_->handles,         parts_->hostNames,
+          parts_->icons,    parts_->ipHelper,   parts_->performanceData, parts_->processes,
+          parts_->registry, parts_->shellStart, parts_->sockets,         parts_->system,
+          parts_->tokens,   parts_->urlCache,   parts_->versionInfo};
 }
 
 LinuxCapture& LinuxMachine::Capture() { return parts_->capture; }

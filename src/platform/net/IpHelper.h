@@ -25,6 +25,7 @@ class IpHelper : public TcpEntryChange {
 
   /// What GetAdaptersInfo needs for one adapter.
   static constexpr std::uint32_t kAdapterBytes = 640;
+  static constexpr std::uint32_t kErrorInsufficientBuffer = 122;
   static constexpr std::uint32_t kErrorBufferOverflow = 111;
   static constexpr std::uint32_t kErrorNotSupported = 50;
 
@@ -34,6 +35,9 @@ class IpHelper : public TcpEntryChange {
   /// `size` counts bytes of room, kAdapterBytes an adapter. With less room than needed it gives
   /// kErrorBufferOverflow and puts the needed size in `size`; otherwise it gives 0 and fills `adapters`.
   virtual std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) = 0;
+  /// The network interfaces: a 32-bit count, then the rows (InterfaceRow.h). Puts the needed size in `size`
+  /// and fails with kErrorInsufficientBuffer when the buffer has less room.
+  virtual std::uint32_t GetIfTable(std::span<std::uint8_t> buffer, std::uint32_t& size, bool sorted) = 0;
 };
 
 } // namespace quendra::platform

@@ -35,6 +35,8 @@ class Processes {
   };
 
   static constexpr std::uint32_t kSnapProcess = 2;
+  /// The access of OpenProcess that TerminateProcess needs.
+  static constexpr std::uint32_t kTerminate = 1;
 
   /// A snapshot's handle, kInvalidHandle on failure. CloseHandle frees it.
   virtual Handle CreateToolhelp32Snapshot(std::uint32_t flags, std::uint32_t processId) = 0;
@@ -53,6 +55,9 @@ class Processes {
   /// and never beyond the text's end; gives the number written, 0 on failure.
   virtual std::uint32_t GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
                                              std::uint32_t size) = 0;
+
+  /// Ends an opened process; false on failure.
+  virtual bool TerminateProcess(Handle process, std::uint32_t exitCode) = 0;
 
   /// 0 when the last call that sets it left no error.
   virtual std::uint32_t GetLastError() = 0;

@@ -12,6 +12,7 @@
 #include "platform/simulated/process/SimulatedTokens.h"
 #include "platform/simulated/process/SimulatedVersionInfo.h"
 #include "platform/simulated/registry/SimulatedRegistry.h"
+#include "platform/simulated/system/SimulatedPerformanceData.h"
 #include "platform/simulated/system/SimulatedShellStart.h"
 #include "platform/simulated/system/SimulatedSystem.h"
 
@@ -29,7 +30,7 @@ class SimulatedMachine {
   SimulatedMachine(const SimulatedMachine&) = delete;
 
   Machine Operations() {
-    return {capture,  capture,    handles, hostNames, icons,  ipHelper, processes,
+    return {capture,  capture,    handles, hostNames, icons,  ipHelper, performanceData, processes,
             registry, shellStart, sockets, system,    tokens, urlCache, versionInfo};
   }
 
@@ -47,6 +48,7 @@ class SimulatedMachine {
   SimulatedHostNames hostNames;
   SimulatedSockets sockets;
   SimulatedCapture capture;
+  SimulatedPerformanceData performanceData;
   SimulatedSystem system;
   SimulatedShellStart shellStart;
   SimulatedRegistry registry;

@@ -1,6 +1,10 @@
 #pragma once
 
+#include "platform/system/MemoryStatus.h"
+#include "platform/system/SystemTime.h"
+
 #include <cstdint>
+#include <span>
 
 namespace quendra::platform {
 
@@ -10,7 +14,12 @@ struct OsVersion {
   std::uint32_t minorVersion = 0;
 };
 
-/// Clock, version and waiting.
+/// What GetSystemInfo tells, as far as the program asks.
+struct SystemInfo {
+  std::uint32_t numberOfProcessors = 0;
+};
+
+/// Clock, version, memory and waiting.
 class System {
  public:
   virtual ~System() = default;
@@ -21,6 +30,12 @@ class System {
   virtual bool GetVersionExA(OsVersion& version) = 0;
   /// Blocks the thread.
   virtual void Sleep(std::uint32_t milliseconds) = 0;
+  virtual void GetSystemInfo(SystemInfo& info) = 0;
+  /// Fills the image, whose length field holds its size.
+  virtual void GlobalMemoryStatus(MemoryStatus& status) = 0;
+  /// False on failure. Hundreds of nanoseconds since the start of 1601.
+  virtual bool SystemTimeToFileTime(std::span<const std::uint8_t, 16> systemTime,
+                                    std::uint64_t& fileTime) = 0;
   /// The current local date as the language numbers days: 1 is 31 December 1899.
   virtual std::int32_t DayNumber() = 0;
   /// The current local time: seconds since midnight.

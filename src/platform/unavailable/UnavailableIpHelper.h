@@ -14,6 +14,9 @@ class UnavailableIpHelper : public IpHelper {
   std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>&, std::uint32_t&) override {
     return kErrorNotSupported;
   }
+  std::uint32_t GetIfTable(std::span<std::uint8_t>, std::uint32_t&, bool) override {
+    return kErrorNotSupported;
+  }
 };
 
 } // namespace quendra::platform::unavailable

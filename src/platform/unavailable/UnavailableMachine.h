@@ -7,6 +7,7 @@
 #include "platform/unavailable/UnavailableHostNames.h"
 #include "platform/unavailable/UnavailableIcons.h"
 #include "platform/unavailable/UnavailableIpHelper.h"
+#include "platform/unavailable/UnavailablePerformanceData.h"
 #include "platform/unavailable/UnavailableProcesses.h"
 #include "platform/unavailable/UnavailableRegistry.h"
 #include "platform/unavailable/UnavailableShellStart.h"
@@ -26,7 +27,7 @@ class UnavailableMachine {
   UnavailableMachine(const UnavailableMachine&) = delete;
 
   Machine Operations() {
-    return {captureControls, captureLibrary, handles, hostNames, icons,  ipHelper, processes,
+    return {captureControls, captureLibrary, handles, hostNames, icons,  ipHelper, performanceData, processes,
             registry,        shellStart,     sockets, system,    tokens, urlCache, versionInfo};
   }
 
@@ -36,6 +37,7 @@ class UnavailableMachine {
   UnavailableHostNames hostNames;
   UnavailableIcons icons;
   UnavailableIpHelper ipHelper;
+  UnavailablePerformanceData performanceData;
   UnavailableProcesses processes;
   UnavailableRegistry registry;
   UnavailableShellStart shellStart;

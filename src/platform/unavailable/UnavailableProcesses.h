@@ -16,6 +16,7 @@ class UnavailableProcesses : public Processes {
   bool CloseHandle(Handle) override { return false; }
   bool EnumProcessModules(Handle, std::span<ModuleHandle>) override { return false; }
   std::uint32_t GetModuleFileNameExA(Handle, ModuleHandle, std::string&, std::uint32_t) override { return 0; }
+  bool TerminateProcess(Handle, std::uint32_t) override { return false; }
   std::uint32_t GetLastError() override { return kCallNotImplemented; }
 };
 

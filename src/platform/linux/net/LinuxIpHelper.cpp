@@ -51,4 +51,10 @@ std::uint32_t LinuxIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& adapter
   return 0;
 }
 
+std::uint32_t LinuxIpHelper::GetIfTable(std::span<std::uint8_t> buffer, std::uint32_t& size, bool) {
+  std::vector<InterfaceRow> rows;
+  if (!interfaces_.Read(rows)) return kErrorNotSupported;
+  return PutInterfaceTable(rows, buffer, size);
+}
+
 } // namespace quendra::platform::linux_

@@ -1,7 +1,8 @@
 #include "platform/linux/net/SocketDiagnostics.h"
 
+#include "platform/linux/net/NetlinkBytes.h"
+
 #include <linux/inet_diag.h>
-#include <linux/netlink.h>
 #include <linux/sock_diag.h>
 #include <sys/socket.h>
 
@@ -21,14 +22,6 @@ constexpr std::uint32_t kKernelListening = 10;
 // The owner table's number for each state number of the kernel.
 constexpr std::array<std::uint32_t, 13> kStates = {0, 5, 3, 4, 6, 7, 11, 1, 8, 10, 2, 9, 4};
 
-template <typename Record>
-std::optional<Record> ReadAt(std::span<const std::uint8_t> bytes, std::size_t offset) {
-  if (offset > bytes.size() || bytes.size() - offset < sizeof(Record)) return {};
-  Record record;
-  std::memcpy(&record, bytes.data() + offset, sizeof record);
-  return record;
-}
-
 bool IsMapped(const std::uint32_t (&address)[4]) {
   static constexpr std::uint8_t kPrefix[12] = {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0xFF, 0xFF};
   return std::memcmp(address, kPrefix, sizeof kPrefix) == 0;
@@ -41,13 +34,11 @@ bool IsUnset(const std::uint32_t (&address)[4]) {
 /// Whether a listener takes connections of the IPv6 family alone; so it is taken to be when the kernel
 /// doesn't tell.
 bool IsV6Only(std::span<const std::uint8_t> attributes) {
-  while (const auto attribute = ReadAt<nlattr>(attributes, 0)) {
-    if (attribute->nla_len < sizeof(nlattr) || attribute->nla_len > attributes.size()) break;
-    if (attribute->nla_type == INET_DIAG_SKV6ONLY && attribute->nla_len > sizeof(nlattr))
-      return attributes[sizeof(nlattr)] != 0;
-    attributes = attributes.subspan(std::min<std::size_t>(NLA_ALIGN(attribute->nla_len), attributes.size()));
-  }
-  return true;
+  std::optional<bool> told;
+  ForEachAttribute(attributes, [&](int type, NetlinkBytes content) {
+    if (type == INET_DIAG_SKV6ONLY && !content.empty() && !told) told = content[0] != 0;
+  });
+  return told.value_or(true);
 }
 
 /// The two IPv4 addresses of the socket; false when it isn't one over IPv4.
@@ -94,7 +85,7 @@ SocketDiagnostics::Progress SocketDiagnostics::TakeUp(std::span<const std::uint8
       if (header->nlmsg_type == NLMSG_ERROR) return Progress::Failed;
       TakeUpSocket(datagram.subspan(sizeof(nlmsghdr), header->nlmsg_len - sizeof(nlmsghdr)), sockets);
     }
-    datagram = datagram.subspan(std::min<std::size_t>(NLMSG_ALIGN(header->nlmsg_len), datagram.size()));
+    datagram = After(datagram, header->nlmsg_len);
   }
   return Progress::More;
 }

@@ -15,6 +15,8 @@ namespace quendra::platform::linux_ {
 /// another one takes over its id.
 struct OpenedProcess {
   Descriptor folder;
+  /// By which it can be ended, where that was asked for.
+  Descriptor process{};
 };
 
 /// A process list as it was, and how far it has been walked.

@@ -1,5 +1,8 @@
 #include "platform/linux/process/LinuxProcesses.h"
 
+#include <signal.h>
+#include <sys/syscall.h>
+
 #include <algorithm>
 
 namespace quendra::platform::linux_ {
@@ -7,6 +10,7 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr ModuleHandle kExecutableModule{1};
+constexpr std::uint32_t kFirstProcess = 1;
 
 } // namespace
 
@@ -19,6 +23,11 @@ bool LinuxProcesses::Fail(std::uint32_t error) {
   return false;
 }
 
+bool LinuxProcesses::Succeed() {
+  handles_.lastError = kNoError;
+  return true;
+}
+
 Handle LinuxProcesses::CreateToolhelp32Snapshot(std::uint32_t flags, std::uint32_t) {
   Snapshot snapshot;
   if ((flags & kSnapProcess) == 0) {
@@ -29,6 +38,7 @@ Handle LinuxProcesses::CreateToolhelp32Snapshot(std::uint32_t flags, std::uint32
     Fail(kAccessDenied);
     return kInvalidHandle;
   }
+  Succeed();
   return handles_.Add(std::move(snapshot));
 }
 
@@ -50,21 +60,56 @@ bool LinuxProcesses::NextOf(Snapshot* snapshot, Entry& entry) {
   entry.parentProcessId = row.parentProcessId;
   entry.exeFile.fill('\0');
   std::copy_n(row.name.begin(), std::min(row.name.size(), ProcessList::kNameLength), entry.exeFile.begin());
-  return true;
+  return Succeed();
 }
 
-Handle LinuxProcesses::OpenProcess(std::uint32_t, bool, std::uint32_t processId) {
+Handle LinuxProcesses::OpenProcess(std::uint32_t access, bool, std::uint32_t processId) {
   Descriptor folder = processId == 0 ? Descriptor() : folder_.Open(processId);
   if (!folder) {
     Fail(kInvalidParameter);
     return kNoHandle;
   }
-  return handles_.Add(OpenedProcess{std::move(folder)});
+  Descriptor process;
+  if ((access & kTerminate) != 0) {
+    process = OpenToEnd(processId, folder);
+    if (!process) return kNoHandle;
+  }
+  Succeed();
+  return handles_.Add(OpenedProcess{std::move(folder), std::move(process)});
+}
+
+Descriptor LinuxProcesses::OpenToEnd(std::uint32_t processId, const Descriptor& folder) {
+  Descriptor process(static_cast<int>(::syscall(SYS_pidfd_open, processId, 0)));
+  // Asked of the folder after that: as it still answers, the id has had one process all the time.
+  const auto stat = ProcFolder::Stat(folder);
+  const auto shown = list_.StartTimeOf(processId);
+  if (!stat || (shown && *shown != stat->startTime)) {
+    Fail(kInvalidParameter);
+    return {};
+  }
+  // The kernel and its first process would take the signal and go on.
+  if (!process || processId == kFirstProcess || stat->isKernelThread) {
+    Fail(kAccessDenied);
+    return {};
+  }
+  return process;
+}
+
+bool LinuxProcesses::TerminateProcess(Handle handle, std::uint32_t) {
+  const OpenedProcess* opened = handles_.Find<OpenedProcess>(handle);
+  if (opened == nullptr) return Fail(kErrorInvalidHandle);
+  const bool ended =
+      opened->process && ::syscall(SYS_pidfd_send_signal, opened->process.Number(), SIGKILL, nullptr, 0) == 0;
+  return ended ? Succeed() : Fail(kAccessDenied);
+}
+
+Handle LinuxProcesses::GetCurrentProcess() {
+  Succeed();
+  return kOwnProcess;
 }
 
 bool LinuxProcesses::CloseHandle(Handle handle) {
-  if (handle == kOwnProcess) return true;
-  return handles_.Close(handle) || Fail(kErrorInvalidHandle);
+  return handle == kOwnProcess || handles_.Close(handle) ? Succeed() : Fail(kErrorInvalidHandle);
 }
 
 std::optional<std::string> LinuxProcesses::ExecutableOf(Handle process) {
@@ -87,7 +132,7 @@ std::optional<std::string> LinuxProcesses::ExecutableOf(Handle process) {
 bool LinuxProcesses::EnumProcessModules(Handle process, std::span<ModuleHandle> modules) {
   if (!ExecutableOf(process)) return false;
   if (!modules.empty()) modules[0] = kExecutableModule;
-  return true;
+  return Succeed();
 }
 
 std::uint32_t LinuxProcesses::GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
@@ -100,6 +145,7 @@ std::uint32_t LinuxProcesses::GetModuleFileNameExA(Handle process, ModuleHandle 
   }
   const std::string name = paths_.ToSystem(*executable, std::min<std::size_t>(size, path.size()));
   std::copy(name.begin(), name.end(), path.begin());
+  Succeed();
   return static_cast<std::uint32_t>(name.size());
 }
 

@@ -18,15 +18,21 @@ class LinuxProcesses : public Processes {
   bool Process32First(Handle snapshot, Entry& entry) override;
   bool Process32Next(Handle snapshot, Entry& entry) override;
   Handle OpenProcess(std::uint32_t access, bool inherit, std::uint32_t processId) override;
-  Handle GetCurrentProcess() override { return kOwnProcess; }
+  Handle GetCurrentProcess() override;
   bool CloseHandle(Handle handle) override;
   bool EnumProcessModules(Handle process, std::span<ModuleHandle> modules) override;
   std::uint32_t GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
                                      std::uint32_t size) override;
+  bool TerminateProcess(Handle process, std::uint32_t exitCode) override;
   std::uint32_t GetLastError() override { return handles_.lastError; }
 
  private:
   bool Fail(std::uint32_t error);
+  /// Every call that succeeds leaves no error.
+  bool Succeed();
+  /// By which the process of that folder can be ended; nothing, with the error, when it may not be ended or
+  /// isn't the one that the last snapshot showed under its id.
+  Descriptor OpenToEnd(std::uint32_t processId, const Descriptor& folder);
   bool NextOf(Snapshot* snapshot, Entry& entry);
   std::optional<std::string> ExecutableOf(Handle process);
 

@@ -173,6 +173,10 @@ std::optional<ProcessStat> ProcFolder::Stat(std::uint32_t processId) const {
   return StatAt(folder_.Number(), NameOf(processId, "stat").data());
 }
 
+std::optional<ProcessStat> ProcFolder::Stat(const Descriptor& processFolder) {
+  return StatAt(processFolder.Number(), "stat");
+}
+
 bool ProcFolder::HasLivingThread(std::uint32_t processId) const {
   return AskThreads(folder_.Number(), std::to_string(processId), [this](const std::string& thread) {
     const auto stat = StatAt(folder_.Number(), (thread + "/stat").c_str());

@@ -41,6 +41,7 @@ class ProcFolder {
   /// In ascending order of the ids; false when /proc can't be read.
   bool List(std::vector<Place>& places) const;
   std::optional<ProcessStat> Stat(std::uint32_t processId) const;
+  static std::optional<ProcessStat> Stat(const Descriptor& processFolder);
   /// The process's folder, to be asked about this very process even when its id is taken over.
   Descriptor Open(std::uint32_t processId) const;
   /// The effective user id.

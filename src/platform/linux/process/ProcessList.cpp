@@ -69,6 +69,11 @@ bool ProcessList::Read(std::vector<Row>& rows) {
   return true;
 }
 
+std::optional<std::uint64_t> ProcessList::StartTimeOf(std::uint32_t processId) const {
+  const auto found = known_.find(processId);
+  return found == known_.end() ? std::nullopt : std::optional(found->second.startTime);
+}
+
 bool ProcessList::IsDue(const Known& known, const ProcFolder::Place& place, std::uint64_t now) const {
   if (known.readAt == 0 || known.node != place.node || place.node == 0) return true;
   if (now - known.firstSeen <= kYoungMilliseconds) return true;

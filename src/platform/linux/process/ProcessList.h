@@ -29,6 +29,8 @@ class ProcessList {
   /// can't be seen there is an id that no process has. A process known from before is looked at again while
   /// it is young, since it may yet become another program, and from time to time later.
   bool Read(std::vector<Row>& rows);
+  /// When the process of this id started, as it was last read; nothing when it wasn't there.
+  std::optional<std::uint64_t> StartTimeOf(std::uint32_t processId) const;
 
   static constexpr std::uint64_t kYoungMilliseconds = 3000;
   static constexpr std::uint64_t kRereadMilliseconds = 15000;

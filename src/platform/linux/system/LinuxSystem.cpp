@@ -1,5 +1,9 @@
 #include "platform/linux/system/LinuxSystem.h"
 
+#include "platform/linux/system/Files.h"
+#include "platform/linux/system/MemoryFigures.h"
+#include "platform/linux/system/ProcessorFigures.h"
+
 #include <chrono>
 #include <ctime>
 #include <optional>
@@ -20,7 +24,15 @@ std::optional<std::tm> LocalTime() {
   return local;
 }
 
+/// How long figures of memory hold. The kernel itself brings most of them up to date once a second.
+constexpr std::uint64_t kMemoryMilliseconds = 250;
+
 } // namespace
+
+LinuxSystem::LinuxSystem(Clock clock, const std::string& procRoot)
+    : clock_(std::move(clock)), start_(clock_()), folder_(procRoot),
+      processors_(static_cast<std::uint32_t>(ProcessorsOf(folder_.File("stat").value_or(""), 1).size() - 1)) {
+}
 
 std::uint32_t LinuxSystem::GetTickCount() {
   return static_cast<std::uint32_t>(kTickAtStart + clock_() - start_);
@@ -33,6 +45,23 @@ bool LinuxSystem::GetVersionExA(OsVersion& version) {
 
 void LinuxSystem::Sleep(std::uint32_t milliseconds) {
   std::this_thread::sleep_for(std::chrono::milliseconds(milliseconds));
+}
+
+void LinuxSystem::GlobalMemoryStatus(MemoryStatus& status) {
+  const std::uint64_t now = clock_();
+  if (!memoryRead_ || now - *memoryRead_ >= kMemoryMilliseconds) {
+    memory_ = ReadMemory();
+    memoryRead_ = now;
+  }
+  status = memory_;
+}
+
+MemoryStatus LinuxSystem::ReadMemory() const {
+  // Pages: all that are mapped, then those that are held.
+  const auto pages = Split(folder_.File("self/statm").value_or(""), ' ');
+  const std::uint64_t held = pages.size() > 1 ? WholeNumber(pages[1]).value_or(0) : 0;
+  return MemoryStatusOf(folder_.File("meminfo").value_or(""),
+                        held * static_cast<std::uint64_t>(::sysconf(_SC_PAGESIZE)));
 }
 
 std::int32_t LinuxSystem::DayNumber() {

@@ -43,4 +43,12 @@ std::uint32_t SimulatedIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& ada
   return 0;
 }
 
+std::uint32_t SimulatedIpHelper::GetIfTable(std::span<std::uint8_t> buffer, std::uint32_t& size,
+                                            bool sorted) {
+  InterfaceCalls.push_back(sorted);
+  if (InterfacesError != 0) return InterfacesError;
+  if (!buffer.empty() && InterfacesErrorWithRoom != 0) return InterfacesErrorWithRoom;
+  return PutInterfaceTable(Interfaces, buffer, size);
+}
+
 } // namespace quendra::platform::simulated

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/net/InterfaceRow.h"
 #include "platform/net/IpHelper.h"
 
 #include <array>
@@ -26,6 +27,14 @@ class SimulatedIpHelper : public IpHelper {
   /// Other than 0: what GetAdaptersInfo fails with.
   std::uint32_t AdaptersError = 0;
 
+  /// The rows of GetIfTable in this order; the texts stand in their images.
+  std::vector<InterfaceRow> Interfaces;
+  /// Other than 0: what GetIfTable fails with, at once or only when it is given room.
+  std::uint32_t InterfacesError = 0;
+  std::uint32_t InterfacesErrorWithRoom = 0;
+  /// Whether each call of GetIfTable asked for sorted rows.
+  std::vector<bool> InterfaceCalls;
+
   // Dormant: the records that SetTcpEntry was given, and what it gives.
   std::vector<std::array<std::uint8_t, TcpTableEntry::kBytesWithoutOwner>> Deleted;
   std::uint32_t SetTcpEntryResult = 0;
@@ -33,6 +42,7 @@ class SimulatedIpHelper : public IpHelper {
   std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) override;
   std::uint32_t SetTcpEntry(std::span<const std::uint8_t, TcpTableEntry::kBytesWithoutOwner> record) override;
   std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
+  std::uint32_t GetIfTable(std::span<std::uint8_t> buffer, std::uint32_t& size, bool sorted) override;
 };
 
 } // namespace quendra::platform::simulated

@@ -94,4 +94,15 @@ std::uint32_t SimulatedProcesses::GetModuleFileNameExA(Handle handle, ModuleHand
   return static_cast<std::uint32_t>(length);
 }
 
+bool SimulatedProcesses::TerminateProcess(Handle handle, std::uint32_t exitCode) {
+  const Process* process = Opened(handle);
+  TerminateCalls.push_back(std::to_string(process ? process->id : 0) + " " + std::to_string(exitCode));
+  core_.lastError = !process                          ? kErrorInvalidHandle
+                    : unending_.contains(process->id) ? kAccessDenied
+                                                      : kNoError;
+  if (core_.lastError != 0) return false;
+  End(process->id);
+  return true;
+}
+
 } // namespace quendra::platform::simulated

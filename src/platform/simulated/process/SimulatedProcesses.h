@@ -3,6 +3,8 @@
 #include "platform/process/Processes.h"
 #include "platform/simulated/SimulatedCore.h"
 
+#include <set>
+
 namespace quendra::platform::simulated {
 
 /// Texts are bytes of the system's code page. A process without a path has no modules.
@@ -26,6 +28,11 @@ class SimulatedProcesses : public Processes {
   /// The error that an earlier call left.
   void LeaveError(std::uint32_t error) { core_.lastError = error; }
 
+  /// TerminateProcess of this id is refused.
+  void RefuseToEnd(std::uint32_t id) { unending_.insert(id); }
+  /// One text a call: id (0 for a handle of nothing) and exit code, as in "100 0".
+  std::vector<std::string> TerminateCalls;
+
   /// Handles of any kind that were given and not closed.
   int OpenHandles() const { return static_cast<int>(core_.opened.size()); }
   /// CloseHandle calls for something that was no open handle.
@@ -47,6 +54,7 @@ class SimulatedProcesses : public Processes {
   bool EnumProcessModules(Handle process, std::span<ModuleHandle> modules) override;
   std::uint32_t GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
                                      std::uint32_t size) override;
+  bool TerminateProcess(Handle process, std::uint32_t exitCode) override;
   std::uint32_t GetLastError() override { return core_.lastError; }
 
  private:
@@ -59,6 +67,7 @@ class SimulatedProcesses : public Processes {
   Core& core_;
   std::vector<Process> processes_;
   std::map<std::uint32_t, Handle> failingOpens_;
+  std::set<std::uint32_t> unending_;
   std::map<Handle, Snapshot> snapshots_;
 };
 

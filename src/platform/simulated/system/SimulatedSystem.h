@@ -15,6 +15,11 @@ class SimulatedSystem : public System {
   /// Family 2, version 5.1 unless set.
   OsVersion Version{2, 5, 1};
   bool FailVersion = false;
+  std::uint32_t ProcessorCount = 1;
+  /// Half a gigabyte, half of it free, unless set.
+  MemoryStatus Memory =
+      MemoryOf({50, 0x20000000, 0x10000000, 0x40000000, 0x30000000, 0x7FFE0000, 0x7F000000});
+  int MemoryQuestions = 0;
   std::int32_t Day = 38353;        ///< 1 January 2005
   std::int32_t Second = 12 * 3600; ///< of the day
 
@@ -27,8 +32,28 @@ class SimulatedSystem : public System {
     core_.calls.push_back("Sleep " + std::to_string(milliseconds));
     core_.tickCount += milliseconds;
   }
+  void GetSystemInfo(SystemInfo& info) override { info.numberOfProcessors = ProcessorCount; }
+  void GlobalMemoryStatus(MemoryStatus& status) override {
+    ++MemoryQuestions;
+    status = Memory;
+  }
+  bool SystemTimeToFileTime(std::span<const std::uint8_t, 16> systemTime, std::uint64_t& fileTime) override {
+    return FileTimeOf(systemTime, fileTime);
+  }
   std::int32_t DayNumber() override { return Day; }
   std::int32_t SecondOfDay() override { return Second; }
+
+  /// The load in per cent, then total and available bytes: physical, page file, virtual.
+  static MemoryStatus MemoryOf(const std::array<std::uint32_t, 7>& figures) {
+    MemoryStatus status;
+    status.Set(MemoryStatus::kLength, MemoryStatus::kBytes);
+    std::size_t at = MemoryStatus::kMemoryLoad;
+    for (const std::uint32_t figure : figures) {
+      PutLittle32(status.bytes, at, figure);
+      at += sizeof figure;
+    }
+    return status;
+  }
 
  private:
   Core& core_;
