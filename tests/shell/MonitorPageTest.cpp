@@ -71,9 +71,9 @@ TEST_F(MonitorPageSwitchTest,
   Recorder recorder(machine);
   const platform::Machine original = machine.Operations();
   app::Program other({original.captureControls, original.captureLibrary, original.handles, recorder,
-                      original.icons, original.ipHelper, original.performanceData, original.processes,
-                      original.registry, original.shellStart, original.sockets, recorder, original.tokens,
-                      original.urlCache, original.versionInfo},
+                      original.icmp, original.icons, original.ipHelper, original.keyboardLayout,
+                      original.performanceData, original.processes, original.registry, original.shellStart,
+                      original.sockets, recorder, original.tokens, original.urlCache, original.versionInfo},
                      desktop);
   other.Start();
   desktop.Click(other.frmSplash.Label2);

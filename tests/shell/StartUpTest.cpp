@@ -55,11 +55,23 @@ TEST_F(StartUp, The_load_opens_the_capture_library_and_makes_the_control_and_doe
 TEST_F(StartUp, The_load_reads_the_version_before_it_stores_the_cursor_and_starts_no_timer) {
   RecordingSystem system(machine.system, desktop);
   const platform::Machine original = machine.Operations();
-  const platform::Machine recorded{original.captureControls, original.captureLibrary, original.handles,
-                                   original.hostNames,       original.icons,          original.ipHelper,
-                                   original.performanceData, original.processes,      original.registry,
-                                   original.shellStart,      original.sockets,        system,
-                                   original.tokens,          original.urlCache,       original.versionInfo};
+  const platform::Machine recorded{original.captureControls,
+                                   original.captureLibrary,
+                                   original.handles,
+                                   original.hostNames,
+                                   original.icmp,
+                                   original.icons,
+                                   original.ipHelper,
+                                   original.keyboardLayout,
+                                   original.performanceData,
+                                   original.processes,
+                                   original.registry,
+                                   original.shellStart,
+                                   original.sockets,
+                                   system,
+                                   original.tokens,
+                                   original.urlCache,
+                                   original.versionInfo};
   app::Program other(recorded, desktop);
   other.Start();
   desktop.Calls.clear();

@@ -26,9 +26,23 @@ class UnavailableMachineTest : public testing::Test {
   /// The machine with sockets of another.
   platform::Machine WithSockets(platform::Sockets& sockets) {
     const platform::Machine all = machine.Operations();
-    return {all.captureControls, all.captureLibrary, all.handles,    all.hostNames,  all.icons, all.ipHelper,
-            all.performanceData, all.processes,      all.registry,   all.shellStart, sockets,   all.system,
-            all.tokens,          all.urlCache,       all.versionInfo};
+    return {all.captureControls,
+            all.captureLibrary,
+            all.handles,
+            all.hostNames,
+            all.icmp,
+            all.icons,
+            all.ipHelper,
+            all.keyboardLayout,
+            all.performanceData,
+            all.processes,
+            all.registry,
+            all.shellStart,
+            sockets,
+            all.system,
+            all.tokens,
+            all.urlCache,
+            all.versionInfo};
   }
 
   platform::unavailable::UnavailableMachine machine;

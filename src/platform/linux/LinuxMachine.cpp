@@ -12,6 +12,8 @@
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
 #include "platform/unavailable/UnavailableHandles.h"
+#include "platform/unavailable/UnavailableIcmp.h"
+#include "platform/unavailable/UnavailableKeyboardLayout.h"
 #include "platform/unavailable/UnavailableRegistry.h"
 #include "platform/unavailable/UnavailableUrlCache.h"
 
@@ -31,9 +33,11 @@ struct LinuxMachine::Parts {
   LinuxCapture capture;
   unavailable::UnavailableHandles handles; // this system has no list of all handles
   LinuxHostNames hostNames{folder};
+  unavailable::UnavailableIcmp icmp;
   LinuxIcons icons{desktopIndex, iconTheme, paths};
   LinuxIpHelper ipHelper{folder, {MayTraceEveryProcess(), ::geteuid()}};
   LinuxPerformanceData performanceData{folder};
+  unavailable::UnavailableKeyboardLayout keyboardLayout;
   LinuxProcesses processes{folder, handleTable, paths};
   unavailable::UnavailableRegistry registry;
   LinuxShellStart shellStart;
@@ -50,10 +54,12 @@ LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, const 
 LinuxMachine::~LinuxMachine() = default;
 
 Machine LinuxMachine::Operations() {
-  return {parts_->capture,  parts_->capture,    parts_->handles,         parts_->hostNames,
-          parts_->icons,    parts_->ipHelper,   parts_->performanceData, parts_->processes,
-          parts_->registry, parts_->shellStart, parts_->sockets,         parts_->system,
-          parts_->tokens,   parts_->urlCache,   parts_->versionInfo};
+  return {parts_->capture,   parts_->capture,        parts_->handles,
+          parts_->hostNames, parts_->icmp,           parts_->icons,
+          parts_->ipHelper,  parts_->keyboardLayout, parts_->performanceData,
+          parts_->processes, parts_->registry,       parts_->shellStart,
+          parts_->sockets,   parts_->system,         parts_->tokens,
+          parts_->urlCache,  parts_->versionInfo};
 }
 
 LinuxCapture& LinuxMachine::Capture() { return parts_->capture; }

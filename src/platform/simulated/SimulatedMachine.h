@@ -2,6 +2,7 @@
 
 #include "platform/Machine.h"
 #include "platform/simulated/capture/SimulatedCapture.h"
+#include "platform/simulated/icmp/SimulatedIcmp.h"
 #include "platform/simulated/internet/SimulatedUrlCache.h"
 #include "platform/simulated/net/SimulatedHostNames.h"
 #include "platform/simulated/net/SimulatedIpHelper.h"
@@ -12,6 +13,7 @@
 #include "platform/simulated/process/SimulatedTokens.h"
 #include "platform/simulated/process/SimulatedVersionInfo.h"
 #include "platform/simulated/registry/SimulatedRegistry.h"
+#include "platform/simulated/system/SimulatedKeyboardLayout.h"
 #include "platform/simulated/system/SimulatedPerformanceData.h"
 #include "platform/simulated/system/SimulatedShellStart.h"
 #include "platform/simulated/system/SimulatedSystem.h"
@@ -23,15 +25,16 @@ namespace quendra::platform::simulated {
 class SimulatedMachine {
  public:
   SimulatedMachine()
-      : processes(core_), tokens(core_), handles(core_), sockets(core_, hostNames), capture(core_),
-        system(core_), shellStart(core_) {}
+      : processes(core_), tokens(core_), handles(core_), icmp(core_), sockets(core_, hostNames),
+        capture(core_), system(core_), shellStart(core_) {}
   /// With sockets whose messages go through a loop.
   explicit SimulatedMachine(EventLoop& loop) : SimulatedMachine() { sockets.UseLoop(loop); }
   SimulatedMachine(const SimulatedMachine&) = delete;
 
   Machine Operations() {
-    return {capture,  capture,    handles, hostNames, icons,  ipHelper, performanceData, processes,
-            registry, shellStart, sockets, system,    tokens, urlCache, versionInfo};
+    return {capture,  capture,        handles,         hostNames, icmp,       icons,
+            ipHelper, keyboardLayout, performanceData, processes, registry,   shellStart,
+            sockets,  system,         tokens,          urlCache,  versionInfo};
   }
 
  private:
@@ -46,10 +49,12 @@ class SimulatedMachine {
   SimulatedHandles handles;
   SimulatedIpHelper ipHelper;
   SimulatedHostNames hostNames;
+  SimulatedIcmp icmp;
   SimulatedSockets sockets;
   SimulatedCapture capture;
   SimulatedPerformanceData performanceData;
   SimulatedSystem system;
+  SimulatedKeyboardLayout keyboardLayout;
   SimulatedShellStart shellStart;
   SimulatedRegistry registry;
   SimulatedUrlCache urlCache;

@@ -5,8 +5,10 @@
 #include "platform/unavailable/UnavailableCaptureLibrary.h"
 #include "platform/unavailable/UnavailableHandles.h"
 #include "platform/unavailable/UnavailableHostNames.h"
+#include "platform/unavailable/UnavailableIcmp.h"
 #include "platform/unavailable/UnavailableIcons.h"
 #include "platform/unavailable/UnavailableIpHelper.h"
+#include "platform/unavailable/UnavailableKeyboardLayout.h"
 #include "platform/unavailable/UnavailablePerformanceData.h"
 #include "platform/unavailable/UnavailableProcesses.h"
 #include "platform/unavailable/UnavailableRegistry.h"
@@ -27,17 +29,20 @@ class UnavailableMachine {
   UnavailableMachine(const UnavailableMachine&) = delete;
 
   Machine Operations() {
-    return {captureControls, captureLibrary, handles, hostNames, icons,  ipHelper, performanceData, processes,
-            registry,        shellStart,     sockets, system,    tokens, urlCache, versionInfo};
+    return {captureControls, captureLibrary, handles,         hostNames, icmp,       icons,
+            ipHelper,        keyboardLayout, performanceData, processes, registry,   shellStart,
+            sockets,         system,         tokens,          urlCache,  versionInfo};
   }
 
   UnavailableCaptureControls captureControls;
   UnavailableCaptureLibrary captureLibrary;
   UnavailableHandles handles;
   UnavailableHostNames hostNames;
+  UnavailableIcmp icmp;
   UnavailableIcons icons;
   UnavailableIpHelper ipHelper;
   UnavailablePerformanceData performanceData;
+  UnavailableKeyboardLayout keyboardLayout;
   UnavailableProcesses processes;
   UnavailableRegistry registry;
   UnavailableShellStart shellStart;

@@ -139,6 +139,21 @@ TEST_F(UnavailableFamilies, The_internet_cache_has_no_walk_and_deletes_nothing) 
   EXPECT_EQ(size, 77u);
 }
 
+TEST_F(UnavailableFamilies, No_echo_can_be_sent_for_want_of_a_handle) {
+  std::array<std::uint8_t, 28> reply{};
+  reply.fill(0xEE);
+  const auto before = reply;
+  EXPECT_EQ(machine.icmp.IcmpCreateFile(), kNoIcmp);
+  EXPECT_EQ(machine.icmp.IcmpSendEcho(kNoIcmp, {}, reply, 1000), 0u);
+  EXPECT_EQ(reply, before);
+  EXPECT_FALSE(machine.icmp.IcmpCloseHandle(kNoIcmp));
+  EXPECT_FALSE(machine.icmp.LacksRight());
+}
+
+TEST_F(UnavailableFamilies, The_keyboard_layout_has_no_name) {
+  EXPECT_FALSE(machine.keyboardLayout.GetKeyboardLayoutNameA());
+}
+
 } // namespace
 
 } // namespace quendra::platform::unavailable
