@@ -25,7 +25,7 @@ class SimulatedUrlCache : public WalkedUrlCache {
     Calls.push_back("LocalAlloc " + std::to_string(size));
     if (BlocksLeft == 0 || !WalkedUrlCache::LocalAlloc(entry, size)) return false;
     --BlocksLeft;
-    ++BlocksInUse;
+    if (size > 0) ++BlocksInUse;
     return true;
   }
   void LocalFree(UrlCacheEntry& entry) override {
