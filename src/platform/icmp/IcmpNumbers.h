@@ -9,7 +9,6 @@ namespace quendra::platform {
 
 enum EchoStatus : std::uint32_t {
   kEchoSuccess = 0,
-  kEchoBufferTooSmall = 11001,
   kEchoNetUnreachable = 11002,
   kEchoHostUnreachable = 11003,
   kEchoProtocolUnreachable = 11004,
@@ -21,7 +20,6 @@ enum EchoStatus : std::uint32_t {
   kEchoTtlExpiredInTransit = 11013,
   kEchoTtlExpiredInReassembly = 11014,
   kEchoParameterProblem = 11015,
-  kEchoSourceQuench = 11016,
   kEchoBadDestination = 11018,
   kEchoGeneralFailure = 11050,
 };

@@ -1,6 +1,7 @@
 #include "platform/linux/LinuxMachine.h"
 
 #include "platform/linux/capture/LinuxCapture.h"
+#include "platform/linux/icmp/LinuxIcmp.h"
 #include "platform/linux/net/LinuxHostNames.h"
 #include "platform/linux/net/LinuxIpHelper.h"
 #include "platform/linux/net/LinuxSockets.h"
@@ -12,7 +13,6 @@
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
 #include "platform/unavailable/UnavailableHandles.h"
-#include "platform/unavailable/UnavailableIcmp.h"
 #include "platform/unavailable/UnavailableKeyboardLayout.h"
 #include "platform/unavailable/UnavailableRegistry.h"
 #include "platform/unavailable/UnavailableUrlCache.h"
@@ -33,7 +33,7 @@ struct LinuxMachine::Parts {
   LinuxCapture capture;
   unavailable::UnavailableHandles handles; // this system has no list of all handles
   LinuxHostNames hostNames{folder};
-  unavailable::UnavailableIcmp icmp;
+  LinuxIcmp icmp;
   LinuxIcons icons{desktopIndex, iconTheme, paths};
   LinuxIpHelper ipHelper{folder, {MayTraceEveryProcess(), ::geteuid()}};
   LinuxPerformanceData performanceData{folder};
