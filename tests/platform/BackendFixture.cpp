@@ -39,6 +39,7 @@ class SimulatedBackend : public Backend {
     machine_.AddProcess({.id = OwnId(), .parent = OwnParent(), .name = OwnName(), .path = OwnPath()});
     machine_.hostNames.Addresses = {"127.0.0.1", "10.0.0.7"};
     machine_.ipHelper.Adapters = {{"{1}", "Ethernet", {"10.0.0.7"}, {"10.0.0.138"}}};
+    machine_.icmp.RouteTo("127.0.0.1").Target(0);
     machine_.AddCaptureAdapter({"\\Device\\NPF_{1}", "Ethernet", "10.0.0.7"});
   }
 

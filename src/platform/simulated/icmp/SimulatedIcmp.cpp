@@ -12,6 +12,7 @@ IcmpHandle SimulatedIcmp::IcmpCreateFile() {
 
 std::uint32_t SimulatedIcmp::IcmpSendEcho(IcmpHandle handle, const EchoRequest& request,
                                           std::span<std::uint8_t> replyBuffer, std::uint32_t milliseconds) {
+  if (!open_.contains(handle)) PutEchoFailure(replyBuffer, kEchoBadRequest);
   if (!open_.contains(handle) || replyBuffer.size() < kEchoReplySize) return 0;
   const std::uint8_t ttl = request.options.empty() ? kOwnTtl : request.options[kOptionsTtl];
   Echoes.push_back({request.address,
