@@ -75,7 +75,7 @@ std::uint32_t EchoToSelf(Icmp& icmp, IcmpHandle handle, std::span<std::uint8_t> 
 TEST_P(BehaviourTest, An_echo_to_the_own_machine_comes_back_with_its_data) {
   const IcmpHandle handle = machine.icmp.IcmpCreateFile();
   ASSERT_NE(handle, kNoIcmp);
-  EXPECT_FALSE(machine.icmp.LacksRight());
+  EXPECT_EQ(machine.icmp.MissingRight(), "");
   std::array<std::uint8_t, 280> reply{};
 
   EXPECT_EQ(EchoToSelf(machine.icmp, handle, reply), 1U);

@@ -6,6 +6,7 @@
 
 #include <cstdint>
 #include <span>
+#include <string>
 
 namespace quendra::platform {
 
@@ -26,8 +27,9 @@ class Icmp {
   virtual ~Icmp() = default;
 
   virtual IcmpHandle IcmpCreateFile() = 0;
-  /// Whether the last IcmpCreateFile failed because this user lacks the right to send echoes.
-  virtual bool LacksRight() = 0;
+  /// The system's name of the right for want of which the last IcmpCreateFile failed; empty for any other
+  /// outcome.
+  virtual std::string MissingRight() = 0;
   /// Sends one echo and blocks the thread until its reply or the time limit. Gives the number of replies that
   /// the buffer now holds, 0 or 1: ICMP_ECHO_REPLY and the data. A router's answer is a reply too, with that
   /// router's address and its status. Without a reply the record is empty save for its status, the number of

@@ -8,7 +8,7 @@ namespace quendra::platform::unavailable {
 class UnavailableIcmp : public Icmp {
  public:
   IcmpHandle IcmpCreateFile() override { return kNoIcmp; }
-  bool LacksRight() override { return false; }
+  std::string MissingRight() override { return {}; }
   std::uint32_t IcmpSendEcho(IcmpHandle, const EchoRequest&, std::span<std::uint8_t>,
                              std::uint32_t) override {
     return 0;

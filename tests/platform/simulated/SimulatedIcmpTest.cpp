@@ -83,9 +83,9 @@ TEST_F(SimulatedIcmpTest, A_handle_is_closed_once_and_sends_nothing_afterwards) 
 }
 
 TEST_F(SimulatedIcmpTest, Without_the_right_there_is_no_handle) {
-  machine.icmp.RefuseRight = true;
+  machine.icmp.LackedRight = "the right to ping";
   EXPECT_EQ(machine.icmp.IcmpCreateFile(), kNoIcmp);
-  EXPECT_TRUE(machine.icmp.LacksRight());
+  EXPECT_EQ(machine.icmp.MissingRight(), "the right to ping");
 }
 
 } // namespace

@@ -147,7 +147,7 @@ TEST_F(UnavailableFamilies, No_echo_can_be_sent_for_want_of_a_handle) {
   EXPECT_EQ(machine.icmp.IcmpSendEcho(kNoIcmp, {}, reply, 1000), 0u);
   EXPECT_EQ(reply, before);
   EXPECT_FALSE(machine.icmp.IcmpCloseHandle(kNoIcmp));
-  EXPECT_FALSE(machine.icmp.LacksRight());
+  EXPECT_EQ(machine.icmp.MissingRight(), "");
 }
 
 TEST_F(UnavailableFamilies, The_keyboard_layout_has_no_name) {

@@ -14,7 +14,7 @@ class LinuxIcmp : public Icmp {
   explicit LinuxIcmp(Opener open = OpenEchoSocket) : openSocket_(open) {}
 
   IcmpHandle IcmpCreateFile() override;
-  bool LacksRight() override { return lacksRight_; }
+  std::string MissingRight() override { return lacksRight_ ? "CAP_NET_RAW" : ""; }
   std::uint32_t IcmpSendEcho(IcmpHandle handle, const EchoRequest& request,
                              std::span<std::uint8_t> replyBuffer, std::uint32_t milliseconds) override;
   bool IcmpCloseHandle(IcmpHandle handle) override { return open_.erase(handle) > 0; }

@@ -5,7 +5,7 @@
 namespace quendra::platform::simulated {
 
 IcmpHandle SimulatedIcmp::IcmpCreateFile() {
-  if (FailHandle || RefuseRight) return kNoIcmp;
+  if (FailHandle || !LackedRight.empty()) return kNoIcmp;
   lastHandle_ += 4;
   return *open_.insert(IcmpHandle(lastHandle_)).first;
 }

@@ -17,8 +17,8 @@ class SimulatedIcmp : public Icmp {
   ScriptedRoute& RouteTo(const std::string& address) { return routes_[AddressOf(address)]; }
   /// No handle can be opened.
   bool FailHandle = false;
-  /// Nor can one, and the reason is a missing right.
-  bool RefuseRight = false;
+  /// Nor can one for want of this right.
+  std::string LackedRight;
 
   /// What was sent.
   struct Sent {
@@ -33,7 +33,7 @@ class SimulatedIcmp : public Icmp {
   std::size_t CountOpen() const { return open_.size(); }
 
   IcmpHandle IcmpCreateFile() override;
-  bool LacksRight() override { return RefuseRight; }
+  std::string MissingRight() override { return LackedRight; }
   std::uint32_t IcmpSendEcho(IcmpHandle handle, const EchoRequest& request,
                              std::span<std::uint8_t> replyBuffer, std::uint32_t milliseconds) override;
   bool IcmpCloseHandle(IcmpHandle handle) override { return open_.erase(handle) > 0; }

@@ -221,7 +221,7 @@ std::string HandleOfUser(const char* groupsThatMayPing) {
       return std::string("still root");
     LinuxIcmp icmp;
     const IcmpHandle handle = icmp.IcmpCreateFile();
-    if (handle == kNoIcmp) return std::string(icmp.LacksRight() ? "lacks the right" : "fails");
+    if (handle == kNoIcmp) return "lacks " + icmp.MissingRight();
     std::array<std::uint8_t, 280> reply;
     const std::array<std::uint8_t, 1> data{'x'};
     const auto count =
@@ -238,7 +238,7 @@ TEST(LinuxIcmpRights, A_user_of_a_group_that_may_ping_sends_echoes) {
 
 TEST(LinuxIcmpRights, Any_other_user_has_no_handle_for_want_of_the_right) {
   if (!NetworkNamespace::Possible()) GTEST_SKIP() << NetworkNamespace::kSkipReason;
-  EXPECT_EQ(HandleOfUser("1 0"), "lacks the right");
+  EXPECT_EQ(HandleOfUser("1 0"), "lacks CAP_NET_RAW");
 }
 
 } // namespace
