@@ -72,11 +72,11 @@ ListRow* ListView::Find(TextView key) {
 }
 
 ListRow& ListView::Add(Text key, Text text, int smallIcon) {
-  if (byKey_.contains(key)) throw Fault(Fault::kDuplicateKey);
+  if (!key.empty() && byKey_.contains(key)) throw Fault(Fault::kDuplicateKey);
   rows_.push_back(std::make_unique<ListRow>(*this, std::move(key), std::move(text), smallIcon));
   ListRow& row = *rows_.back();
   row.index_ = Count();
-  byKey_.emplace(row.Key(), &row);
+  if (!row.Key().empty()) byKey_.emplace(row.Key(), &row);
   ++revision_;
   if (observer_) observer_->RowAdded(row.index_);
   if (Count() == 1) Select(&row);

@@ -110,7 +110,8 @@ class ListView : public Control {
   /// The place of a row of this list now.
   int IndexOf(const ListRow& row) const { return row.index_; }
 
-  /// Adds after the last row; the first row of a list becomes its selection. Fault 457 for a key in use.
+  /// Adds after the last row; the first row of a list becomes its selection. Fault 457 for a key in use; an
+  /// empty key is none.
   ListRow& Add(Text key, Text text, int smallIcon);
   /// A removed selection passes to the row that takes its place, else to the last row.
   void Remove(int index);

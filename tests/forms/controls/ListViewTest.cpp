@@ -68,6 +68,15 @@ TEST_F(ListViewTest, A_key_in_use_is_a_fault_and_adds_nothing) {
   EXPECT_TRUE(observer.told.empty());
 }
 
+TEST_F(ListViewTest, Rows_without_a_key_are_as_many_as_one_likes_and_none_is_found) {
+  list.Add({}, u"a", 0);
+  list.Add({}, u"b", 0);
+  list.Remove(1);
+
+  EXPECT_EQ(list.Count(), 1);
+  EXPECT_EQ(list.Find({}), nullptr);
+}
+
 TEST_F(ListViewTest, A_key_is_free_again_once_its_row_was_removed_or_the_list_cleared) {
   Add(u"p4");
   list.Remove(1);
