@@ -9,6 +9,7 @@ for byte as they came. Of all reports the newest N stay."""
 
 import argparse
 import os
+import re
 import signal
 import socket
 import socketserver
@@ -21,7 +22,8 @@ LONGEST_HEAD = 64 * 1024
 LONGEST_BODY = 64 * 1024 * 1024
 PATIENCE = 20
 MOST_CONNECTIONS = 64
-HEAD_END = b"\r\n\r\n"
+# The checks of a surf page end their lines with a line feed alone.
+HEAD_END = re.compile(rb"\r?\n\r?\n")
 
 
 class BadRequest(Exception):
@@ -31,14 +33,14 @@ class BadRequest(Exception):
 def read_request(connection):
     """Head and body, each as bytes; what stands after the body is left alone."""
     data = b""
-    while HEAD_END not in data:
+    while not (end := HEAD_END.search(data)):
         if len(data) > LONGEST_HEAD:
             raise BadRequest("the head is too long")
         piece = connection.recv(65536)
         if not piece:
             raise BadRequest("the request ends in its head")
         data += piece
-    head, _, body = data.partition(HEAD_END)
+    head, body = data[: end.start()], data[end.end() :]
     length = body_length(head)
     pieces = [body]
     missing = length - len(body)
@@ -52,7 +54,7 @@ def read_request(connection):
 
 
 def body_length(head):
-    for line in head.split(b"\r\n")[1:]:
+    for line in head.splitlines()[1:]:
         name, _, value = line.partition(b":")
         if name.strip().lower() == b"content-length":
             value = value.strip()
@@ -64,7 +66,7 @@ def body_length(head):
 
 def method_and_path(head):
     """The address may be absolute, and blanks may stand after the version."""
-    words = head.split(b"\r\n")[0].decode("latin-1").split()
+    words = head.partition(b"\n")[0].decode("latin-1").split()
     if len(words) != 3 or not words[2].startswith("HTTP/"):
         raise BadRequest("no request line")
     try:
