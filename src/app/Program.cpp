@@ -9,8 +9,8 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
 
       systemVersion(machine.system, desktop), hostAddresses(machine.hostNames, machine.ipHelper),
 
-      frmAbout(desktop), frmMenu(desktop, frmAbout, systemVersion, hostAddresses),
-      frmSplash(desktop, frmMenu),
+      frmAbout(desktop), frmMemInfo(desktop, machine.system),
+      frmMenu(desktop, frmAbout, systemVersion, hostAddresses), frmSplash(desktop, frmMenu),
 
       monitorPage(frmMenu, kPageTable[shell::kMonitorPage]), surfPage(frmMenu, kPageTable[shell::kSurfPage]),
       firstConnectionPage(frmMenu, kPageTable[shell::kFirstConnectionPage]),
@@ -33,10 +33,13 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
       supportExchange(modSocketPlus, desktop, monitorPage.reporting, processTable, monitorPage.main_Timer1),
 
       captureSetup(machine.shellStart, frmSplash, frmMenu, captureSession, packetControl),
-      monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession, sniffer) {
+      monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession, sniffer),
+      processActions(monitorPage, portSource, machine.processes, machine.shellStart, desktop),
+      monitorDialogs(desktop, frmMenu) {
   frmMenu.Add(monitorPage);
   frmMenu.Add(surfPage);
   frmMenu.Add(firstConnectionPage);
+  monitorDialogs.Offer(monitorPage.main_cmdMemInfo, frmMemInfo);
   surfPage.surf_Timer1.Tick = [this] { modProcPort.surf_Timer1_Timer(); };
 }
 

@@ -5,6 +5,8 @@
 #include "capture/PacketAttribution.h"
 #include "capture/dormant/Sniffer.h"
 #include "diagnostics/SurfPage.h"
+#include "diagnostics/frmAbout.h"
+#include "diagnostics/frmMemInfo.h"
 #include "forms/Desktop.h"
 #include "foundation/modSocketPlus.h"
 #include "monitor/ProcessTable.h"
@@ -12,9 +14,10 @@
 #include "provisioning/FirstConnectionPage.h"
 #include "report/SupportExchange.h"
 #include "shell/CaptureSetup.h"
+#include "shell/MonitorDialogs.h"
 #include "shell/MonitorPage.h"
 #include "shell/MonitorWork.h"
-#include "shell/frmAbout.h"
+#include "shell/ProcessActions.h"
 #include "shell/frmMenu.h"
 #include "shell/frmSplash.h"
 
@@ -39,7 +42,8 @@ class Program {
   capture::HostAddresses hostAddresses;
 
   // Forms.
-  shell::frmAbout frmAbout;
+  diagnostics::frmAbout frmAbout;
+  diagnostics::frmMemInfo frmMemInfo;
   shell::frmMenu frmMenu;
   shell::frmSplash frmSplash;
 
@@ -67,6 +71,8 @@ class Program {
 
   shell::CaptureSetup captureSetup;
   shell::MonitorWork monitorWork;
+  shell::ProcessActions processActions;
+  shell::MonitorDialogs monitorDialogs;
 };
 
 } // namespace quendra::app

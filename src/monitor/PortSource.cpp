@@ -20,9 +20,13 @@ void PortSource::MergeIntoRows() {
   procPort_.MergeTcpPorts();
 }
 
-PortsByOwner PortSource::OfAllHandles() {
+void PortSource::EnableDebugging() {
   if (!SeDebugEnabled)
     SeDebugEnabled = fileInfo_.EnablePrivilege(u"SeDebugPrivilege", platform::Tokens::kEnabled);
+}
+
+PortsByOwner PortSource::OfAllHandles() {
+  EnableDebugging();
   PortsByOwner ports;
   const bool scanned = procPort_.ScanSocketHandles();
   if (!scanned || !SeDebugEnabled) return ports;

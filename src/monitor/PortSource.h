@@ -18,6 +18,9 @@ class PortSource {
   /// Adds the ports of connections to the rows that stand, at the end of a pass.
   void MergeIntoRows();
 
+  /// Asks for the right to look at and end processes of others, unless it was got before.
+  void EnableDebugging();
+
   Boolean16 SeDebugEnabled = kFalse16;
 
  private:

@@ -49,12 +49,16 @@ std::string RoundedDigits(const Decimal& decimal, int places) {
   return digits;
 }
 
+void PartInThrees(std::string& digits) {
+  for (std::size_t at = digits.size(); at > 3;) digits.insert(at -= 3, ",");
+}
+
 } // namespace
 
 Text Format(double value, TextView format) {
   if (!std::isfinite(value)) throw Fault(Fault::kOverflow);
   const auto point = format.find(u'.');
-  const TextView whole = format.substr(0, point);
+  const Text whole = Replaced(format.substr(0, point), u",", u"");
   const TextView fraction = point == TextView::npos ? TextView{} : format.substr(point + 1);
   const auto places = fraction.size();
   const Decimal decimal = DecimalOf(value);
@@ -66,6 +70,7 @@ Text Format(double value, TextView format) {
   const auto firstZero = std::min(whole.find(u'0'), whole.size());
   const auto needed = whole.size() - firstZero;
   if (before.size() < needed) before.insert(0, needed - before.size(), '0');
+  if (format.substr(0, point).find(u',') != TextView::npos) PartInThrees(before);
   while (!after.empty() && after.back() == '0' && fraction[after.size() - 1] == u'#') after.pop_back();
 
   const bool zero = digits.find_first_not_of('0') == std::string::npos;

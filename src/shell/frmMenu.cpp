@@ -1,7 +1,6 @@
 #include "shell/frmMenu.h"
 
 #include "runtime/Integers.h"
-#include "shell/frmAbout.h"
 
 namespace quendra::shell {
 
@@ -13,7 +12,7 @@ constexpr int kCornerEllipse = 10;
 
 } // namespace
 
-frmMenu::frmMenu(forms::Desktop& desktop, frmAbout& about, monitor::SystemVersion& version,
+frmMenu::frmMenu(forms::Desktop& desktop, forms::Form& about, monitor::SystemVersion& version,
                  const capture::HostAddresses& addresses)
     : PageWindow(u"frmMenu"), desktop_(desktop), about_(about), version_(version), handCursor_(desktop),
       highlight_({PicMenu, picMenu2, picMenu3, linMenu1, linMenu2}), pages_(lblCaption, highlight_),

@@ -11,8 +11,6 @@
 
 namespace quendra::shell {
 
-class frmAbout;
-
 /// The main window: its menu, and pages of which it knows no more than their table. Unloading it ends the
 /// program, save when its Tag holds "not close".
 class frmMenu : public forms::PageWindow {
@@ -20,7 +18,7 @@ class frmMenu : public forms::PageWindow {
   using PictureBox = forms::PictureBox;
 
  public:
-  frmMenu(forms::Desktop& desktop, frmAbout& about, monitor::SystemVersion& version,
+  frmMenu(forms::Desktop& desktop, forms::Form& about, monitor::SystemVersion& version,
           const capture::HostAddresses& addresses);
 
   /// Pages come in the order of their table.
@@ -64,7 +62,7 @@ class frmMenu : public forms::PageWindow {
   void picOut_MouseMove(int button);
 
   forms::Desktop& desktop_;
-  frmAbout& about_;
+  forms::Form& about_;
   monitor::SystemVersion& version_;
   HandCursor handCursor_;
   MenuHighlight highlight_;

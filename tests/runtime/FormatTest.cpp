@@ -112,6 +112,16 @@ TEST(NumberOf, A_text_without_a_number_is_a_type_mismatch) {
     EXPECT_EQ(FaultOfText(text), Fault::kTypeMismatch) << ToUtf8(text);
 }
 
+TEST(Format, A_comma_between_places_parts_the_digits_in_threes) {
+  EXPECT_EQ(Format(1, u"###,###,###"), u"1");
+  EXPECT_EQ(Format(999, u"###,###,###"), u"999");
+  EXPECT_EQ(Format(1000, u"###,###,###"), u"1,000");
+  EXPECT_EQ(Format(1234567, u"###,###,###"), u"1,234,567");
+  EXPECT_EQ(Format(1234567890, u"###,###,###"), u"1,234,567,890");
+  EXPECT_EQ(Format(-2097152, u"###,###,###"), u"-2,097,152");
+  EXPECT_EQ(Format(0, u"###,###,###"), u"");
+}
+
 TEST(NumberOf, A_number_beyond_a_double_overflows) { EXPECT_EQ(FaultOfText(u"1e999"), Fault::kOverflow); }
 
 TEST(NumberText, Has_fifteen_significant_digits_and_no_more_than_needed) {

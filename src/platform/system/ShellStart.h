@@ -10,6 +10,7 @@ class ShellStart {
   virtual ~ShellStart() = default;
 
   static constexpr int kNormalWindow = 1;
+  static constexpr int kAsItIsShown = 5;
   static constexpr int kMinimizedWithoutFocus = 6;
 
   /// Doesn't wait. False when nothing could be started.

@@ -1,8 +1,8 @@
-#include "shell/frmAbout.h"
+#include "diagnostics/frmAbout.h"
 
 #include "foundation/Twips.h"
 
-namespace quendra::shell {
+namespace quendra::diagnostics {
 
 using foundation::Px;
 
@@ -20,4 +20,4 @@ void frmAbout::Design() {
   Image1.Move(0, 0, Px(420), Px(280));
 }
 
-} // namespace quendra::shell
+} // namespace quendra::diagnostics

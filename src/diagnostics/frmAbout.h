@@ -3,7 +3,7 @@
 #include "forms/FormHost.h"
 #include "forms/controls/Image.h"
 
-namespace quendra::shell {
+namespace quendra::diagnostics {
 
 /// The about box: one picture, which a click closes. The main window cuts it to its rounded shape.
 class frmAbout : public forms::Form {
@@ -18,4 +18,4 @@ class frmAbout : public forms::Form {
   forms::FormHost& forms_;
 };
 
-} // namespace quendra::shell
+} // namespace quendra::diagnostics

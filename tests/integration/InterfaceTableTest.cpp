@@ -1,0 +1,196 @@
+#include "integration/NetworkNamespace.h"
+
+#include "platform/linux/net/LinuxIpHelper.h"
+#include "platform/linux/process/LinuxTokens.h"
+#include "platform/net/InterfaceRow.h"
+#include "runtime/Text.h"
+
+#include <gtest/gtest.h>
+#include <netinet/in.h>
+#include <sys/socket.h>
+
+#include <array>
+#include <cstdio>
+#include <map>
+#include <optional>
+
+namespace quendra::integration {
+namespace {
+
+using Row = platform::InterfaceRow;
+
+/// Links of the test's own namespace, and what the system's own tool prints of them.
+class InterfaceTable : public testing::Test {
+ protected:
+  void SetUp() override {
+    if (!NetworkNamespace::Possible()) GTEST_SKIP() << NetworkNamespace::kSkipReason;
+    network_.emplace();
+    RunCommand("ip link set lo up");
+    RunCommand("ip link add near address 02:00:0a:ff:00:01 mtu 1400 type veth peer name far");
+    RunCommand("ip link set near alias 'Cable to the far end'");
+    RunCommand("ip link add hub type bridge");
+    RunCommand("ip tuntap add dev bare mode tun");
+    RunCommand("ip link set near up && ip link set far up && ip link set hub up");
+    RunCommand("ip addr add 192.0.2.1/24 dev near");
+  }
+
+  std::vector<Row> Rows() {
+    std::uint32_t size = 0;
+    EXPECT_EQ(helper().GetIfTable({}, size, false), platform::IpHelper::kErrorInsufficientBuffer);
+    std::vector<std::uint8_t> table(size);
+    EXPECT_EQ(helper().GetIfTable(table, size, false), 0U);
+    std::vector<Row> rows(Little32(table, 0));
+    EXPECT_EQ(table.size(), Row::kFirstOffset + rows.size() * Row::kBytes);
+    for (std::size_t i = 0; i < rows.size(); ++i)
+      std::copy_n(table.begin() + static_cast<std::ptrdiff_t>(Row::kFirstOffset + i * Row::kBytes),
+                  Row::kBytes, rows[i].bytes.begin());
+    return rows;
+  }
+  static std::string NameOf(const Row& row) {
+    Text name;
+    for (std::size_t at = 0; Little16(row.bytes, at) != 0; at += 2)
+      name.push_back(static_cast<char16_t>(Little16(row.bytes, at)));
+    return ToUtf8(name);
+  }
+  Row RowNamed(const std::string& name) {
+    for (const Row& row : Rows())
+      if (NameOf(row) == name) return row;
+    ADD_FAILURE() << "no row of " << name;
+    return {};
+  }
+  /// The figures of one link as the tool prints them, by the names of their fields.
+  static std::map<std::string, std::string> Printed(const std::string& name) {
+    static constexpr const char* kScript =
+        "import json,sys; "
+        "link=json.load(sys.stdin)[0]; stats=link['stats64']; "
+        "flat={k:v for k,v in link.items() if not isinstance(v,(dict,list))}; "
+        "flat.update({d+'_'+k:v for d in ('rx','tx') for k,v in stats[d].items()}); "
+        "flat['up']='UP' in link['flags']; "
+        "[print(k+'='+str(v)) for k,v in flat.items()]";
+    const std::string command = "ip -s -d -j link show dev " + name + " | python3 -c \"" + kScript + "\"";
+    std::map<std::string, std::string> fields;
+    FILE* pipe = popen(command.c_str(), "r");
+    std::array<char, 512> line;
+    while (fgets(line.data(), line.size(), pipe) != nullptr) {
+      const std::string text(line.data());
+      const auto equals = text.find('=');
+      fields[text.substr(0, equals)] = text.substr(equals + 1, text.size() - equals - 2);
+    }
+    pclose(pipe);
+    return fields;
+  }
+  static std::string AddressOf(const Row& row) {
+    std::string text;
+    for (std::size_t i = 0; i < row.Get(Row::kAddressLength); ++i) {
+      std::array<char, 4> byte;
+      std::snprintf(byte.data(), byte.size(), "%02x:", row.bytes[Row::kAddressOffset + i]);
+      text += byte.data();
+    }
+    if (!text.empty()) text.pop_back();
+    return text;
+  }
+  static void ExpectAsPrinted(const Row& row, std::map<std::string, std::string> printed) {
+    const auto expect = [&](Row::Field field, const std::string& name) {
+      EXPECT_EQ(std::to_string(row.Get(field)), printed.at(name)) << name;
+    };
+    expect(Row::kIndex, "ifindex");
+    expect(Row::kMtu, "mtu");
+    expect(Row::kInOctets, "rx_bytes");
+    expect(Row::kInErrors, "rx_errors");
+    expect(Row::kInDiscards, "rx_dropped");
+    expect(Row::kInNonunicast, "rx_multicast");
+    expect(Row::kOutOctets, "tx_bytes");
+    expect(Row::kOutUnicast, "tx_packets");
+    expect(Row::kOutErrors, "tx_errors");
+    expect(Row::kOutDiscards, "tx_dropped");
+    EXPECT_EQ(std::to_string(row.Get(Row::kInUnicast) + row.Get(Row::kInNonunicast)),
+              printed.at("rx_packets"));
+    EXPECT_EQ(row.Get(Row::kAdminStatus), printed.at("up") == "True" ? 1U : 2U);
+  }
+  /// So that counters move.
+  static void SendSome() {
+    const int sender = socket(AF_INET, SOCK_DGRAM | SOCK_CLOEXEC, 0);
+    const int yes = 1;
+    setsockopt(sender, SOL_SOCKET, SO_BROADCAST, &yes, sizeof yes);
+    for (const std::uint32_t address : {0x7F000001U, 0xC00002FFU}) {
+      sockaddr_in to{};
+      to.sin_family = AF_INET;
+      to.sin_port = htons(9);
+      to.sin_addr.s_addr = htonl(address);
+      for (int i = 0; i < 3; ++i)
+        EXPECT_EQ(sendto(sender, "datagram", 8, 0, reinterpret_cast<const sockaddr*>(&to), sizeof to), 8);
+    }
+    close(sender);
+  }
+
+  platform::linux_::LinuxIpHelper& helper() {
+    if (!helper_) helper_.emplace(folder_, platform::linux_::SocketOwners::Rights{true, 0});
+    return *helper_;
+  }
+
+ private:
+  std::optional<NetworkNamespace> network_;
+  platform::linux_::ProcFolder folder_;
+  std::optional<platform::linux_::LinuxIpHelper> helper_;
+};
+
+TEST_F(InterfaceTable, Rows_stand_by_ascending_index) {
+  const auto rows = Rows();
+  ASSERT_EQ(rows.size(), 5U);
+  EXPECT_TRUE(std::ranges::is_sorted(rows, {}, [](const Row& row) { return row.Get(Row::kIndex); }));
+}
+
+TEST_F(InterfaceTable, Every_link_has_the_figures_that_the_systems_own_tool_prints) {
+  Rows(); // the counters of these links began with them
+  SendSome();
+  for (const char* name : {"lo", "near", "far", "hub", "bare"}) {
+    SCOPED_TRACE(name);
+    ExpectAsPrinted(RowNamed(name), Printed(name));
+  }
+  EXPECT_GT(RowNamed("lo").Get(Row::kInOctets), 0U);
+  EXPECT_GT(RowNamed("near").Get(Row::kOutOctets), 0U);
+  EXPECT_GT(RowNamed("far").Get(Row::kInOctets), 0U);
+}
+
+TEST_F(InterfaceTable, Links_have_their_kind_address_and_description) {
+  EXPECT_EQ(RowNamed("lo").Get(Row::kType), 24U);
+  EXPECT_EQ(AddressOf(RowNamed("lo")), Printed("lo").at("address"));
+  const Row near = RowNamed("near");
+  EXPECT_EQ(near.Get(Row::kType), 6U);
+  EXPECT_EQ(AddressOf(near), "02:00:0a:ff:00:01");
+  EXPECT_EQ(near.Get(Row::kDescriptionLength), 20U);
+  EXPECT_EQ(std::string(near.bytes.begin() + Row::kDescriptionOffset,
+                        near.bytes.begin() + Row::kDescriptionOffset + 20),
+            "Cable to the far end");
+  EXPECT_EQ(AddressOf(RowNamed("hub")), Printed("hub").at("address"));
+  EXPECT_EQ(RowNamed("bare").Get(Row::kAddressLength), 0U);
+  EXPECT_EQ(RowNamed("bare").Get(Row::kType), 131U);
+}
+
+TEST_F(InterfaceTable, States_are_numbered_as_the_table_does) {
+  EXPECT_EQ(RowNamed("lo").Get(Row::kOperStatus), platform::kOperational);
+  EXPECT_EQ(RowNamed("near").Get(Row::kOperStatus), platform::kOperational);
+  EXPECT_EQ(RowNamed("bare").Get(Row::kOperStatus), platform::kNonOperational);
+  RunCommand("ip link set far down");
+  EXPECT_EQ(RowNamed("near").Get(Row::kOperStatus), platform::kDisconnected);
+  EXPECT_EQ(RowNamed("near").Get(Row::kAdminStatus), platform::kAdminUp);
+  EXPECT_EQ(RowNamed("far").Get(Row::kAdminStatus), platform::kAdminDown);
+}
+
+TEST_F(InterfaceTable, An_unknown_speed_is_10_megabits_and_a_high_one_stops_at_2147483647) {
+  EXPECT_EQ(RowNamed("lo").Get(Row::kSpeed), 10'000'000U);
+  EXPECT_EQ(RowNamed("near").Get(Row::kSpeed), 2'147'483'647U); // the kernel says 10 gigabits
+}
+
+TEST_F(InterfaceTable, Counters_count_from_the_start) {
+  SendSome();
+  const auto before = Printed("lo");
+  ASSERT_GT(std::stoul(before.at("rx_bytes")), 0U);
+  EXPECT_EQ(RowNamed("lo").Get(Row::kInOctets), 0U);
+  SendSome();
+  EXPECT_EQ(RowNamed("lo").Get(Row::kInOctets),
+            std::stoul(Printed("lo").at("rx_bytes")) - std::stoul(before.at("rx_bytes")));
+}
+
+} // namespace
+} // namespace quendra::integration
