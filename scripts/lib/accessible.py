@@ -73,8 +73,8 @@ class Program:
     def texts(self, window):
         return [control.get_name() for control in below(window) if control.get_name()]
 
-    def table(self):
-        return Table(self.control(TABLE))
+    def table(self, name=TABLE):
+        return Table(self.control(name))
 
 
 def centre_of(control):
@@ -83,7 +83,7 @@ def centre_of(control):
 
 
 class Table:
-    """The process table: captions and rows of texts, column by column as the table holds them."""
+    """A list, the process table most of all: captions and rows of texts, column by column as the table holds them."""
 
     def __init__(self, node):
         self.node = node
@@ -115,6 +115,11 @@ class Table:
         self.node.clear_cache()
         columns = range(min(SHOWN_COLUMNS, self.table.get_n_columns()))
         return [[self.cell(row, column) for column in columns] for row in range(self.table.get_n_rows())]
+
+    def description(self, row, column):
+        """What a cell without text shows: the name of its icon."""
+        cell = self.table.get_accessible_at(row, column)
+        return cell.get_description() if cell else ""
 
 
 def number(text):

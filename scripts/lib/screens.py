@@ -60,7 +60,8 @@ def walk_through(walk):
     time.sleep(3)
     walk.picture("monitor")
     walk.about()
-    walk.other_pages()
+    walk.surf()
+    walk.first_connection()
     walk.close()
     return walk.wrong
 

@@ -7,6 +7,7 @@ when the program, the table, a rate or the report isn't as it should be.
 The link and the traffic need root. Without it the program runs on this machine as it is and the table has no rates."""
 
 import contextlib
+import dataclasses
 import glob
 import os
 import signal
@@ -19,6 +20,7 @@ from gi.repository import GLib
 import cast
 import report
 import stage
+import surf
 from accessible import Program
 from checks import missing_processes, missing_rates
 from read_table import as_text
@@ -56,16 +58,36 @@ def send_report(walk, support):
     return wrong
 
 
-def tour(program, child, ports, support):
+def check_surfing(walk, servers_are_there):
+    """The page for surf problems; gives what is wrong with it."""
+    rows, wrong = surf.SurfStep(walk).take(servers_are_there)
+    for details, caption, icon in rows:
+        print(f"surf: {icon or '-':9} {caption} {details}".rstrip())
+    if os.geteuid() == 0:  # who else may send echoes is up to the machine
+        report_text, lacks = surf.TraceStep(walk).take("127.0.0.1")
+        print(report_text)
+        wrong += lacks
+    walk.click("surf_lblBack")
+    return wrong
+
+
+def check_ports(walk, servers_are_there):
+    answers, wrong = surf.PortsStep(walk).take(servers_are_there)
+    for port, answer in answers.items():
+        print(f"port {port}: {answer}")
+    return wrong
+
+
+def tour(program, child, ports, servers):
     walk = Walk(program, SCREENS)
     try:
-        return walk_through(walk, child, ports, support)
+        return walk_through(walk, child, ports, servers)
     except RuntimeError:
         walk.picture("where-it-failed")
         raise
 
 
-def walk_through(walk, child, ports, support):
+def walk_through(walk, child, ports, servers):
     program = walk.program
     walk.splash()
     walk.home()
@@ -78,8 +100,10 @@ def walk_through(walk, child, ports, support):
     walk.column()
     walk.about()
     print("\n".join(walk.addresses()))
-    wrong += send_report(walk, support)
-    walk.other_pages()
+    wrong += send_report(walk, servers.support)
+    wrong += check_ports(walk, servers.all_there)
+    wrong += check_surfing(walk, servers.all_there)
+    walk.first_connection()
     walk.monitor()
     time.sleep(3)
     walk.picture("monitor-again")
@@ -105,6 +129,21 @@ def set_scene(stack, *screen):
     os.environ.pop("SUDO_UID", None)
 
 
+@dataclasses.dataclass
+class Servers:
+    support: report.Support
+    all_there: bool
+
+
+def start_servers(stack, spaces):
+    """The stand-ins that the report and the checks speak to."""
+    support = report.start_server(stack, spaces, cast.SECONDS)
+    missing = surf.start_mail_servers(stack, spaces, cast.SECONDS)
+    for reason in missing:
+        say(f"a mail server is missing: {reason}")
+    return Servers(support, bool(support.folder) and not missing)
+
+
 def perform():
     os.makedirs(SCREENS, exist_ok=True)
     for old in glob.glob(f"{SCREENS}/*.png"):
@@ -119,9 +158,9 @@ def perform():
             say("traffic runs, local ports " + ", ".join(f"{name} {port}" for name, port in ports.items()))
         else:
             say("not root: no capture, no traffic of its own, so no rates are looked for")
-        support = report.start_server(stack, spaces, cast.SECONDS)
+        servers = start_servers(stack, spaces)
         child = stack.enter_context(stage.started(command))
-        return tour(Program(child.pid), child, ports, support)
+        return tour(Program(child.pid), child, ports, servers)
 
 
 def too_late(*_):

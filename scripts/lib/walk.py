@@ -92,13 +92,21 @@ class Walk:
         wait_for("the address panel to close", lambda: len(self.program.windows()) == before)
         return said
 
-    def other_pages(self):
-        for index, back, name in ((1, "surf_lblBack", "surf"), (2, "frsCon_lblBack", "first-connection")):
-            self.click(f"lblCaption({index})")
-            self.program.control(back)
-            time.sleep(0.4)
-            self.picture(name)
-            self.click(back)
+    def surf(self):
+        """The page with its checks under way, or through with them."""
+        self.click("lblCaption(1)")
+        self.program.control("surf_ListView1")
+        time.sleep(0.4)
+        self.picture("surf")
+        self.program.control("surf_lblBack", 30)
+        self.click("surf_lblBack")
+
+    def first_connection(self):
+        self.click("lblCaption(2)")
+        self.program.control("frsCon_lblBack")
+        time.sleep(0.4)
+        self.picture("first-connection")
+        self.click("frsCon_lblBack")
 
     def close(self):
         window = self.windows()[-1]

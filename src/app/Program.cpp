@@ -32,6 +32,18 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
       modSocketPlus(machine.sockets, machine.hostNames, desktop),
       supportExchange(modSocketPlus, desktop, monitorPage.reporting, processTable, monitorPage.main_Timer1),
 
+      mdlInternetCache(machine.urlCache), regEdit(machine.registry, desktop),
+      localChecks{
+          diagnostics::CacheCheck(machine.urlCache, mdlInternetCache, regEdit),
+          diagnostics::ProcessorCheck(machine.system, machine.performanceData, machine.registry),
+          diagnostics::LineCheck(machine.ipHelper, machine.system, desktop),
+          diagnostics::SharingCheck(machine.processes),
+      },
+      surfChecks(modSocketPlus, desktop, surfPage, localChecks),
+      routeTracing(surfPage.advanced, {machine.sockets, machine.hostNames, machine.icmp}, desktop,
+                   machine.keyboardLayout),
+      downloadOffer(surfPage, desktop), frmPortsChecks(desktop, modSocketPlus),
+
       captureSetup(machine.shellStart, frmSplash, frmMenu, captureSession, packetControl),
       monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession, sniffer),
       processActions(monitorPage, portSource, machine.processes, machine.shellStart, desktop),
@@ -39,6 +51,7 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
   frmMenu.Add(monitorPage);
   frmMenu.Add(surfPage);
   frmMenu.Add(firstConnectionPage);
+  monitorDialogs.Offer(monitorPage.main_cmdChecks, frmPortsChecks);
   monitorDialogs.Offer(monitorPage.main_cmdMemInfo, frmMemInfo);
   surfPage.surf_Timer1.Tick = [this] { modProcPort.surf_Timer1_Timer(); };
 }

@@ -4,9 +4,13 @@
 #include "capture/HostAddresses.h"
 #include "capture/PacketAttribution.h"
 #include "capture/dormant/Sniffer.h"
+#include "diagnostics/RouteTracing.h"
+#include "diagnostics/SurfChecks.h"
 #include "diagnostics/SurfPage.h"
+#include "diagnostics/dormant/DownloadOffer.h"
 #include "diagnostics/frmAbout.h"
 #include "diagnostics/frmMemInfo.h"
+#include "diagnostics/frmPortsChecks.h"
 #include "forms/Desktop.h"
 #include "foundation/modSocketPlus.h"
 #include "monitor/ProcessTable.h"
@@ -68,6 +72,14 @@ class Program {
 
   foundation::modSocketPlus modSocketPlus;
   report::SupportExchange supportExchange;
+
+  diagnostics::mdlInternetCache mdlInternetCache;
+  foundation::RegEdit regEdit;
+  diagnostics::LocalChecks localChecks;
+  diagnostics::SurfChecks surfChecks;
+  diagnostics::RouteTracing routeTracing;
+  diagnostics::DownloadOffer downloadOffer;
+  diagnostics::frmPortsChecks frmPortsChecks;
 
   shell::CaptureSetup captureSetup;
   shell::MonitorWork monitorWork;

@@ -178,5 +178,85 @@ TEST_F(Cache, Without_its_keys_is_limited_nowhere_and_passes_all_the_same) {
   EXPECT_FALSE(machine.registry.HasKey(kOlderContent));
 }
 
+TEST_F(LocalCheckTest, An_idle_processor_shows_the_first_reading_that_says_nothing_and_passes) {
+  EXPECT_EQ(program.localChecks.processor.Run(rows), Outcome::Passed);
+
+  // 100 of one reading and 0 of fourteen.
+  EXPECT_EQ(Detail(1), u"6.67%");
+  EXPECT_EQ(Pauses(), 15);
+}
+
+/// What the interfaces have carried, and how fast the last one is.
+class Line : public LocalCheckTest {
+ protected:
+  void SetCard(std::uint32_t received, std::uint32_t sent, std::uint32_t speed) {
+    platform::InterfaceRow card;
+    card.Set(platform::InterfaceRow::kInOctets, received);
+    card.Set(platform::InterfaceRow::kOutOctets, sent);
+    card.Set(platform::InterfaceRow::kSpeed, speed);
+    card.Set(platform::InterfaceRow::kOperStatus, platform::kDisconnected);
+    machine.ipHelper.Interfaces.push_back(card);
+  }
+  Outcome Run() { return program.localChecks.line.Run(rows); }
+  int FaultOfRun() {
+    try {
+      Run();
+    } catch (const Fault& fault) {
+      return fault.number;
+    }
+    return 0;
+  }
+};
+
+TEST_F(Line, Of_exactly_40_passes) {
+  machine.ipHelper.Interfaces.clear();
+  SetCard(2'000'000, 1'000'000, 10'500);
+
+  EXPECT_EQ(Run(), Outcome::Passed);
+
+  EXPECT_EQ(Detail(1), u"40.00%");
+  EXPECT_EQ(Pauses(), 15);
+  EXPECT_EQ(Repaints(), 7);
+}
+
+TEST_F(Line, A_little_above_40_fails) {
+  machine.ipHelper.Interfaces.clear();
+  SetCard(2'000'750, 1'000'000, 10'500);
+
+  EXPECT_EQ(Run(), Outcome::Failed);
+
+  EXPECT_EQ(Detail(1), u"40.01%");
+}
+
+TEST_F(Line, Goes_by_the_speed_of_the_last_interface_though_another_one_is_in_use) {
+  SetCard(1'500'000, 0, 10'500);
+
+  Run();
+
+  EXPECT_EQ(Detail(1), u"20.00%");
+}
+
+TEST_F(Line, Without_a_speed_is_an_untrapped_fault) {
+  machine.ipHelper.Interfaces.clear();
+  SetCard(1, 0, 0);
+  EXPECT_EQ(FaultOfRun(), Fault::kDivision);
+  machine.ipHelper.Interfaces.clear();
+  SetCard(0, 0, 0);
+  EXPECT_EQ(FaultOfRun(), Fault::kOverflow);
+}
+
+TEST_F(Line, Without_an_interface_is_an_untrapped_fault) {
+  machine.ipHelper.Interfaces.clear();
+
+  EXPECT_EQ(FaultOfRun(), Fault::kSubscript);
+}
+
+TEST_F(Line, That_carried_more_than_31_bits_count_is_an_untrapped_fault) {
+  machine.ipHelper.Interfaces.clear();
+  SetCard(2'147'483'647, 1, 10'500);
+
+  EXPECT_EQ(FaultOfRun(), Fault::kOverflow);
+}
+
 } // namespace
 } // namespace quendra::diagnostics

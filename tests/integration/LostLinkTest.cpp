@@ -40,7 +40,7 @@ class LostLink : public testing::Test {
   }
   /// Leaves the page and opens it again.
   void ReopenPage() {
-    ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[1]));
+    ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[2]));
     ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[0]));
   }
 

@@ -47,7 +47,7 @@ class ReportTest : public testing::Test {
     ASSERT_TRUE(desktop.Click(menu.lblCaption[0]));
     program.monitorPage.table.main_ListView1.Clear();
   }
-  void LeavePage() { ASSERT_TRUE(desktop.Click(menu.lblCaption[1])); }
+  void LeavePage() { ASSERT_TRUE(desktop.Click(menu.lblCaption[2])); }
   void AddRow(const Text& application, const std::vector<Text>& cells) {
     forms::ListView& table = program.monitorPage.table.main_ListView1;
     forms::ListRow& row = table.Add(u"p" + DecimalText(1000 + table.Count()), application, 1);

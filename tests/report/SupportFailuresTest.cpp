@@ -249,7 +249,7 @@ TEST_F(SupportFailures,
   OpenPage();
   machine.sockets.Fail("WSACleanup", 10091);
 
-  desktop.Click(menu.lblCaption[1]);
+  desktop.Click(menu.lblCaption[2]);
 
   EXPECT_TRUE(desktop.Ended);
   EXPECT_EQ(desktop.Boxes.back().text, u"Run-time error '10091':\n\nNetwork subsystem is unavailable.");

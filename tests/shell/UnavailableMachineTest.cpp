@@ -59,8 +59,6 @@ TEST_F(UnavailableMachineTest, The_main_window_comes_up_and_says_that_the_versio
 
 TEST_F(UnavailableMachineTest, Pages_that_ask_nothing_of_the_machine_open_and_close) {
   ComeHome(machine.Operations());
-  ClickEntry(1);
-  EXPECT_TRUE(program->surfPage.frameSurfProb.Visible());
   ClickEntry(2);
   EXPECT_TRUE(program->firstConnectionPage.frameFirstConnection.Visible());
   desktop.CloseBox(program->frmMenu);
@@ -68,14 +66,19 @@ TEST_F(UnavailableMachineTest, Pages_that_ask_nothing_of_the_machine_open_and_cl
   EXPECT_EQ(desktop.EndStatus, 0);
 }
 
-TEST_F(UnavailableMachineTest, The_monitor_page_ends_the_program_with_the_run_times_message_for_the_network) {
+/// The pages that have sockets.
+class UnavailableNetwork : public UnavailableMachineTest, public testing::WithParamInterface<std::size_t> {};
+
+TEST_P(UnavailableNetwork, Ends_the_program_with_the_run_times_message) {
   ComeHome(machine.Operations());
-  ClickEntry(0);
+  ClickEntry(GetParam());
   EXPECT_TRUE(desktop.Ended);
   EXPECT_EQ(desktop.EndStatus, 1);
   ASSERT_EQ(desktop.Boxes.size(), 2u);
   EXPECT_EQ(desktop.Boxes[1].text, u"Run-time error '10091':\n\nNetwork subsystem is unavailable.");
 }
+
+INSTANTIATE_TEST_SUITE_P(OfThePage, UnavailableNetwork, testing::Values(0, 1));
 
 TEST_F(UnavailableMachineTest,
        With_a_network_alone_the_monitor_page_shows_an_empty_table_and_why_nothing_is_captured) {

@@ -78,7 +78,7 @@ class Soak : public LiveReportTest {
            Await([&] { return StateOf(2) == foundation::sckClosed; });
   }
   void LeaveAndReturn() {
-    desktop.Click(program->frmMenu.lblCaption[1]);
+    desktop.Click(program->frmMenu.lblCaption[2]);
     desktop.Click(program->frmMenu.lblCaption[0]);
   }
 

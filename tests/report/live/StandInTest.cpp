@@ -134,7 +134,7 @@ TEST_F(StandIn, A_load_that_the_server_ends_closes_its_socket) {
 TEST_F(StandIn, Leaving_the_page_in_the_middle_of_a_load_closes_every_socket) {
   const auto server = Start(64);
   OpenPage();
-  WhenLoaded(kEnough, [&] { desktop.Click(program->frmMenu.lblCaption[1]); });
+  WhenLoaded(kEnough, [&] { desktop.Click(program->frmMenu.lblCaption[2]); });
 
   desktop.DoubleClick(program->monitorPage.table.main_Label3);
 

@@ -1,0 +1,23 @@
+#pragma once
+
+#include "diagnostics/AdvancedPanel.h"
+#include "diagnostics/mdlTracert.h"
+#include "foundation/InputNormaliser.h"
+
+namespace quendra::diagnostics {
+
+/// What the controls of the advanced panel ask of other modules: the trace, and the mending of what is typed
+/// with the Hebrew layout.
+class RouteTracing {
+ public:
+  RouteTracing(AdvancedPanel& panel, const mdlTracert::Network& network, forms::MessageLoop& loop,
+               platform::KeyboardLayout& layout);
+
+ private:
+  void frmSurf_txtping_KeyPress(int& keyCode);
+
+  mdlTracert mdlTracert_;
+  foundation::InputNormaliser normaliser_;
+};
+
+} // namespace quendra::diagnostics
