@@ -1,7 +1,6 @@
 #include "platform/BackendFixture.h"
 #include "platform/capture/CaptureControls.h"
 #include "platform/capture/CaptureLibrary.h"
-#include "platform/icmp/Icmp.h"
 #include "platform/net/HostNames.h"
 #include "platform/net/IpHelper.h"
 #include "platform/process/Handles.h"
@@ -63,49 +62,6 @@ struct BehaviourTest : testing::TestWithParam<Kind> {
 };
 
 constexpr std::uint32_t kLoopbackInMemory = 0x0100007F;
-
-// Echoes.
-
-/// Sends one to this machine itself.
-std::uint32_t EchoToSelf(Icmp& icmp, IcmpHandle handle, std::span<std::uint8_t> reply) {
-  const std::array<std::uint8_t, 5> data{'h', 'e', 'l', 'l', 'o'};
-  return icmp.IcmpSendEcho(handle, {Ipv4Address::FromMemory(kLoopbackInMemory), data, {}}, reply, 2000);
-}
-
-TEST_P(BehaviourTest, An_echo_to_the_own_machine_comes_back_with_its_data) {
-  const IcmpHandle handle = machine.icmp.IcmpCreateFile();
-  ASSERT_NE(handle, kNoIcmp);
-  EXPECT_EQ(machine.icmp.MissingRight(), "");
-  std::array<std::uint8_t, 280> reply{};
-
-  EXPECT_EQ(EchoToSelf(machine.icmp, handle, reply), 1U);
-
-  EXPECT_EQ(Little32(reply, kReplyAddress), kLoopbackInMemory);
-  EXPECT_EQ(Little32(reply, kReplyStatus), kEchoSuccess);
-  EXPECT_EQ(Little16(reply, kReplyDataSize), 5);
-  EXPECT_EQ(std::string(reply.begin() + kEchoReplySize, reply.begin() + kEchoReplySize + 5), "hello");
-  machine.icmp.IcmpCloseHandle(handle);
-}
-
-TEST_P(BehaviourTest, A_buffer_too_small_for_a_reply_stays_as_it_was) {
-  const IcmpHandle handle = machine.icmp.IcmpCreateFile();
-  std::array<std::uint8_t, kEchoReplySize - 1> reply{};
-  EXPECT_EQ(EchoToSelf(machine.icmp, handle, reply), 0U);
-  EXPECT_EQ(reply, decltype(reply){});
-  machine.icmp.IcmpCloseHandle(handle);
-}
-
-TEST_P(BehaviourTest, An_echo_handle_is_closed_once_and_sends_nothing_afterwards) {
-  const IcmpHandle handle = machine.icmp.IcmpCreateFile();
-  EXPECT_TRUE(machine.icmp.IcmpCloseHandle(handle));
-  std::array<std::uint8_t, 280> reply{};
-
-  EXPECT_EQ(EchoToSelf(machine.icmp, handle, reply), 0U);
-
-  EXPECT_EQ(Little32(reply, kReplyStatus), kEchoBadRequest);
-  EXPECT_FALSE(machine.icmp.IcmpCloseHandle(handle));
-  EXPECT_FALSE(machine.icmp.IcmpCloseHandle(kNoIcmp));
-}
 
 // Processes.
 
