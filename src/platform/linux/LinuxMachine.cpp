@@ -40,7 +40,7 @@ struct LinuxMachine::Parts {
   unavailable::UnavailableKeyboardLayout keyboardLayout;
   LinuxProcesses processes{folder, handleTable, paths};
   unavailable::UnavailableRegistry registry;
-  LinuxShellStart shellStart;
+  LinuxShellStart shellStart{paths};
   LinuxSockets sockets;
   LinuxSystem system;
   LinuxTokens tokens{handleTable};

@@ -2,6 +2,8 @@
 #include "forms/headless/posix/PolledDesktop.h"
 #include "platform/linux/LinuxFixture.h"
 #include "platform/linux/system/Descriptor.h"
+#include "platform/linux/system/FileManager.h"
+#include "platform/linux/system/Files.h"
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
 #include "platform/net/HostNames.h"
@@ -79,7 +81,8 @@ TEST(LinuxShellStartTest, A_command_line_is_parted_at_blanks_that_are_not_in_quo
 }
 
 TEST(LinuxShellStartTest, A_program_that_does_not_exist_cannot_be_started) {
-  LinuxShellStart shell;
+  SystemPaths paths;
+  LinuxShellStart shell{paths};
   EXPECT_FALSE(shell.Shell("quendra-no-such-program.exe -s \"x.dll\"", ShellStart::kNormalWindow));
   EXPECT_FALSE(shell.Shell("", ShellStart::kNormalWindow));
   EXPECT_FALSE(shell.Shell("\"\"", ShellStart::kNormalWindow));
@@ -87,7 +90,8 @@ TEST(LinuxShellStartTest, A_program_that_does_not_exist_cannot_be_started) {
 
 TEST(LinuxShellStartTest, A_file_that_is_no_program_cannot_be_started) {
   const TemporaryFolder folder;
-  LinuxShellStart shell;
+  SystemPaths paths;
+  LinuxShellStart shell{paths};
   EXPECT_FALSE(shell.Shell(folder.Write("text", "touch x\n", true), ShellStart::kNormalWindow));
   EXPECT_FALSE(shell.Shell(folder.Path(), ShellStart::kNormalWindow));
 }
@@ -95,7 +99,8 @@ TEST(LinuxShellStartTest, A_file_that_is_no_program_cannot_be_started) {
 TEST(LinuxShellStartTest, A_program_that_has_not_ended_is_not_waited_for) {
   const TemporaryFolder folder;
   ASSERT_EQ(::mkfifo((folder / "pipe").c_str(), 0600), 0);
-  LinuxShellStart shell;
+  SystemPaths paths;
+  LinuxShellStart shell{paths};
   // It waits until somebody opens the pipe's other end, which the test does only after the call.
   ASSERT_TRUE(shell.Shell("cat " + (folder / "pipe"), ShellStart::kNormalWindow));
   const Descriptor end(::open((folder / "pipe").c_str(), O_WRONLY | O_CLOEXEC));
@@ -105,7 +110,8 @@ TEST(LinuxShellStartTest, A_program_that_has_not_ended_is_not_waited_for) {
 TEST(LinuxShellStartTest, A_program_that_was_started_leaves_no_child_behind) {
   const TemporaryFolder folder;
   const std::string done = folder / "with blank";
-  LinuxShellStart shell;
+  SystemPaths paths;
+  LinuxShellStart shell{paths};
   ASSERT_TRUE(shell.Shell("touch \"" + done + "\"", ShellStart::kNormalWindow));
   for (int i = 0; i < 5000 && !std::filesystem::exists(done); ++i) ::usleep(1000);
   EXPECT_TRUE(std::filesystem::exists(done));
@@ -113,9 +119,81 @@ TEST(LinuxShellStartTest, A_program_that_was_started_leaves_no_child_behind) {
   EXPECT_EQ(errno, ECHILD);
 }
 
+/// A session without a bus, whose only programs are scripts that write down what they were given.
+class LinuxSessionTest : public testing::Test {
+ protected:
+  LinuxSessionTest() {
+    ::setenv("PATH", folder_.Path().c_str(), 1);
+    ::setenv("DBUS_SESSION_BUS_ADDRESS", ("unix:path=" + (folder_ / "no-bus")).c_str(), 1);
+  }
+  ~LinuxSessionTest() override {
+    Restore("PATH", path_);
+    Restore("DBUS_SESSION_BUS_ADDRESS", bus_);
+  }
+  void AddProgram(const std::string& name) {
+    folder_.Write(name,
+                  "#!/bin/sh\necho \"$*\" > " + (folder_ / name) + ".part\n/bin/mv " + (folder_ / name) +
+                      ".part " + (folder_ / name) + ".given\n",
+                  true);
+  }
+  /// Waits for the program.
+  std::string GivenTo(const std::string& name) {
+    std::optional<std::string> given;
+    Wait([&] { return (given = ReadFile((folder_ / name) + ".given", 1000)).has_value(); });
+    return given.value_or("not started");
+  }
+
+  SystemPaths paths;
+  LinuxShellStart shell{paths};
+
+ private:
+  static std::optional<std::string> Now(const char* name) {
+    const char* value = ::getenv(name);
+    return value == nullptr ? std::nullopt : std::optional<std::string>(value);
+  }
+  static void Restore(const char* name, const std::optional<std::string>& value) {
+    value ? ::setenv(name, value->c_str(), 1) : ::unsetenv(name);
+  }
+
+  TemporaryFolder folder_;
+  std::optional<std::string> path_ = Now("PATH");
+  std::optional<std::string> bus_ = Now("DBUS_SESSION_BUS_ADDRESS");
+};
+
+TEST_F(LinuxSessionTest, A_file_is_shown_by_opening_its_folder_where_no_file_manager_can_be_asked) {
+  AddProgram("xdg-open");
+  EXPECT_TRUE(
+      shell.Shell("explorer.exe /n, /e, /select, /usr/lib/some program/file", ShellStart::kNormalWindow));
+  EXPECT_EQ(GivenTo("xdg-open"), "/usr/lib/some program\n");
+}
+
+TEST_F(LinuxSessionTest, A_file_whose_path_the_code_page_lacks_is_found_by_its_number) {
+  AddProgram("xdg-open");
+  const std::string path = paths.ToSystem("/usr/\u4e16/file");
+  EXPECT_TRUE(shell.Shell("explorer.exe /n, /e, /select, " + path, ShellStart::kNormalWindow));
+  EXPECT_EQ(GivenTo("xdg-open"), "/usr/\u4e16\n");
+}
+
+TEST_F(LinuxSessionTest, The_applet_for_programs_is_the_first_software_centre_that_is_there) {
+  AddProgram("plasma-discover");
+  EXPECT_TRUE(shell.Shell("rundll32.exe shell32.dll,Control_RunDLL appwiz.cpl,,", ShellStart::kAsItIsShown));
+  EXPECT_EQ(GivenTo("plasma-discover"), "\n");
+}
+
+TEST_F(LinuxSessionTest, A_session_without_such_programs_starts_nothing) {
+  EXPECT_FALSE(shell.Shell("explorer.exe /n, /e, /select, /usr/file", ShellStart::kNormalWindow));
+  EXPECT_FALSE(shell.Shell("explorer.exe /n, /e, /select, //9/file", ShellStart::kNormalWindow));
+  EXPECT_FALSE(shell.Shell("rundll32.exe shell32.dll,Control_RunDLL appwiz.cpl,,", ShellStart::kAsItIsShown));
+}
+
+TEST(FileUriTest, Escapes_all_but_letters_digits_and_harmless_signs) {
+  EXPECT_EQ(FileUri("/a b/\xD7\x90#%?.txt"), "file:///a%20b/%D7%90%23%25%3F.txt");
+}
+
 TEST(LinuxShellStartTest, Signs_that_a_shell_would_understand_are_plain_words) {
   const TemporaryFolder folder;
-  LinuxShellStart shell;
+  SystemPaths paths;
+  LinuxShellStart shell{paths};
   ASSERT_TRUE(shell.Shell("touch " + (folder / "a;b") + " " + (folder / "$HOME"), ShellStart::kNormalWindow));
   for (int i = 0; i < 5000 && !std::filesystem::exists(folder / "$HOME"); ++i) ::usleep(1000);
   EXPECT_TRUE(std::filesystem::exists(folder / "a;b"));

@@ -1,12 +1,15 @@
 #include "platform/linux/system/LinuxShellStart.h"
 
 #include "platform/linux/system/Descriptor.h"
+#include "platform/linux/system/FileManager.h"
 #include "platform/linux/system/UserFolders.h"
 #include "runtime/Text.h"
 
 #include <fcntl.h>
 #include <sys/wait.h>
 
+#include <algorithm>
+#include <array>
 #include <cerrno>
 
 namespace quendra::platform::linux_ {
@@ -69,8 +72,27 @@ std::vector<std::string> CommandWords(std::string_view commandLine) {
   return words;
 }
 
-bool LinuxShellStart::Shell(const std::string& commandLine, int) {
-  auto words = CommandWords(ToUtf8(FromCodePage(commandLine)));
+namespace {
+
+constexpr std::string_view kShowFile = "explorer.exe /n, /e, /select, ";
+constexpr std::string_view kAddRemove = "rundll32.exe shell32.dll,Control_RunDLL appwiz.cpl,,";
+/// What adds and removes programs, the desktops' own before others.
+constexpr std::array kSoftwareCentres{"gnome-software", "plasma-discover", "pamac-manager", "mintinstall",
+                                      "io.elementary.appcenter"};
+
+bool Start(std::vector<std::string> words);
+
+bool ShowFile(const std::string& path) {
+  if (path.empty() || path[0] != '/') return false;
+  return ShowInFileManager(path) ||
+         Start({"xdg-open", path.substr(0, std::max<std::size_t>(path.rfind('/'), 1))});
+}
+
+bool StartSoftwareCentre() {
+  return std::ranges::any_of(kSoftwareCentres, [](const char* program) { return Start({program}); });
+}
+
+bool Start(std::vector<std::string> words) {
   if (words.empty() || words[0].empty()) return false;
   const auto files = FilesOf(words[0]);
   std::vector<char*> pointers;
@@ -88,6 +110,15 @@ bool LinuxShellStart::Shell(const std::string& commandLine, int) {
   while (::waitpid(child, nullptr, 0) < 0 && errno == EINTR) {
   }
   return StaysSilent(reading.Number());
+}
+
+} // namespace
+
+bool LinuxShellStart::Shell(const std::string& commandLine, int) {
+  const std::string_view line(commandLine.c_str()); // up to its NUL
+  if (line.starts_with(kShowFile)) return ShowFile(paths_.ToRaw(std::string(line.substr(kShowFile.size()))));
+  if (line == kAddRemove) return StartSoftwareCentre();
+  return Start(CommandWords(ToUtf8(FromCodePage(line))));
 }
 
 } // namespace quendra::platform::linux_
