@@ -22,6 +22,7 @@ struct LinuxProcessesTest : testing::Test {
 
   Handle Snapshot() { return processes.CreateToolhelp32Snapshot(Processes::kSnapProcess, 0); }
   TemporaryFolder files;
+  std::uint32_t errorOfPath = 0; ///< that PathOf met, before it closed the process
 
   /// A process that runs a file of this name below a folder of the test's own; gives the file's path.
   std::string AddRunning(std::uint32_t processId, const std::string& name) {
@@ -37,6 +38,7 @@ struct LinuxProcessesTest : testing::Test {
     std::uint32_t length = 0;
     if (processes.EnumProcessModules(process, modules))
       length = processes.GetModuleFileNameExA(process, modules[0], path, 500);
+    errorOfPath = processes.GetLastError();
     processes.CloseHandle(process);
     EXPECT_EQ(path.size(), 260u);
     return path.substr(0, length);
@@ -137,7 +139,7 @@ TEST_F(LinuxProcessesTest, An_opened_process_is_not_mixed_up_with_one_that_takes
 TEST_F(LinuxProcessesTest, A_process_that_runs_no_file_of_this_machine_has_no_module) {
   proc.Add(7, {"x", 1, "/nowhere/at/all"});
   EXPECT_EQ(PathOf(7), "");
-  EXPECT_EQ(processes.GetLastError(), 299u);
+  EXPECT_EQ(errorOfPath, 299u);
 }
 
 TEST_F(LinuxProcessesTest, A_path_is_written_over_the_start_of_the_text_and_its_length_given) {
