@@ -2,6 +2,7 @@
 
 #include "platform/linux/capture/LinuxCapture.h"
 #include "platform/linux/icmp/LinuxIcmp.h"
+#include "platform/linux/internet/LinuxUrlCache.h"
 #include "platform/linux/net/LinuxHostNames.h"
 #include "platform/linux/net/LinuxIpHelper.h"
 #include "platform/linux/net/LinuxSockets.h"
@@ -9,13 +10,12 @@
 #include "platform/linux/process/LinuxTokens.h"
 #include "platform/linux/programs/LinuxIcons.h"
 #include "platform/linux/programs/LinuxVersionInfo.h"
+#include "platform/linux/registry/LinuxRegistry.h"
 #include "platform/linux/system/LinuxPerformanceData.h"
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
 #include "platform/unavailable/UnavailableHandles.h"
 #include "platform/unavailable/UnavailableKeyboardLayout.h"
-#include "platform/unavailable/UnavailableRegistry.h"
-#include "platform/unavailable/UnavailableUrlCache.h"
 
 namespace quendra::platform::linux_ {
 
@@ -39,12 +39,12 @@ struct LinuxMachine::Parts {
   LinuxPerformanceData performanceData{folder};
   unavailable::UnavailableKeyboardLayout keyboardLayout;
   LinuxProcesses processes{folder, handleTable, paths};
-  unavailable::UnavailableRegistry registry;
+  LinuxRegistry registry{UserFolders::OfEnvironment().dataHome + "/quendra"};
   LinuxShellStart shellStart{paths};
   LinuxSockets sockets;
   LinuxSystem system;
   LinuxTokens tokens{handleTable};
-  unavailable::UnavailableUrlCache urlCache;
+  LinuxUrlCache urlCache{UserFolders::OfEnvironment().cacheHome};
   LinuxVersionInfo versionInfo{desktopIndex, paths};
 };
 

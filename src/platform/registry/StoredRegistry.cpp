@@ -52,7 +52,9 @@ std::uint32_t StoredRegistry::Use(RegistryKey key, std::uint32_t access, KeyNumb
   if (!opened) return kInvalidRegistryKey;
   if ((opened->access & access) != access) return kRegistryAccessDenied;
   number = opened->number;
-  return IsRoot(key) ? std::uint32_t{kRegistrySuccess} : store_.Check(number);
+  // A root stands, also where it was opened once more.
+  if (number >= kClassesRoot.Value() && number <= kDynData.Value()) return kRegistrySuccess;
+  return store_.Check(number);
 }
 
 std::uint32_t StoredRegistry::FindPath(RegistryKey parent, const std::string& path, KeyNumber& number) {

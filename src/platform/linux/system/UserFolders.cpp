@@ -21,12 +21,20 @@ std::vector<std::string> Absolute(const std::string& list) {
   return folders;
 }
 
+/// The folder that a variable names, or that below the user's own.
+std::string HomeFolder(const char* name, const std::string& otherwise) {
+  const auto named = Absolute(Variable(name, ""));
+  return named.empty() ? otherwise : named.front();
+}
+
 } // namespace
 
 UserFolders UserFolders::OfEnvironment() {
   UserFolders folders;
   folders.home = Variable("HOME", "/");
   folders.configHome = Variable("XDG_CONFIG_HOME", folders.home + "/.config");
+  folders.dataHome = HomeFolder("XDG_DATA_HOME", folders.home + "/.local/share");
+  folders.cacheHome = HomeFolder("XDG_CACHE_HOME", folders.home + "/.cache");
   folders.configDirs = Absolute(Variable("XDG_CONFIG_DIRS", "/etc/xdg"));
   folders.dataDirs = Absolute(Variable("XDG_DATA_DIRS", "/usr/local/share:/usr/share"));
   folders.dataDirs.insert(folders.dataDirs.begin(),

@@ -12,6 +12,8 @@ struct UserFolders {
   std::vector<std::string> configDirs;
   std::vector<std::string> dataDirs; ///< the user's own first
   std::vector<std::string> programDirs;
+  std::string dataHome{};
+  std::string cacheHome{};
 
   /// As the environment of this program tells.
   static UserFolders OfEnvironment();

@@ -1,0 +1,126 @@
+#include "platform/linux/registry/RegistryFile.h"
+
+#include "platform/linux/registry/RegistrySchema.h"
+#include "platform/linux/system/Descriptor.h"
+#include "platform/registry/RegistryNumbers.h"
+
+#include <fcntl.h>
+#include <sqlite3.h>
+#include <sys/file.h>
+#include <sys/stat.h>
+
+#include <cerrno>
+#include <cstdio>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+constexpr int kPatienceMilliseconds = 2000;
+constexpr int kMostDamagedFiles = 1000;
+
+bool IsDamage(int result) {
+  const int kind = result & 0xFF;
+  return kind == SQLITE_CORRUPT || kind == SQLITE_NOTADB;
+}
+
+/// Every folder of the path, readable by the user alone where it is made here.
+bool MakeFolders(const std::string& path) {
+  for (std::size_t end = path.find('/', 1);; end = path.find('/', end + 1)) {
+    if (::mkdir(path.substr(0, end).c_str(), 0700) != 0 && errno != EEXIST && end == std::string::npos)
+      return false;
+    if (end == std::string::npos) return true;
+  }
+}
+
+/// A pipe or a device at the file's place would be waited on.
+bool IsNoPipeNorDevice(const std::string& path) {
+  struct stat file {};
+  return ::stat(path.c_str(), &file) != 0 || S_ISREG(file.st_mode);
+}
+
+int OpenDatabase(const std::string& path, Database& database) {
+  sqlite3* opened = nullptr;
+  int result = ::sqlite3_open_v2(path.c_str(), &opened,
+                                 SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE | SQLITE_OPEN_EXRESCODE, nullptr);
+  database.reset(opened);
+  if (result != SQLITE_OK) return result;
+  ::sqlite3_busy_timeout(opened, kPatienceMilliseconds);
+  // What is damaged on purpose does no more than be found to be damaged.
+  ::sqlite3_db_config(opened, SQLITE_DBCONFIG_DEFENSIVE, 1, nullptr);
+  ::sqlite3_db_config(opened, SQLITE_DBCONFIG_TRUSTED_SCHEMA, 0, nullptr);
+  return PrepareSchema(opened);
+}
+
+/// Gives the file another name without taking that of a third: false when another program was faster.
+bool RenameToFree(const std::string& path, std::string& name) {
+  for (int number = 1; number <= kMostDamagedFiles; ++number) {
+    name = path + ".damaged-" + std::to_string(number);
+    if (::renameat2(AT_FDCWD, path.c_str(), AT_FDCWD, name.c_str(), RENAME_NOREPLACE) == 0) return true;
+    if (errno != EEXIST) return false;
+  }
+  return false;
+}
+
+} // namespace
+
+void CloseDatabase::operator()(sqlite3* database) const { ::sqlite3_close_v2(database); }
+
+std::uint32_t RegistryErrorOf(int result) {
+  switch (result & 0xFF) {
+  case SQLITE_OK:
+  case SQLITE_ROW:
+  case SQLITE_DONE: return kRegistrySuccess;
+  case SQLITE_BUSY:
+  case SQLITE_LOCKED: return kRegistryBusy;
+  case SQLITE_CANTOPEN:
+  case SQLITE_PERM:
+  case SQLITE_READONLY:
+  case SQLITE_AUTH: return kRegistryAccessDenied;
+  case SQLITE_FULL: return kRegistryDiskFull;
+  case SQLITE_NOMEM: return kRegistryOutOfMemory;
+  case SQLITE_TOOBIG: return kRegistryInvalidParameter;
+  case SQLITE_IOERR: return kRegistryInputOutput;
+  default: return kRegistryBroken;
+  }
+}
+
+std::uint32_t RegistryFile::Open(sqlite3*& database) {
+  if (!database_) {
+    const std::uint32_t error = TryToOpen();
+    if (error != kRegistrySuccess) return error;
+  }
+  database = database_.get();
+  return kRegistrySuccess;
+}
+
+std::uint32_t RegistryFile::TryToOpen() {
+  if (!MakeFolders(folder_)) return kRegistryAccessDenied;
+  if (!IsNoPipeNorDevice(Path())) return kRegistryBroken;
+  int result = OpenDatabase(Path(), database_);
+  if (IsDamage(result) && PutAside()) result = OpenDatabase(Path(), database_);
+  if (result != SQLITE_OK) database_.reset();
+  return RegistryErrorOf(result);
+}
+
+bool RegistryFile::PutAsideWhenDamaged(int result) { return IsDamage(result) && PutAside(); }
+
+bool RegistryFile::PutAside() {
+  database_.reset();
+  const Descriptor lock(
+      ::open((Path() + ".lock").c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK, 0600));
+  if (!lock || ::flock(lock.Number(), LOCK_EX) != 0) return false;
+  // Another program may have put it aside meanwhile.
+  Database current;
+  if (!IsDamage(OpenDatabase(Path(), current))) return true;
+  current.reset();
+  std::string name;
+  if (!RenameToFree(Path(), name)) return false;
+  // What belongs to the damaged file goes with it: the new one must not be taken for it.
+  for (const char* companion : {"-journal", "-wal", "-shm"})
+    ::rename((Path() + companion).c_str(), (name + companion).c_str());
+  tell_("quendra: the registry's file was damaged. It is kept as " + name + "; a new one was begun.");
+  return true;
+}
+
+} // namespace quendra::platform::linux_
