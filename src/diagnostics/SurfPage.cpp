@@ -12,7 +12,7 @@ namespace {
 constexpr int kRuleLeft = Px(20);
 constexpr int kRuleWidth = 8650;
 constexpr int kRuleHeight = 15;
-constexpr int kAsideLeft = kRuleLeft + kRuleWidth + Px(24);
+constexpr int kAsideLeft = Px(622); // a little behind the rules
 constexpr int kListTop = Px(192);
 constexpr int kPanelInset = Px(6);
 constexpr int kPanelTop = Px(50);

@@ -179,6 +179,8 @@ TEST_F(Cache, Without_its_keys_is_limited_nowhere_and_passes_all_the_same) {
 }
 
 TEST_F(LocalCheckTest, An_idle_processor_shows_the_first_reading_that_says_nothing_and_passes) {
+  machine.performanceData.SetProcessors({{}}, 128'000'000'000'000'000);
+
   EXPECT_EQ(program.localChecks.processor.Run(rows), Outcome::Passed);
 
   // 100 of one reading and 0 of fourteen.
