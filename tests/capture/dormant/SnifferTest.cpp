@@ -187,7 +187,7 @@ TEST_F(SnifferTest, The_teardown_of_a_sleeping_sniffer_does_nothing) {
 }
 
 TEST_F(SnifferTest, The_teardown_goes_in_this_order_and_once) {
-  forms::MessageWindows windows;
+  forms::MessageWindows& windows = desktop.Windows;
   const WindowHandle window = windows.Create();
   const auto own = windows.Procedure(window);
   sniffer.Active = true;
@@ -210,7 +210,7 @@ TEST_F(SnifferTest, The_teardown_goes_in_this_order_and_once) {
 }
 
 TEST_F(SnifferTest, A_message_of_the_window_that_it_is_attached_to_reaches_it) {
-  forms::MessageWindows windows;
+  forms::MessageWindows& windows = desktop.Windows;
   const WindowHandle window = windows.Create();
   sniffer.Subclass = std::make_unique<foundation::cSubCls>(windows);
   sniffer.Subclass->AddMsg(1025, kFalse16);

@@ -159,7 +159,7 @@ TEST_F(Fields, What_changes_while_the_thread_is_held_is_drawn_by_a_repaint) {
     int count = 0;
   } painted;
   ShowActive();
-  RunUntil([] { return true; });
+  ASSERT_TRUE(RunUntil([this] { return WidgetOf(form).testAttribute(Qt::WA_Mapped); }));
   auto& view = As<ListViewView>(list);
   view.viewport()->installEventFilter(&painted);
 

@@ -64,6 +64,7 @@ TEST_F(TypingTest, Tab_and_what_the_form_takes_are_not_typed) {
   EXPECT_FALSE(IsTyped(form, {kTabKey}));
   EXPECT_FALSE(IsTyped(form, {'A', kAlt}));
   EXPECT_TRUE(IsTyped(form, {kEnterKey}));
+  form.Visible = true;
   form.Default = &label;
   EXPECT_FALSE(IsTyped(form, {kEnterKey}));
   EXPECT_TRUE(IsTyped(form, {kEscapeKey}));
