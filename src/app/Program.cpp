@@ -45,7 +45,7 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
       downloadOffer(surfPage, desktop), frmPortsChecks(desktop, modSocketPlus),
 
       captureSetup(machine.shellStart, frmSplash, frmMenu, captureSession, packetControl),
-      monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession, sniffer),
+      monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession),
       processActions(monitorPage, portSource, machine.processes, machine.shellStart, desktop),
       monitorDialogs(desktop, frmMenu) {
   frmMenu.Add(monitorPage);
@@ -53,6 +53,7 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
   frmMenu.Add(firstConnectionPage);
   monitorDialogs.Offer(monitorPage.main_cmdChecks, frmPortsChecks);
   monitorDialogs.Offer(monitorPage.main_cmdMemInfo, frmMemInfo);
+  monitorWork.TearDownSniffer = [this] { sniffer.Teardown(); };
   surfPage.surf_Timer1.Tick = [this] { modProcPort.surf_Timer1_Timer(); };
 }
 

@@ -3,9 +3,8 @@
 namespace quendra::shell {
 
 MonitorWork::MonitorWork(MonitorPage& page, monitor::ProcessTable& table, report::SupportExchange& support,
-                         capture::OwnAddresses& addresses, capture::CaptureSession& capture,
-                         capture::Sniffer& sniffer)
-    : table_(table), support_(support), addresses_(addresses), capture_(capture), sniffer_(sniffer) {
+                         capture::OwnAddresses& addresses, capture::CaptureSession& capture)
+    : table_(table), support_(support), addresses_(addresses), capture_(capture) {
   page.Start = [this] { main_StartPage(); };
   page.Stop = [this] { main_StopPage(); };
   page.main_Timer1.Tick = [this] { main_Timer1_Timer(); };
@@ -22,7 +21,7 @@ void MonitorWork::main_StartPage() {
 
 void MonitorWork::main_StopPage() {
   support_.ReleaseSockets();
-  sniffer_.Teardown();
+  TearDownSniffer();
   capture_.StopCapture();
 }
 

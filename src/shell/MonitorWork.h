@@ -1,7 +1,6 @@
 #pragma once
 
 #include "capture/CaptureSession.h"
-#include "capture/dormant/Sniffer.h"
 #include "monitor/ProcessTable.h"
 #include "report/SupportExchange.h"
 #include "shell/MonitorPage.h"
@@ -13,7 +12,10 @@ namespace quendra::shell {
 class MonitorWork {
  public:
   MonitorWork(MonitorPage& page, monitor::ProcessTable& table, report::SupportExchange& support,
-              capture::OwnAddresses& addresses, capture::CaptureSession& capture, capture::Sniffer& sniffer);
+              capture::OwnAddresses& addresses, capture::CaptureSession& capture);
+
+  /// Part of the page's stop, after its sockets have gone.
+  forms::Event<> TearDownSniffer;
 
   void main_StartPage();
   void main_StopPage();
@@ -28,7 +30,6 @@ class MonitorWork {
   report::SupportExchange& support_;
   capture::OwnAddresses& addresses_;
   capture::CaptureSession& capture_;
-  capture::Sniffer& sniffer_;
 };
 
 } // namespace quendra::shell

@@ -11,7 +11,6 @@ class CommandButton : public Label {
     Style = Look::Button;
     Align = Alignment::Centre;
   }
-  void Accept(ControlVisitor& visitor) override { visitor.Visit(*this); }
 };
 
 } // namespace quendra::forms

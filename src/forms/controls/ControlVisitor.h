@@ -3,7 +3,6 @@
 namespace quendra::forms {
 
 class ComboBox;
-class CommandButton;
 class Frame;
 class Image;
 class ImageList;
@@ -20,7 +19,6 @@ class ControlVisitor {
  public:
   virtual ~ControlVisitor() = default;
   virtual void Visit(ComboBox& combo) = 0;
-  virtual void Visit(CommandButton& button) = 0;
   virtual void Visit(Frame& frame) = 0;
   virtual void Visit(Image& image) = 0;
   virtual void Visit(ImageList& images) = 0;

@@ -2,7 +2,7 @@
 
 #include "forms/loop/TimerView.h"
 #include "forms/view/FocusOrder.h"
-#include "forms/view/Typing.h"
+#include "forms/view/fields/Typing.h"
 
 #include <algorithm>
 
@@ -31,7 +31,6 @@ class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
 
  private:
   void Visit(ComboBox& /*combo*/) override {}
-  void Visit(CommandButton& /*button*/) override {}
   void Visit(Frame& /*frame*/) override {}
   void Visit(Image& /*image*/) override {}
   void Visit(ImageList& /*images*/) override {}

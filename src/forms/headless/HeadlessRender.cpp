@@ -72,13 +72,13 @@ class Renderer : public ControlVisitor {
   }
 
   void Visit(ComboBox& combo) override { Write("ComboBox", combo, ItemsOf(combo)); }
-  void Visit(CommandButton& button) override {
-    Write("CommandButton", button, Quoted(button.Caption) + ColourState(button));
-  }
   void Visit(Frame& frame) override { Write("Frame", frame, Quoted(frame.Caption)); }
   void Visit(Image& image) override { Write("Image", image, PictureText(image.Contents)); }
   void Visit(ImageList& /*images*/) override {}
-  void Visit(Label& label) override { Write("Label", label, Quoted(label.Caption) + ColourState(label)); }
+  void Visit(Label& label) override {
+    const bool isButton = dynamic_cast<const CommandButton*>(&label) != nullptr;
+    Write(isButton ? "CommandButton" : "Label", label, Quoted(label.Caption) + ColourState(label));
+  }
   void Visit(Line& line) override { Write("Line", line); }
   void Visit(ListView& list) override {
     Write("ListView", list);

@@ -1,6 +1,6 @@
 #include "forms/headless/HeadlessDesktop.h"
 #include "forms/view/FocusOrder.h"
-#include "forms/view/Typing.h"
+#include "forms/view/fields/Typing.h"
 
 namespace quendra::forms::headless {
 

@@ -46,7 +46,6 @@ class Describer : public ControlVisitor {
   void Visit(ComboBox& combo) override {
     Description.name = combo.FreeText ? NameOfField(combo, combo) : NameOfFrame(combo);
   }
-  void Visit(CommandButton& button) override { Visit(static_cast<Label&>(button)); }
   void Visit(Frame& frame) override {
     Description.role = Role::Grouping;
     Description.name = CaptionOf(frame);

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/view/FieldLook.h"
+#include "forms/view/fields/FieldLook.h"
 
 #include <QWidget>
 

@@ -2,7 +2,7 @@
 
 #include "forms/qt/drawing/Conversion.h"
 #include "forms/qt/input/KeyEvents.h"
-#include "forms/view/FieldText.h"
+#include "forms/view/fields/FieldText.h"
 
 #include <QFocusEvent>
 #include <QKeyEvent>

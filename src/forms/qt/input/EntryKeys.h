@@ -1,7 +1,7 @@
 #pragma once
 
 #include "forms/loop/Dispatcher.h"
-#include "forms/view/Typing.h"
+#include "forms/view/fields/Typing.h"
 
 #include <QString>
 

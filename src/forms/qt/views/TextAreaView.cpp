@@ -2,7 +2,7 @@
 
 #include "forms/qt/drawing/FieldPainting.h"
 #include "forms/qt/input/MouseEvents.h"
-#include "forms/view/FieldText.h"
+#include "forms/view/fields/FieldText.h"
 
 #include <QContextMenuEvent>
 #include <QInputMethodEvent>

@@ -21,7 +21,6 @@ class ViewMaker : public ControlVisitor {
   MadeView Made;
 
   void Visit(ComboBox& combo) override { Make<ComboBoxView>(combo); }
-  void Visit(CommandButton& button) override { Make<LabelView>(button); }
   void Visit(Frame& frame) override { Make<FrameView>(frame); }
   void Visit(Image& image) override { Make<ImageView>(image); }
   void Visit(ImageList& /*images*/) override {} // lists show its pictures

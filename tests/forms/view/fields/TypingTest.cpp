@@ -1,9 +1,9 @@
-#include "forms/view/Typing.h"
+#include "forms/view/fields/Typing.h"
 
 #include "forms/controls/Controls.h"
 #include "forms/view/BareForm.h"
-#include "forms/view/FieldLook.h"
-#include "forms/view/FieldText.h"
+#include "forms/view/fields/FieldLook.h"
+#include "forms/view/fields/FieldText.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "forms/view/FieldLook.h"
+#include "forms/view/fields/FieldLook.h"
 
 #include "forms/view/Palette.h"
 

@@ -1,4 +1,4 @@
-#include "forms/view/Typing.h"
+#include "forms/view/fields/Typing.h"
 
 #include "forms/controls/ComboBox.h"
 

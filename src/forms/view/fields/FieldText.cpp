@@ -1,4 +1,4 @@
-#include "forms/view/FieldText.h"
+#include "forms/view/fields/FieldText.h"
 
 #include "forms/view/VisibleText.h"
 
