@@ -40,8 +40,8 @@ class WalkedUrlCache : public UrlCache {
 
  private:
   struct Walk {
-    CachedUrls next{};
-    std::optional<CachedUrl> current{};
+    CachedUrls next;
+    std::optional<CachedUrl> current;
   };
 
   bool Fill(const CachedUrl& url, UrlCacheEntry* entry, std::uint32_t& size);
