@@ -177,12 +177,27 @@ class NameService : public SurfLive {
     Replace("/etc/hosts", "\n");
     Replace("/etc/resolv.conf", "nameserver 127.0.0.1\noptions timeout:1 attempts:1\n");
   }
-  static void Replace(const std::string& file, const std::string& content) {
-    const std::string other = testing::TempDir() + "quendra-names-" + std::to_string(getpid());
-    std::ofstream(other) << content;
-    ASSERT_EQ(mount(other.c_str(), file.c_str(), nullptr, MS_BIND, nullptr), 0) << file;
-    ASSERT_EQ(unlink(other.c_str()), 0);
+  void TearDown() override {
+    for (auto place = replaced_.rbegin(); place != replaced_.rend(); ++place) {
+      umount2(place->file.c_str(), MNT_DETACH);
+      unlink(place->other.c_str());
+    }
+    SurfLive::TearDown();
   }
+  void Replace(const std::string& file, const std::string& content) {
+    const std::string other = testing::TempDir() + "quendra-names-" + std::to_string(getpid()) + "-" +
+                              std::to_string(replaced_.size());
+    std::ofstream(other) << content;
+    replaced_.push_back({file, other});
+    ASSERT_EQ(mount(other.c_str(), file.c_str(), nullptr, MS_BIND, nullptr), 0) << file;
+  }
+
+ private:
+  struct Replacement {
+    std::string file;
+    std::string other;
+  };
+  std::vector<Replacement> replaced_;
 };
 
 TEST_F(NameService, That_refuses_fails_the_first_check_alone) {
