@@ -9,8 +9,6 @@
 
 namespace quendra::capture {
 
-namespace {} // namespace
-
 PacketAttribution::PacketAttribution(platform::CaptureLibrary& library, forms::MessageLoop& loop,
                                      PacketControl& control, const OwnAddresses& addresses,
                                      monitor::ProcessTable& table)

@@ -1,6 +1,5 @@
 #pragma once
 
-#include <algorithm>
 #include <cstdint>
 #include <vector>
 
@@ -8,7 +7,7 @@ namespace quendra::foundation {
 
 class CSocketPlus;
 
-/// A pair of parallel arrays from 1: handles and the objects that own them. Grows and never shrinks while the
+/// Handles and the objects that own them. Grows and never shrinks while the
 /// dispatcher lives; an entry that was freed holds -1 and nothing, and takes the next pair.
 template <typename Handle> class HandleOwners {
  public:
@@ -32,9 +31,10 @@ template <typename Handle> class HandleOwners {
   }
   /// nullptr for a handle that is not there.
   CSocketPlus* OwnerOf(Handle handle) const {
-    const auto found = std::find_if(entries_.begin(), entries_.end(),
-                                    [&](const Entry& entry) { return entry.handle == handle; });
-    return handle == kFree || found == entries_.end() ? nullptr : found->owner;
+    if (handle == kFree) return nullptr;
+    for (const Entry& entry : entries_)
+      if (entry.handle == handle) return entry.owner;
+    return nullptr;
   }
   std::vector<Handle> HandlesOf(const CSocketPlus* owner) const {
     std::vector<Handle> handles;

@@ -1,6 +1,7 @@
 #include "shell/HandCursor.h"
 
 #include "forms/controls/Label.h"
+
 namespace quendra::shell {
 
 void HandCursor::ShowOverButtons(const forms::Container& container) {

@@ -55,7 +55,7 @@ template <typename TestedDesktop> class HeldUpEvent : public MonitoredDownload {
   void SetUp() override {
     MonitoredDownload::SetUp();
     if (IsSkipped()) return;
-    // Made behind the workers: they are forks, and no toolkit's threads must be lost in them.
+    // Made after the workers: they are forks, and no toolkit's threads must be lost in them.
     qputenv("QT_QPA_PLATFORM", "offscreen");
     desktop.emplace();
     OpenPage(*desktop);

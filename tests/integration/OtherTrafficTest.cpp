@@ -14,7 +14,7 @@ constexpr int kSeconds = 5;
 constexpr int kExchangesASecond = 10;
 constexpr int kReply = 9640;
 
-/// What the row of the downloading process shows behind a pass of the table.
+/// What the row of the downloading process shows after a pass of the table.
 struct Pass {
   double secondsSinceTheLast = 0; ///< from its end to the start of this one
   double rate = 0;                ///< KB/s, as shown

@@ -9,7 +9,7 @@
 
 namespace quendra::capture {
 
-/// The polling form of the capture loop. Complete but asleep: nothing makes one.
+/// The polling form of the capture loop. Dormant: complete, but nothing makes one.
 class PollingLoop {
  public:
   PollingLoop(platform::CaptureLibrary& library, forms::Desktop& desktop, const CaptureSession& session,

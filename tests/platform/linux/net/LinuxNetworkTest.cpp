@@ -229,7 +229,6 @@ TEST_F(LinuxIpHelperTest, A_user_without_rights_sees_the_table_and_owners_of_own
     // A process that was the administrator's is closed to all others, and so to itself, until it says
     // otherwise.
     ::prctl(PR_SET_DUMPABLE, 1);
-    // itself.
     const int own = Listen(0);
     const ProcFolder proc;
     LinuxIpHelper limited(proc, {false, 65534});

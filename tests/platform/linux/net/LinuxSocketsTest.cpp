@@ -1,11 +1,6 @@
 #include "platform/linux/net/LinuxSocketsFixture.h"
-#include "platform/linux/net/SocketErrorNumbers.h"
-#include "runtime/ByteFields.h"
-
-#include <netdb.h>
 
 #include <array>
-#include <cerrno>
 #include <cstring>
 
 namespace quendra::platform::linux_ {
@@ -319,97 +314,6 @@ TEST_F(LinuxSocketsTest, A_closed_socket_announces_nothing_more) {
   Settle();
   EXPECT_EQ(Count(near, kFdRead), 0);
   EXPECT_EQ(Count(near, kFdClose), 0);
-}
-
-// Names.
-
-TEST_F(LinuxSocketsTest, A_name_is_found_and_its_addresses_stand_in_the_buffer) {
-  std::array<std::uint8_t, 1024> buffer{};
-  const LookUpHandle lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
-  ASSERT_NE(lookUp, kNoLookUp);
-  ASSERT_TRUE(Until([&] { return !names.empty(); }));
-  EXPECT_EQ(names, (std::vector<Seen>{{SocketHandle(lookUp.Value()), 0, 0}}));
-  EXPECT_GE(Little32(buffer, 0), 1u);
-  EXPECT_EQ(Big32(buffer, 4), INADDR_LOOPBACK);
-}
-
-TEST_F(LinuxSocketsTest, A_name_that_no_host_can_have_is_not_found) {
-  std::array<std::uint8_t, 1024> buffer{};
-  for (const std::string& name : {std::string(300, 'x'), std::string(70'000, 'y')}) {
-    names.clear();
-    const LookUpHandle lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, name, buffer);
-    ASSERT_TRUE(Until([&] { return !names.empty(); }));
-    EXPECT_EQ(names, (std::vector<Seen>{{SocketHandle(lookUp.Value()), 0, 11001}}));
-  }
-}
-
-TEST_F(LinuxSocketsTest, A_look_up_that_is_cancelled_tells_nothing_and_can_not_be_cancelled_twice) {
-  std::array<std::uint8_t, 1024> buffer{};
-  const LookUpHandle lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
-  EXPECT_EQ(sockets.WSACancelAsyncRequest(lookUp), 0);
-  EXPECT_EQ(sockets.WSACancelAsyncRequest(lookUp), kSocketError);
-  EXPECT_EQ(LastError(), kInvalidArgument);
-  Settle();
-  EXPECT_TRUE(names.empty());
-  EXPECT_EQ(buffer[0], 0);
-}
-
-TEST_F(LinuxSocketsTest, The_sockets_may_go_while_look_ups_run) {
-  std::array<std::uint8_t, 64> buffer{};
-  forms::headless::PolledDesktop desktop;
-  const ProcFolder folder;
-  LinuxHostNames hostNames(folder);
-  for (int round = 0; round < 20; ++round) {
-    LinuxSockets gone(desktop, desktop, hostNames);
-    gone.WSAStartup(257);
-    for (int i = 0; i < 5; ++i)
-      gone.WSAAsyncGetHostByName(WindowHandle(1), kNameMessage, "localhost", buffer);
-  }
-  desktop.WaitFor([] { return false; }, 50);
-  EXPECT_FALSE(desktop.Ended);
-}
-
-// Numbers.
-
-TEST(SocketErrorNumbers, The_systems_numbers_have_their_names_in_the_library) {
-  const std::pair<int, std::int32_t> rows[] = {
-      {0, 0},
-      {EINTR, 10004},
-      {EACCES, 10013},
-      {EFAULT, 10014},
-      {EINVAL, 10022},
-      {EMFILE, 10024},
-      {EAGAIN, 10035},
-      {EINPROGRESS, 10035},
-      {EALREADY, 10037},
-      {ENOTSOCK, 10038},
-      {EDESTADDRREQ, 10039},
-      {EMSGSIZE, 10040},
-      {EADDRINUSE, 10048},
-      {EADDRNOTAVAIL, 10049},
-      {ENETDOWN, 10050},
-      {ENETUNREACH, 10051},
-      {ECONNABORTED, 10053},
-      {ECONNRESET, 10054},
-      {EPIPE, 10054},
-      {ENOBUFS, 10055},
-      {ENOSPC, 10055},
-      {EISCONN, 10056},
-      {ENOTCONN, 10057},
-      {ETIMEDOUT, 10060},
-      {ECONNREFUSED, 10061},
-      {EHOSTUNREACH, 10065},
-      {ENOSYS, 10091},
-  };
-  for (const auto& [system, library] : rows) EXPECT_EQ(SocketErrorOf(system), library) << system;
-}
-
-TEST(SocketErrorNumbers, The_ends_of_look_ups_are_11001_to_11004) {
-  EXPECT_EQ(LookUpErrorOf(0), 0);
-  EXPECT_EQ(LookUpErrorOf(EAI_NONAME), 11001);
-  EXPECT_EQ(LookUpErrorOf(EAI_AGAIN), 11002);
-  EXPECT_EQ(LookUpErrorOf(EAI_FAIL), 11003);
-  EXPECT_EQ(LookUpErrorOf(EAI_NODATA), 11004);
 }
 
 } // namespace
