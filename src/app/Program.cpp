@@ -5,9 +5,8 @@ namespace quendra::app {
 using shell::kPageTable;
 
 Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
-    : desktop_(desktop),
-
-      systemVersion(machine.system, desktop), hostAddresses(machine.hostNames, machine.ipHelper),
+    : desktop_(desktop), systemVersion(machine.system, desktop),
+      hostAddresses(machine.hostNames, machine.ipHelper),
 
       frmAbout(desktop), frmMemInfo(desktop, machine.system),
       frmMenu(desktop, frmAbout, systemVersion, hostAddresses), frmSplash(desktop, frmMenu),
@@ -26,23 +25,12 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
       packetAttribution(machine.captureLibrary, desktop, packetControl, ownAddresses, processTable),
       captureSession(machine.captureLibrary, machine.system, monitorPage.adapters, packetControl,
                      ownAddresses),
-
       sniffer(machine.sockets, monitorPage.table.main_ListView1, monitorPage.main_Timer1, ownAddresses),
 
       modSocketPlus(machine.sockets, machine.hostNames, desktop),
       supportExchange(modSocketPlus, desktop, monitorPage.reporting, processTable, monitorPage.main_Timer1),
 
-      mdlInternetCache(machine.urlCache), regEdit(machine.registry, desktop),
-      localChecks{
-          diagnostics::CacheCheck(machine.urlCache, mdlInternetCache, regEdit),
-          diagnostics::ProcessorCheck(machine.system, machine.performanceData, machine.registry),
-          diagnostics::LineCheck(machine.ipHelper, machine.system, desktop),
-          diagnostics::SharingCheck(machine.processes),
-      },
-      surfChecks(modSocketPlus, desktop, surfPage, localChecks),
-      routeTracing(surfPage.advanced, {machine.sockets, machine.hostNames, machine.icmp}, desktop,
-                   machine.keyboardLayout),
-      downloadOffer(surfPage, desktop), frmPortsChecks(desktop, modSocketPlus),
+      surf(machine, desktop, modSocketPlus, surfPage), frmPortsChecks(desktop, modSocketPlus),
 
       captureSetup(machine.shellStart, frmSplash, frmMenu, captureSession, packetControl),
       monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession),

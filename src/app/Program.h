@@ -1,16 +1,14 @@
 #pragma once
 
+#include "app/SurfWing.h"
 #include "capture/CaptureSession.h"
 #include "capture/HostAddresses.h"
 #include "capture/PacketAttribution.h"
 #include "capture/dormant/Sniffer.h"
-#include "diagnostics/RouteTracing.h"
-#include "diagnostics/SurfChecks.h"
 #include "diagnostics/SurfPage.h"
-#include "diagnostics/dormant/DownloadOffer.h"
-#include "diagnostics/frmAbout.h"
-#include "diagnostics/frmMemInfo.h"
-#include "diagnostics/frmPortsChecks.h"
+#include "diagnostics/dialogs/frmAbout.h"
+#include "diagnostics/dialogs/frmMemInfo.h"
+#include "diagnostics/dialogs/frmPortsChecks.h"
 #include "forms/Desktop.h"
 #include "foundation/modSocketPlus.h"
 #include "monitor/ProcessTable.h"
@@ -73,12 +71,7 @@ class Program {
   foundation::modSocketPlus modSocketPlus;
   report::SupportExchange supportExchange;
 
-  diagnostics::mdlInternetCache mdlInternetCache;
-  foundation::RegEdit regEdit;
-  diagnostics::LocalChecks localChecks;
-  diagnostics::SurfChecks surfChecks;
-  diagnostics::RouteTracing routeTracing;
-  diagnostics::DownloadOffer downloadOffer;
+  SurfWing surf;
   diagnostics::frmPortsChecks frmPortsChecks;
 
   shell::CaptureSetup captureSetup;

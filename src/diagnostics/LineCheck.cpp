@@ -1,6 +1,6 @@
 #include "diagnostics/LineCheck.h"
 
-#include "diagnostics/CIpHelper.h"
+#include "diagnostics/interfaces/CIpHelper.h"
 #include "runtime/Integers.h"
 
 namespace quendra::diagnostics {

@@ -1,6 +1,6 @@
 #include "diagnostics/ProcessorCheck.h"
 
-#include "diagnostics/CPULoad.h"
+#include "diagnostics/load/CPULoad.h"
 
 namespace quendra::diagnostics {
 

@@ -38,13 +38,16 @@ class frmMenu : public forms::PageWindow {
   PictureBox picOut{*this, u"picOut"};
   Label lblWelcome{picOut, u"lblWelcome"};
   Label lblWelcomeHint{picOut, u"lblWelcomeHint"};
-  std::array<PictureBox, kEntryCount> PicMenu = forms::ControlArray<PictureBox, kEntryCount>(*this, u"PicMenu");
+  std::array<PictureBox, kEntryCount> PicMenu =
+      forms::ControlArray<PictureBox, kEntryCount>(*this, u"PicMenu");
   MenuHighlight::Lines linMenu1 = LinesOnSecondRow(u"linMenu1");
   MenuHighlight::Lines linMenu2 = LinesOnSecondRow(u"linMenu2");
   std::array<Label, kEntryCount> lblCaption = forms::ControlArrayOn<Label>(PicMenu, u"lblCaption");
   Label Label1{*this, u"Label1"};
-  std::array<PictureBox, kPageCount> picMenu2 = forms::ControlArray<PictureBox, kPageCount>(*this, u"picMenu2");
-  std::array<PictureBox, kPageCount> picMenu3 = forms::ControlArray<PictureBox, kPageCount>(*this, u"picMenu3");
+  std::array<PictureBox, kPageCount> picMenu2 =
+      forms::ControlArray<PictureBox, kPageCount>(*this, u"picMenu2");
+  std::array<PictureBox, kPageCount> picMenu3 =
+      forms::ControlArray<PictureBox, kPageCount>(*this, u"picMenu3");
 
   void resetButtons() override { pages_.resetButtons(); }
   bool PageChosen() const { return pages_.PageChosen; }

@@ -55,7 +55,7 @@ class Sharing : public LocalCheckTest {
   Text Names(const std::vector<std::string>& processes) {
     std::uint32_t id = 100;
     for (const std::string& name : processes) machine.AddProcess({id++, 0, name, ""});
-    EXPECT_EQ(program.localChecks.sharing.Run(rows), Outcome::Passed);
+    EXPECT_EQ(program.surf.localChecks.sharing.Run(rows), Outcome::Passed);
     return Detail(1);
   }
 };
@@ -97,7 +97,7 @@ TEST_F(Sharing, Passes_with_nothing_found_where_no_snapshot_can_be_taken) {
 
 class Cache : public LocalCheckTest {
  protected:
-  void Run() { EXPECT_EQ(program.localChecks.cache.Run(rows), Outcome::Passed); }
+  void Run() { EXPECT_EQ(program.surf.localChecks.cache.Run(rows), Outcome::Passed); }
   std::optional<platform::RegistryValue> Limit(const std::string& key) {
     return machine.registry.Value(key, "CacheLimit");
   }
@@ -139,7 +139,7 @@ TEST_F(Cache, Of_more_than_32767_entries_is_a_fault_before_anything_is_deleted) 
   int number = 0;
 
   try {
-    program.localChecks.cache.Run(rows);
+    program.surf.localChecks.cache.Run(rows);
   } catch (const Fault& fault) {
     number = fault.number;
   }
@@ -181,7 +181,7 @@ TEST_F(Cache, Without_its_keys_is_limited_nowhere_and_passes_all_the_same) {
 TEST_F(LocalCheckTest, An_idle_processor_shows_the_first_reading_that_says_nothing_and_passes) {
   machine.performanceData.SetProcessors({{}}, 128'000'000'000'000'000);
 
-  EXPECT_EQ(program.localChecks.processor.Run(rows), Outcome::Passed);
+  EXPECT_EQ(program.surf.localChecks.processor.Run(rows), Outcome::Passed);
 
   // 100 of one reading and 0 of fourteen.
   EXPECT_EQ(Detail(1), u"6.67%");
@@ -199,7 +199,7 @@ class Line : public LocalCheckTest {
     card.Set(platform::InterfaceRow::kOperStatus, platform::kDisconnected);
     machine.ipHelper.Interfaces.push_back(card);
   }
-  Outcome Run() { return program.localChecks.line.Run(rows); }
+  Outcome Run() { return program.surf.localChecks.line.Run(rows); }
   int FaultOfRun() {
     try {
       Run();

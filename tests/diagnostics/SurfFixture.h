@@ -89,7 +89,7 @@ class SurfTest : public testing::Test {
   app::Program program{machine.Operations(), desktop};
   shell::frmMenu& menu = program.frmMenu;
   SurfPage& page = program.surfPage;
-  SurfChecks& checks = program.surfChecks;
+  SurfChecks& checks = program.surf.surfChecks;
 };
 
 } // namespace quendra::diagnostics

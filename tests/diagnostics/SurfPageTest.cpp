@@ -46,8 +46,8 @@ TEST_F(SurfPageTest, The_question_before_outside_programs_has_its_words_kept) {
   OpenPage();
   for (const int answer : {6, 7}) desktop.AnswerNextBox(answer);
 
-  program.downloadOffer.surf_cmdDownload_Click();
-  program.downloadOffer.surf_cmdDownload_Click();
+  program.surf.downloadOffer.surf_cmdDownload_Click();
+  program.surf.downloadOffer.surf_cmdDownload_Click();
 
   const forms::headless::HeadlessDesktop::Box question{
       u"חשוב לציין:\r\nהתוכנות אינן של זלמר בינלאומי,\r\nואינן נתמכות במוקד התמיכה.\r\n\r\nלהמשיך?", 0x180034,

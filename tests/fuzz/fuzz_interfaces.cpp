@@ -1,6 +1,6 @@
 // Any bytes as the table of network interfaces, whatever number of rows they state.
 
-#include "diagnostics/CIpHelper.h"
+#include "diagnostics/interfaces/CIpHelper.h"
 #include "forms/MessageLoop.h"
 #include "platform/unavailable/UnavailableIpHelper.h"
 #include "runtime/Fault.h"

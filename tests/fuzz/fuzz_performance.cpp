@@ -1,6 +1,6 @@
 // Any bytes as the block of performance data.
 
-#include "diagnostics/CPULoad.h"
+#include "diagnostics/load/CPULoad.h"
 #include "platform/simulated/registry/SimulatedRegistry.h"
 #include "platform/simulated/system/SimulatedPerformanceData.h"
 #include "platform/simulated/system/SimulatedSystem.h"

@@ -58,11 +58,17 @@ TEST(Integers, Rounding_overflows_outside_32_bits) {
   EXPECT_EQ(FaultOf([] { RoundToInt32(std::nan("")); }), Fault::kOverflow);
 }
 
-TEST(Quotient, Division_by_zero_is_fault_11) { EXPECT_EQ(FaultOf([] { Quotient(1, 0); }), Fault::kDivision); }
+TEST(Quotient, Division_by_zero_is_fault_11) {
+  EXPECT_EQ(FaultOf([] { Quotient(1, 0); }), Fault::kDivision);
+}
 
-TEST(Quotient, Zero_by_zero_is_fault_6) { EXPECT_EQ(FaultOf([] { Quotient(0, 0); }), Fault::kOverflow); }
+TEST(Quotient, Zero_by_zero_is_fault_6) {
+  EXPECT_EQ(FaultOf([] { Quotient(0, 0); }), Fault::kOverflow);
+}
 
-TEST(Quotient, What_no_double_holds_is_fault_6) { EXPECT_EQ(FaultOf([] { Quotient(1e308, 1e-3); }), Fault::kOverflow); }
+TEST(Quotient, What_no_double_holds_is_fault_6) {
+  EXPECT_EQ(FaultOf([] { Quotient(1e308, 1e-3); }), Fault::kOverflow);
+}
 
 TEST(Quotient, A_negative_divisor_divides) { EXPECT_DOUBLE_EQ(Quotient(3, -2), -1.5); }
 

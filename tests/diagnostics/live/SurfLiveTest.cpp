@@ -94,7 +94,7 @@ TEST_P(MailServer, Ends_its_check_as_it_behaves) {
   EXPECT_EQ(Icon(2), kTick);
   EXPECT_EQ(Icon(3), GetParam().icon);
   EXPECT_EQ(Detail(3), GetParam().detail);
-  EXPECT_EQ(program->surfChecks.FailCount(), GetParam().icon == kCross ? 1 : 0);
+  EXPECT_EQ(program->surf.surfChecks.FailCount(), GetParam().icon == kCross ? 1 : 0);
 }
 
 INSTANTIATE_TEST_SUITE_P(Manners, MailServer,
@@ -119,7 +119,7 @@ TEST_F(SurfLive, A_silent_server_holds_its_step_and_the_window_lives) {
   EXPECT_TRUE(desktop.Click(program->surfPage.surf_lblBack));
 
   EXPECT_FALSE(program->surfPage.frameSurfProb.Visible());
-  EXPECT_EQ(program->surfChecks.Sockets(), nullptr);
+  EXPECT_EQ(program->surf.surfChecks.Sockets(), nullptr);
 }
 
 TEST_F(SurfLive, An_old_socket_that_is_reset_fails_the_step_that_waits) {

@@ -54,10 +54,10 @@ class Soak : public LiveReportTest {
     const platform::Machine given = quiet.Operations();
     const platform::Machine real = machine->Operations();
     program = std::make_unique<app::Program>(
-        platform::Machine{given.captureControls, given.captureLibrary, given.handles, real.hostNames, given.icmp,
-                          given.icons, given.ipHelper, given.keyboardLayout, given.performanceData,
-                          given.processes, given.registry, given.shellStart, real.sockets, given.system,
-                          given.tokens, given.urlCache, given.versionInfo},
+        platform::Machine{given.captureControls, given.captureLibrary, given.handles, real.hostNames,
+                          given.icmp, given.icons, given.ipHelper, given.keyboardLayout,
+                          given.performanceData, given.processes, given.registry, given.shellStart,
+                          real.sockets, given.system, given.tokens, given.urlCache, given.versionInfo},
         desktop);
     quiet.AddCaptureAdapter({"lo", "Loopback", "127.0.0.1"});
     OpenPage();

@@ -1,4 +1,4 @@
-#include "diagnostics/frmMemInfo.h"
+#include "diagnostics/dialogs/frmMemInfo.h"
 
 #include "runtime/Fault.h"
 #include "runtime/Format.h"

@@ -1,4 +1,4 @@
-#include "diagnostics/CPULoad.h"
+#include "diagnostics/load/CPULoad.h"
 
 #include "platform/simulated/SimulatedMachine.h"
 #include "platform/unavailable/UnavailableMachine.h"

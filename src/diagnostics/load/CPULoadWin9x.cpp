@@ -1,5 +1,5 @@
-#include "diagnostics/CPULoad.h"
-#include "diagnostics/CPULoadError.h"
+#include "diagnostics/load/CPULoad.h"
+#include "diagnostics/load/CPULoadError.h"
 #include "runtime/ByteFields.h"
 
 #include <array>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "diagnostics/CInterface.h"
+#include "diagnostics/interfaces/CInterface.h"
 
 #include <memory>
 #include <vector>

@@ -1,7 +1,7 @@
-#include "diagnostics/CPULoad.h"
+#include "diagnostics/load/CPULoad.h"
 
-#include "diagnostics/CPULoadError.h"
-#include "diagnostics/ProcessorBlockReader.h"
+#include "diagnostics/load/CPULoadError.h"
+#include "diagnostics/load/ProcessorBlockReader.h"
 #include "runtime/Format.h"
 #include "runtime/Integers.h"
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "diagnostics/CInterfaces.h"
+#include "diagnostics/interfaces/CInterfaces.h"
 #include "forms/MessageLoop.h"
 #include "platform/net/IpHelper.h"
 

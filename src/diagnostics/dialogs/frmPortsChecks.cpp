@@ -1,4 +1,4 @@
-#include "diagnostics/frmPortsChecks.h"
+#include "diagnostics/dialogs/frmPortsChecks.h"
 
 #include "diagnostics/ProbeTexts.h"
 #include "foundation/Looks.h"

@@ -1,4 +1,4 @@
-#include "diagnostics/InterfaceReading.h"
+#include "diagnostics/interfaces/InterfaceReading.h"
 
 #include "runtime/Fault.h"
 

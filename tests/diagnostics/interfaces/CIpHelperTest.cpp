@@ -1,4 +1,4 @@
-#include "diagnostics/CIpHelper.h"
+#include "diagnostics/interfaces/CIpHelper.h"
 
 #include "forms/headless/HeadlessDesktop.h"
 #include "platform/simulated/net/SimulatedIpHelper.h"

@@ -1,4 +1,4 @@
-#include "diagnostics/frmPortsChecks.h"
+#include "diagnostics/dialogs/frmPortsChecks.h"
 
 #include "diagnostics/SurfFixture.h"
 

@@ -1,6 +1,6 @@
-#include "diagnostics/CIpHelper.h"
+#include "diagnostics/interfaces/CIpHelper.h"
 
-#include "diagnostics/InterfaceReading.h"
+#include "diagnostics/interfaces/InterfaceReading.h"
 #include "platform/net/InterfaceRow.h"
 #include "runtime/Integers.h"
 

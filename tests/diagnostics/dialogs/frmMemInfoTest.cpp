@@ -1,4 +1,4 @@
-#include "diagnostics/frmMemInfo.h"
+#include "diagnostics/dialogs/frmMemInfo.h"
 
 #include "forms/headless/HeadlessDesktop.h"
 #include "platform/simulated/system/SimulatedSystem.h"

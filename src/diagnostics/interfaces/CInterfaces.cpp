@@ -1,4 +1,4 @@
-#include "diagnostics/CInterfaces.h"
+#include "diagnostics/interfaces/CInterfaces.h"
 
 #include "runtime/Fault.h"
 

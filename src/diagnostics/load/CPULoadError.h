@@ -1,6 +1,6 @@
 #pragma once
 
-#include "diagnostics/CPULoad.h"
+#include "diagnostics/load/CPULoad.h"
 #include "runtime/Fault.h"
 
 namespace quendra::diagnostics {

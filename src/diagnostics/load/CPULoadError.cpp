@@ -1,4 +1,4 @@
-#include "diagnostics/CPULoadError.h"
+#include "diagnostics/load/CPULoadError.h"
 
 #include <algorithm>
 #include <array>

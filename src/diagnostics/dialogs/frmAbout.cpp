@@ -1,4 +1,4 @@
-#include "diagnostics/frmAbout.h"
+#include "diagnostics/dialogs/frmAbout.h"
 
 #include "foundation/Twips.h"
 

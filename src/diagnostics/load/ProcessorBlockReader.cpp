@@ -1,6 +1,6 @@
-#include "diagnostics/ProcessorBlockReader.h"
+#include "diagnostics/load/ProcessorBlockReader.h"
 
-#include "diagnostics/CPULoadError.h"
+#include "diagnostics/load/CPULoadError.h"
 #include "platform/system/PerformanceBlock.h"
 #include "runtime/ByteFields.h"
 
