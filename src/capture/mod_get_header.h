@@ -8,7 +8,7 @@
 /// Reads the headers that stand before the packet in a capture record.
 namespace quendra::capture::mod_get_header {
 
-/// The record's own header, in host order.
+/// The record's own header, low byte first.
 struct CaptureRecordHeader {
   std::uint32_t seconds = 0;
   std::uint32_t microseconds = 0;

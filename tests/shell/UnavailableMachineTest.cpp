@@ -104,31 +104,5 @@ TEST_F(UnavailableMachineTest, With_a_network_alone_the_pages_follow_each_other_
   EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
 }
 
-TEST_F(UnavailableMachineTest, Each_family_answers_that_it_is_not_there) {
-  const platform::Machine all = machine.Operations();
-  platform::IpHelper::TcpTable table;
-  platform::FrameBytes frame;
-  platform::CaptureHeader header{};
-  std::int32_t result = 0;
-  const auto control = all.captureControls.Create();
-  control->BindAdapter("eth0", result);
-
-  EXPECT_EQ(result, -1);
-  EXPECT_EQ(all.captureLibrary.VBPcapInit(), -1);
-  EXPECT_LT(all.captureLibrary.vpCapture(frame, header), 0);
-  EXPECT_EQ(frame.UpperBound(), 59);
-  EXPECT_EQ(all.processes.CreateToolhelp32Snapshot(2, 0), platform::kInvalidHandle);
-  EXPECT_NE(all.processes.GetLastError(), 0u);
-  EXPECT_EQ(all.ipHelper.AllocateAndGetTcpExTableFromStack(table), platform::IpHelper::kErrorNotSupported);
-  EXPECT_EQ(table, nullptr);
-  EXPECT_FALSE(all.hostNames.gethostname());
-  EXPECT_EQ(all.hostNames.LastError(), platform::kSubsystemUnavailable);
-  EXPECT_EQ(all.sockets.WSAStartup(257), platform::kSubsystemUnavailable);
-  EXPECT_EQ(all.sockets.socket(2, 1, 6), platform::kNoSocket);
-  EXPECT_EQ(all.icons.ExtractIconExA("C:\\a.exe", 0), platform::kNoHandle);
-  EXPECT_EQ(all.versionInfo.GetFileVersionInfoSizeA("C:\\a.exe"), 0u);
-  EXPECT_FALSE(all.shellStart.Shell("a.exe", 1));
-}
-
 } // namespace
 } // namespace quendra::shell

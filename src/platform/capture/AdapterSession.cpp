@@ -5,7 +5,7 @@ namespace quendra::platform {
 void AdapterSession::Open(const std::string& name) {
   Close();
   failed_ = false;
-  number_ = name.empty() ? 0 : adapters_.NumberIfUp(name);
+  number_ = NumberOf(name);
   if (number_ != 0) source_ = adapters_.Open(name, shaper_);
 }
 
@@ -15,15 +15,22 @@ void AdapterSession::Close() {
 }
 
 bool AdapterSession::Follows(const std::string& name) const {
-  return adapters_.NumberIfUp(name) == number_ && IsLive() == (number_ != 0);
+  return NumberOf(name) == number_ && IsLive() == (number_ != 0);
+}
+
+unsigned AdapterSession::NumberOf(const std::string& name) const {
+  return name.empty() ? 0 : adapters_.NumberIfUp(name);
 }
 
 int AdapterSession::Fill() {
   const int count = source_->Fill();
-  if (count < 0)
+  if (count < 0) {
     failed_ = true;
-  else
-    counters_.received += static_cast<std::uint64_t>(count);
+    ++failuresInARow_;
+    return count;
+  }
+  if (count > 0) failuresInARow_ = 0;
+  counters_.received += static_cast<std::uint64_t>(count);
   return count;
 }
 

@@ -19,6 +19,8 @@ class AdapterSession {
   bool HasSource() const { return source_ != nullptr; }
   bool IsLive() const { return HasSource() && !failed_; }
   bool HasFailed() const { return HasSource() && failed_; }
+  /// Whether the source before it had failed, too, and no packet came between.
+  bool FailsAgain() const { return HasFailed() && failuresInARow_ > 1; }
   /// Whether it is on the adapter that bears the name now.
   bool Follows(const std::string& name) const;
 
@@ -31,10 +33,14 @@ class AdapterSession {
   CaptureCounters Counters() const;
 
  private:
+  /// 0 for the name of no adapter.
+  unsigned NumberOf(const std::string& name) const;
+
   CaptureAdapters& adapters_;
   FrameShaper shaper_;
   std::unique_ptr<FrameSource> source_;
   bool failed_ = false;
+  int failuresInARow_ = 0;
   unsigned number_ = 0;      // of the adapter that it was opened on, 0 for none
   CaptureCounters counters_; // without what the source that is open has dropped
 };

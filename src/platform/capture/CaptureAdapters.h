@@ -16,7 +16,7 @@ class CaptureAdapters {
  public:
   virtual ~CaptureAdapters() = default;
 
-  /// Whether the system's capture library is there. Without it no other question is asked, save AddressOf.
+  /// Whether the system's capture library is there. Without it nothing is listed or opened.
   virtual bool HasLibrary() const = 0;
   /// Whether this process may open a capture.
   virtual bool MayCapture() const = 0;
@@ -31,7 +31,8 @@ class CaptureAdapters {
   /// nullptr when the adapter can't be opened. The shaper outlives the source.
   [[nodiscard]] virtual std::unique_ptr<FrameSource> Open(const std::string& name, FrameShaper& shaper) = 0;
   /// Calls `changed` from the loop when an adapter may have come, gone or changed, or its address, until the
-  /// subscription goes. What exactly isn't told: whoever is told looks for itself.
+  /// subscription goes. What exactly isn't told: whoever is told looks for itself. `changed` may end the
+  /// subscription.
   [[nodiscard]] virtual std::unique_ptr<EventLoop::Subscription> Watch(std::function<void()> changed) = 0;
 };
 

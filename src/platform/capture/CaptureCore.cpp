@@ -8,6 +8,8 @@ namespace quendra::platform {
 namespace {
 
 constexpr int kPaceMilliseconds = 50;
+// A source that fails as soon as it is opened is tried again at leisure.
+constexpr int kRetryMilliseconds = 1000;
 // So that a line faster than this loop doesn't keep it for ever.
 constexpr int kMostBatches = 256;
 
@@ -142,7 +144,10 @@ std::int32_t CaptureCore::Capture(FrameBytes& frame, CaptureHeader& header) {
   if (queue_.Empty()) {
     if (!session_.IsLive()) return -1;
     queue_.Rewind();
-    if (session_.Fill() < 0) return -1;
+    if (session_.Fill() < 0) {
+      UpdateBell();
+      return -1;
+    }
   }
   const FrameRecord* next = queue_.Pop();
   if (next == nullptr) return 0;
@@ -185,12 +190,13 @@ bool CaptureCore::Busy() const { return event_ != nullptr && !event_->IsHeldUp()
 
 void CaptureCore::StartPace() {
   pace_.reset();
-  pace_ = loop_.StartTimer(kPaceMilliseconds, Guarded(&CaptureCore::LookAgain));
+  const int pace = session_.FailsAgain() ? kRetryMilliseconds : kPaceMilliseconds;
+  pace_ = loop_.StartTimer(pace, Guarded(&CaptureCore::LookAgain));
 }
 
 void CaptureCore::PacketsMayWait() {
   watch_.reset();
-  if (!MayRing()) return;
+  if (!MayRing()) return UpdateBell();
   StartPace();
   if (!Busy() && !secondRingPosted_) Serve();
 }
@@ -228,6 +234,7 @@ bool CaptureCore::Gather(int batches) {
     moved = moved || count > 0;
     if (count < FrameSource::kBatch) break;
   }
+  if (session_.HasFailed()) UpdateBell();
   return moved;
 }
 

@@ -7,7 +7,7 @@
 
 namespace quendra::platform {
 
-/// The header of a capture record, in host order: where its fields stand.
+/// The header of a capture record, low byte first: where its fields stand.
 namespace capture_record {
 inline constexpr int kSeconds = 0;
 inline constexpr int kMicroseconds = 4;

@@ -24,7 +24,7 @@ class FrameSource {
   virtual std::uint64_t Dropped() const = 0;
   /// Calls `ready` from the loop when packets may wait, again and again until the subscription goes, which is
   /// before the source does: as a descriptor tells, or at a pace that keeps the system's buffer from running
-  /// over.
+  /// over. `ready` may end the subscription, and the source with it.
   [[nodiscard]] virtual std::unique_ptr<EventLoop::Subscription> Watch(std::function<void()> ready) = 0;
 };
 

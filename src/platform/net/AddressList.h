@@ -6,8 +6,8 @@
 
 namespace quendra::platform {
 
-/// What WSAAsyncGetHostByName leaves in its buffer: a count (32 bits, host order) and as many addresses, as
-/// they lie in memory. Those that find no room are left out, and of a buffer without room for the count
+/// What WSAAsyncGetHostByName leaves in its buffer: a count (32 bits, low byte first) and as many addresses,
+/// as they lie in memory. Those that find no room are left out, and of a buffer without room for the count
 /// nothing is touched.
 void PutAddressList(std::span<std::uint8_t> buffer, std::span<const Ipv4Address> addresses);
 

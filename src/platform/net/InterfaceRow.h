@@ -6,7 +6,7 @@
 #include <cstdint>
 #include <span>
 
-/// The layout of the table of network interfaces (MIB_IFTABLE): a 32-bit count in host order, then the rows
+/// The layout of the table of network interfaces (MIB_IFTABLE): a 32-bit count, low byte first, then the rows
 /// (MIB_IFROW).
 namespace quendra::platform {
 

@@ -29,7 +29,7 @@ class IpHelper : public TcpEntryChange {
   static constexpr std::uint32_t kErrorBufferOverflow = 111;
   static constexpr std::uint32_t kErrorNotSupported = 50;
 
-  /// The IPv4 TCP connections with their owners: a 32-bit count in host order, then the entries
+  /// The IPv4 TCP connections with their owners: a 32-bit count, low byte first, then the entries
   /// (TcpTableEntry). 0 on success; on failure `table` stays as it was.
   virtual std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) = 0;
   /// `size` counts bytes of room, kAdapterBytes an adapter. With less room than needed it gives

@@ -73,7 +73,7 @@ class Sockets : public BlockingCalls {
                                       std::int32_t events) = 0;
   /// Starts a look-up and gives its handle, kNoLookUp on failure. When it ends the window gets the message
   /// with the handle as wParam and an error number in the high word of lParam; without an error `buffer`
-  /// starts with the count of the name's addresses (32 bits, host order) and the addresses as they lie in
+  /// starts with the count of the name's addresses (32 bits, low byte first) and the addresses as they lie in
   /// memory.
   virtual LookUpHandle WSAAsyncGetHostByName(WindowHandle window, std::uint32_t message,
                                              const std::string& name, std::span<std::uint8_t> buffer) = 0;

@@ -5,7 +5,7 @@
 #include <cstdint>
 #include <span>
 
-/// The layout of the table of TCP connections with their owners: a 32-bit count in host order, then the
+/// The layout of the table of TCP connections with their owners: a 32-bit count, low byte first, then the
 /// entries.
 namespace quendra::platform {
 

@@ -49,6 +49,12 @@ TEST_F(AdapterIndexesTest, Beyond_the_indexes_there_is_no_adapter) {
   EXPECT_EQ(NameAt(indexes.Count()), "none");
 }
 
+TEST_F(AdapterIndexesTest, No_more_than_1024_adapters_have_an_index_of_their_own) {
+  for (int i = 0; i < 1025; ++i) lines.Add("a" + std::to_string(i), "10.0.0.1");
+  indexes.CountAdapters();
+  EXPECT_EQ(indexes.Count(), 1024 + AdapterIndexes::kSpare);
+}
+
 TEST_F(AdapterIndexesTest, Adapters_that_come_later_stand_in_a_fresh_list_within_the_same_indexes) {
   lines.Add("a", "10.0.0.1");
   indexes.CountAdapters();

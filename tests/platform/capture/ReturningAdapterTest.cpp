@@ -95,6 +95,28 @@ TEST_P(ReturningAdapterTest, A_source_that_fails_is_opened_again) {
   ExpectFrames();
 }
 
+TEST_P(ReturningAdapterTest, A_source_that_fails_outside_of_an_event_is_opened_again) {
+  lines.Find("line")->fails = true;
+  FrameBytes frame;
+  CaptureHeader header{};
+  EXPECT_EQ(capture->vpCapture(frame, header), -1);
+  Settle();
+  EXPECT_EQ(told, Told{Availability::Available});
+  ExpectFrames();
+}
+
+TEST_P(ReturningAdapterTest, A_source_that_fails_again_and_again_is_opened_once_a_second) {
+  lines.Find("line")->failsAlways = true;
+  Arrive(1);
+  desktop.Advance(5000);
+  const int before = lines.opened;
+  desktop.Advance(10000);
+  EXPECT_EQ(lines.opened - before, 10);
+  lines.Find("line")->failsAlways = false;
+  Settle();
+  ExpectFrames();
+}
+
 TEST_P(ReturningAdapterTest, A_session_that_ended_while_it_was_gone_hears_nothing_of_its_return) {
   lines.Remove("line");
   Settle();

@@ -22,6 +22,7 @@ class ScriptedLines {
     bool isUp = true;
     std::deque<integration::Bytes> waiting{};
     bool fails = false;        ///< the next Fill does, which ends its source
+    bool failsAlways = false;  ///< each Fill does
     std::uint64_t dropped = 0; ///< by the system, of the source that is open
   };
 
@@ -31,6 +32,7 @@ class ScriptedLines {
   bool mayCapture = true;
   bool knowsItsLinks = true; ///< otherwise no source can be opened
   int openSources = 0;
+  int opened = 0; ///< sources in all
   std::size_t largestFill = 0;
 
   /// An adapter comes, or comes again under its name and another number.

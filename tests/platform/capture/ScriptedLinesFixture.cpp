@@ -31,12 +31,13 @@ class ScriptedLines::Source : public FrameSource {
   Source(ScriptedLines& lines, const Line& line, FrameShaper& shaper)
       : lines_(lines), adapter_(line.adapter), shaper_(shaper) {
     ++lines_.openSources;
+    ++lines_.opened;
   }
   ~Source() override { --lines_.openSources; }
 
   int Fill() override {
     Line* line = FindLine();
-    if (line == nullptr || std::exchange(line->fails, false)) return -1;
+    if (line == nullptr || line->failsAlways || std::exchange(line->fails, false)) return -1;
     int count = 0;
     for (; count < kBatch && !line->waiting.empty(); ++count) {
       const auto packet = std::move(line->waiting.front());

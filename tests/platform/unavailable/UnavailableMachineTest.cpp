@@ -26,6 +26,21 @@ TEST_F(UnavailableFamilies, Processes_cannot_be_listed_nor_opened_and_the_error_
   EXPECT_EQ(machine.processes.GetLastError(), kCallNotImplemented);
 }
 
+TEST_F(UnavailableFamilies, No_adapter_is_counted_and_no_frame_comes_but_a_blank_one) {
+  FrameBytes frame;
+  CaptureHeader header{};
+  EXPECT_EQ(machine.captureLibrary.VBPcapInit(), -1);
+  EXPECT_LT(machine.captureLibrary.vpCapture(frame, header), 0);
+  EXPECT_EQ(frame.UpperBound(), 59);
+}
+
+TEST_F(UnavailableFamilies, A_capture_control_is_there_and_binds_no_adapter) {
+  std::int32_t result = 0;
+  const auto control = machine.captureControls.Create();
+  control->BindAdapter("eth0", result);
+  EXPECT_EQ(result, -1);
+}
+
 TEST_F(UnavailableFamilies, A_process_has_no_modules) {
   std::array<ModuleHandle, 2> modules{};
   std::string path = "before";

@@ -4,7 +4,6 @@
 #include "platform/linux/capture/LinkWatch.h"
 #include "platform/linux/capture/PcapSession.h"
 #include "platform/linux/net/DefaultRoute.h"
-#include "platform/linux/net/NetworkInterfaces.h"
 
 #include <ifaddrs.h>
 #include <net/if.h>
