@@ -106,7 +106,7 @@ TEST_P(BehaviourTest, A_process_that_was_not_opened_has_no_modules) {
 
 // Tokens.
 
-TEST_P(BehaviourTest, The_debug_privilege_is_enabled_or_fails_with_1300) {
+TEST_P(BehaviourTest, The_debug_privilege_is_enabled_and_no_step_leaves_an_error) {
   Handle token = kNoHandle;
   std::uint64_t luid = 0;
   std::array<std::uint8_t, 16> previous{};
@@ -116,9 +116,7 @@ TEST_P(BehaviourTest, The_debug_privilege_is_enabled_or_fails_with_1300) {
   EXPECT_TRUE(machine.tokens.LookupPrivilegeValueA("", std::string("SeDebugPrivilege\0", 17), luid));
   EXPECT_EQ(machine.processes.GetLastError(), 0U);
   EXPECT_TRUE(machine.tokens.AdjustTokenPrivileges(token, false, luid, 2, previous));
-
-  const auto error = machine.processes.GetLastError();
-  EXPECT_TRUE(error == 0 || error == 1300) << error;
+  EXPECT_EQ(machine.processes.GetLastError(), 0U);
   EXPECT_TRUE(machine.processes.CloseHandle(token));
 }
 

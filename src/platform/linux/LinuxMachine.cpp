@@ -8,6 +8,7 @@
 #include "platform/linux/net/LinuxSockets.h"
 #include "platform/linux/process/LinuxProcesses.h"
 #include "platform/linux/process/LinuxTokens.h"
+#include "platform/linux/process/TraceRight.h"
 #include "platform/linux/programs/LinuxIcons.h"
 #include "platform/linux/programs/LinuxVersionInfo.h"
 #include "platform/linux/registry/LinuxRegistry.h"
