@@ -21,9 +21,10 @@
 namespace quendra::platform::linux_ {
 
 struct LinuxMachine::Parts {
-  Parts(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot)
-      : folder(procRoot), capture(loop, descriptors), sockets(loop, descriptors, hostNames),
-        system(CoarseMilliseconds, procRoot) {}
+  Parts(EventLoop& loop, DescriptorWatch& descriptors, DamagedFileNotice tellOfDamagedRegistry)
+      : capture(loop, descriptors),
+        registry(UserFolders::OfEnvironment().dataHome + "/quendra", std::move(tellOfDamagedRegistry)),
+        sockets(loop, descriptors, hostNames) {}
 
   ProcFolder folder;
   HandleTable handleTable;
@@ -40,7 +41,7 @@ struct LinuxMachine::Parts {
   LinuxPerformanceData performanceData{folder};
   unavailable::UnavailableKeyboardLayout keyboardLayout;
   LinuxProcesses processes{folder, handleTable, paths};
-  LinuxRegistry registry{UserFolders::OfEnvironment().dataHome + "/quendra"};
+  LinuxRegistry registry;
   LinuxShellStart shellStart{paths};
   LinuxSockets sockets;
   LinuxSystem system;
@@ -49,8 +50,9 @@ struct LinuxMachine::Parts {
   LinuxVersionInfo versionInfo{desktopIndex, paths};
 };
 
-LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot)
-    : parts_(std::make_unique<Parts>(loop, descriptors, procRoot)) {}
+LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors,
+                           DamagedFileNotice tellOfDamagedRegistry)
+    : parts_(std::make_unique<Parts>(loop, descriptors, std::move(tellOfDamagedRegistry))) {}
 
 LinuxMachine::~LinuxMachine() = default;
 

@@ -114,6 +114,13 @@ std::uint32_t RegistryFile::TryToOpen() {
 bool RegistryFile::PutAsideWhenDamaged(int result) { return IsDamage(result) && PutAside(); }
 
 bool RegistryFile::PutAside() {
+  std::string keptAs;
+  if (!MoveAside(keptAs)) return false;
+  if (!keptAs.empty() && tellOfDamage_) tellOfDamage_(keptAs);
+  return true;
+}
+
+bool RegistryFile::MoveAside(std::string& keptAs) {
   database_.reset();
   const Descriptor lock(
       ::open((Path() + ".lock").c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK, 0600));
@@ -122,12 +129,10 @@ bool RegistryFile::PutAside() {
   Database current;
   if (!IsDamage(OpenDatabase(Path(), current))) return true;
   current.reset();
-  std::string name;
-  if (!RenameToFree(Path(), name)) return false;
+  if (!RenameToFree(Path(), keptAs)) return false;
   // What belongs to the damaged file goes with it: the new one must not be taken for it.
   for (const char* companion : {"-journal", "-wal", "-shm"})
-    ::rename((Path() + companion).c_str(), (name + companion).c_str());
-  tell_("quendra: the registry's file was damaged. It is kept as " + name + "; a new one was begun.");
+    ::rename((Path() + companion).c_str(), (keptAs + companion).c_str());
   return true;
 }
 
