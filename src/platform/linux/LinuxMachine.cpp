@@ -3,6 +3,7 @@
 #include "platform/linux/capture/LinuxCapture.h"
 #include "platform/linux/icmp/LinuxIcmp.h"
 #include "platform/linux/internet/LinuxUrlCache.h"
+#include "platform/linux/keyboard/LinuxKeyboardLayout.h"
 #include "platform/linux/net/LinuxHostNames.h"
 #include "platform/linux/net/LinuxIpHelper.h"
 #include "platform/linux/net/LinuxSockets.h"
@@ -16,7 +17,6 @@
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
 #include "platform/unavailable/UnavailableHandles.h"
-#include "platform/unavailable/UnavailableKeyboardLayout.h"
 
 namespace quendra::platform::linux_ {
 
@@ -39,7 +39,7 @@ struct LinuxMachine::Parts {
   LinuxIcons icons{desktopIndex, iconTheme, paths};
   LinuxIpHelper ipHelper{folder, {MayTraceEveryProcess(), ::geteuid()}};
   LinuxPerformanceData performanceData{folder};
-  unavailable::UnavailableKeyboardLayout keyboardLayout;
+  LinuxKeyboardLayout keyboardLayout;
   LinuxProcesses processes{folder, handleTable, paths};
   LinuxRegistry registry;
   LinuxShellStart shellStart{paths};
