@@ -20,7 +20,7 @@ TEST(RegistryNoticeTest, The_subscriber_reads_once_where_the_damaged_file_is_kep
   EXPECT_EQ(desktop.Boxes[0],
             (HeadlessDesktop::Box{u"קובץ ההגדרות של התוכנה נמצא פגום, ובמקומו נפתח קובץ חדש.\r\n"
                                   u"הקובץ הפגום נשמר כאן:\r\n"
-                                  u"\u202A/home/דנה/registry.sqlite.damaged-1\u202C",
+                                  u"/home/דנה/registry.sqlite.damaged-1",
                                   0x180030, u"זלמר בינלאומי@נט"}));
 }
 
