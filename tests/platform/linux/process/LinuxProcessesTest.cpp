@@ -262,7 +262,8 @@ TEST_F(LinuxTokensTest, Everybody_gets_the_privilege_and_no_error_is_left) {
   const Child user([this] {
     if (::geteuid() == 0 && ::setuid(65534) != 0) return std::string("not another user");
     handles.lastError = 5;
-    return std::to_string(Adjust()) + " " + std::to_string(handles.lastError);
+    const bool adjusted = Adjust();
+    return std::to_string(adjusted) + " " + std::to_string(handles.lastError);
   });
   EXPECT_EQ(user.Answer(), "1 0");
 }
