@@ -167,8 +167,9 @@ TEST_F(RegistryFileTest, A_folder_that_can_only_be_read_tells_its_values_and_tak
 
   EXPECT_EQ(AsReader([&] {
               auto registry = Registry();
-              return std::to_string(Read(registry, "One")) + " " + std::to_string(Write(registry, "One", 1)) +
-                     " " + std::to_string(Read(registry, "One"));
+              std::string answer = std::to_string(Read(registry, "One"));
+              answer += " " + std::to_string(Write(registry, "One", 1));
+              return answer + " " + std::to_string(Read(registry, "One"));
             }),
             "7 5 7");
 }
@@ -180,7 +181,8 @@ TEST_F(RegistryFileTest, A_damaged_file_in_a_folder_that_can_only_be_read_is_an_
 
   EXPECT_EQ(AsReader([&] {
               auto registry = Registry();
-              return std::to_string(Write(registry, "One", 1)) + " " + std::to_string(told.size());
+              const auto error = Write(registry, "One", 1);
+              return std::to_string(error) + " " + std::to_string(told.size());
             }),
             std::to_string(kRegistryBroken) + " 0");
   EXPECT_EQ(Content(file), rubbish);
