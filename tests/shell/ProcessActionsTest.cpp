@@ -206,8 +206,8 @@ TEST_F(ProcessActionsTest, A_dialog_comes_modally_after_the_main_window_leaves_t
   for (const auto& [button, dialog] : offers) {
     desktop.Calls.clear();
     bool stood = false;
-    desktop.OnModal = [&](forms::Form& form) {
-      stood = &form == dialog && form.Visible();
+    desktop.OnModal = [&stood, offered = dialog, this](forms::Form& form) {
+      stood = &form == offered && form.Visible();
       desktop.Unload(form);
     };
     EXPECT_TRUE(desktop.Click(*button));
