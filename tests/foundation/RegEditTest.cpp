@@ -171,6 +171,46 @@ TEST_F(RegEditTest, A_number_is_written_as_4_bytes_low_byte_first) {
   EXPECT_EQ(regEdit.LastRegStatus(), 0u);
 }
 
+TEST_F(RegEditTest, A_key_is_opened_for_writing_alone) {
+  struct RemembersAccess : platform::simulated::SimulatedRegistry {
+    std::uint32_t RegOpenKeyExA(RegistryKey parent, const std::string& path, std::uint32_t access,
+                                RegistryKey& key) override {
+      asked.push_back(access);
+      return SimulatedRegistry::RegOpenKeyExA(parent, path, access, key);
+    }
+    std::vector<std::uint32_t> asked;
+  } remembering;
+  remembering.AddKey(kSettings);
+  RegEdit writer(remembering, desktop);
+
+  writer.SetRegDword(settings, u"a", 1);
+  writer.SetRegString(settings, u"b", u"c");
+  writer.SetRegBinary(settings, u"d", u"e");
+
+  EXPECT_EQ(remembering.asked, (std::vector<std::uint32_t>{0x20006, 0x20006, 0x20006}));
+}
+
+TEST_F(RegEditTest, A_path_that_is_a_root_alone_writes_at_the_root) {
+  regEdit.CreateRegKey(u"HKEY_CURRENT_USER");
+  EXPECT_EQ(regEdit.LastRegStatus(), 0u);
+
+  regEdit.SetRegDword(u"HKEY_CURRENT_USER", u"a", 1);
+
+  EXPECT_EQ(registry.Value("HKEY_CURRENT_USER", "a"), (RegistryValue{platform::kRegDword, {1, 0, 0, 0}}));
+  EXPECT_TRUE(desktop.Boxes.empty());
+}
+
+TEST_F(RegEditTest, A_badly_formed_path_after_one_of_an_unknown_root_reaches_no_registry) {
+  regEdit.SetRegDword(settings, u"a", 1);
+  regEdit.CreateRegKey(u"HKEY_NOBODY\\a");
+  registry.Calls.clear();
+
+  regEdit.SetRegDword(u"HKEY_CURRENT_USER\\", u"b", 2);
+
+  EXPECT_EQ(desktop.Boxes.size(), 1u);
+  EXPECT_TRUE(registry.Calls.empty());
+}
+
 TEST_F(RegEditTest, A_text_is_written_in_the_code_page_without_a_closing_NUL) {
   regEdit.SetRegString(settings, u"Name", u"a\u05D0");
 

@@ -1,7 +1,6 @@
 #include "integration/NetworkNamespace.h"
 
 #include "platform/linux/net/LinuxIpHelper.h"
-#include "platform/linux/process/LinuxTokens.h"
 #include "platform/net/InterfaceRow.h"
 #include "runtime/Text.h"
 

@@ -1,12 +1,15 @@
 #include "platform/BackendFixture.h"
 
 #include "forms/headless/posix/PolledDesktop.h"
+#include "platform/linux/LinuxFixture.h"
 #include "platform/linux/LinuxMachine.h"
+#include "platform/linux/internet/CacheFilesFixture.h"
 #include "platform/simulated/SimulatedMachine.h"
 
 #include <arpa/inet.h>
 #include <fcntl.h>
 #include <sys/socket.h>
+#include <sys/wait.h>
 #include <unistd.h>
 
 #include <array>
@@ -40,6 +43,8 @@ class SimulatedBackend : public Backend {
     machine_.hostNames.Addresses = {"127.0.0.1", "10.0.0.7"};
     machine_.ipHelper.Adapters = {{"{1}", "Ethernet", {"10.0.0.7"}, {"10.0.0.138"}}};
     machine_.icmp.RouteTo("127.0.0.1").Target(0);
+    machine_.ipHelper.Interfaces = {Interface(1, kLoopbackInterface), Interface(2, kEthernetInterface)};
+    machine_.performanceData.SetProcessors({{u"0", 1000}, {u"_Total", 1000}}, 5);
     machine_.AddCaptureAdapter({"\\Device\\NPF_{1}", "Ethernet", "10.0.0.7"});
   }
 
@@ -49,6 +54,18 @@ class SimulatedBackend : public Backend {
   std::string OwnName() const override { return "quendra.exe"; }
   std::string OwnPath() const override { return "C:\\Program Files\\quendra.exe"; }
   std::uint32_t MissingId() const override { return 4321; }
+  std::uint32_t StartWaiting() override {
+    machine_.AddProcess({.id = ++lastStarted_, .parent = OwnId(), .name = "waiting.exe"});
+    return lastStarted_;
+  }
+  bool HasEnded(std::uint32_t processId) override {
+    Processes& processes = machine_.processes;
+    const Handle process = processes.OpenProcess(1040, false, processId);
+    if (process != kNoHandle) processes.CloseHandle(process);
+    return process == kNoHandle;
+  }
+  void KeepInCache(const std::string& url) override { machine_.urlCache.Add(url); }
+  std::optional<std::string> Layout() const override { return machine_.keyboardLayout.Name; }
   std::uint16_t Listen() override {
     machine_.AddConnection({.state = 2, .localAddress = "127.0.0.1", .localPort = 1025, .owner = OwnId()});
     return 1025;
@@ -83,6 +100,14 @@ class SimulatedBackend : public Backend {
   void Settle() override { desktop_.RunUntilIdle(); }
 
  private:
+  static InterfaceRow Interface(std::uint32_t index, InterfaceKind kind) {
+    InterfaceRow row;
+    row.Set(InterfaceRow::kIndex, index);
+    row.Set(InterfaceRow::kType, kind);
+    return row;
+  }
+
+  std::uint32_t lastStarted_ = 2000;
   forms::headless::HeadlessDesktop desktop_;
   simulated::SimulatedMachine machine_{desktop_};
   simulated::SimulatedServer& server_ = machine_.sockets.Listen("10.1.1.1", 80);
@@ -117,14 +142,21 @@ class RealFarEnd : public FarEnd {
   int socket_;
 };
 
+/// What the user of this machine keeps is left alone: registry and caches are in a folder of the test, and no
+/// display tells a layout.
 class LinuxBackend : public Backend {
  public:
-  LinuxBackend() : machine_(loop_, loop_) {}
+  LinuxBackend() {
+    environment_.Set("XDG_DATA_HOME", folder_ / "data");
+    environment_.Set("XDG_CACHE_HOME", folder_ / "cache");
+    for (const char* name : {"DISPLAY", "XDG_SESSION_TYPE"}) environment_.Set(name, {});
+    machine_.emplace(loop_, loop_);
+  }
   ~LinuxBackend() override {
     for (const int socket : sockets_) close(socket);
   }
 
-  Machine Operations() override { return machine_.Operations(); }
+  Machine Operations() override { return machine_->Operations(); }
   std::uint32_t OwnId() const override { return static_cast<std::uint32_t>(getpid()); }
   std::uint32_t OwnParent() const override { return static_cast<std::uint32_t>(getppid()); }
   std::string OwnName() const override { return std::filesystem::path(OwnPath()).filename(); }
@@ -135,6 +167,22 @@ class LinuxBackend : public Backend {
     std::ifstream("/proc/sys/kernel/pid_max") >> limit;
     return limit + 1;
   }
+  std::uint32_t StartWaiting() override {
+    started_.push_back(std::make_unique<linux_::Child>([] { return std::string(); }));
+    return static_cast<std::uint32_t>(started_.back()->Id());
+  }
+  bool HasEnded(std::uint32_t processId) override {
+    siginfo_t ending{};
+    return linux_::Wait([&] {
+      return waitid(P_PID, processId, &ending, WEXITED | WNOHANG | WNOWAIT) == 0 && ending.si_pid != 0;
+    });
+  }
+  void KeepInCache(const std::string& url) override {
+    std::string name = std::to_string(++cached_);
+    name.insert(0, 40 - name.size(), '0');
+    folder_.Write("cache/mozilla/firefox/profile/cache2/entries/" + name, linux_::FirefoxFile(":" + url));
+  }
+  std::optional<std::string> Layout() const override { return {}; }
   std::uint16_t Listen() override {
     const int socket = NewSocket();
     const sockaddr_in any = Loopback(0);
@@ -185,8 +233,12 @@ class LinuxBackend : public Backend {
     return ntohs(address.sin_port);
   }
 
+  linux_::TemporaryFolder folder_;
+  linux_::Environment environment_;
   forms::headless::PolledDesktop loop_;
-  linux_::LinuxMachine machine_;
+  std::optional<linux_::LinuxMachine> machine_;
+  std::vector<std::unique_ptr<linux_::Child>> started_;
+  int cached_ = 0;
   std::vector<int> sockets_;
 };
 

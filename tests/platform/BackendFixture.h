@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 
 namespace quendra::platform {
@@ -37,6 +38,15 @@ class Backend {
   virtual std::string OwnPath() const = 0;
   /// An id that no process has.
   virtual std::uint32_t MissingId() const = 0;
+
+  /// Starts a process that waits to be ended, and says whether one has ended.
+  virtual std::uint32_t StartWaiting() = 0;
+  virtual bool HasEnded(std::uint32_t processId) = 0;
+
+  /// A browser has kept what it loaded from there.
+  virtual void KeepInCache(const std::string& url) = 0;
+  /// The layout with which the user types now; nothing where the machine can't tell it.
+  virtual std::optional<std::string> Layout() const = 0;
 
   /// The asking process listens on 127.0.0.1; gives the port.
   virtual std::uint16_t Listen() = 0;

@@ -60,6 +60,11 @@ struct BehaviourTest : testing::TestWithParam<Kind> {
   }
 };
 
+/// For suites that derive from BehaviourTest.
+inline const auto kEveryBackend =
+    testing::Values(Kind{"Simulated", MakeSimulatedBackend}, Kind{"Linux", MakeLinuxBackend});
+inline std::string NameOfBackend(const testing::TestParamInfo<Kind>& tested) { return tested.param.name; }
+
 inline constexpr std::uint32_t kLoopbackInMemory = 0x0100007F;
 
 } // namespace quendra::platform

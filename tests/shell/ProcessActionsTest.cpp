@@ -199,18 +199,23 @@ TEST_F(ProcessActionsTest, The_next_pass_sorts_by_the_download_again) {
   EXPECT_EQ(list.Order(), forms::SortOrder::Descending);
 }
 
-TEST_F(ProcessActionsTest, The_memory_panel_comes_modally_after_the_main_window_leaves_the_topmost_band) {
+TEST_F(ProcessActionsTest, A_dialog_comes_modally_after_the_main_window_leaves_the_topmost_band) {
   OpenWith({});
-  desktop.Calls.clear();
-  bool stood = false;
-  desktop.OnModal = [&](forms::Form& form) {
-    stood = &form == &program.frmMemInfo && form.Visible();
-    desktop.Unload(form);
-  };
-  EXPECT_TRUE(desktop.Click(page.main_cmdMemInfo));
-  EXPECT_TRUE(stood);
-  ASSERT_EQ(desktop.Calls.size(), 2U) << desktop.Calls.back();
-  EXPECT_EQ(desktop.Calls[0], "SetWindowPos frmMenu -2 0 0 0 0 3");
+  const std::pair<forms::Label*, forms::Form*> offers[] = {{&page.main_cmdMemInfo, &program.frmMemInfo},
+                                                           {&page.main_cmdChecks, &program.frmPortsChecks}};
+  for (const auto& [button, dialog] : offers) {
+    desktop.Calls.clear();
+    bool stood = false;
+    desktop.OnModal = [&stood, offered = dialog, this](forms::Form& form) {
+      stood = &form == offered && form.Visible();
+      desktop.Unload(form);
+    };
+    EXPECT_TRUE(desktop.Click(*button));
+    EXPECT_TRUE(stood);
+    EXPECT_EQ(desktop.Calls,
+              (std::vector<std::string>{"SetWindowPos frmMenu -2 0 0 0 0 3",
+                                        "Show " + ToUtf8(dialog->Name()) + " modal owner frmMenu"}));
+  }
 }
 
 } // namespace

@@ -3,6 +3,8 @@
 #include "forms/MessageLoop.h"
 #include "forms/view/VisibleText.h"
 
+#include <algorithm>
+
 namespace quendra::forms {
 
 namespace {
@@ -17,13 +19,24 @@ BoxSign SignOf(int flags) {
   }
 }
 
-/// Each line decides by itself how it reads; a mark in front has lines of numbers read with the others.
+bool HasLatinLetter(TextView line) {
+  return std::any_of(line.begin(), line.end(), [](char16_t unit) {
+    return (unit >= u'a' && unit <= u'z') || (unit >= u'A' && unit <= u'Z');
+  });
+}
+
+/// Each line decides by itself how it reads; a mark in front has lines of numbers read with the others. A
+/// path or an address on a line of its own keeps its order.
 Text MarkedRightToLeft(TextView text) {
   constexpr char16_t kMark = u'\u200F';
-  Text marked(1, kMark);
-  for (const char16_t unit : text) {
-    marked += unit;
-    if (unit == u'\n') marked += kMark;
+  Text marked;
+  for (bool more = true; more;) {
+    const std::size_t end = std::min(text.find(u'\n'), text.size());
+    const TextView line = text.substr(0, end);
+    (marked += kMark) += HasLatinLetter(line) ? Isolated(line) : Text(line);
+    more = end < text.size();
+    if (more) marked += u'\n';
+    text.remove_prefix(std::min(end + 1, text.size()));
   }
   return marked;
 }

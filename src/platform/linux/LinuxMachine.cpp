@@ -3,11 +3,13 @@
 #include "platform/linux/capture/LinuxCapture.h"
 #include "platform/linux/icmp/LinuxIcmp.h"
 #include "platform/linux/internet/LinuxUrlCache.h"
+#include "platform/linux/keyboard/LinuxKeyboardLayout.h"
 #include "platform/linux/net/LinuxHostNames.h"
 #include "platform/linux/net/LinuxIpHelper.h"
 #include "platform/linux/net/LinuxSockets.h"
 #include "platform/linux/process/LinuxProcesses.h"
 #include "platform/linux/process/LinuxTokens.h"
+#include "platform/linux/process/TraceRight.h"
 #include "platform/linux/programs/LinuxIcons.h"
 #include "platform/linux/programs/LinuxVersionInfo.h"
 #include "platform/linux/registry/LinuxRegistry.h"
@@ -15,14 +17,14 @@
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
 #include "platform/unavailable/UnavailableHandles.h"
-#include "platform/unavailable/UnavailableKeyboardLayout.h"
 
 namespace quendra::platform::linux_ {
 
 struct LinuxMachine::Parts {
-  Parts(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot)
-      : folder(procRoot), capture(loop, descriptors), sockets(loop, descriptors, hostNames),
-        system(CoarseMilliseconds, procRoot) {}
+  Parts(EventLoop& loop, DescriptorWatch& descriptors, DamagedFileNotice tellOfDamagedRegistry)
+      : capture(loop, descriptors),
+        registry(UserFolders::OfEnvironment().dataHome + "/quendra", std::move(tellOfDamagedRegistry)),
+        sockets(loop, descriptors, hostNames) {}
 
   ProcFolder folder;
   HandleTable handleTable;
@@ -37,9 +39,9 @@ struct LinuxMachine::Parts {
   LinuxIcons icons{desktopIndex, iconTheme, paths};
   LinuxIpHelper ipHelper{folder, {MayTraceEveryProcess(), ::geteuid()}};
   LinuxPerformanceData performanceData{folder};
-  unavailable::UnavailableKeyboardLayout keyboardLayout;
+  LinuxKeyboardLayout keyboardLayout;
   LinuxProcesses processes{folder, handleTable, paths};
-  LinuxRegistry registry{UserFolders::OfEnvironment().dataHome + "/quendra"};
+  LinuxRegistry registry;
   LinuxShellStart shellStart{paths};
   LinuxSockets sockets;
   LinuxSystem system;
@@ -48,8 +50,9 @@ struct LinuxMachine::Parts {
   LinuxVersionInfo versionInfo{desktopIndex, paths};
 };
 
-LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot)
-    : parts_(std::make_unique<Parts>(loop, descriptors, procRoot)) {}
+LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors,
+                           DamagedFileNotice tellOfDamagedRegistry)
+    : parts_(std::make_unique<Parts>(loop, descriptors, std::move(tellOfDamagedRegistry))) {}
 
 LinuxMachine::~LinuxMachine() = default;
 

@@ -3,6 +3,7 @@
 #include "platform/DescriptorWatch.h"
 #include "platform/Machine.h"
 
+#include <functional>
 #include <memory>
 #include <string>
 
@@ -14,8 +15,11 @@ class LinuxCapture;
 /// libpcap.
 class LinuxMachine {
  public:
-  /// `procRoot` is where the processes are found; tests give a folder of their own making.
-  LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, const std::string& procRoot = "/proc");
+  /// Hears under which path a damaged file is kept.
+  using DamagedFileNotice = std::function<void(const std::string& keptAs)>;
+
+  /// `tellOfDamagedRegistry` is called in the midst of an operation of the registry.
+  LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors, DamagedFileNotice tellOfDamagedRegistry = {});
   ~LinuxMachine();
 
   Machine Operations();

@@ -23,6 +23,11 @@ TEST(BoxContentTest, Each_line_of_a_box_that_reads_from_right_to_left_is_marked)
   EXPECT_EQ(box.text, u"\u200F1: 10.0.0.5\n\u200F2: 10.0.0.138\n\u200F");
 }
 
+TEST(BoxContentTest, A_path_on_a_line_of_its_own_keeps_its_order_in_a_box_that_reads_from_right_to_left) {
+  EXPECT_EQ(BoxContentOf(u"כאן:\r\n/usr/a-1\r\nסוף of", kHebrewBox, u"").text,
+            u"\u200Fכאן:\n\u200F\u2066/usr/a-1\u2069\n\u200Fסוף of");
+}
+
 TEST(BoxContentTest, A_text_that_reads_from_left_to_right_stays_as_it_is) {
   const BoxContent box = BoxContentOf(u"a\nb", kExclamation | kRightAligned, u"");
 

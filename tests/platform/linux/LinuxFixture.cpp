@@ -41,6 +41,24 @@ std::string TemporaryFolder::Write(const std::string& name, const std::string& c
 
 namespace {
 
+void PutVariable(const std::string& name, const std::optional<std::string>& value) {
+  value ? ::setenv(name.c_str(), value->c_str(), 1) : ::unsetenv(name.c_str());
+}
+
+} // namespace
+
+Environment::~Environment() {
+  for (const auto& [name, value] : before_) PutVariable(name, value);
+}
+
+void Environment::Set(const std::string& name, const std::optional<std::string>& value) {
+  const char* now = ::getenv(name.c_str());
+  before_.emplace(name, now == nullptr ? std::nullopt : std::optional<std::string>(now));
+  PutVariable(name, value);
+}
+
+namespace {
+
 std::string StatLine(std::uint32_t processId, const FakeProc::Process& process) {
   const std::uint32_t flags = process.isKernelThread ? 0x208040 : 0x400000;
   return std::to_string(processId) + " (" + process.comm + ") " + process.state + " " +
@@ -164,6 +182,33 @@ void Child::End() {
   ::kill(id_, SIGKILL);
   ::waitpid(id_, nullptr, 0);
   id_ = -1;
+}
+
+std::vector<std::string> AtOnce(const std::vector<std::function<std::string()>>& works) {
+  int start[2];
+  if (::pipe2(start, O_CLOEXEC) != 0) throw std::runtime_error("no pipe");
+  std::vector<std::pair<pid_t, int>> running;
+  for (const auto& work : works) {
+    int ends[2];
+    const pid_t id = Fork(ends);
+    if (id == 0) {
+      char go = 0;
+      const std::string answer = ::read(start[0], &go, 1) == 1 ? work() : "not started";
+      ::_exit(::write(ends[1], answer.data(), answer.size()) < 0);
+    }
+    running.emplace_back(id, ends[0]);
+  }
+  const std::string go(works.size(), 'g');
+  [[maybe_unused]] const ssize_t told = ::write(start[1], go.data(), go.size());
+  std::vector<std::string> answers;
+  for (const auto& [id, end] : running) {
+    answers.push_back(ReadAll(end));
+    ::close(end);
+    ::waitpid(id, nullptr, 0);
+  }
+  ::close(start[0]);
+  ::close(start[1]);
+  return answers;
 }
 
 ProcessWithoutFirstThread::ProcessWithoutFirstThread() {

@@ -6,6 +6,8 @@
 
 #include <cstdint>
 #include <functional>
+#include <map>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -25,6 +27,20 @@ class TemporaryFolder {
 
  private:
   std::string path_;
+};
+
+/// Changes of this process's environment, undone with the object.
+class Environment {
+ public:
+  Environment() = default;
+  ~Environment();
+  Environment(const Environment&) = delete;
+
+  /// Without a value the variable is taken away.
+  void Set(const std::string& name, const std::optional<std::string>& value);
+
+ private:
+  std::map<std::string, std::optional<std::string>> before_;
 };
 
 /// A made-up /proc.
@@ -86,6 +102,9 @@ class Child {
   pid_t id_ = -1;
   std::string answer_;
 };
+
+/// Runs each of these in a process of its own, all at the same time; gives what they returned.
+std::vector<std::string> AtOnce(const std::vector<std::function<std::string()>>& works);
 
 /// A process of the test's own whose first thread has ended while another waits to be ended. It inherits what
 /// the test has open.

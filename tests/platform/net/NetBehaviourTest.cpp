@@ -1,4 +1,5 @@
 #include "platform/BehaviourFixture.h"
+#include "platform/net/InterfaceRow.h"
 
 namespace quendra::platform {
 
@@ -55,6 +56,61 @@ TEST_P(BehaviourTest, A_table_once_given_stays_as_it_was) {
 
   EXPECT_EQ(*first, before);
   EXPECT_NE(first, second);
+}
+
+// Interfaces.
+
+std::vector<std::uint8_t> InterfaceTableOf(IpHelper& ipHelper) {
+  std::uint32_t size = 0;
+  EXPECT_EQ(ipHelper.GetIfTable({}, size, true), IpHelper::kErrorInsufficientBuffer);
+  // Room for one that comes meanwhile.
+  size += InterfaceRow::kBytes;
+  std::vector<std::uint8_t> table(size);
+  EXPECT_EQ(ipHelper.GetIfTable(table, size, true), 0U);
+  table.resize(size);
+  return table;
+}
+
+TEST_P(BehaviourTest, The_interface_table_is_a_count_and_as_many_rows_by_ascending_index) {
+  const auto table = InterfaceTableOf(machine.ipHelper);
+
+  const std::uint32_t count = Little32(table, 0);
+  ASSERT_EQ(table.size(), InterfaceRow::kFirstOffset + count * InterfaceRow::kBytes);
+  ASSERT_GE(count, 1U);
+  std::uint32_t last = 0;
+  for (std::size_t at = InterfaceRow::kFirstOffset; at < table.size(); at += InterfaceRow::kBytes) {
+    const std::uint32_t index = Little32(table, at + InterfaceRow::kIndex);
+    EXPECT_GT(index, last);
+    last = index;
+    EXPECT_LE(Little32(table, at + InterfaceRow::kAddressLength), InterfaceRow::kAddressBytes);
+    EXPECT_LE(Little32(table, at + InterfaceRow::kDescriptionLength), InterfaceRow::kDescriptionBytes);
+  }
+}
+
+TEST_P(BehaviourTest, A_loopback_stands_in_the_interface_table) {
+  const auto table = InterfaceTableOf(machine.ipHelper);
+  bool found = false;
+  for (std::size_t at = InterfaceRow::kFirstOffset; at < table.size(); at += InterfaceRow::kBytes)
+    found = found || Little32(table, at + InterfaceRow::kType) == kLoopbackInterface;
+  EXPECT_TRUE(found);
+}
+
+TEST_P(BehaviourTest, A_buffer_with_too_little_room_for_the_interface_table_stays_as_it_was) {
+  const auto whole = static_cast<std::uint32_t>(InterfaceTableOf(machine.ipHelper).size());
+  for (const std::uint32_t room : {whole - 1, 4U, 3U}) {
+    std::vector<std::uint8_t> buffer(room, 0xA5);
+    std::uint32_t size = room;
+    EXPECT_EQ(machine.ipHelper.GetIfTable(buffer, size, true), IpHelper::kErrorInsufficientBuffer);
+    EXPECT_GE(size, whole);
+    EXPECT_EQ(buffer, std::vector<std::uint8_t>(room, 0xA5));
+  }
+}
+
+TEST_P(BehaviourTest, A_stated_size_is_believed_where_the_buffer_has_more) {
+  std::vector<std::uint8_t> buffer(1'000'000, 0xA5);
+  std::uint32_t size = 10;
+  EXPECT_EQ(machine.ipHelper.GetIfTable(buffer, size, true), IpHelper::kErrorInsufficientBuffer);
+  EXPECT_EQ(buffer[0], 0xA5);
 }
 
 // Addresses.

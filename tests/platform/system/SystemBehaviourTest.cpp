@@ -1,4 +1,5 @@
 #include "platform/BehaviourFixture.h"
+#include "platform/system/KeyboardLayout.h"
 
 namespace quendra::platform {
 
@@ -32,6 +33,32 @@ TEST_P(BehaviourTest, The_day_number_is_one_of_this_century) {
 TEST_P(BehaviourTest, The_second_of_the_day_lies_between_midnight_and_midnight) {
   EXPECT_GE(machine.system.SecondOfDay(), 0);
   EXPECT_LT(machine.system.SecondOfDay(), 86400);
+}
+
+// Memory.
+
+TEST_P(BehaviourTest, The_image_of_the_memory_has_its_length_and_no_more_available_than_there_is) {
+  MemoryStatus status;
+  status.Set(MemoryStatus::kLength, MemoryStatus::kBytes);
+
+  machine.system.GlobalMemoryStatus(status);
+
+  EXPECT_EQ(status.Get(MemoryStatus::kLength), 32U);
+  EXPECT_LE(status.Get(MemoryStatus::kMemoryLoad), 100U);
+  using Field = MemoryStatus::Field;
+  for (const auto& [total, available] : {std::pair(Field::kTotalPhys, Field::kAvailPhys),
+                                         std::pair(Field::kTotalPageFile, Field::kAvailPageFile),
+                                         std::pair(Field::kTotalVirtual, Field::kAvailVirtual)}) {
+    EXPECT_GT(status.Get(available), 0U) << available;
+    EXPECT_LE(status.Get(available), status.Get(total)) << available;
+    EXPECT_LE(status.Get(total), 0x7FFFFFFFU) << total;
+  }
+}
+
+// Keyboard.
+
+TEST_P(BehaviourTest, The_layout_is_told_as_the_user_has_it_or_not_at_all) {
+  EXPECT_EQ(machine.keyboardLayout.GetKeyboardLayoutNameA(), backend->Layout());
 }
 
 } // namespace quendra::platform

@@ -3,18 +3,13 @@
 #include "platform/linux/process/HandleTable.h"
 #include "platform/process/Tokens.h"
 
-#include <functional>
-
 namespace quendra::platform::linux_ {
 
-/// True for those who may look at every process: the administrator, and who may trace any process.
-bool MayTraceEveryProcess();
-
-/// The one privilege that the program asks for, held by those who may look at every process.
+/// The one privilege that the program asks for. On this system nobody has to switch on a right that he has,
+/// and what he may not do is refused when he tries it, so everybody gets the privilege.
 class LinuxTokens : public Tokens {
  public:
-  explicit LinuxTokens(HandleTable& handles, std::function<bool()> mayTrace = MayTraceEveryProcess)
-      : handles_(handles), mayTrace_(std::move(mayTrace)) {}
+  explicit LinuxTokens(HandleTable& handles) : handles_(handles) {}
 
   bool OpenProcessToken(Handle process, std::uint32_t access, Handle& token) override;
   bool LookupPrivilegeValueA(const std::string& system, const std::string& name,
@@ -26,7 +21,6 @@ class LinuxTokens : public Tokens {
   bool Answer(std::uint32_t error);
 
   HandleTable& handles_;
-  std::function<bool()> mayTrace_;
 };
 
 } // namespace quendra::platform::linux_

@@ -8,6 +8,7 @@
 #include <sqlite3.h>
 #include <sys/file.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 #include <cerrno>
 #include <cstdio>
@@ -16,7 +17,7 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-constexpr int kPatienceMilliseconds = 2000;
+constexpr int kMostWaits = 2000;
 constexpr int kMostDamagedFiles = 1000;
 
 bool IsDamage(int result) {
@@ -39,13 +40,20 @@ bool IsNoPipeNorDevice(const std::string& path) {
   return ::stat(path.c_str(), &file) != 0 || S_ISREG(file.st_mode);
 }
 
+/// Waits a millisecond for the other program, two seconds in all. The database's own waits grow to a tenth of
+/// a second, and would miss the moments at which one that writes on and on lets others in.
+int WaitForOther(void*, int waits) {
+  ::usleep(1000);
+  return waits < kMostWaits ? 1 : 0;
+}
+
 int OpenDatabase(const std::string& path, Database& database) {
   sqlite3* opened = nullptr;
   int result = ::sqlite3_open_v2(path.c_str(), &opened,
                                  SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE | SQLITE_OPEN_EXRESCODE, nullptr);
   database.reset(opened);
   if (result != SQLITE_OK) return result;
-  ::sqlite3_busy_timeout(opened, kPatienceMilliseconds);
+  ::sqlite3_busy_handler(opened, WaitForOther, nullptr);
   // What is damaged on purpose does no more than be found to be damaged.
   ::sqlite3_db_config(opened, SQLITE_DBCONFIG_DEFENSIVE, 1, nullptr);
   ::sqlite3_db_config(opened, SQLITE_DBCONFIG_TRUSTED_SCHEMA, 0, nullptr);
@@ -106,6 +114,13 @@ std::uint32_t RegistryFile::TryToOpen() {
 bool RegistryFile::PutAsideWhenDamaged(int result) { return IsDamage(result) && PutAside(); }
 
 bool RegistryFile::PutAside() {
+  std::string keptAs;
+  if (!MoveAside(keptAs)) return false;
+  if (!keptAs.empty() && tellOfDamage_) tellOfDamage_(keptAs);
+  return true;
+}
+
+bool RegistryFile::MoveAside(std::string& keptAs) {
   database_.reset();
   const Descriptor lock(
       ::open((Path() + ".lock").c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK, 0600));
@@ -114,12 +129,10 @@ bool RegistryFile::PutAside() {
   Database current;
   if (!IsDamage(OpenDatabase(Path(), current))) return true;
   current.reset();
-  std::string name;
-  if (!RenameToFree(Path(), name)) return false;
+  if (!RenameToFree(Path(), keptAs)) return false;
   // What belongs to the damaged file goes with it: the new one must not be taken for it.
   for (const char* companion : {"-journal", "-wal", "-shm"})
-    ::rename((Path() + companion).c_str(), (name + companion).c_str());
-  tell_("quendra: the registry's file was damaged. It is kept as " + name + "; a new one was begun.");
+    ::rename((Path() + companion).c_str(), (keptAs + companion).c_str());
   return true;
 }
 

@@ -22,9 +22,9 @@ using Database = std::unique_ptr<sqlite3, CloseDatabase>;
 /// One that is whole but not ours, as of a later edition, is left alone and not used.
 class RegistryFile {
  public:
-  /// `tell` hears of a damaged file.
-  RegistryFile(std::string folder, std::function<void(const std::string&)> tell)
-      : folder_(std::move(folder)), tell_(std::move(tell)) {}
+  /// `tellOfDamage` hears under which path a damaged file is kept.
+  RegistryFile(std::string folder, std::function<void(const std::string& keptAs)> tellOfDamage)
+      : folder_(std::move(folder)), tellOfDamage_(std::move(tellOfDamage)) {}
 
   /// 0 with an open database, or why there is none.
   std::uint32_t Open(sqlite3*& database);
@@ -35,12 +35,14 @@ class RegistryFile {
 
  private:
   std::uint32_t TryToOpen();
-  /// Under a lock that other programs heed, so that none puts aside the new file of another.
   bool PutAside();
+  /// Under a lock that other programs heed, so that none puts aside the new file of another. `keptAs` stays
+  /// empty when another program was faster.
+  bool MoveAside(std::string& keptAs);
   std::string Path() const { return folder_ + "/" + kName; }
 
   std::string folder_;
-  std::function<void(const std::string&)> tell_;
+  std::function<void(const std::string& keptAs)> tellOfDamage_;
   Database database_;
 };
 

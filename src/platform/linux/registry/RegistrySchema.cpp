@@ -82,8 +82,9 @@ int PrepareSchema(sqlite3* database) {
   std::int64_t form = 0;
   std::int64_t tables = 0;
   int result = LookThrough(database);
-  if (result == SQLITE_OK) result = OneNumber(database, "PRAGMA user_version", form);
+  // In this order: another program may make both between the two, and tables without a form are none of ours.
   if (result == SQLITE_OK) result = OneNumber(database, "SELECT count(*) FROM sqlite_schema", tables);
+  if (result == SQLITE_OK) result = OneNumber(database, "PRAGMA user_version", form);
   if (result != SQLITE_OK) return result;
   if (form == 0 && tables == 0) return MakeFresh(database);
   return form == kForm ? SQLITE_OK : SQLITE_MISMATCH;

@@ -8,8 +8,8 @@ namespace quendra::platform::linux_ {
 /// The keys of a registry in its file. What fails with damage is tried once more with the new file.
 class SqliteRegistryStore : public RegistryStore {
  public:
-  SqliteRegistryStore(std::string folder, std::function<void(const std::string&)> tell)
-      : file_(std::move(folder), std::move(tell)) {}
+  SqliteRegistryStore(std::string folder, std::function<void(const std::string& keptAs)> tellOfDamage)
+      : file_(std::move(folder), std::move(tellOfDamage)) {}
 
   std::uint32_t Find(KeyNumber parent, const std::string& name, KeyNumber& key) override;
   std::uint32_t Check(KeyNumber key) override;

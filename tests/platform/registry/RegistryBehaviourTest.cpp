@@ -1,25 +1,15 @@
-#include "platform/linux/LinuxFixture.h"
-#include "platform/linux/registry/LinuxRegistry.h"
-#include "platform/simulated/registry/SimulatedRegistry.h"
-
-#include <gtest/gtest.h>
+#include "platform/BehaviourFixture.h"
+#include "platform/registry/Registry.h"
 
 #include <array>
-
-// What every registry must answer alike.
 
 namespace quendra::platform {
 namespace {
 
 using Bytes = std::vector<std::uint8_t>;
 
-struct RealRegistry {
-  linux_::TemporaryFolder folder;
-  linux_::LinuxRegistry registry{folder / "quendra"};
-};
-
-struct RegistrySuite : testing::TestWithParam<bool> {
-  Registry& registry = GetParam() ? static_cast<Registry&>(real_.registry) : simulated_;
+struct RegistryBehaviourTest : BehaviourTest {
+  Registry& registry = machine.registry;
 
   RegistryKey Make(const std::string& path, RegistryKey parent = kCurrentUser) {
     RegistryKey key;
@@ -41,13 +31,9 @@ struct RegistrySuite : testing::TestWithParam<bool> {
     std::uint32_t type = 0;
     return Read(key, name, type);
   }
-
- private:
-  RealRegistry real_;
-  simulated::SimulatedRegistry simulated_;
 };
 
-TEST_P(RegistrySuite, A_key_is_made_with_all_above_it_and_opened_later) {
+TEST_P(RegistryBehaviourTest, A_key_is_made_with_all_above_it_and_opened_later) {
   const RegistryKey made = Make("One\\Two\\Three");
   RegistryKey opened;
 
@@ -57,14 +43,14 @@ TEST_P(RegistrySuite, A_key_is_made_with_all_above_it_and_opened_later) {
   EXPECT_EQ(registry.RegCloseKey(made), kInvalidRegistryKey);
 }
 
-TEST_P(RegistrySuite, A_key_that_isnt_there_is_not_found_and_leaves_the_handle) {
+TEST_P(RegistryBehaviourTest, A_key_that_isnt_there_is_not_found_and_leaves_the_handle) {
   RegistryKey key(77);
   EXPECT_EQ(Open("Missing", kKeyRead, key), kKeyNotFound);
   EXPECT_EQ(Open("Missing\\Below", kKeyRead, key), kKeyNotFound);
   EXPECT_EQ(key, RegistryKey(77));
 }
 
-TEST_P(RegistrySuite, Making_a_key_again_keeps_its_values_and_the_case_of_its_name) {
+TEST_P(RegistryBehaviourTest, Making_a_key_again_keeps_its_values_and_the_case_of_its_name) {
   const RegistryKey key = Make("Case");
   ASSERT_EQ(registry.RegSetValueExA(key, "v", kRegBinary, Bytes{1}), kRegistrySuccess);
 
@@ -76,7 +62,7 @@ TEST_P(RegistrySuite, Making_a_key_again_keeps_its_values_and_the_case_of_its_na
   EXPECT_EQ(name, "Case");
 }
 
-TEST_P(RegistrySuite, Hebrew_names_and_bytes_that_the_code_page_leaves_undefined_survive) {
+TEST_P(RegistryBehaviourTest, Hebrew_names_and_bytes_that_the_code_page_leaves_undefined_survive) {
   const RegistryKey key = Make("\xE6\xEC\xEE\xF8\\\x8D\xFF");
   ASSERT_EQ(registry.RegSetValueExA(key, "\xFF", kRegText, Bytes{0xFF, 0x8D}), kRegistrySuccess);
 
@@ -88,7 +74,7 @@ TEST_P(RegistrySuite, Hebrew_names_and_bytes_that_the_code_page_leaves_undefined
   EXPECT_EQ(name, "\x8D\xFF");
 }
 
-TEST_P(RegistrySuite, Values_keep_type_and_bytes_NULs_too) {
+TEST_P(RegistryBehaviourTest, Values_keep_type_and_bytes_NULs_too) {
   const RegistryKey key = Make("Values");
   for (const std::uint32_t type : {0U, 1U, 3U, 4U, 0xFFFFFFFFU})
     for (const Bytes& data : {Bytes{}, Bytes{0}, Bytes{0, 1, 0, 255}}) {
@@ -99,7 +85,7 @@ TEST_P(RegistrySuite, Values_keep_type_and_bytes_NULs_too) {
     }
 }
 
-TEST_P(RegistrySuite, A_value_tells_its_size_first_and_fills_no_buffer_with_less_room) {
+TEST_P(RegistryBehaviourTest, A_value_tells_its_size_first_and_fills_no_buffer_with_less_room) {
   const RegistryKey key = Make("Values");
   ASSERT_EQ(registry.RegSetValueExA(key, "v", kRegBinary, Bytes{1, 2, 3}), kRegistrySuccess);
   std::uint32_t type = 0;
@@ -115,7 +101,7 @@ TEST_P(RegistrySuite, A_value_tells_its_size_first_and_fills_no_buffer_with_less
   EXPECT_EQ(registry.RegQueryValueExA(key, "other", type, room, size), kKeyNotFound);
 }
 
-TEST_P(RegistrySuite, A_handle_does_what_it_was_opened_for) {
+TEST_P(RegistryBehaviourTest, A_handle_does_what_it_was_opened_for) {
   Make("Access");
   RegistryKey reading;
   RegistryKey writing;
@@ -133,7 +119,7 @@ TEST_P(RegistrySuite, A_handle_does_what_it_was_opened_for) {
   Make("Below", writing);
 }
 
-TEST_P(RegistrySuite, Paths_with_an_empty_name_are_refused) {
+TEST_P(RegistryBehaviourTest, Paths_with_an_empty_name_are_refused) {
   RegistryKey key(77);
   for (const char* path : {"\\", "\\One", "One\\", "One\\\\Two", "HKEY_CURRENT_USER\\"}) {
     EXPECT_EQ(registry.RegCreateKeyA(kCurrentUser, path, key), kBadKeyPath) << path;
@@ -142,7 +128,7 @@ TEST_P(RegistrySuite, Paths_with_an_empty_name_are_refused) {
   EXPECT_EQ(Open("One", kKeyRead, key), kKeyNotFound);
 }
 
-TEST_P(RegistrySuite, Names_of_255_bytes_and_512_deep_are_the_limit) {
+TEST_P(RegistryBehaviourTest, Names_of_255_bytes_and_512_deep_are_the_limit) {
   RegistryKey key;
   Make(std::string(255, 'x'));
   EXPECT_EQ(registry.RegCreateKeyA(kCurrentUser, std::string(256, 'x'), key), kRegistryInvalidParameter);
@@ -154,14 +140,14 @@ TEST_P(RegistrySuite, Names_of_255_bytes_and_512_deep_are_the_limit) {
             kRegistryInvalidParameter);
 }
 
-TEST_P(RegistrySuite, A_path_ends_at_its_NUL) {
+TEST_P(RegistryBehaviourTest, A_path_ends_at_its_NUL) {
   Make(std::string("Cut\0\\Off", 8));
   RegistryKey key;
   EXPECT_EQ(Open("Cut", kKeyRead, key), kRegistrySuccess);
   EXPECT_EQ(Open("Cut\\Off", kKeyRead, key), kKeyNotFound);
 }
 
-TEST_P(RegistrySuite, Roots_are_open_hold_values_and_stay_open) {
+TEST_P(RegistryBehaviourTest, Roots_are_open_hold_values_and_stay_open) {
   EXPECT_EQ(registry.RegSetValueExA(kCurrentUser, "v", kRegBinary, Bytes{5}), kRegistrySuccess);
   EXPECT_EQ(registry.RegCloseKey(kCurrentUser), kRegistrySuccess);
   EXPECT_EQ(Read(kCurrentUser, "v"), Bytes{5});
@@ -170,7 +156,7 @@ TEST_P(RegistrySuite, Roots_are_open_hold_values_and_stay_open) {
   EXPECT_EQ(registry.RegOpenKeyExA(kNoRegistryKey, "", kKeyRead, key), kInvalidRegistryKey);
 }
 
-TEST_P(RegistrySuite, No_hive_is_made_or_deleted) {
+TEST_P(RegistryBehaviourTest, No_hive_is_made_or_deleted) {
   RegistryKey key;
   EXPECT_EQ(registry.RegCreateKeyA(kLocalMachine, "Mine", key), kRegistryInvalidParameter);
   EXPECT_EQ(registry.RegCreateKeyA(kUsers, "Mine\\Below", key), kRegistryInvalidParameter);
@@ -179,7 +165,7 @@ TEST_P(RegistrySuite, No_hive_is_made_or_deleted) {
   EXPECT_EQ(registry.RegDeleteKeyA(kCurrentUser, ""), kRegistryAccessDenied);
 }
 
-TEST_P(RegistrySuite, A_key_with_keys_stays_and_a_deleted_one_takes_nothing_more) {
+TEST_P(RegistryBehaviourTest, A_key_with_keys_stays_and_a_deleted_one_takes_nothing_more) {
   const RegistryKey outer = Make("Outer");
   const RegistryKey inner = Make("Outer\\Inner");
   ASSERT_EQ(registry.RegSetValueExA(inner, "v", kRegBinary, Bytes{1}), kRegistrySuccess);
@@ -194,7 +180,7 @@ TEST_P(RegistrySuite, A_key_with_keys_stays_and_a_deleted_one_takes_nothing_more
   EXPECT_EQ(registry.RegQueryValueExA(Make("Outer\\Inner"), "v", number, {}, number), kKeyNotFound);
 }
 
-TEST_P(RegistrySuite, Keys_are_told_by_number_and_values_can_be_deleted) {
+TEST_P(RegistryBehaviourTest, Keys_are_told_by_number_and_values_can_be_deleted) {
   const RegistryKey key = Make("List");
   for (const char* name : {"b", "A", "c"}) Make(name, key);
   std::string names;
@@ -208,7 +194,7 @@ TEST_P(RegistrySuite, Keys_are_told_by_number_and_values_can_be_deleted) {
   EXPECT_EQ(registry.RegDeleteValueA(key, "v"), kKeyNotFound);
 }
 
-TEST_P(RegistrySuite, A_fresh_system_has_the_newer_internet_settings_alone) {
+TEST_P(RegistryBehaviourTest, A_fresh_system_has_the_newer_internet_settings_alone) {
   const std::string settings = "software\\microsoft\\windows\\CurrentVersion\\Internet Settings\\";
   RegistryKey key;
   EXPECT_EQ(Open(settings + "5.0\\Cache\\Content", kKeyWrite, key), kRegistrySuccess);
@@ -217,8 +203,7 @@ TEST_P(RegistrySuite, A_fresh_system_has_the_newer_internet_settings_alone) {
             kRegistrySuccess);
 }
 
-INSTANTIATE_TEST_SUITE_P(, RegistrySuite, testing::Bool(),
-                         [](const auto& kind) { return kind.param ? "Linux" : "Simulated"; });
+INSTANTIATE_TEST_SUITE_P(, RegistryBehaviourTest, kEveryBackend, NameOfBackend);
 
 } // namespace
 } // namespace quendra::platform

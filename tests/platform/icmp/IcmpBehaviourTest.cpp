@@ -1,26 +1,15 @@
-#include "platform/BackendFixture.h"
+#include "platform/BehaviourFixture.h"
 #include "platform/icmp/Icmp.h"
 #include "runtime/ByteFields.h"
 
-#include <gtest/gtest.h>
-
 #include <array>
-
-// What every machine must answer alike to echoes, real or simulated.
 
 namespace quendra::platform {
 namespace {
 
 constexpr Ipv4Address kSelf = Ipv4Address::FromHost(0x7F000001);
 
-struct Kind {
-  const char* name;
-  std::unique_ptr<Backend> (*make)();
-};
-
-struct IcmpBehaviourTest : testing::TestWithParam<Kind> {
-  std::unique_ptr<Backend> backend = GetParam().make();
-  Machine machine = backend->Operations();
+struct IcmpBehaviourTest : BehaviourTest {
   Icmp& icmp = machine.icmp;
   const IcmpHandle handle = icmp.IcmpCreateFile();
 
@@ -63,10 +52,7 @@ TEST_P(IcmpBehaviourTest, An_echo_handle_is_closed_once_and_sends_nothing_afterw
   EXPECT_FALSE(icmp.IcmpCloseHandle(kNoIcmp));
 }
 
-INSTANTIATE_TEST_SUITE_P(Machines, IcmpBehaviourTest,
-                         testing::Values(Kind{"simulated", MakeSimulatedBackend},
-                                         Kind{"linux", MakeLinuxBackend}),
-                         [](const testing::TestParamInfo<Kind>& tested) { return tested.param.name; });
+INSTANTIATE_TEST_SUITE_P(, IcmpBehaviourTest, kEveryBackend, NameOfBackend);
 
 } // namespace
 } // namespace quendra::platform
