@@ -82,6 +82,11 @@ def centre_of(control):
     return box.x + box.width // 2, box.y + box.height // 2
 
 
+def text_of(field):
+    """What stands in a field."""
+    return Atspi.Text.get_text(field.get_text_iface(), 0, -1)
+
+
 class Table:
     """A list, the process table most of all: captions and rows of texts, column by column as the table holds them."""
 
@@ -110,6 +115,11 @@ class Table:
         """The texts of a column's first rows, quick enough to be of one pass."""
         self.node.clear_cache()
         return [self.cell(row, column) for row in range(min(rows, self.table.get_n_rows()))]
+
+    def selected(self):
+        """The numbers of the selected rows."""
+        self.node.clear_cache()
+        return self.table.get_selected_rows()
 
     def rows(self):
         self.node.clear_cache()
