@@ -76,6 +76,19 @@ TEST_F(Keyboard, Tab_passes_over_what_a_panel_lies_over_in_both_directions) {
   EXPECT_EQ(QApplication::focusWidget()->objectName(), QStringLiteral("within"));
 }
 
+TEST_F(Keyboard, A_form_shows_the_ring_at_once_to_those_who_opened_it_by_the_keys) {
+  ShowActive();
+  for (const bool byKeys : {true, false}) {
+    TestForm dialog;
+    WidgetOf(form).setAttribute(Qt::WA_KeyboardFocusChange, byKeys);
+
+    desktop.Show(dialog, Modality::Modeless, &form);
+
+    EXPECT_EQ(WidgetOf(dialog).testAttribute(Qt::WA_KeyboardFocusChange), byKeys);
+    desktop.Unload(dialog);
+  }
+}
+
 TEST_F(Keyboard, Enter_and_Space_press_a_label) {
   Label label(form, u"label");
   int clicks = 0;

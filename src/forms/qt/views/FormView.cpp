@@ -191,7 +191,10 @@ void FormView::ShowOver(const QWidget* owner) {
   show();
   raise();
   activateWindow();
-  if (!std::exchange(hadFocus_, true)) FocusFirst();
+  if (std::exchange(hadFocus_, true)) return;
+  FocusFirst();
+  // Who opens a form by the keyboard sees the ring at its first stop, too.
+  setAttribute(Qt::WA_KeyboardFocusChange, owner && owner->testAttribute(Qt::WA_KeyboardFocusChange));
 }
 
 QWidget* FormView::WidgetOf(const Control* control) {
