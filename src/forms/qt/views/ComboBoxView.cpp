@@ -10,7 +10,9 @@ namespace quendra::forms::qt {
 
 namespace {
 constexpr int kArrow = 14;
-}
+/// What keeps a text from the ring, beside the toolkit's own room.
+constexpr int kAside = 3;
+} // namespace
 
 ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, QWidget* parent)
     : QComboBox(parent), WidgetView(context, combo, *this) {
@@ -74,8 +76,9 @@ void ComboBoxView::paintEvent(QPaintEvent* /*event*/) {
   QStylePainter painter(this);
   QStyleOptionComboBox option;
   initStyleOption(&option);
-  if (!field_) painter.drawControl(QStyle::CE_ComboBoxLabel, option);
   const QRect button = style()->subControlRect(QStyle::CC_ComboBox, &option, QStyle::SC_ComboBoxArrow, this);
+  option.rect.adjust(kAside, 0, -kAside, 0);
+  if (!field_) painter.drawControl(QStyle::CE_ComboBoxLabel, option);
   option.rect = QRect(0, 0, kArrow, kArrow);
   option.rect.moveCenter(button.center());
   painter.drawPrimitive(QStyle::PE_IndicatorArrowDown, option);
