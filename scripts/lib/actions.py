@@ -54,7 +54,8 @@ class ActionsStep:
         """Gives how the process ended, and what is wrong with that or with its row."""
         before = len(self.program.windows())
         self.press("main_lblEndProcess")
-        status = self.victim.process.wait(10)
+        wait_for(f"the end of {self.victim.name}", lambda: self.victim.process.poll() is not None, 10)
+        status = self.victim.process.returncode
         wrong = [] if status == -9 else [f"{self.victim.name} ended with {status}"]
         try:
             wait_for("the row to go", lambda: self.place() is None, 3)
