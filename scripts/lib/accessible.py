@@ -63,6 +63,14 @@ class Program:
                 return control
         return None
 
+    def focused(self):
+        """The control with the focus; None when none of the program's own has it."""
+        node = self.node()
+        for control in below(node) if node else ():
+            if control.get_description() and control.get_state_set().contains(Atspi.StateType.FOCUSED):
+                return control
+        return None
+
     def control(self, name, seconds=15):
         return wait_for(name, lambda: self.find(name), seconds)
 

@@ -6,6 +6,10 @@ import urllib.parse
 from accessible import NAME, wait_for
 
 TRIES = 8
+BUTTONS = (
+    *("main_lblEndProcess", "main_lblJumpToPath", "main_cmdChecks", "main_cmdMemInfo"),
+    *("main_cmdAddRemove", "main_cmdRpt"),
+)
 
 
 class ActionsStep:

@@ -23,6 +23,7 @@ import actions
 import cast
 import desktop
 import dialogs
+import keys
 import report
 import stage
 import surf
@@ -64,6 +65,13 @@ def send_report(walk, support):
     return wrong
 
 
+def go_round(walk, *wanted):
+    """By the Tab key; gives what is wrong with its stops."""
+    stops, wrong = keys.KeysStep(walk).take(wanted)
+    print("keys: " + ", ".join(stops))
+    return wrong
+
+
 def act_on_process(walk, scene):
     with report.silence(scene.spaces, walk.program.process):
         lines, wrong = actions.ActionsStep(walk, scene.desktop, scene.victim).take()
@@ -90,6 +98,7 @@ def check_surfing(walk, scene):
     rows, wrong = surf.SurfStep(walk).take(scene.servers_are_there)
     for details, caption, icon in rows:
         print(f"surf: {icon or '-':9} {caption} {details}".rstrip())
+    wrong += go_round(walk, surf.LIST, "frmSurf_cmdAdvanced", "surf_lblBack")
     if scene.route:
         said, lacks = trace.TraceStep(walk).take(scene.route)
         print(said)
@@ -124,6 +133,7 @@ def walk_through(walk, scene):
     wrong += act_on_process(walk, scene)
     wrong += check_ports(walk, scene.servers_are_there)
     wrong += read_memory(walk)
+    wrong += go_round(walk, "main_ListView1", *actions.BUTTONS, "main_cmbAdapters")
     wrong += check_surfing(walk, scene)
     walk.first_connection()
     walk.monitor()
