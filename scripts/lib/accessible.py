@@ -63,6 +63,14 @@ class Program:
                 return control
         return None
 
+    def focused(self):
+        """The control with the focus; None when none of the program's own has it."""
+        node = self.node()
+        for control in below(node) if node else ():
+            if control.get_description() and control.get_state_set().contains(Atspi.StateType.FOCUSED):
+                return control
+        return None
+
     def control(self, name, seconds=15):
         return wait_for(name, lambda: self.find(name), seconds)
 
@@ -80,6 +88,11 @@ class Program:
 def centre_of(control):
     box = control.get_extents(Atspi.CoordType.SCREEN)
     return box.x + box.width // 2, box.y + box.height // 2
+
+
+def text_of(field):
+    """What stands in a field."""
+    return Atspi.Text.get_text(field.get_text_iface(), 0, -1)
 
 
 class Table:
@@ -110,6 +123,11 @@ class Table:
         """The texts of a column's first rows, quick enough to be of one pass."""
         self.node.clear_cache()
         return [self.cell(row, column) for row in range(min(rows, self.table.get_n_rows()))]
+
+    def selected(self):
+        """The numbers of the selected rows."""
+        self.node.clear_cache()
+        return self.table.get_selected_rows()
 
     def rows(self):
         self.node.clear_cache()

@@ -1,5 +1,6 @@
 """The tour's clients and servers: who they are, how they are started, and which rates their rows must show."""
 
+import dataclasses
 import os
 import shutil
 import subprocess
@@ -67,3 +68,20 @@ def start_traffic(stack, spaces):
         if side == "here":
             ports[name] = int(said)
     return ports
+
+
+@dataclasses.dataclass
+class Victim:
+    """A process that is there to be ended."""
+
+    name: str
+    file: str
+    process: subprocess.Popen
+
+
+def start_victim(stack):
+    """It has no traffic and a name that no other tour gives."""
+    name = f"runaway-{os.getpid()}"
+    file = executable(stack.enter_context(stage.private_directory()), name, "")
+    command = [file, "-S", "-c", f"import time; time.sleep({SECONDS})"]
+    return Victim(name, file, stack.enter_context(stage.started(command)))

@@ -1,6 +1,6 @@
 #!/usr/bin/python3
 """Walks through the program on virtual screens of several sizes, each with a window manager and room for a panel at the
-lower edge. Leaves pictures of the splash, the home page, the three pages and the about box in
+lower edge. Leaves pictures of the splash, the home page, the three pages, the panel that traces and every dialog in
 build/screens/WIDTHxHEIGHT[@SCALE] and ends non-zero when a window, its frame included, lies outside the usable screen.
 
     screens.py [WIDTHxHEIGHT[@SCALE]...]        without a size: all of them"""
@@ -15,12 +15,18 @@ import time
 from gi.repository import GLib
 
 import cast
+import dialogs
 import stage
+import surf
 import tour
+import trace
 from accessible import Program
 from walk import Walk
 
-SIZES = ("800x600", "1024x768", "1366x768", "1920x1080@2", "3840x2160", "3840x2160@2")
+SIZES = (
+    *("800x600", "1024x768", "1280x800", "1366x768", "1920x1080", "1920x1080@1.5", "1920x1080@2"),
+    *("3840x2160", "3840x2160@2"),
+)
 PANEL = 40
 SECONDS = 110
 
@@ -60,7 +66,13 @@ def walk_through(walk):
     time.sleep(3)
     walk.picture("monitor")
     walk.about()
-    walk.surf()
+    # No server answers here: the dialog and the page show what went wrong.
+    dialogs.PortsStep(walk).take(False)
+    dialogs.MemoryStep(walk).take()
+    surf.SurfStep(walk).take(False)
+    if os.geteuid() == 0:  # who else may send echoes is up to the machine
+        trace.TraceStep(walk).take(trace.Route([], ["127.0.0.1"]))
+    walk.click("surf_lblBack")
     walk.first_connection()
     walk.close()
     return walk.wrong
@@ -68,13 +80,15 @@ def walk_through(walk):
 
 def show(size):
     """One size, in a process of its own: the accessibility bus is that of the first display that a process speaks to."""
-    width, height, scale = map(int, re.fullmatch(r"(\d+)x(\d+)(?:@(\d+))?", size).groups(default="1"))
+    parts = re.fullmatch(r"(\d+)x(\d+)(?:@([\d.]+))?", size).groups(default="1")
+    width, height, scale = int(parts[0]), int(parts[1]), float(parts[2])
     folder = f"{tour.SCREENS}/{size}"
     os.makedirs(folder, exist_ok=True)
     for old in os.listdir(folder):
         os.remove(f"{folder}/{old}")
     with contextlib.ExitStack() as stack:
         tour.set_scene(stack, width, height, PANEL)
+        surf.fill_cache()
         os.environ["QT_SCALE_FACTOR"] = str(scale)
         command = [tour.PROGRAM]
         if os.geteuid() == 0:

@@ -1,10 +1,12 @@
 #!/usr/bin/python3
 """Walks through the program on a virtual display as a user would, with real clicks and keys, while real clients and
-servers exchange data over a link of its own, and sends a report to a stand-in support server. Leaves screenshots in
-build/screens, prints the process table as a screen reader sees it and the report as the server got it, and ends non-zero
-when the program, the table, a rate or the report isn't as it should be.
+servers exchange data over a link of its own: sends a report to a stand-in support server, has a file shown and a process
+ended, opens every dialog, runs the checks of the page for surf problems and traces a route. Leaves screenshots in
+build/screens, prints what the table, the report, each row and each dialog say, and ends non-zero when something isn't as
+it should be.
 
-The link and the traffic need root. Without it the program runs on this machine as it is and the table has no rates."""
+The link, the traffic and the route need root. Without it the program runs on this machine as it is, the table has no
+rates and no route is traced."""
 
 import contextlib
 import dataclasses
@@ -17,10 +19,15 @@ import time
 
 from gi.repository import GLib
 
+import actions
 import cast
+import desktop
+import dialogs
+import keys
 import report
 import stage
 import surf
+import trace
 from accessible import Program
 from checks import missing_processes, missing_rates
 from read_table import as_text
@@ -58,41 +65,63 @@ def send_report(walk, support):
     return wrong
 
 
-def check_surfing(walk, servers_are_there):
-    """The page for surf problems; gives what is wrong with it."""
-    rows, wrong = surf.SurfStep(walk).take(servers_are_there)
-    for details, caption, icon in rows:
-        print(f"surf: {icon or '-':9} {caption} {details}".rstrip())
-    if os.geteuid() == 0:  # who else may send echoes is up to the machine
-        report_text, lacks = surf.TraceStep(walk).take("127.0.0.1")
-        print(report_text)
-        wrong += lacks
-    walk.click("surf_lblBack")
+def go_round(walk, *wanted):
+    """By the Tab key; gives what is wrong with its stops."""
+    stops, wrong = keys.KeysStep(walk).take(wanted)
+    print("keys: " + ", ".join(stops))
+    return wrong
+
+
+def act_on_process(walk, scene):
+    with report.silence(scene.spaces, walk.program.process):
+        lines, wrong = actions.ActionsStep(walk, scene.desktop, scene.victim).take()
+    print("\n".join(lines))
     return wrong
 
 
 def check_ports(walk, servers_are_there):
-    answers, wrong = surf.PortsStep(walk).take(servers_are_there)
+    answers, wrong = dialogs.PortsStep(walk).take(servers_are_there)
     for port, answer in answers.items():
         print(f"port {port}: {answer}")
     return wrong
 
 
-def tour(program, child, ports, servers):
-    walk = Walk(program, SCREENS)
+def read_memory(walk):
+    figures, wrong = dialogs.MemoryStep(walk).take()
+    for field, figure in figures.items():
+        print(f"{field}: {figure}")
+    return wrong
+
+
+def check_surfing(walk, scene):
+    """The page for surf problems; gives what is wrong with it."""
+    rows, wrong = surf.SurfStep(walk).take(scene.servers_are_there)
+    for details, caption, icon in rows:
+        print(f"surf: {icon or '-':9} {caption} {details}".rstrip())
+    wrong += go_round(walk, surf.LIST, "frmSurf_cmdAdvanced", "surf_lblBack")
+    if scene.route:
+        said, lacks = trace.TraceStep(walk).take(scene.route)
+        print(said)
+        wrong += lacks
+    walk.click("surf_lblBack")
+    return wrong
+
+
+def tour(scene, child):
+    walk = Walk(Program(child.pid), SCREENS)
     try:
-        return walk_through(walk, child, ports, servers)
+        return walk_through(walk, scene) + end_of(walk, child)
     except RuntimeError:
         walk.picture("where-it-failed")
         raise
 
 
-def walk_through(walk, child, ports, servers):
+def walk_through(walk, scene):
     program = walk.program
     walk.splash()
     walk.home()
     walk.monitor()
-    rows, wrong = watch_table(program, ports)
+    rows, wrong = watch_table(program, scene.ports)
     walk.picture("monitor")
     print(as_text(program.table().captions(), rows, limit=40))
     for label in ("main_lblUpload", "main_lblDownload"):
@@ -100,27 +129,36 @@ def walk_through(walk, child, ports, servers):
     walk.column()
     walk.about()
     print("\n".join(walk.addresses()))
-    wrong += send_report(walk, servers.support)
-    wrong += check_ports(walk, servers.all_there)
-    wrong += check_surfing(walk, servers.all_there)
+    wrong += send_report(walk, scene.support)
+    wrong += act_on_process(walk, scene)
+    wrong += check_ports(walk, scene.servers_are_there)
+    wrong += read_memory(walk)
+    wrong += go_round(walk, "main_ListView1", *actions.BUTTONS, "main_cmbAdapters")
+    wrong += check_surfing(walk, scene)
     walk.first_connection()
     walk.monitor()
     time.sleep(3)
     walk.picture("monitor-again")
+    return wrong
+
+
+def end_of(walk, child):
+    """Closes the program; gives what is wrong with its end."""
     walk.close()
     try:
         status = child.wait(10)
     except subprocess.TimeoutExpired:
         status = "none: it still runs"
-    if status != 0:
-        wrong.append(f"the program was closed and its status is {status}")
-    return wrong
+    return [] if status == 0 else [f"the program was closed and its status is {status}"]
 
 
 def set_scene(stack, *screen):
     """Display and buses; gives the environment that the program and this script share."""
     directory = stack.enter_context(stage.private_directory())
-    os.environ.update(XDG_RUNTIME_DIR=directory, XDG_DATA_HOME=f"{directory}/data")
+    # The program keeps data, and deletes what browsers keep: never this user's own.
+    os.environ.update(
+        XDG_RUNTIME_DIR=directory, XDG_DATA_HOME=f"{directory}/data", XDG_CACHE_HOME=f"{directory}/cache"
+    )
     os.environ["DISPLAY"] = stack.enter_context(stage.display(directory, *screen))
     os.environ["DBUS_SESSION_BUS_ADDRESS"] = stack.enter_context(stage.message_bus(directory))
     os.environ["QT_LINUX_ACCESSIBILITY_ALWAYS_ON"] = "1"
@@ -130,18 +168,40 @@ def set_scene(stack, *screen):
 
 
 @dataclasses.dataclass
-class Servers:
-    support: report.Support
-    all_there: bool
+class Scene:
+    """What the tour has around the program."""
+
+    desktop: desktop.Desktop
+    victim: cast.Victim
+    spaces: list = dataclasses.field(default_factory=list)
+    ports: dict = dataclasses.field(default_factory=dict)
+    route: trace.Route | None = None
+    support: report.Support | None = None
+    servers_are_there: bool = False
+
+    def command(self):
+        """The program's, on this side of the link where there is one."""
+        return stage.in_namespace(self.spaces[0], PROGRAM) if self.spaces else [PROGRAM]
 
 
-def start_servers(stack, spaces):
+def add_network(stack, scene):
+    """The link, the traffic on it and a route behind it, as far as this user may make them."""
+    if os.geteuid() != 0:
+        say("not root: no capture, no traffic of its own and no route, so no rates are looked for and nothing is traced")
+        return
+    scene.spaces = here, there = stack.enter_context(stage.linked_namespaces())
+    scene.ports = cast.start_traffic(stack, {"here": here, "there": there})
+    scene.route = stack.enter_context(trace.route(there))
+    say("traffic runs, local ports " + ", ".join(f"{name} {port}" for name, port in scene.ports.items()))
+
+
+def add_servers(stack, scene):
     """The stand-ins that the report and the checks speak to."""
-    support = report.start_server(stack, spaces, cast.SECONDS)
-    missing = surf.start_mail_servers(stack, spaces, cast.SECONDS)
+    scene.support = report.start_server(stack, scene.spaces, cast.SECONDS)
+    missing = surf.start_mail_servers(stack, scene.spaces, cast.SECONDS)
     for reason in missing:
         say(f"a mail server is missing: {reason}")
-    return Servers(support, bool(support.folder) and not missing)
+    scene.servers_are_there = bool(scene.support.folder) and not missing
 
 
 def perform():
@@ -150,17 +210,11 @@ def perform():
         os.remove(old)
     with contextlib.ExitStack() as stack:
         set_scene(stack)
-        command, ports, spaces = [PROGRAM], {}, []
-        if os.geteuid() == 0:
-            spaces = here, there = stack.enter_context(stage.linked_namespaces())
-            ports = cast.start_traffic(stack, {"here": here, "there": there})
-            command = stage.in_namespace(here, PROGRAM)
-            say("traffic runs, local ports " + ", ".join(f"{name} {port}" for name, port in ports.items()))
-        else:
-            say("not root: no capture, no traffic of its own, so no rates are looked for")
-        servers = start_servers(stack, spaces)
-        child = stack.enter_context(stage.started(command))
-        return tour(Program(child.pid), child, ports, servers)
+        scene = Scene(desktop.Desktop(stack, cast.SECONDS), cast.start_victim(stack))
+        surf.fill_cache()
+        add_network(stack, scene)
+        add_servers(stack, scene)
+        return tour(scene, stack.enter_context(stage.started(scene.command())))
 
 
 def too_late(*_):

@@ -92,15 +92,6 @@ class Walk:
         wait_for("the address panel to close", lambda: len(self.program.windows()) == before)
         return said
 
-    def surf(self):
-        """The page with its checks under way, or through with them."""
-        self.click("lblCaption(1)")
-        self.program.control("surf_ListView1")
-        time.sleep(0.4)
-        self.picture("surf")
-        self.program.control("surf_lblBack", 30)
-        self.click("surf_lblBack")
-
     def first_connection(self):
         self.click("lblCaption(2)")
         self.program.control("frsCon_lblBack")

@@ -12,7 +12,7 @@ SurfWing::SurfWing(const platform::Machine& machine, forms::Desktop& desktop,
           diagnostics::SharingCheck(machine.processes),
       },
       surfChecks(modSocketPlus, desktop, page, localChecks),
-      routeTracing(page.advanced, {machine.sockets, machine.hostNames, machine.icmp}, desktop,
+      routeTracing(page.advanced, {machine.sockets, machine.hostNames, machine.icmp}, desktop, desktop,
                    machine.keyboardLayout),
       downloadOffer(page, desktop) {}
 

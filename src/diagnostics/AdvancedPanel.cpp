@@ -41,6 +41,7 @@ void AdvancedPanel::Design(const forms::Geometry& place) {
   frmSurf_txtPingResult.VerticalScrollBar = true;
   frmSurf_txtPingResult.Monospaced = true;
   frmSurf_txtPingResult.TextFont = looks::kBody;
+  frmSurf_txtPingResult.Description = u"תוצאות המעקב";
   frmSurf_txtPingResult.Move(Px(14), Px(52), place.width - Px(28), place.height - Px(60));
 }
 

@@ -2,6 +2,7 @@
 
 #include "diagnostics/AdvancedPanel.h"
 #include "diagnostics/mdlTracert.h"
+#include "forms/FormHost.h"
 #include "foundation/InputNormaliser.h"
 
 namespace quendra::diagnostics {
@@ -10,8 +11,8 @@ namespace quendra::diagnostics {
 /// with the Hebrew layout.
 class RouteTracing {
  public:
-  RouteTracing(AdvancedPanel& panel, const mdlTracert::Network& network, forms::MessageLoop& loop,
-               platform::KeyboardLayout& layout);
+  RouteTracing(AdvancedPanel& panel, const mdlTracert::Network& network, forms::FormHost& forms,
+               forms::MessageLoop& loop, platform::KeyboardLayout& layout);
 
  private:
   void frmSurf_txtping_KeyPress(int& keyCode);

@@ -62,6 +62,7 @@ void SurfPage::DesignList() {
   surf_ListView1.ClearColumns();
   surf_ListView1.SmallIcons = &surf_ImageList1;
   surf_ListView1.TextFont = looks::kSmall;
+  surf_ListView1.Description = u"תוצאות הבדיקות";
   surf_ListView1.AddColumn({});
   surf_ListView1.AddColumn({u"פרטים", kDetailsWidth});
   surf_ListView1.AddColumn({u"בדיקה", kCheckWidth});

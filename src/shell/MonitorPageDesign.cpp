@@ -60,6 +60,7 @@ void MonitorPage::DesignTable() {
   table.main_ListView1.SmallIcons = &table.main_ImList;
   table.main_ListView1.HeaderIcons = &table.main_headersIL;
   table.main_ListView1.TextFont = looks::kSmall;
+  table.main_ListView1.Description = u"תהליכים פעילים";
   table.main_ListView1.Move(Px(kInset), Px(kTableTop), Px(kPageWidth - 2 * kInset), Px(kTableHeight));
   table.main_ImList.Clear();
   table.main_ImList.Add(forms::Picture::Artwork("default_process"));

@@ -1,6 +1,8 @@
 #include "diagnostics/SurfPage.h"
 
 #include "diagnostics/SurfFixture.h"
+#include "forms/view/Accessible.h"
+#include "forms/view/FocusOrder.h"
 
 namespace quendra::diagnostics {
 namespace {
@@ -64,6 +66,45 @@ TEST_F(SurfPageTest, The_panel_is_hidden_until_its_button_is_pressed) {
   desktop.Click(page.frmSurf_cmdAdvanced);
 
   EXPECT_TRUE(page.advanced.frmSurf_frameAdvanced.Visible());
+}
+
+TEST_F(SurfPageTest, An_open_panel_leaves_the_keyboard_nothing_of_what_it_lies_over) {
+  OpenPage();
+  ASSERT_TRUE(desktop.Click(page.frmSurf_cmdAdvanced));
+
+  std::vector<Text> reached;
+  const forms::Control* control = &menu.Label1;
+  while (control != &page.surf_lblBack) {
+    control = forms::NextFocus(menu, control, forms::TabDirection::Forwards);
+    reached.push_back(control->Name());
+  }
+
+  EXPECT_EQ(reached, (std::vector<Text>{u"frmSurf_txtping", u"frmSurf_cmdStart", u"frmSurf_txtPingResult",
+                                        u"surf_lblBack"}));
+}
+
+TEST_F(SurfPageTest, Results_without_a_caption_have_a_name_for_assistive_technology) {
+  OpenPage();
+
+  EXPECT_EQ(forms::AccessibleOf(page.surf_ListView1).name, u"תוצאות הבדיקות");
+  EXPECT_EQ(forms::AccessibleOf(page.advanced.frmSurf_txtPingResult).name, u"תוצאות המעקב");
+  EXPECT_EQ(forms::AccessibleOf(page.advanced.frmSurf_txtping).name, u"כתובת מעקב:");
+}
+
+TEST_F(SurfPageTest, A_trace_shows_that_it_runs_before_the_thread_is_held) {
+  OpenPage();
+  desktop.Click(page.frmSurf_cmdAdvanced);
+  page.advanced.frmSurf_txtping.Value = u"127.0.0.1";
+  desktop.Calls.clear();
+  desktop.OnYield = [&] {
+    desktop.OnYield = nullptr;
+    EXPECT_EQ(desktop.Calls, std::vector<std::string>{"Repaint frmSurf_frameAdvanced"});
+    desktop.Calls.clear();
+  };
+
+  desktop.Click(page.advanced.frmSurf_cmdStart);
+
+  EXPECT_EQ(desktop.CountOf("Repaint frmSurf_frameAdvanced"), 0);
 }
 
 /// The panel, open.

@@ -1,5 +1,6 @@
 #include "shell/MonitorPage.h"
 
+#include "forms/view/Accessible.h"
 #include "shell/ProgramFixture.h"
 
 namespace quendra::shell {
@@ -96,6 +97,11 @@ TEST_F(MonitorPageSwitchTest, The_start_seeds_the_last_refresh_with_the_day_numb
   ClickEntry(0);
   EXPECT_EQ(program.processTable.LastRefreshTick, machine.system.Day);
   EXPECT_EQ(machine.processes.SnapshotsTaken, 1);
+}
+
+TEST_F(MonitorPageSwitchTest, The_table_has_a_name_for_assistive_technology) {
+  ComeHome();
+  EXPECT_EQ(forms::AccessibleOf(program.monitorPage.table.main_ListView1).name, u"תהליכים פעילים");
 }
 
 TEST_F(MonitorPageSwitchTest, The_start_clears_the_pinned_sort) {

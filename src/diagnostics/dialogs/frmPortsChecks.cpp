@@ -27,7 +27,7 @@ void frmPortsChecks::Design() {
   Border = forms::BorderStyle::FixedDialog;
   MinimizeBox = false;
   BackColour = looks::kPaper;
-  Move(0, 0, Px(560), Px(196));
+  Move(0, 0, Px(670), Px(196));
   struct Line {
     forms::Label& port;
     const char16_t* caption;
@@ -40,14 +40,14 @@ void frmPortsChecks::Design() {
     looks::PlainText(line.port, line.caption, looks::kBody);
     line.port.Move(Px(18), top, Px(190), Px(24));
     looks::PlainText(line.result, u"", looks::kStrong);
-    line.result.Move(Px(214), top, Px(330), Px(24));
+    line.result.Move(Px(214), top, Px(440), Px(24)); // the longest error
     line.result.Tag = Text();
     top += Px(38);
   }
   looks::Button(Command1, u"בדוק...");
   Command1.Move(Px(18), Px(146), Px(120), Px(32));
   looks::Button(Command2, u"סגור");
-  Command2.Move(Px(422), Px(146), Px(120), Px(32));
+  Command2.Move(Px(532), Px(146), Px(120), Px(32));
 }
 
 void frmPortsChecks::Form_Load() {

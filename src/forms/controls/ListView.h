@@ -132,6 +132,9 @@ class ListView : public Control {
   /// A number from 1: the header that was clicked.
   Event<int> ColumnClick;
 
+  /// What assistive technology says of the list.
+  Text Description;
+
   ImageList* SmallIcons = nullptr;
   ImageList* HeaderIcons = nullptr;
 

@@ -58,7 +58,7 @@ class Describer : public ControlVisitor {
     Description.name = VisibleText(caption.empty() ? label.Description : caption, LineBreaks::Keep);
   }
   void Visit(Line& /*line*/) override { Description.role = Role::Separator; }
-  void Visit(ListView& /*list*/) override {}
+  void Visit(ListView& list) override { Description.name = VisibleText(list.Description); }
   void Visit(PictureBox& /*box*/) override { Description.role = Role::Graphic; }
   void Visit(TextBox& box) override { Description.name = NameOfField(box, box); }
   void Visit(Timer& /*timer*/) override {}

@@ -60,7 +60,7 @@ void AddButtons(BoxContent& box, int flags) {
 BoxContent BoxContentOf(TextView text, int flags, TextView title) {
   BoxContent box;
   box.rightToLeft = (flags & kRightToLeft) != 0;
-  box.title = VisibleText(title);
+  box.title = VisibleText(title.empty() ? u"Quendra" : title);
   box.text = VisibleText(text, LineBreaks::Keep, kMostBoxText);
   if (box.rightToLeft) box.text = MarkedRightToLeft(box.text);
   box.sign = SignOf(flags);

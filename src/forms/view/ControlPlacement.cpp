@@ -20,8 +20,12 @@ Area PlaceOf(const Geometry& control, int container, const Scale& scale, Directi
 }
 
 Extent ExtentOf(const Geometry& control, const Scale& scale) {
-  return {std::max(0, scale.PixelsX(control.left + control.width) - scale.PixelsX(control.left)),
-          std::max(0, scale.PixelsY(control.top + control.height) - scale.PixelsY(control.top))};
+  // Rules stay in sight in a form that is shown smaller.
+  const auto atLeast = [](int twips) { return twips > 0 ? 1 : 0; };
+  return {std::max(atLeast(control.width),
+                   scale.PixelsX(control.left + control.width) - scale.PixelsX(control.left)),
+          std::max(atLeast(control.height),
+                   scale.PixelsY(control.top + control.height) - scale.PixelsY(control.top))};
 }
 
 Spot TwipsAt(double left, double top, int width, const Scale& scale, Direction direction) {

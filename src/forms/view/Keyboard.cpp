@@ -1,5 +1,7 @@
 #include "forms/view/Keyboard.h"
 
+#include "forms/view/FocusOrder.h"
+
 #include <algorithm>
 
 namespace quendra::forms {
@@ -16,11 +18,7 @@ std::vector<Control*> TabOrder(const Form& form) {
   return controls;
 }
 
-Control* FirstFocus(const Form& form) {
-  for (Control* control : TabOrder(form))
-    if (control->TakesFocus() && control->IsUsable()) return control;
-  return nullptr;
-}
+Control* FirstFocus(const Form& form) { return NextFocus(form, nullptr, TabDirection::Forwards); }
 
 bool HearsOf(const Form& form, const KeyPress& key, bool aControlHasFocus) {
   return key.code != 0 && (form.KeyPreview || !aControlHasFocus);

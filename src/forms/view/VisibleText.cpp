@@ -14,6 +14,14 @@ constexpr char16_t kEndOfIsolate = u'\u2069';
 bool IsHighSurrogate(char16_t unit) { return unit >= 0xD800 && unit <= 0xDBFF; }
 bool IsLowSurrogate(char16_t unit) { return unit >= 0xDC00 && unit <= 0xDFFF; }
 
+bool IsHebrew(char16_t unit) { return unit >= 0x0590 && unit <= 0x05FF; }
+
+/// Of an alphabet, as far as reading goes: signs and digits take the direction of their surroundings.
+bool IsLetter(char16_t unit) {
+  const bool isSign = unit == u'\u00D7' || unit == u'\u00F7' || (unit >= 0x2000 && unit <= 0x2BFF);
+  return (unit >= u'A' && unit <= u'Z') || (unit >= u'a' && unit <= u'z') || (unit >= 0xC0 && !isSign);
+}
+
 bool ChangesDirectionOrHides(char16_t unit) {
   return unit == u'\u00AD' || unit == u'\u061C' || unit == u'\uFEFF' ||
          (unit >= u'\u200B' && unit <= u'\u200F') || (unit >= u'\u2028' && unit <= u'\u202E') ||
@@ -50,8 +58,8 @@ Text VisibleText(TextView text, LineBreaks lineBreaks, std::size_t limit) {
 }
 
 Direction DirectionOf(TextView text) {
-  const auto isHebrew = [](char16_t unit) { return unit >= 0x0590 && unit <= 0x05FF; };
-  return std::any_of(text.begin(), text.end(), isHebrew) ? Direction::RightToLeft : Direction::LeftToRight;
+  const auto first = std::find_if(text.begin(), text.end(), IsLetter);
+  return first != text.end() && IsHebrew(*first) ? Direction::RightToLeft : Direction::LeftToRight;
 }
 
 Text Isolated(TextView text) {

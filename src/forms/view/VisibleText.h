@@ -12,8 +12,8 @@ enum class LineBreaks { Keep, Show };
 /// made visible too.
 Text VisibleText(TextView text, LineBreaks lineBreaks = LineBreaks::Show, std::size_t limit = 1024);
 
-/// Right to left for a text that holds Hebrew, left to right for any other: addresses, paths and names keep
-/// their order.
+/// Right to left for a text whose first letter is Hebrew, left to right for any other: addresses, paths and
+/// names keep their order, also with Hebrew in them.
 Direction DirectionOf(TextView text);
 
 /// The text set apart from its surroundings when it reads from left to right, for views that lay out by

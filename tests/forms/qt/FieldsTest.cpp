@@ -4,6 +4,7 @@
 #include "forms/qt/views/ListViewView.h"
 #include "forms/qt/views/TextAreaView.h"
 #include "forms/qt/views/TextLineView.h"
+#include "forms/view/Palette.h"
 
 #include <QAccessible>
 #include <QClipboard>
@@ -125,6 +126,33 @@ TEST_F(Fields, A_field_is_named_by_the_label_before_it) {
   EXPECT_EQ(Line().accessibleName(), QStringLiteral("כתובת מעקב:"));
   EXPECT_EQ(Line().accessibleDescription(), QStringLiteral("line"));
   EXPECT_EQ(QAccessible::queryAccessibleInterface(&Line())->role(), QAccessible::EditableText);
+}
+
+TEST_F(Fields, The_scroll_bar_of_a_report_stands_inside_its_edge) {
+  ShowActive();
+
+  const QRect bar(Lines().verticalScrollBar()->mapTo(&Lines(), QPoint()),
+                  Lines().verticalScrollBar()->size());
+
+  EXPECT_TRUE(Lines().rect().adjusted(2, 2, -2, -2).contains(bar));
+}
+
+TEST_F(Fields, A_combo_box_has_the_ring_of_all_fields_for_those_who_use_the_keys) {
+  for (const bool freeText : {true, false}) {
+    combo.FreeText = freeText;
+    ShowActive();
+    QWidget& box = WidgetOf(combo);
+    const auto edge = [&] { return box.grab().toImage().pixelColor(box.width() / 2, 1); };
+    Line().setFocus();
+    const QColor without = edge();
+
+    box.setFocus();
+    box.window()->setAttribute(Qt::WA_KeyboardFocusChange);
+
+    EXPECT_EQ(edge(), ToQColor(Palette::Focus)) << freeText;
+    EXPECT_NE(edge(), without);
+    desktop.Unload(form);
+  }
 }
 
 TEST_F(Fields, A_chosen_item_stands_in_the_field_without_marks) {

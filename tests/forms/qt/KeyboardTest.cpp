@@ -61,6 +61,34 @@ TEST_F(Keyboard, Tab_reaches_every_clickable_label_and_no_other) {
             QStringList({QStringLiteral("second"), QStringLiteral("third"), QStringLiteral("first")}));
 }
 
+TEST_F(Keyboard, Tab_passes_over_what_a_panel_lies_over_in_both_directions) {
+  Label under(form, u"under");
+  Label beside(form, u"beside");
+  Frame panel(form, u"panel");
+  TextBox within(panel, u"within");
+  MakeButtons({&under, &beside});
+  beside.Move(3000, 0, 300, 300);
+  panel.Move(0, 0, 1500, 1500);
+
+  EXPECT_EQ(ReachedByTab(within),
+            QStringList({QStringLiteral("beside"), QStringLiteral("within"), QStringLiteral("beside")}));
+  PressKey(*QApplication::focusWidget(), Qt::Key_Backtab);
+  EXPECT_EQ(QApplication::focusWidget()->objectName(), QStringLiteral("within"));
+}
+
+TEST_F(Keyboard, A_form_shows_the_ring_at_once_to_those_who_opened_it_by_the_keys) {
+  ShowActive();
+  for (const bool byKeys : {true, false}) {
+    TestForm dialog;
+    WidgetOf(form).setAttribute(Qt::WA_KeyboardFocusChange, byKeys);
+
+    desktop.Show(dialog, Modality::Modeless, &form);
+
+    EXPECT_EQ(WidgetOf(dialog).testAttribute(Qt::WA_KeyboardFocusChange), byKeys);
+    desktop.Unload(dialog);
+  }
+}
+
 TEST_F(Keyboard, Enter_and_Space_press_a_label) {
   Label label(form, u"label");
   int clicks = 0;

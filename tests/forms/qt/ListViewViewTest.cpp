@@ -1,6 +1,7 @@
 #include "forms/qt/QtFixture.h"
 
 #include "forms/qt/drawing/Conversion.h"
+#include "forms/view/ListLook.h"
 
 #include <QHeaderView>
 #include <QPaintEvent>
@@ -244,10 +245,18 @@ TEST_F(TableView, A_text_of_4_KB_is_cut_and_its_tip_is_plain_text) {
   View().grab();
 }
 
-TEST_F(TableView, Texts_with_Hebrew_read_from_right_to_left_and_others_keep_their_own_order) {
-  EXPECT_EQ(ToQt(DirectionOf(u"C:\\Program Files (x86)")), Qt::LeftToRight);
-  EXPECT_EQ(ToQt(DirectionOf(u".80.1025.")), Qt::LeftToRight);
-  EXPECT_EQ(ToQt(DirectionOf(u"file שלום.exe")), Qt::RightToLeft);
+TEST_F(TableView, A_selected_row_has_its_plain_ground_in_a_list_with_the_focus_too) {
+  desktop.Show(form);
+  AddRow(u"1");
+  View().setFocus();
+  View().window()->setAttribute(Qt::WA_KeyboardFocusChange);
+  QCoreApplication::processEvents();
+
+  const QImage image = View().viewport()->grab().toImage();
+
+  const QRect row = View().visualRect(View().model()->index(0, 0));
+  for (int y = row.top() + 4; y <= row.bottom(); ++y)
+    EXPECT_EQ(image.pixelColor(row.right() - 4, y), ToQColor(RowGround(0, true))) << y;
 }
 
 TEST_F(TableView, A_leading_cell_stands_at_the_right_edge_of_a_mirrored_form) {

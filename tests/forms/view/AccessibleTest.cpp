@@ -66,6 +66,13 @@ TEST_F(AccessibleTest, A_field_is_named_by_its_description_else_the_label_before
   EXPECT_EQ(AccessibleOf(second).name, u"מסגרת");
 }
 
+TEST_F(AccessibleTest, A_list_is_named_by_its_description) {
+  ListView list(form, u"list");
+  list.Description = u"תהליכים\u202E";
+
+  EXPECT_EQ(AccessibleOf(list).name, u"תהליכים\uFFFD");
+}
+
 TEST_F(AccessibleTest, A_command_button_is_a_button) {
   CommandButton button(form, u"button");
   button.Caption = Text(u"התחל");

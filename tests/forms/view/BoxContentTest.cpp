@@ -42,6 +42,10 @@ TEST(BoxContentTest, What_would_do_harm_is_made_visible_and_line_breaks_stay) {
   EXPECT_EQ(box.title, u"x\u240Ay");
 }
 
+TEST(BoxContentTest, A_box_has_the_name_of_the_program_for_a_title_where_none_is_given) {
+  EXPECT_EQ(BoxContentOf(u"text", 0, u"").title, u"Quendra");
+}
+
 TEST(BoxContentTest, No_more_is_shown_than_4096_units_and_an_ellipsis) {
   EXPECT_EQ(BoxContentOf(Text(4096, u'x'), 0, u"").text, Text(4096, u'x'));
   EXPECT_EQ(BoxContentOf(Text(4097, u'x'), 0, u"").text, Text(4096, u'x') + u'\u2026');

@@ -35,6 +35,13 @@ TEST(ControlPlace, Of_a_control_without_extent_has_none) {
   EXPECT_EQ(PlaceOf({0, 0, -30, -30}, kContainer, kScreen, kLatin).extent, Extent());
 }
 
+TEST(ControlPlace, Of_a_rule_of_one_pixel_has_one_however_small_its_form_is_shown) {
+  for (int place = 0; place < 300; ++place) {
+    EXPECT_EQ(PlaceOf({0, place, 1500, 15}, kContainer, kScreen.Zoomed(0.5), kHebrew).extent.height, 1);
+    EXPECT_EQ(PlaceOf({place, 0, 15, 1500}, kContainer, kScreen.Zoomed(0.5), kHebrew).extent.width, 1);
+  }
+}
+
 TEST(ControlPlace, Gives_its_mirrored_spots_back_in_twips_from_the_leading_edge) {
   EXPECT_EQ(TwipsAt(90, 4, 100, kScreen, kHebrew), (Spot{150, 60}));
   EXPECT_EQ(TwipsAt(90, 4, 100, kScreen, kLatin), (Spot{1350, 60}));

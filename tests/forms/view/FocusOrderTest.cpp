@@ -55,5 +55,60 @@ TEST_F(FocusOrderTest, What_is_not_there_to_take_it_is_passed_over) {
   EXPECT_EQ(After(&form.first), nullptr);
 }
 
+/// Two buttons, and a panel with one of its own in front of the first.
+struct ButtonUnderPanel : Form {
+  ButtonUnderPanel() : Form(u"frmPanel") {
+    Visible = true;
+    for (Label* button : {&under, &beside, &within}) button->Click = [] {};
+    under.Move(100, 100, 100, 50);
+    beside.Move(300, 100, 100, 50);
+    panel.Move(100, 100, 100, 50);
+  }
+  void Design() override {}
+
+  Label under{*this, u"under"};
+  Label beside{*this, u"beside"};
+  Frame panel{*this, u"panel"};
+  Label within{panel, u"within"};
+};
+
+TEST(FocusUnderPanelTest, What_a_panel_lies_over_is_passed_over) {
+  ButtonUnderPanel form;
+
+  EXPECT_EQ(FirstFocus(form), &form.beside);
+  EXPECT_EQ(NextFocus(form, &form.within, TabDirection::Forwards), &form.beside);
+  EXPECT_EQ(NextFocus(form, &form.beside, TabDirection::Backwards), &form.within);
+}
+
+TEST(FocusUnderPanelTest, It_is_reached_where_the_panel_is_hidden_behind_it_or_too_small) {
+  ButtonUnderPanel form;
+
+  form.panel.Visible = false;
+  EXPECT_EQ(FirstFocus(form), &form.under);
+  form.panel.Visible = true;
+  form.under.BringToFront();
+  EXPECT_EQ(NextFocus(form, &form.within, TabDirection::Forwards), &form.under);
+  form.panel.BringToFront();
+  for (const Geometry tooSmall : {Geometry{101, 100, 99, 50}, Geometry{100, 101, 100, 49},
+                                  Geometry{100, 100, 99, 50}, Geometry{100, 100, 100, 49}}) {
+    form.panel.Position = tooSmall;
+    EXPECT_EQ(NextFocus(form, &form.beside, TabDirection::Forwards), &form.under);
+  }
+}
+
+TEST(FocusUnderPanelTest, What_lies_in_a_container_under_a_panel_is_passed_over) {
+  ButtonUnderPanel form;
+  Frame page(form, u"page");
+  Label onPage(page, u"onPage");
+  Frame cover(form, u"cover");
+  onPage.Click = [] {};
+  page.Move(500, 500, 100, 100);
+  cover.Move(400, 400, 300, 300);
+
+  EXPECT_EQ(NextFocus(form, &form.within, TabDirection::Forwards), &form.beside);
+  cover.Visible = false;
+  EXPECT_EQ(NextFocus(form, &form.within, TabDirection::Forwards), &onPage);
+}
+
 } // namespace
 } // namespace quendra::forms

@@ -50,9 +50,14 @@ TEST(VisibleText, A_cut_through_a_pair_leaves_no_half_of_it) {
   EXPECT_EQ(VisibleText(u"1\U0001F600", LineBreaks::Show, 2), u"1\uFFFD\u2026");
 }
 
-TEST(TextDirection, Is_right_to_left_with_a_single_Hebrew_letter) {
-  EXPECT_EQ(DirectionOf(u"file שלום.exe"), Direction::RightToLeft);
-  EXPECT_EQ(DirectionOf(u"C:\\ת"), Direction::RightToLeft);
+TEST(TextDirection, Is_right_to_left_where_the_first_letter_is_Hebrew) {
+  for (const TextView text : {u"שלום", u"תקשורת עם שרת Web", u"1: כתובת", u"(ת) x", u"\u2026 ת"})
+    EXPECT_EQ(DirectionOf(text), Direction::RightToLeft);
+}
+
+TEST(TextDirection, Is_left_to_right_where_another_letter_comes_first) {
+  for (const TextView text : {u"DNS תקשורת עם שרת", u"file שלום.exe", u"C:\\ת", u"é ת", u"Ω ת"})
+    EXPECT_EQ(DirectionOf(text), Direction::LeftToRight);
 }
 
 TEST(TextDirection, Of_addresses_paths_and_numbers_is_their_own) {

@@ -1,9 +1,18 @@
 #include "forms/qt/views/ComboBoxView.h"
 
+#include "forms/qt/drawing/FieldPainting.h"
+
 #include <QSignalBlocker>
+#include <QStylePainter>
 #include <QWheelEvent>
 
 namespace quendra::forms::qt {
+
+namespace {
+constexpr int kArrow = 14;
+/// What keeps a text from the ring, beside the toolkit's own room.
+constexpr int kAside = 3;
+} // namespace
 
 ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, QWidget* parent)
     : QComboBox(parent), WidgetView(context, combo, *this) {
@@ -24,6 +33,7 @@ void ComboBoxView::TakeFreeText() {
   setLineEdit(field_);
   setInsertPolicy(QComboBox::NoInsert);
   setCompleter(nullptr);
+  BareField(*field_);
 }
 
 void ComboBoxView::ControlGone() {
@@ -57,6 +67,21 @@ void ComboBoxView::FillItems() {
     setItemData(i, text.toHtmlEscaped(), Qt::ToolTipRole);
     setItemData(i, text, Qt::AccessibleTextRole);
   }
+}
+
+// The face of all fields, on which the toolkit puts what tells a list: its arrow and the text of the selected
+// item.
+void ComboBoxView::paintEvent(QPaintEvent* /*event*/) {
+  PaintField(*this, StateOfField(*this, false));
+  QStylePainter painter(this);
+  QStyleOptionComboBox option;
+  initStyleOption(&option);
+  const QRect button = style()->subControlRect(QStyle::CC_ComboBox, &option, QStyle::SC_ComboBoxArrow, this);
+  option.rect.adjust(kAside, 0, -kAside, 0);
+  if (!field_) painter.drawControl(QStyle::CE_ComboBoxLabel, option);
+  option.rect = QRect(0, 0, kArrow, kArrow);
+  option.rect.moveCenter(button.center());
+  painter.drawPrimitive(QStyle::PE_IndicatorArrowDown, option);
 }
 
 // Turning the wheel over a closed list would switch what it stands for by accident.

@@ -17,6 +17,7 @@ class ComboBoxView : public QComboBox, public WidgetView {
  protected:
   void Apply(Aspect aspect) override;
   bool event(QEvent* event) override;
+  void paintEvent(QPaintEvent* event) override;
   void wheelEvent(QWheelEvent* event) override;
 
  private:

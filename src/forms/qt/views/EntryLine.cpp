@@ -61,13 +61,16 @@ void EntryLine::inputMethodEvent(QInputMethodEvent* event) {
   QLineEdit::inputMethodEvent(event);
 }
 
+// Where the line is a part of another field, that one draws the ring.
 void EntryLine::focusInEvent(QFocusEvent* event) {
   QLineEdit::focusInEvent(event);
+  parentWidget()->update();
   keys_.FocusCame(*event);
 }
 
 void EntryLine::focusOutEvent(QFocusEvent* event) {
   QLineEdit::focusOutEvent(event);
+  parentWidget()->update();
   keys_.FocusWent(*event);
 }
 

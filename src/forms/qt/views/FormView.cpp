@@ -2,7 +2,7 @@
 
 #include "forms/qt/views/FrameView.h"
 #include "forms/qt/views/ViewFactory.h"
-#include "forms/view/Keyboard.h"
+#include "forms/view/FocusOrder.h"
 
 #include <QCloseEvent>
 #include <QEventLoop>
@@ -49,7 +49,6 @@ FormView::FormView(ViewContext& context, Form& form, WindowHandle handle)
   setWidget(page_);
   page_->setAutoFillBackground(false);
   AddViews(form, *page_);
-  OrderTabs();
   connect(screen(), &QScreen::availableGeometryChanged, this, [this] {
     if (!TheForm()) return;
     Place();
@@ -67,16 +66,6 @@ void FormView::AddViews(const Container& container, QWidget& parent) {
     if (!made.widget) ownedViews_.emplace_back(made.view);
     child->Attach(made.view);
     if (const auto* inner = dynamic_cast<const Container*>(child)) AddViews(*inner, *made.widget);
-  }
-}
-
-void FormView::OrderTabs() const {
-  QWidget* before = nullptr;
-  for (const Control* control : TabOrder(*TheForm())) {
-    auto* view = dynamic_cast<WidgetView*>(control->View());
-    if (!view) continue;
-    if (before) setTabOrder(before, &view->Widget());
-    before = &view->Widget();
   }
 }
 
@@ -202,14 +191,37 @@ void FormView::ShowOver(const QWidget* owner) {
   show();
   raise();
   activateWindow();
-  if (!std::exchange(hadFocus_, true)) FocusFirst();
+  if (std::exchange(hadFocus_, true)) return;
+  FocusFirst();
+  // Who opens a form by the keyboard sees the ring at its first stop, too.
+  setAttribute(Qt::WA_KeyboardFocusChange, owner && owner->testAttribute(Qt::WA_KeyboardFocusChange));
 }
 
-// The toolkit's order is a ring, which says nothing of where it is entered.
+QWidget* FormView::WidgetOf(const Control* control) {
+  auto* view = control ? dynamic_cast<WidgetView*>(control->View()) : nullptr;
+  return view ? &view->Widget() : nullptr;
+}
+
 void FormView::FocusFirst() {
-  const Control* first = TheForm() ? FirstFocus(*TheForm()) : nullptr;
-  if (auto* view = first ? dynamic_cast<WidgetView*>(first->View()) : nullptr)
-    view->Widget().setFocus(Qt::ActiveWindowFocusReason);
+  if (QWidget* first = TheForm() ? WidgetOf(FirstFocus(*TheForm())) : nullptr)
+    first->setFocus(Qt::ActiveWindowFocusReason);
+}
+
+const Control* FormView::ControlWithFocus() const {
+  for (QWidget* widget = focusWidget(); widget && widget != this; widget = widget->parentWidget())
+    if (const auto* view = dynamic_cast<WidgetView*>(widget)) return view->TheControl();
+  return nullptr;
+}
+
+// Not by the toolkit's own ring of widgets, which also holds those that a panel lies over.
+bool FormView::focusNextPrevChild(bool next) {
+  if (!TheForm()) return QScrollArea::focusNextPrevChild(next);
+  const TabDirection direction = next ? TabDirection::Forwards : TabDirection::Backwards;
+  QWidget* const widget = WidgetOf(NextFocus(*TheForm(), ControlWithFocus(), direction));
+  if (!widget) return false;
+  widget->setFocus(next ? Qt::TabFocusReason : Qt::BacktabFocusReason);
+  ensureWidgetVisible(widget);
+  return true;
 }
 
 void FormView::RunModal(QWidget* owner) {

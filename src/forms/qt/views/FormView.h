@@ -57,11 +57,13 @@ class FormView : private FormContext, public QScrollArea, public WidgetView {
   void changeEvent(QEvent* event) override;
   void moveEvent(QMoveEvent* event) override;
   void closeEvent(QCloseEvent* event) override;
+  bool focusNextPrevChild(bool next) override;
 
  private:
   void AddViews(const Container& container, QWidget& parent);
-  void OrderTabs() const;
+  static QWidget* WidgetOf(const Control* control);
   void FocusFirst();
+  const Control* ControlWithFocus() const;
   void Zoom(double factor);
   void CutOut();
   QMargins Frame() const;

@@ -18,7 +18,6 @@ ListViewView::ListViewView(ViewContext& context, ListView& list, QWidget* parent
   setRootIsDecorated(false);
   setItemsExpandable(false);
   setUniformRowHeights(true);
-  setAllColumnsShowFocus(true);
   setAlternatingRowColors(true);
   setTabKeyNavigation(false);
   setEditTriggers(QAbstractItemView::NoEditTriggers);

@@ -14,15 +14,21 @@
 
 namespace quendra::forms::qt {
 
+namespace {
+constexpr int kEdge = 3;
+}
+
 TextAreaView::TextAreaView(ViewContext& context, TextBox& box, QWidget* parent)
     : QPlainTextEdit(parent), WidgetView(context, box, *this),
       keys_(context.dispatcher, box, box,
             {true, [this](const QString& text) { insertPlainText(text); },
              [this] { textCursor().deletePreviousChar(); }}) {
-  setFrameShape(QFrame::NoFrame);
+  // Never drawn: the room of the field's edge and ring, inside of which the scroll bar stands.
+  setFrameStyle(QFrame::Box | QFrame::Plain);
+  setLineWidth(kEdge);
   setTabChangesFocus(true);
   setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-  setViewportMargins(2, 2, 2, 2);
+  setViewportMargins(2, 0, 2, 0);
   BareField(*viewport());
   viewport()->setAutoFillBackground(false);
   QTextOption reading = document()->defaultTextOption();
@@ -84,7 +90,10 @@ void TextAreaView::TellSelection() {
 
 bool TextAreaView::event(QEvent* event) {
   if (event->type() == QEvent::Show && TheControl()) TellName();
-  if (event->type() == QEvent::Paint) PaintField(*this, StateOfField(*this, isReadOnly()));
+  if (event->type() == QEvent::Paint) {
+    PaintField(*this, StateOfField(*this, isReadOnly()));
+    return true;
+  }
   return QPlainTextEdit::event(event);
 }
 
