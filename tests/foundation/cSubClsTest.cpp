@@ -231,15 +231,17 @@ TEST_F(Subclassing, Objects_detached_in_the_order_of_their_attachment_leave_noth
 TEST_F(Subclassing, An_attached_object_stays_with_its_window_owner_and_mode) {
   Trace others;
   Owner other(others);
+  const auto before = windows.Procedure(window);
   subclass.AddMsg(5, kFalse16);
   subclass.SubClass(window, owner, kFalse16);
-  const auto attached = windows.Procedure(window);
 
   subclass.SubClass(windows.Create(), other, kTrue16);
   Send(5);
   Send(6);
+  subclass.UnSubclass();
 
-  EXPECT_EQ(windows.Procedure(window), attached);
+  EXPECT_EQ(subclass.Window(), window);
+  EXPECT_EQ(windows.Procedure(window), before);
   EXPECT_EQ(trace, (Trace{"procedure 5", "after 5 got 77", "procedure 6"}));
   EXPECT_EQ(others, Trace{});
 }

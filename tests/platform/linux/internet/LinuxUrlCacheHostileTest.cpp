@@ -98,6 +98,34 @@ TEST_F(LinuxUrlCacheTest, A_folder_that_a_link_replaces_during_the_walk_leads_no
   EXPECT_EQ(names.size(), 50U);
 }
 
+TEST_F(LinuxUrlCacheTest, Files_that_become_pipes_folders_or_links_during_the_walk_are_passed_over) {
+  TemporaryFolder outside;
+  const std::string precious = outside.Write("precious", ChromiumFile("http://outside/"));
+  for (int i = 1; i <= 30; ++i) folder.Write(ChromiumName(i), ChromiumFile("http://inside/"));
+  UrlCacheEntry entry;
+  std::uint32_t size = 1000;
+  ASSERT_TRUE(cache.LocalAlloc(entry, size));
+  const UrlCacheWalk walk = cache.FindFirstUrlCacheEntryA(nullptr, &entry, size);
+  ASSERT_NE(walk, kNoUrlCacheWalk);
+  for (int i = 1; i <= 30; ++i) {
+    const std::string path = folder / ChromiumName(i);
+    files::remove(path);
+    switch (i % 3) {
+    case 0: ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0); break;
+    case 1: files::create_directory(path); break;
+    default: files::create_symlink(precious, path);
+    }
+  }
+
+  // The first entry, and one that was read ahead.
+  int told = 1;
+  while (cache.FindNextUrlCacheEntryA(walk, &entry, size)) {
+    EXPECT_EQ(entry.sourceUrlName, "http://inside/");
+    ++told;
+  }
+  EXPECT_EQ(told, 2);
+}
+
 TEST_F(LinuxUrlCacheTest, A_folder_that_takes_an_entrys_place_stays_with_all_in_it) {
   const std::string entry = folder.Write(ChromiumName(1), ChromiumFile("http://a/"));
   List();
