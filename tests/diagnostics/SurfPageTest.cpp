@@ -22,6 +22,13 @@ TEST_F(SurfPageTest, The_list_has_a_first_column_of_no_width_and_three_in_their_
   EXPECT_EQ(columns[3].width, 829);
 }
 
+TEST_F(SurfPageTest, The_sleeping_timer_has_an_interval_of_100_milliseconds) {
+  OpenPage();
+
+  EXPECT_EQ(page.surf_Timer1.Interval(), 100);
+  EXPECT_FALSE(page.surf_Timer1.Enabled());
+}
+
 TEST_F(SurfPageTest, The_images_are_the_tick_and_the_cross_in_this_order) {
   OpenPage();
 
