@@ -59,6 +59,22 @@ TEST_F(InternetCacheTest, A_name_ends_at_its_NUL_and_comes_from_the_code_page) {
   EXPECT_EQ(list.at(1), u"http://\u05D0/");
 }
 
+TEST_F(InternetCacheTest, An_entry_whose_record_points_to_no_name_is_listed_with_an_empty_one) {
+  struct NamelessCache : platform::simulated::SimulatedUrlCache {
+    platform::UrlCacheWalk FindFirstUrlCacheEntryA(const char* pattern, platform::UrlCacheEntry* entry,
+                                                   std::uint32_t& size) override {
+      const auto walk = SimulatedUrlCache::FindFirstUrlCacheEntryA(pattern, entry, size);
+      if (entry) PutLittle32(entry->block, platform::UrlCacheEntry::kSourceUrlNameAt, 0);
+      return walk;
+    }
+  } nameless;
+  nameless.Add("http://a/");
+
+  mdlInternetCache(nameless).GetCacheURLList(list);
+
+  EXPECT_EQ(list, (std::vector<Text>{u"", u""}));
+}
+
 TEST_F(InternetCacheTest, A_name_of_4_KB_is_listed_whole) {
   cache.Add("http://a/" + std::string(4096, 'x'));
 
