@@ -144,6 +144,20 @@ TEST_F(AdvancedPanelTest, The_box_of_the_target_selects_its_text_when_it_gets_th
   EXPECT_EQ(panel.frmSurf_txtping.SelLength(), 8);
 }
 
+TEST_F(AdvancedPanelTest, The_report_can_be_read_and_not_changed) {
+  OpenPanel();
+
+  EXPECT_TRUE(panel.frmSurf_txtPingResult.ReadOnly());
+}
+
+TEST_F(AdvancedPanelTest, A_second_design_offers_the_hosts_once) {
+  OpenPanel();
+
+  page.Design();
+
+  EXPECT_EQ(panel.frmSurf_txtping.ListCount(), 3);
+}
+
 TEST_F(AdvancedPanelTest, The_caret_of_the_report_follows_its_end) {
   OpenPanel();
 
