@@ -148,6 +148,29 @@ TEST_F(Cache, Of_more_than_32767_entries_is_a_fault_before_anything_is_deleted) 
   EXPECT_TRUE(machine.urlCache.Deleted.empty());
 }
 
+TEST_F(Cache, Of_32767_entries_is_gone_through_to_the_last) {
+  machine.urlCache.Entries.assign(32766, {"Cookie:user@a/"});
+  machine.urlCache.Add("http://last/");
+
+  Run();
+
+  EXPECT_EQ(Detail(1), u"32767/32767");
+  EXPECT_EQ(machine.urlCache.Deleted, (std::vector<std::string>{"", "http://last/"}));
+}
+
+TEST_F(Cache, Of_more_than_32767_entries_ends_the_program_with_the_run_times_box) {
+  AllServersAnswer();
+  machine.urlCache.Entries.assign(32768, {"http://a/"});
+
+  OpenPage();
+
+  ASSERT_EQ(desktop.Boxes.size(), 1U);
+  EXPECT_EQ(desktop.Boxes[0].text, u"Run-time error '6':\n\nOverflow");
+  EXPECT_EQ(desktop.EndStatus, 1);
+  EXPECT_EQ(CaptionOf(RowCount()), u"מחיקת קבצי אינטרנט זמניים");
+  EXPECT_TRUE(machine.urlCache.Deleted.empty());
+}
+
 TEST_F(Cache, Of_a_hundred_entries_of_one_name_is_emptied) {
   machine.urlCache.Entries.assign(100, {"http://a/"});
 
@@ -167,6 +190,10 @@ TEST_F(Cache, Is_limited_in_both_keys_the_newer_first) {
     EXPECT_EQ(Limit(key)->type, platform::kRegDword);
     EXPECT_EQ(Limit(key)->data, (std::vector<std::uint8_t>{0x00, 0x2C, 0x01, 0x00})); // 76800
   }
+  EXPECT_EQ(machine.registry.Calls,
+            (std::vector<std::string>{"RegOpenKeyExA " + kContent, "RegSetValueExA CacheLimit", "RegCloseKey",
+                                      "RegOpenKeyExA " + kOlderContent, "RegSetValueExA CacheLimit",
+                                      "RegCloseKey"}));
 }
 
 TEST_F(Cache, Without_its_keys_is_limited_nowhere_and_passes_all_the_same) {

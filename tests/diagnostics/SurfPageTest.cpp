@@ -24,6 +24,13 @@ TEST_F(SurfPageTest, The_list_has_a_first_column_of_no_width_and_three_in_their_
   EXPECT_EQ(columns[3].width, 829);
 }
 
+TEST_F(SurfPageTest, The_sleeping_timer_has_an_interval_of_100_milliseconds) {
+  OpenPage();
+
+  EXPECT_EQ(page.surf_Timer1.Interval(), 100);
+  EXPECT_FALSE(page.surf_Timer1.Enabled());
+}
+
 TEST_F(SurfPageTest, The_images_are_the_tick_and_the_cross_in_this_order) {
   OpenPage();
 
@@ -176,6 +183,20 @@ TEST_F(AdvancedPanelTest, The_box_of_the_target_selects_its_text_when_it_gets_th
 
   EXPECT_EQ(panel.frmSurf_txtping.SelStart(), 0);
   EXPECT_EQ(panel.frmSurf_txtping.SelLength(), 8);
+}
+
+TEST_F(AdvancedPanelTest, The_report_can_be_read_and_not_changed) {
+  OpenPanel();
+
+  EXPECT_TRUE(panel.frmSurf_txtPingResult.ReadOnly());
+}
+
+TEST_F(AdvancedPanelTest, A_second_design_offers_the_hosts_once) {
+  OpenPanel();
+
+  page.Design();
+
+  EXPECT_EQ(panel.frmSurf_txtping.ListCount(), 3);
 }
 
 TEST_F(AdvancedPanelTest, The_caret_of_the_report_follows_its_end) {

@@ -59,6 +59,22 @@ TEST_F(InternetCacheTest, A_name_ends_at_its_NUL_and_comes_from_the_code_page) {
   EXPECT_EQ(list.at(1), u"http://\u05D0/");
 }
 
+TEST_F(InternetCacheTest, An_entry_whose_record_points_to_no_name_is_listed_with_an_empty_one) {
+  struct NamelessCache : platform::simulated::SimulatedUrlCache {
+    platform::UrlCacheWalk FindFirstUrlCacheEntryA(const char* pattern, platform::UrlCacheEntry* entry,
+                                                   std::uint32_t& size) override {
+      const auto walk = SimulatedUrlCache::FindFirstUrlCacheEntryA(pattern, entry, size);
+      if (entry) PutLittle32(entry->block, platform::UrlCacheEntry::kSourceUrlNameAt, 0);
+      return walk;
+    }
+  } nameless;
+  nameless.Add("http://a/");
+
+  mdlInternetCache(nameless).GetCacheURLList(list);
+
+  EXPECT_EQ(list, (std::vector<Text>{u"", u""}));
+}
+
 TEST_F(InternetCacheTest, A_name_of_4_KB_is_listed_whole) {
   cache.Add("http://a/" + std::string(4096, 'x'));
 
@@ -105,6 +121,34 @@ TEST_F(InternetCacheTest, A_walk_that_opens_where_only_a_size_was_asked_for_is_c
 
   EXPECT_EQ(list, std::vector<Text>{u""});
   EXPECT_EQ(eager.Calls.back(), "FindClose");
+}
+
+TEST_F(InternetCacheTest, A_first_entry_that_grows_between_its_two_calls_leaves_the_list_as_it_was) {
+  struct GrowingCache : platform::simulated::SimulatedUrlCache {
+    bool LocalAlloc(platform::UrlCacheEntry& entry, std::uint32_t size) override {
+      return SimulatedUrlCache::LocalAlloc(entry, size - 1);
+    }
+  } growing;
+  growing.Add("http://a/");
+
+  mdlInternetCache(growing).GetCacheURLList(list);
+
+  EXPECT_EQ(list, std::vector<Text>{u""});
+  EXPECT_EQ(growing.Calls, (std::vector<std::string>{"FindFirst 0 0", "LocalAlloc 89", "FindFirst all 90 90",
+                                                     "LocalFree", "FindClose none"}));
+  EXPECT_EQ(growing.BlocksInUse, 0);
+}
+
+TEST_F(InternetCacheTest, Any_other_error_than_too_small_a_block_ends_the_walk_before_it_begins) {
+  struct ClosedCache : platform::simulated::SimulatedUrlCache {
+    std::uint32_t GetLastError() override { return kErrorAccessDenied; }
+  } closed;
+  closed.Add("http://a/");
+
+  mdlInternetCache(closed).GetCacheURLList(list);
+
+  EXPECT_EQ(list, std::vector<Text>{u""});
+  EXPECT_EQ(closed.Calls, (std::vector<std::string>{"FindFirst 0 0", "LocalFree", "FindClose none"}));
 }
 
 TEST_F(InternetCacheTest, An_entry_that_grows_between_its_two_calls_ends_the_walk) {

@@ -219,6 +219,7 @@ TEST_F(SocketFailures, A_read_that_fails_is_raised_from_RecvDataToBuffer) {
   const auto socket = static_cast<std::uint32_t>(Object->SocketHandle(1));
   EXPECT_EQ(FaultText([&] { Object->WndProc(WindowHandle(), 32769, socket, 1); }),
             "10054 Connection reset by peer. [CSocketPlus.RecvDataToBuffer]");
+  EXPECT_EQ(Object->BytesReceived(1), 0);
 }
 
 TEST_F(SocketFailures, A_datagram_that_can_not_be_read_is_raised_from_RecvData) {

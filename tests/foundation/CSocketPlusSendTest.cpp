@@ -27,6 +27,13 @@ TEST_F(SocketSends, A_refused_send_reports_what_went_out_and_FD_WRITE_goes_on_wi
   EXPECT_EQ(Object.Events, (Events{"SendProgress 1 10 5", "SendProgress 1 5 0", "SendComplete 1"}));
 }
 
+TEST_F(SocketSends, A_single_byte_that_went_out_before_a_refusal_is_reported) {
+  Server.TakeAtMost(1);
+  Connect(1);
+  Object->SendData(1, Text(u"abc"));
+  EXPECT_EQ(Object.Events, Events{"SendProgress 1 1 2"});
+}
+
 TEST_F(SocketSends, A_send_that_is_refused_at_once_reports_nothing) {
   Connect(1);
   Net().Fail("send", 10035);

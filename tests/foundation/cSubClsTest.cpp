@@ -216,6 +216,91 @@ TEST_F(Subclassing, Two_objects_on_one_window_both_see_a_message) {
   second.UnSubclass();
 }
 
+TEST_F(Subclassing, Objects_detached_in_the_order_of_their_attachment_leave_nothing_that_reaches_an_owner) {
+  cSubCls second(windows);
+  subclass.SubClass(window, owner, kTrue16);
+  second.SubClass(window, owner, kTrue16);
+
+  subclass.UnSubclass();
+  second.UnSubclass();
+
+  EXPECT_EQ(Send(5), 77);
+  EXPECT_EQ(trace, Trace{"procedure 5"});
+}
+
+TEST_F(Subclassing, An_attached_object_stays_with_its_window_owner_and_mode) {
+  Trace others;
+  Owner other(others);
+  const auto before = windows.Procedure(window);
+  subclass.AddMsg(5, kFalse16);
+  subclass.SubClass(window, owner, kFalse16);
+
+  subclass.SubClass(windows.Create(), other, kTrue16);
+  Send(5);
+  Send(6);
+  subclass.UnSubclass();
+
+  EXPECT_EQ(subclass.Window(), window);
+  EXPECT_EQ(windows.Procedure(window), before);
+  EXPECT_EQ(trace, (Trace{"procedure 5", "after 5 got 77", "procedure 6"}));
+  EXPECT_EQ(others, Trace{});
+}
+
+/// Keeps what came with the last message.
+struct Listener : iSubCls {
+  void Despues(std::int32_t&, WindowHandle hWnd, std::uint32_t uMsg, std::uint32_t wParam,
+               std::uint32_t lParam) override {
+    after = {hWnd.Value(), uMsg, wParam, lParam};
+    if (during) during();
+  }
+  void Antes(std::int32_t&, std::int32_t&, WindowHandle hWnd, std::uint32_t uMsg, std::uint32_t wParam,
+             std::uint32_t lParam) override {
+    before = {hWnd.Value(), uMsg, wParam, lParam};
+    if (during) during();
+  }
+  std::vector<std::uint32_t> before;
+  std::vector<std::uint32_t> after;
+  std::function<void()> during;
+};
+
+TEST_F(Subclassing, Both_operations_are_told_the_window_the_message_and_its_two_numbers) {
+  Listener listener;
+  subclass.AddMsg(5, kTrue16);
+  subclass.AddMsg(6, kFalse16);
+  subclass.SubClass(window, listener, kFalse16);
+
+  windows.Dispatch(window, 5, 0xFFFFFFFF, 2);
+  windows.Dispatch(window, 6, 3, 0x80000000);
+
+  EXPECT_EQ(listener.before, (std::vector<std::uint32_t>{window.Value(), 5, 0xFFFFFFFF, 2}));
+  EXPECT_EQ(listener.after, (std::vector<std::uint32_t>{window.Value(), 6, 3, 0x80000000}));
+}
+
+TEST_F(Subclassing, An_owner_may_end_the_object_in_either_of_its_operations) {
+  for (const Boolean16 before : {kTrue16, kFalse16}) {
+    Listener listener;
+    auto ending = std::make_unique<cSubCls>(windows);
+    listener.during = [&] { ending.reset(); };
+    ending->AddMsg(5, before);
+    ending->SubClass(window, listener, kFalse16);
+
+    EXPECT_EQ(Send(5), 77);
+    EXPECT_EQ(ending, nullptr);
+    EXPECT_EQ(Send(5), 77);
+  }
+}
+
+TEST_F(Subclassing, A_window_that_goes_inside_its_message_takes_nobody_along) {
+  subclass.SubClass(window, owner, kTrue16);
+  during = [this] { windows.Remove(window); };
+
+  EXPECT_EQ(Send(5), 77);
+  EXPECT_EQ(Send(5), 0);
+  subclass.UnSubclass();
+
+  EXPECT_EQ(trace, (Trace{"procedure 5", "after 5 got 77"}));
+}
+
 TEST_F(Subclassing, A_window_that_does_not_exist_harms_nobody) {
   subclass.SubClass(WindowHandle(1), owner, kTrue16);
   subclass.UnSubclass();

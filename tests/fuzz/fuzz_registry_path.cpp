@@ -2,7 +2,8 @@
 // found again, and nothing stays open.
 
 #include "foundation/RegEdit.h"
-#include "platform/simulated/registry/SimulatedRegistry.h"
+#include "platform/registry/StoredRegistry.h"
+#include "platform/simulated/registry/RegistryTree.h"
 #include "runtime/Fault.h"
 
 #include <algorithm>
@@ -25,6 +26,16 @@ struct CountingLoop : forms::MessageLoop {
   }
   void DoEvents() override {}
   [[noreturn]] void End(int) override { std::abort(); }
+};
+
+/// One hive, in which keys can be made; a fresh system's other keys would have to be made for every run.
+struct SmallRegistry {
+  SmallRegistry() {
+    platform::RegistryStore::KeyNumber made = 0;
+    Require(tree.Make(platform::kLocalMachine.Value(), {"SOFTWARE"}, made) == platform::kRegistrySuccess);
+  }
+  platform::simulated::RegistryTree tree;
+  platform::StoredRegistry registry{tree};
 };
 
 std::string TakeLine(std::string_view& rest) {
@@ -67,16 +78,16 @@ void CheckWritten(platform::Registry& registry, foundation::RegEdit& regEdit, co
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   std::string_view rest(reinterpret_cast<const char*>(data), size);
-  platform::simulated::SimulatedRegistry registry;
+  SmallRegistry small;
   CountingLoop loop;
-  foundation::RegEdit regEdit(registry, loop);
+  foundation::RegEdit regEdit(small.registry, loop);
   // Two paths, so that a bad one comes after a good one.
   for (int i = 0; i < 2; ++i) {
     const Text path = FromCodePage(TakeLine(rest));
     const Text name = FromCodePage(TakeLine(rest));
     CheckSplit(regEdit, path, loop.boxes, loop);
-    CheckWritten(registry, regEdit, path, name, FromCodePage(rest));
+    CheckWritten(small.registry, regEdit, path, name, FromCodePage(rest));
   }
-  Require(registry.OpenCount() == 0);
+  Require(small.registry.OpenCount() == 0);
   return 0;
 }

@@ -126,6 +126,21 @@ TEST_F(MonitorPageSwitchTest, The_stop_tears_the_dormant_sniffer_down_when_its_f
   EXPECT_EQ(std::count(machine.Calls.begin(), machine.Calls.end(), "WSAIsBlocking"), 1);
 }
 
+TEST_F(MonitorPageSwitchTest, The_sniffer_goes_after_the_pages_sockets_and_before_the_session) {
+  ComeHome();
+  ClickEntry(0);
+  program.sniffer.Active = true;
+  machine.Calls.clear();
+
+  program.monitorWork.main_StopPage();
+
+  const std::vector<std::string> calls{"WSACleanup", "WSAIsBlocking", "WSACleanup", "vpEnd"};
+  std::vector<std::string> seen;
+  for (const auto& call : machine.Calls)
+    if (std::find(calls.begin(), calls.end(), call) != calls.end()) seen.push_back(call);
+  EXPECT_EQ(seen, calls);
+}
+
 TEST_F(MonitorPageSwitchTest, The_stop_releases_the_sockets_ends_the_session_pauses_and_stops_the_control) {
   ComeHome();
   ClickEntry(0);

@@ -85,6 +85,31 @@ TEST(SniffedPackets, Protocol_47_in_a_tunnel_takes_its_ports_from_byte_28) {
   EXPECT_EQ(packet.ports->destination, 6);
 }
 
+TEST(SniffedPackets, In_a_tunnel_udp_still_takes_its_ports_from_byte_20) {
+  Bytes bytes = TunnelledPacket(17);
+  PutBig16(bytes, 20, 53);
+  PutBig16(bytes, 22, 1025);
+  PutBig16(bytes, 56, 7);
+  const SniffedPacket packet = Read(bytes);
+  EXPECT_EQ(packet.protocolName, u"UDP");
+  EXPECT_EQ(packet.payloadSize, 512);
+  EXPECT_EQ(packet.ports->source, 53);
+  EXPECT_EQ(packet.ports->destination, 1025);
+}
+
+TEST(SniffedPackets, In_a_tunnel_other_protocols_have_a_header_of_20_bytes_and_no_ports) {
+  for (const auto& [protocol, name] : {std::pair{1, u"ICMP"}, std::pair{50, u"50"}}) {
+    const SniffedPacket packet = Read(TunnelledPacket(protocol));
+    EXPECT_EQ(packet.protocolName, name);
+    EXPECT_EQ(packet.payloadSize, 520);
+    EXPECT_FALSE(packet.ports);
+  }
+}
+
+TEST(SniffedPackets, A_packet_shorter_than_its_headers_has_a_payload_below_0) {
+  EXPECT_EQ(Read(PacketOf(6, kServer, 80, 1025, 20, 39)).payloadSize, -1);
+}
+
 TEST(SniffedPackets, An_empty_packet_is_no_fault) { EXPECT_EQ(Read({}).payloadSize, -20); }
 
 struct SnifferTest : CaptureProgram {
@@ -116,6 +141,13 @@ TEST_F(SnifferTest, Any_other_event_of_a_socket_is_passed_over) {
   sniffer.Despues(result, WindowHandle(), 1025, kSocket.Value(), 2);
   EXPECT_EQ(Upload(Row()), 0);
   EXPECT_EQ(result, 5);
+}
+
+TEST_F(SnifferTest, A_readable_event_that_brings_an_error_number_is_passed_over) {
+  machine.sockets.Receive(kSocket, PacketOf(6, kOwnAddress, 1025, 80));
+  std::int32_t result = 0;
+  sniffer.Despues(result, WindowHandle(), 1025, kSocket.Value(), 10054U << 16 | kReadable);
+  EXPECT_EQ(Upload(Row()), 0);
 }
 
 TEST_F(SnifferTest, Before_the_windows_procedure_nothing_is_done) {
@@ -163,6 +195,33 @@ TEST_F(SnifferTest, Three_addresses_are_local_here_the_gateways_among_them) {
 TEST_F(SnifferTest, A_packet_from_elsewhere_is_a_download_by_its_destination_port) {
   machine.sockets.Receive(kSocket, PacketOf(6, kServer, 80, 1025));
   Sniff();
+  EXPECT_EQ(Download(Row()), 1);
+}
+
+TEST_F(SnifferTest, The_first_row_with_the_port_is_charged_and_no_other) {
+  AddRow(2, u".80.1025.");
+  machine.sockets.Receive(kSocket, PacketOf(6, kOwnAddress, 1025, 80));
+  Sniff();
+  EXPECT_EQ(Upload(Row()), 1);
+  EXPECT_EQ(Upload(form.main_ListView1.Row(2)), 0);
+}
+
+TEST_F(SnifferTest, What_is_sent_counts_by_its_source_port_alone_and_what_comes_by_its_destination_port) {
+  machine.sockets.Receive(kSocket, PacketOf(6, kOwnAddress, 80, 1025, 20, 1064, 2000));
+  machine.sockets.Receive(kSocket, PacketOf(6, kServer, 1025, 80));
+  Sniff();
+  EXPECT_EQ(Upload(Row()), 0);
+  EXPECT_EQ(Download(Row()), 0);
+}
+
+TEST_F(SnifferTest, Blanks_around_an_own_address_do_not_count_and_an_empty_one_is_nobodys) {
+  addresses.LocalAddressLast = u" 192.0.2.80 ";
+  addresses.LocalAddressPrevious = u"  ";
+  addresses.GatewayAddress = u" 10.0.0.1 ";
+  for (const std::string source : {"192.0.2.80", "10.0.0.1", "0.0.0.0"})
+    machine.sockets.Receive(kSocket, PacketOf(6, source, 1025, 1025, 20, 1064, 2000));
+  Sniff();
+  EXPECT_EQ(Upload(Row()), 2);
   EXPECT_EQ(Download(Row()), 1);
 }
 

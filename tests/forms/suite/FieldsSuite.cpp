@@ -229,6 +229,30 @@ TEST_P(DesktopSuite, Messages_of_a_form_reach_the_procedure_that_replaced_its_ow
   EXPECT_EQ(seen, (std::vector<std::uint32_t>{1025, 1026}));
 }
 
+TEST_P(DesktopSuite, A_procedure_without_a_predecessor_or_that_is_its_own_passes_a_message_to_the_forms_own) {
+  desktop.Show(form);
+  const WindowHandle window = desktop.HandleOf(form);
+  int calls = 0;
+  WindowProcedure previous;
+  using Procedure = WindowProcedure::element_type;
+  const auto passing = std::make_shared<Procedure>([&](auto sentTo, auto... rest) {
+    ++calls;
+    return desktop.Windows.Call(previous, sentTo, rest...);
+  });
+  const WindowProcedure own = desktop.Windows.Replace(window, passing);
+  const std::int32_t answer = desktop.Windows.Call(own, window, 1025, 0, 1);
+
+  for (const WindowProcedure& predecessor : {WindowProcedure(), WindowProcedure(passing)}) {
+    previous = predecessor;
+    calls = 0;
+    EXPECT_EQ(desktop.SendMessage(window, 1025, 0, 1), answer);
+    EXPECT_EQ(calls, 1);
+    loop.PostMessage(window, 1025, 0, 1);
+    EXPECT_TRUE(user->WaitUntil([&] { return calls == 2; }));
+  }
+  previous = nullptr;
+}
+
 TEST_P(DesktopSuite, A_message_for_a_form_that_has_gone_is_lost) {
   desktop.Show(other);
   desktop.Show(form);

@@ -72,6 +72,20 @@ TEST_F(CaptureDriverSetupTest, The_values_are_written_in_their_order) {
   EXPECT_EQ(CallsOf("RegSetValueExA"), expected);
 }
 
+TEST_F(CaptureDriverSetupTest, Each_value_goes_to_its_key_in_the_order_of_the_keys) {
+  setup.InstallCaptureDriver();
+
+  std::vector<std::string> opened{kSharedDllsKey};
+  opened.insert(opened.end(), 7, kUninstallKey);
+  for (const auto& set : {kSet1, kSet2}) {
+    opened.insert(opened.end(), 5, set + "NPF");
+    opened.push_back(set + "NPF\\Security");
+    opened.insert(opened.end(), 7, set + "rpcapd");
+    opened.push_back(set + "rpcapd\\Security");
+  }
+  EXPECT_EQ(CallsOf("RegOpenKeyExA"), opened);
+}
+
 TEST_F(CaptureDriverSetupTest, The_uninstaller_is_a_shared_file_and_stands_among_the_products) {
   setup.InstallCaptureDriver();
 
@@ -170,7 +184,8 @@ struct Descriptor {
   std::uint32_t Long(std::size_t at) const { return Little32(bytes, at); }
   /// As in "S-1-5-18".
   std::string Trustee(std::size_t at) const {
-    std::string text = "S-" + std::to_string(bytes[at]) + "-" + std::to_string(bytes[at + 7]);
+    std::string text =
+        "S-" + std::to_string(bytes[at]) + "-" + std::to_string(Big64(bytes, at) & 0xFFFFFFFFFFFF);
     for (std::size_t i = 0; i < bytes[at + 1]; ++i) text += "-" + std::to_string(Long(at + 8 + 4 * i));
     return text;
   }
@@ -231,6 +246,13 @@ TEST_P(CaptureDriverSecurityTest, Four_entries_of_24_28_24_and_28_bytes_allow) {
     at += entry.size;
   }
   EXPECT_EQ(at, 0xA0u);
+}
+
+TEST_P(CaptureDriverSecurityTest, What_stands_between_the_fields_is_0) {
+  EXPECT_EQ(descriptor.Word(0x1A), 0); // behind the audit list's count
+  EXPECT_EQ(descriptor.Word(0x36), 0); // behind the access list's
+  for (const std::size_t behindTrustee : {0x4EU, 0x68U, 0x6AU, 0x80U, 0x82U, 0x9CU, 0x9EU})
+    EXPECT_EQ(descriptor.Word(behindTrustee), 0) << behindTrustee;
 }
 
 INSTANTIATE_TEST_SUITE_P(, CaptureDriverSecurityTest, testing::Values(NpfSecurity, RpcapdSecurity));

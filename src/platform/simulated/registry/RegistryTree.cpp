@@ -15,6 +15,10 @@ bool RegistryTree::CaseBlind::operator()(const std::string& left, const std::str
                                       [](char one, char other) { return Small(one) < Small(other); });
 }
 
+bool RegistryTree::ByParentThenName::operator()(const Place& left, const Place& right) const {
+  return left.parent != right.parent ? left.parent < right.parent : CaseBlind()(left.name, right.name);
+}
+
 std::uint32_t RegistryTree::WhyRefused(KeyNumber key) const {
   for (const KeyNumber asked : {KeyNumber{0}, key})
     if (const auto found = Refused.find(asked); found != Refused.end()) return found->second;
@@ -22,10 +26,26 @@ std::uint32_t RegistryTree::WhyRefused(KeyNumber key) const {
 }
 
 RegistryTree::KeyNumber RegistryTree::Child(KeyNumber parent, const std::string& name) const {
-  constexpr CaseBlind comesBefore;
-  for (const auto& [number, key] : keys_)
-    if (key.parent == parent && !comesBefore(key.name, name) && !comesBefore(name, key.name)) return number;
-  return 0;
+  const auto found = places_.find({parent, name});
+  return found == places_.end() ? 0 : found->second;
+}
+
+bool RegistryTree::HasKeys(KeyNumber key) const {
+  const auto first = FirstBelow(key);
+  return first != places_.end() && first->first.parent == key;
+}
+
+RegistryTree::KeyNumber RegistryTree::Add(KeyNumber parent, const std::string& name) {
+  keys_[++last_] = {parent, name, {}};
+  places_[{parent, name}] = last_;
+  return last_;
+}
+
+void RegistryTree::Forget(KeyNumber key) {
+  const auto found = keys_.find(key);
+  if (found == keys_.end()) return;
+  places_.erase({found->second.parent, found->second.name});
+  keys_.erase(found);
 }
 
 std::uint32_t RegistryTree::Find(KeyNumber parent, const std::string& name, KeyNumber& key) {
@@ -51,38 +71,29 @@ std::uint32_t RegistryTree::Make(KeyNumber parent, const std::vector<std::string
     at = child;
     ++known;
   }
-  for (; known < path.size(); ++known) {
-    keys_[++last_] = {at, path[known], {}};
-    at = last_;
-  }
+  for (; known < path.size(); ++known) at = Add(at, path[known]);
   key = at;
   return kRegistrySuccess;
 }
 
 std::uint32_t RegistryTree::Remove(KeyNumber key) {
-  const bool hasKeys =
-      std::any_of(keys_.begin(), keys_.end(), [&](const auto& entry) { return entry.second.parent == key; });
-  if (hasKeys) return kRegistryAccessDenied;
-  keys_.erase(key);
+  if (HasKeys(key)) return kRegistryAccessDenied;
+  Forget(key);
   return kRegistrySuccess;
 }
 
 void RegistryTree::RemoveAll(KeyNumber key) {
-  std::vector<KeyNumber> below;
-  for (const auto& [number, entry] : keys_)
-    if (entry.parent == key) below.push_back(number);
-  for (const KeyNumber number : below) RemoveAll(number);
-  keys_.erase(key);
+  while (HasKeys(key)) RemoveAll(FirstBelow(key)->second);
+  Forget(key);
 }
 
 std::uint32_t RegistryTree::NameAt(KeyNumber parent, std::uint32_t index, std::string& name) {
-  std::vector<std::string> names;
-  for (const auto& [number, entry] : keys_)
-    if (entry.parent == parent) names.push_back(entry.name);
-  std::sort(names.begin(), names.end(), CaseBlind());
-  if (index >= names.size()) return kNoMoreKeys;
-  name = names[index];
-  return kRegistrySuccess;
+  for (auto at = FirstBelow(parent); at != places_.end() && at->first.parent == parent; ++at) {
+    if (index-- > 0) continue;
+    name = at->first.name;
+    return kRegistrySuccess;
+  }
+  return kNoMoreKeys;
 }
 
 std::uint32_t RegistryTree::Read(KeyNumber key, const std::string& name, RegistryValue& value) {

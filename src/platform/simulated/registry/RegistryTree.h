@@ -36,9 +36,25 @@ class RegistryTree : public RegistryStore {
   void RemoveAll(KeyNumber key);
 
  private:
+  /// Where a key stands: its parent, and its name there.
+  struct Place {
+    KeyNumber parent = 0;
+    std::string name{};
+  };
+  struct ByParentThenName {
+    bool operator()(const Place& left, const Place& right) const;
+  };
+  using Places = std::map<Place, KeyNumber, ByParentThenName>;
+
   std::uint32_t WhyRefused(KeyNumber key) const;
+  /// The keys of a key stand one after the other from here on, by their names.
+  Places::const_iterator FirstBelow(KeyNumber parent) const { return places_.lower_bound({parent, {}}); }
+  bool HasKeys(KeyNumber key) const;
+  KeyNumber Add(KeyNumber parent, const std::string& name);
+  void Forget(KeyNumber key);
 
   std::map<KeyNumber, Key> keys_; ///< roots too, once they have values
+  Places places_;
   KeyNumber last_ = 0;
 };
 

@@ -1,60 +1,12 @@
 #include "platform/linux/internet/LinuxUrlCache.h"
 
-#include "platform/linux/LinuxFixture.h"
-#include "platform/linux/internet/CacheFilesFixture.h"
+#include "platform/linux/internet/LinuxUrlCacheFixture.h"
 
-#include <gtest/gtest.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
-#include <filesystem>
-#include <set>
-
 namespace quendra::platform::linux_ {
 namespace {
-
-namespace files = std::filesystem;
-using Names = std::multiset<std::string>;
-
-const std::string kFirefox = "mozilla/firefox/abc.default/cache2/entries/";
-const std::string kChromium = "chromium/Default/Cache/Cache_Data/";
-
-/// The name of an entry's file, by number.
-std::string FirefoxName(int number) {
-  const std::string digits = std::to_string(number);
-  return kFirefox + std::string(40 - digits.size(), 'A') + digits;
-}
-std::string ChromiumName(int number, const char* stream = "0") {
-  const std::string digits = std::to_string(number);
-  return kChromium + std::string(16 - digits.size(), 'a') + digits + "_" + stream;
-}
-
-struct LinuxUrlCacheTest : testing::Test {
-  TemporaryFolder folder;
-  LinuxUrlCache cache{folder.Path()};
-
-  Names List() {
-    Names names;
-    UrlCacheEntry entry;
-    std::uint32_t size = 0;
-    EXPECT_EQ(cache.FindFirstUrlCacheEntryA("0", nullptr, size), kNoUrlCacheWalk);
-    EXPECT_TRUE(cache.LocalAlloc(entry, size));
-    const UrlCacheWalk walk = cache.FindFirstUrlCacheEntryA(nullptr, &entry, size);
-    for (bool more = walk != kNoUrlCacheWalk; more;) {
-      names.insert(entry.sourceUrlName);
-      size = 0;
-      EXPECT_FALSE(cache.FindNextUrlCacheEntryA(walk, nullptr, size));
-      EXPECT_TRUE(cache.LocalAlloc(entry, size));
-      more = cache.FindNextUrlCacheEntryA(walk, &entry, size);
-    }
-    cache.FindCloseUrlCache(walk);
-    return names;
-  }
-  void DeleteAll() {
-    for (const auto& name : List()) cache.DeleteUrlCacheEntryA(name);
-  }
-  bool Exists(const std::string& name) const { return files::exists(files::symlink_status(folder / name)); }
-};
 
 TEST_F(LinuxUrlCacheTest, A_folder_without_browsers_is_an_empty_cache) {
   std::uint32_t size = 0;
