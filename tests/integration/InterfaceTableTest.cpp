@@ -207,6 +207,15 @@ TEST_F(InterfaceTable, Rows_stand_by_ascending_index) {
   EXPECT_TRUE(std::ranges::is_sorted(rows, {}, [](const Row& row) { return row.Get(Row::kIndex); }));
 }
 
+TEST_F(InterfaceTable, A_machine_of_many_links_shows_the_39_of_the_lowest_indexes) {
+  const auto few = Rows();
+  RunCommand("for i in $(seq 1 40); do ip link add many$i type bridge; done");
+  const auto many = Rows();
+  ASSERT_EQ(many.size(), 39U);
+  for (std::size_t i = 0; i < few.size(); ++i) EXPECT_EQ(NameOf(many[i]), NameOf(few[i]));
+  EXPECT_EQ(InterfaceNamed("lo").InterfaceType, 24U);
+}
+
 TEST_F(InterfaceTable, Every_interface_is_as_the_systems_own_tool_prints_it_field_by_field) {
   Rows(); // the counters of these links began with them
   SendSome();
