@@ -1,22 +1,28 @@
+#include "diagnostics/interfaces/CIpHelper.h"
+#include "forms/headless/HeadlessDesktop.h"
 #include "integration/NetworkNamespace.h"
-
 #include "platform/linux/net/LinuxIpHelper.h"
 #include "platform/net/InterfaceRow.h"
 #include "runtime/Text.h"
 
 #include <gtest/gtest.h>
+#include <net/if.h>
 #include <netinet/in.h>
+#include <netpacket/packet.h>
 #include <sys/socket.h>
 
 #include <array>
 #include <cstdio>
 #include <map>
 #include <optional>
+#include <sstream>
 
 namespace quendra::integration {
 namespace {
 
+using diagnostics::CInterface;
 using Row = platform::InterfaceRow;
+using Fields = std::map<std::string, std::string>;
 
 /// Links of the test's own namespace, and what the system's own tool prints of them.
 class InterfaceTable : public testing::Test {
@@ -24,13 +30,16 @@ class InterfaceTable : public testing::Test {
   void SetUp() override {
     if (!NetworkNamespace::Possible()) GTEST_SKIP() << NetworkNamespace::kSkipReason;
     network_.emplace();
+    // The system would send frames of its own while the figures are compared.
+    NetworkNamespace::Set("net/ipv6/conf/default/disable_ipv6", "1");
     RunCommand("ip link set lo up");
     RunCommand("ip link add near address 02:00:0a:ff:00:01 mtu 1400 type veth peer name far");
     RunCommand("ip link set near alias 'Cable to the far end'");
-    RunCommand("ip link add hub type bridge");
+    RunCommand("ip link add hub type bridge mcast_snooping 0 && ip link set far master hub");
     RunCommand("ip tuntap add dev bare mode tun");
     RunCommand("ip link set near up && ip link set far up && ip link set hub up");
     RunCommand("ip addr add 192.0.2.1/24 dev near");
+    RunCommand("ip addr add 198.51.100.1/24 dev bare && ip link set bare up");
   }
 
   std::vector<Row> Rows() {
@@ -58,16 +67,16 @@ class InterfaceTable : public testing::Test {
     return {};
   }
   /// The figures of one link as the tool prints them, by the names of their fields.
-  static std::map<std::string, std::string> Printed(const std::string& name) {
+  static Fields Printed(const std::string& name) {
     static constexpr const char* kScript =
         "import json,sys; "
         "link=json.load(sys.stdin)[0]; stats=link['stats64']; "
         "flat={k:v for k,v in link.items() if not isinstance(v,(dict,list))}; "
         "flat.update({d+'_'+k:v for d in ('rx','tx') for k,v in stats[d].items()}); "
-        "flat['up']='UP' in link['flags']; "
+        "flat['up']='UP' in link['flags']; flat['runs']='LOWER_UP' in link['flags']; "
         "[print(k+'='+str(v)) for k,v in flat.items()]";
     const std::string command = "ip -s -d -j link show dev " + name + " | python3 -c \"" + kScript + "\"";
-    std::map<std::string, std::string> fields;
+    Fields fields;
     FILE* pipe = popen(command.c_str(), "r");
     std::array<char, 512> line;
     while (fgets(line.data(), line.size(), pipe) != nullptr) {
@@ -88,39 +97,97 @@ class InterfaceTable : public testing::Test {
     if (!text.empty()) text.pop_back();
     return text;
   }
-  static void ExpectAsPrinted(const Row& row, std::map<std::string, std::string> printed) {
-    const auto expect = [&](Row::Field field, const std::string& name) {
-      EXPECT_EQ(std::to_string(row.Get(field)), printed.at(name)) << name;
-    };
-    expect(Row::kIndex, "ifindex");
-    expect(Row::kMtu, "mtu");
-    expect(Row::kInOctets, "rx_bytes");
-    expect(Row::kInErrors, "rx_errors");
-    expect(Row::kInDiscards, "rx_dropped");
-    expect(Row::kInNonunicast, "rx_multicast");
-    expect(Row::kOutOctets, "tx_bytes");
-    expect(Row::kOutUnicast, "tx_packets");
-    expect(Row::kOutErrors, "tx_errors");
-    expect(Row::kOutDiscards, "tx_dropped");
-    EXPECT_EQ(std::to_string(row.Get(Row::kInUnicast) + row.Get(Row::kInNonunicast)),
-              printed.at("rx_packets"));
-    EXPECT_EQ(row.Get(Row::kAdminStatus), printed.at("up") == "True" ? 1U : 2U);
+  CInterface InterfaceNamed(const std::string& name) {
+    forms::headless::HeadlessDesktop desktop;
+    diagnostics::CIpHelper reader(helper(), desktop);
+    Text field; // as the property gives it: a zero after each letter
+    for (const char letter : name + '\0') field += {static_cast<char16_t>(letter), u'\0'};
+    for (const auto& item : reader.Interfaces()->NewEnum())
+      if (item->InterfaceName.starts_with(field)) return *item;
+    ADD_FAILURE() << "no interface of " << name;
+    return {};
   }
-  /// So that counters move.
-  static void SendSome() {
+  /// All that the tool prints of an interface; it prints no speed, and only the limit of a queue.
+  static void ExpectAsPrinted(const CInterface& read, Fields printed) {
+    const auto expect = [&](std::uint32_t value, const std::string& name) {
+      EXPECT_EQ(std::to_string(value), printed.at(name)) << name;
+    };
+    expect(read.InterfaceIndex, "ifindex");
+    expect(read.MaximumTransmissionUnit, "mtu");
+    expect(read.OctetsReceived, "rx_bytes");
+    expect(read.UnicastPacketsReceived + read.NonunicastPacketsReceived, "rx_packets");
+    expect(read.NonunicastPacketsReceived, "rx_multicast");
+    expect(read.IncomingErrors, "rx_errors");
+    expect(read.DiscardedIncomingPackets, "rx_dropped");
+    expect(read.OctetsSent, "tx_bytes");
+    expect(read.UnicastPacketsSent + read.NonunicastPacketsSent, "tx_packets");
+    expect(read.OutgoingErrors, "tx_errors");
+    expect(read.DiscardedOutgoingPackets, "tx_dropped");
+    EXPECT_EQ(read.InterfaceType, KindPrinted(printed));
+    EXPECT_EQ(read.AdminStatus, printed.at("up") == "True" ? 1U : 2U);
+    EXPECT_EQ(read.OperationalStatus, StatusPrinted(printed));
+    EXPECT_EQ(read.AdapterAddress, AddressPrinted(printed));
+    const std::string alias = printed["ifalias"];
+    EXPECT_EQ(ToUtf8(read.InterfaceDescription), alias.empty() ? printed.at("ifname") : alias);
+    EXPECT_EQ(read.UnknownProtocolPackets, 0U);
+    EXPECT_EQ(read.OutputQueueLength, 0U);
+    EXPECT_EQ(read.LastChange, 4.0);
+  }
+  static std::uint32_t KindPrinted(const Fields& printed) {
+    const std::map<std::string, std::uint32_t> kinds{{"ether", 6}, {"loopback", 24}, {"none", 131}};
+    return kinds.at(printed.at("link_type"));
+  }
+  static std::uint32_t StatusPrinted(const Fields& printed) {
+    const std::string state = printed.at("operstate");
+    if (printed.at("up") != "True") return platform::kNonOperational;
+    const bool runs = state == "UP" || (state == "UNKNOWN" && printed.at("runs") == "True");
+    return runs ? platform::kOperational : platform::kDisconnected;
+  }
+  /// "02:00:0a" reads as "2-00-A".
+  static Text AddressPrinted(Fields& printed) {
+    Text text;
+    std::istringstream bytes(printed["address"]);
+    for (std::string byte; std::getline(bytes, byte, ':');) {
+      const auto value = static_cast<std::uint8_t>(std::stoul(byte, nullptr, 16));
+      text += (text.empty() ? u"" : u"-") + (value == 0 ? Text(u"00") : HexText(value));
+    }
+    return text;
+  }
+  /// So that counters move, those of what is dropped among them: nobody reads at the other end of the link
+  /// that has no carrier, and nobody knows the protocol of the frames that the bridge gets.
+  void SendSome() {
+    for (const std::uint32_t address : {0x7F000001U, 0xC00002FFU, 0xC6336402U}) SendDatagrams(address);
+    const auto dropped = [] { return std::stoul(Printed("hub").at("rx_dropped")); };
+    const auto before = dropped();
+    SendFrames(if_nametoindex("near"));
+    for (int i = 0; i < 100 && dropped() < before + kSent; ++i) usleep(10'000);
+  }
+  static void SendDatagrams(std::uint32_t address) {
     const int sender = socket(AF_INET, SOCK_DGRAM | SOCK_CLOEXEC, 0);
     const int yes = 1;
     setsockopt(sender, SOL_SOCKET, SO_BROADCAST, &yes, sizeof yes);
-    for (const std::uint32_t address : {0x7F000001U, 0xC00002FFU}) {
-      sockaddr_in to{};
-      to.sin_family = AF_INET;
-      to.sin_port = htons(9);
-      to.sin_addr.s_addr = htonl(address);
-      for (int i = 0; i < 3; ++i)
-        EXPECT_EQ(sendto(sender, "datagram", 8, 0, reinterpret_cast<const sockaddr*>(&to), sizeof to), 8);
-    }
+    sockaddr_in to{};
+    to.sin_family = AF_INET;
+    to.sin_port = htons(9);
+    to.sin_addr.s_addr = htonl(address);
+    for (int i = 0; i < kSent; ++i)
+      EXPECT_EQ(sendto(sender, "datagram", 8, 0, reinterpret_cast<const sockaddr*>(&to), sizeof to), 8);
     close(sender);
   }
+  static void SendFrames(unsigned link) {
+    const int sender = socket(AF_PACKET, SOCK_RAW | SOCK_CLOEXEC, 0);
+    sockaddr_ll to{};
+    to.sll_family = AF_PACKET;
+    to.sll_ifindex = static_cast<int>(link);
+    std::array<std::uint8_t, 60> frame{0x01, 0x00, 0x5E, 0, 0, 1, 2, 0, 0x0A, 0xFF, 0, 1, 0x88, 0xB5};
+    for (int i = 0; i < kSent; ++i)
+      EXPECT_EQ(
+          sendto(sender, frame.data(), frame.size(), 0, reinterpret_cast<const sockaddr*>(&to), sizeof to),
+          60);
+    close(sender);
+  }
+
+  static constexpr int kSent = 3;
 
   platform::linux_::LinuxIpHelper& helper() {
     if (!helper_) helper_.emplace(folder_, platform::linux_::SocketOwners::Rights{true, 0});
@@ -139,16 +206,28 @@ TEST_F(InterfaceTable, Rows_stand_by_ascending_index) {
   EXPECT_TRUE(std::ranges::is_sorted(rows, {}, [](const Row& row) { return row.Get(Row::kIndex); }));
 }
 
-TEST_F(InterfaceTable, Every_link_has_the_figures_that_the_systems_own_tool_prints) {
+TEST_F(InterfaceTable, A_machine_of_many_links_shows_the_39_of_the_lowest_indexes) {
+  const auto few = Rows();
+  RunCommand("for i in $(seq 1 40); do ip link add many$i type bridge; done");
+  const auto many = Rows();
+  ASSERT_EQ(many.size(), 39U);
+  for (std::size_t i = 0; i < few.size(); ++i) EXPECT_EQ(NameOf(many[i]), NameOf(few[i]));
+  EXPECT_EQ(InterfaceNamed("lo").InterfaceType, 24U);
+}
+
+TEST_F(InterfaceTable, Every_interface_is_as_the_systems_own_tool_prints_it_field_by_field) {
   Rows(); // the counters of these links began with them
   SendSome();
   for (const char* name : {"lo", "near", "far", "hub", "bare"}) {
     SCOPED_TRACE(name);
-    ExpectAsPrinted(RowNamed(name), Printed(name));
+    ExpectAsPrinted(InterfaceNamed(name), Printed(name));
   }
-  EXPECT_GT(RowNamed("lo").Get(Row::kInOctets), 0U);
-  EXPECT_GT(RowNamed("near").Get(Row::kOutOctets), 0U);
-  EXPECT_GT(RowNamed("far").Get(Row::kInOctets), 0U);
+  EXPECT_GT(InterfaceNamed("lo").OctetsReceived, 0U);
+  EXPECT_GT(InterfaceNamed("near").UnicastPacketsSent, 0U);
+  EXPECT_GT(InterfaceNamed("far").OctetsReceived, 0U);
+  EXPECT_GT(InterfaceNamed("hub").NonunicastPacketsReceived, 0U);
+  EXPECT_GT(InterfaceNamed("hub").DiscardedIncomingPackets, 0U);
+  EXPECT_GT(InterfaceNamed("bare").DiscardedOutgoingPackets, 0U);
 }
 
 TEST_F(InterfaceTable, Links_have_their_kind_address_and_description) {
@@ -169,8 +248,9 @@ TEST_F(InterfaceTable, Links_have_their_kind_address_and_description) {
 TEST_F(InterfaceTable, States_are_numbered_as_the_table_does) {
   EXPECT_EQ(RowNamed("lo").Get(Row::kOperStatus), platform::kOperational);
   EXPECT_EQ(RowNamed("near").Get(Row::kOperStatus), platform::kOperational);
+  EXPECT_EQ(RowNamed("bare").Get(Row::kOperStatus), platform::kDisconnected);
+  RunCommand("ip link set far down && ip link set bare down");
   EXPECT_EQ(RowNamed("bare").Get(Row::kOperStatus), platform::kNonOperational);
-  RunCommand("ip link set far down");
   EXPECT_EQ(RowNamed("near").Get(Row::kOperStatus), platform::kDisconnected);
   EXPECT_EQ(RowNamed("near").Get(Row::kAdminStatus), platform::kAdminUp);
   EXPECT_EQ(RowNamed("far").Get(Row::kAdminStatus), platform::kAdminDown);

@@ -14,7 +14,7 @@ namespace {
 constexpr std::uint32_t kNtFamily = 2;
 constexpr std::int32_t kBufferStep = 4096;
 /// Far above any block; a system that asks for ever more is answered as one that has no data.
-constexpr std::int32_t kMostBuffer = 16 << 20;
+constexpr std::int32_t kMostBuffer = 1 << 20;
 
 /// The number that a name holds; nothing for a name that isn't numeric.
 std::optional<std::int32_t> NumberIn(const Text& name) {

@@ -41,6 +41,33 @@ TEST_F(frmMemInfoTest, The_title_is_that_of_memory_figures) {
   EXPECT_EQ(form.cmdClose.Caption(), u"סגור");
 }
 
+TEST_F(frmMemInfoTest, Every_group_and_label_has_its_caption) {
+  Open();
+  const std::vector<Text> captions{form.Frame1.Caption(), form.Label1.Caption(), form.Label3.Caption(),
+                                   form.Frame2.Caption(), form.Label2.Caption(), form.Label4.Caption(),
+                                   form.Frame3.Caption(), form.Label6.Caption(), form.Label5.Caption(),
+                                   form.Label7.Caption()};
+  EXPECT_EQ(captions, (std::vector<Text>{u" זיכרון פיזי ", u"סה\"כ זיכרון פיזי:", u"זיכרון פיזי זמין:",
+                                         u" זיכרון וירטואלי ", u"סה\"כ זיכרון וירטואלי:",
+                                         u"זיכרון וירטואלי זמין: ", u" ניצול דפי זיכרון ", u"גודל דף זיכרון:",
+                                         u"גודל דף זמין:", u"זכרון מנוצל:"}));
+}
+
+TEST_F(frmMemInfoTest, The_system_is_asked_with_a_record_of_32_bytes) {
+  /// Keeps the length that the caller states.
+  struct : platform::simulated::SimulatedSystem {
+    using SimulatedSystem::SimulatedSystem;
+    std::uint32_t length = 0;
+    void GlobalMemoryStatus(MemoryStatus& status) override {
+      length = status.Get(MemoryStatus::kLength);
+      SimulatedSystem::GlobalMemoryStatus(status);
+    }
+  } asked{core};
+  frmMemInfo other(desktop, asked);
+  desktop.Show(other);
+  EXPECT_EQ(asked.length, 32U);
+}
+
 TEST_F(frmMemInfoTest, A_figure_below_1024_shows_no_digit) {
   Set(MemoryStatus::kAvailPhys, 1023);
   Open();
@@ -62,6 +89,13 @@ TEST_F(frmMemInfoTest, Free_memory_below_16000_Kb_is_red_and_16000_is_black_agai
   EXPECT_EQ(form.txtAPhysicalMemory.ForeColour(), forms::kBlack);
 }
 
+TEST_F(frmMemInfoTest, Free_memory_above_2_GB_is_below_any_limit_and_so_red) {
+  Set(MemoryStatus::kAvailPhys, 0x80000000);
+  Open();
+  EXPECT_EQ(form.txtAPhysicalMemory.Value(), u"-2,097,152 Kb");
+  EXPECT_EQ(form.txtAPhysicalMemory.ForeColour(), forms::kRed);
+}
+
 TEST_F(frmMemInfoTest, Nearly_no_free_virtual_memory_and_page_file_stay_black) {
   Set(MemoryStatus::kAvailVirtual, 1);
   Set(MemoryStatus::kAvailPageFile, 1);
@@ -81,6 +115,16 @@ TEST_F(frmMemInfoTest, A_total_below_half_of_what_is_available_is_red_and_stays_
   Tick();
   EXPECT_EQ(form.txtAVirtualMemory.ForeColour(), forms::kRed);
   EXPECT_EQ(form.txtAPageFile.ForeColour(), forms::kRed);
+}
+
+TEST_F(frmMemInfoTest, A_dialog_that_was_closed_opens_in_its_own_colours) {
+  Set(MemoryStatus::kTotalVirtual, 49);
+  Set(MemoryStatus::kAvailVirtual, 100);
+  Open();
+  desktop.Click(form.cmdClose);
+  Set(MemoryStatus::kTotalVirtual, 100);
+  Open();
+  EXPECT_EQ(form.txtAVirtualMemory.ForeColour(), forms::kBlack);
 }
 
 TEST_F(frmMemInfoTest, A_total_of_exactly_half_stays_black) {
@@ -107,6 +151,14 @@ TEST_F(frmMemInfoTest, No_available_virtual_memory_divides_by_zero_and_ends_the_
   ASSERT_EQ(desktop.Boxes.size(), 1U);
   EXPECT_NE(desktop.Boxes[0].text.find(u"11"), Text::npos);
   EXPECT_EQ(desktop.EndStatus, 1);
+}
+
+TEST_F(frmMemInfoTest, Nothing_available_ends_the_program_before_the_dialog_stands) {
+  Set(MemoryStatus::kAvailVirtual, 0);
+  desktop.Dispatch([this] { Open(); });
+  ASSERT_EQ(desktop.Boxes.size(), 1U);
+  EXPECT_EQ(desktop.EndStatus, 1);
+  EXPECT_FALSE(form.Visible());
 }
 
 TEST_F(frmMemInfoTest, No_available_page_file_divides_by_zero_and_ends_the_program) {

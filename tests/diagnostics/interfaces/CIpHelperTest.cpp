@@ -116,6 +116,12 @@ TEST_F(CIpHelperTest, An_address_of_8_bytes_is_read_and_one_of_9_is_a_bounds_fau
   EXPECT_EQ(FaultOf([&] { helper.Interfaces(); }), Fault::kSubscript);
 }
 
+TEST_F(CIpHelperTest, An_address_of_negative_length_is_empty) {
+  SetAddress(Add(), {1, 2, 3});
+  machine.Interfaces[0].Set(Row::kAddressLength, 0xFFFFFFFF);
+  EXPECT_EQ(Only().AdapterAddress, u"");
+}
+
 TEST_F(CIpHelperTest, A_description_is_cut_to_its_length_and_read_in_the_code_page) {
   SetDescription(Add(), "Card \xE0\xE1 and more", 7);
   EXPECT_EQ(Only().InterfaceDescription, u"Card אב");
@@ -200,12 +206,51 @@ TEST_F(CIpHelperTest, Two_reads_give_two_collections_and_the_first_is_no_longer_
   EXPECT_EQ(second->Count(), 1);
 }
 
+TEST_F(CIpHelperTest, A_collection_that_is_put_in_is_held_until_the_next_read) {
+  auto put = std::make_shared<CInterfaces>();
+  const std::weak_ptr<CInterfaces> held = put;
+  helper.Interfaces(std::move(put));
+  EXPECT_FALSE(held.expired());
+  helper.Interfaces();
+  EXPECT_TRUE(held.expired());
+}
+
 TEST_F(CIpHelperTest, A_system_without_the_table_is_told_of_in_a_box) {
   machine.InterfacesError = 50;
   EXPECT_EQ(helper.Interfaces()->Count(), 0);
   ASSERT_EQ(desktop.Boxes.size(), 1U);
   EXPECT_EQ(desktop.Boxes[0].text, u"IP Helper is not supported by this system.");
   EXPECT_EQ(desktop.Boxes[0].title, u"Quendra");
+  EXPECT_EQ(desktop.Boxes[0].flags, 0);
+  EXPECT_EQ(machine.InterfaceCalls.size(), 1U);
+}
+
+TEST_F(CIpHelperTest, The_same_answer_to_the_second_call_is_a_failure_like_any_other) {
+  AddMany(2);
+  machine.InterfacesErrorWithRoom = 50;
+  EXPECT_EQ(helper.Interfaces()->Count(), 0);
+  EXPECT_TRUE(desktop.Boxes.empty());
+}
+
+TEST_F(CIpHelperTest, A_first_call_that_fails_otherwise_is_followed_by_the_second_without_room) {
+  AddMany(2);
+  machine.InterfacesError = 5;
+  EXPECT_EQ(helper.Interfaces()->Count(), 0);
+  EXPECT_EQ(machine.InterfaceCalls.size(), 2U);
+  EXPECT_TRUE(desktop.Boxes.empty());
+}
+
+TEST_F(CIpHelperTest, A_read_that_fails_leaves_sums_of_0) {
+  Add(RowOfOctets(100, 7));
+  for (const std::uint32_t error : {5U, platform::IpHelper::kErrorNotSupported}) {
+    machine.InterfacesError = 0;
+    helper.Interfaces();
+    ASSERT_EQ(helper.BytesReceived(), 100);
+    machine.InterfacesError = error;
+    helper.Interfaces();
+    EXPECT_EQ(helper.BytesReceived(), 0) << error;
+    EXPECT_EQ(helper.BytesSent(), 0) << error;
+  }
 }
 
 TEST_F(CIpHelperTest, A_machine_that_lacks_the_table_is_such_a_system) {
@@ -221,6 +266,37 @@ TEST_F(CIpHelperTest, Any_other_failure_leaves_the_collection_empty_without_a_wo
   EXPECT_EQ(helper.Interfaces()->Count(), 0);
   EXPECT_EQ(helper.BytesReceived(), 0);
   EXPECT_TRUE(desktop.Boxes.empty());
+}
+
+/// A system whose table is these bytes.
+class BytesAsTable : public platform::unavailable::UnavailableIpHelper {
+ public:
+  explicit BytesAsTable(std::vector<std::uint8_t> bytes) : bytes_(std::move(bytes)) {}
+  std::uint32_t GetIfTable(std::span<std::uint8_t> buffer, std::uint32_t& size, bool) override {
+    size = static_cast<std::uint32_t>(bytes_.size());
+    if (buffer.size() < bytes_.size()) return kErrorInsufficientBuffer;
+    std::ranges::copy(bytes_, buffer.begin());
+    return 0;
+  }
+
+ private:
+  std::vector<std::uint8_t> bytes_;
+};
+
+TEST_F(CIpHelperTest, A_table_that_ends_before_its_rows_or_its_count_do_is_a_bounds_fault) {
+  std::vector<std::uint8_t> oneRow(Row::kFirstOffset + Row::kBytes);
+  PutLittle32(oneRow, 0, 2);
+  for (const auto& bytes : {oneRow, std::vector<std::uint8_t>(3)}) {
+    BytesAsTable table(bytes);
+    CIpHelper other(table, desktop);
+    EXPECT_EQ(FaultOf([&] { other.Interfaces(); }), Fault::kSubscript) << bytes.size();
+  }
+}
+
+TEST_F(CIpHelperTest, A_negative_number_of_rows_gives_an_empty_collection) {
+  BytesAsTable table({0xFF, 0xFF, 0xFF, 0xFF});
+  CIpHelper other(table, desktop);
+  EXPECT_EQ(other.Interfaces()->Count(), 0);
 }
 
 TEST(CInterfacesTest, Items_are_added_counted_found_walked_and_removed) {

@@ -15,6 +15,7 @@ using platform::ProcessorTimes;
 
 constexpr std::uint64_t kTime = 127'500'000'000'000'000;
 constexpr std::uint64_t kSecond = 10'000'000;
+constexpr std::uint64_t kMillisecond = 10'000;
 
 struct Raised {
   std::uint32_t number = 0;
@@ -52,6 +53,11 @@ class CPULoadTest : public testing::Test {
   }
   /// The place of a field of the object in the block.
   void Put(std::size_t at, std::uint32_t value) { PutLittle32(machine.performanceData.Block, at, value); }
+  void Grow(std::size_t at, std::size_t bytes) {
+    Put(at, Little32(machine.performanceData.Block, at) + static_cast<std::uint32_t>(bytes));
+  }
+  /// Another counter's definition, of which only the length and the title say anything.
+  void PutCounterBefore();
 
   platform::simulated::SimulatedMachine machine;
   CPULoad load{machine.system, machine.performanceData, machine.registry};
@@ -60,6 +66,19 @@ class CPULoadTest : public testing::Test {
 constexpr std::size_t kObjectAt = platform::PerformanceBlock::kBytes;
 constexpr std::size_t kCounterAt = kObjectAt + platform::PerformanceObject::kBytes;
 constexpr std::size_t kInstanceAt = kCounterAt + platform::PerformanceCounter::kBytes;
+
+void CPULoadTest::PutCounterBefore() {
+  using platform::PerformanceObject;
+  std::vector<std::uint8_t> other(platform::PerformanceCounter::kBytes + 8);
+  PutLittle32(other, platform::PerformanceCounter::kByteLength, static_cast<std::uint32_t>(other.size()));
+  PutLittle32(other, platform::PerformanceCounter::kNameTitleIndex, 142);
+  PutLittle32(other, platform::PerformanceCounter::kCounterOffset, 0x7FFFFFF0);
+  auto& block = machine.performanceData.Block;
+  block.insert(block.begin() + kCounterAt, other.begin(), other.end());
+  Grow(kObjectAt + PerformanceObject::kNumCounters, 1);
+  Grow(kObjectAt + PerformanceObject::kDefinitionLength, other.size());
+  Grow(kObjectAt + PerformanceObject::kTotalByteLength, other.size());
+}
 
 TEST_F(CPULoadTest, A_version_that_cannot_be_had_is_an_error_of_the_start) {
   machine.system.FailVersion = true;
@@ -70,6 +89,13 @@ TEST_F(CPULoadTest, A_version_that_cannot_be_had_is_an_error_of_the_start) {
 TEST_F(CPULoadTest, The_count_is_asked_for_once) {
   EXPECT_EQ(load.GetCPUCount(), 2);
   machine.system.ProcessorCount = 5;
+  EXPECT_EQ(load.GetCPUCount(), 2);
+}
+
+TEST_F(CPULoadTest, A_count_below_1_is_asked_for_again) {
+  machine.system.ProcessorCount = 0;
+  EXPECT_EQ(load.GetCPUCount(), 0);
+  machine.system.ProcessorCount = 2;
   EXPECT_EQ(load.GetCPUCount(), 2);
 }
 
@@ -86,9 +112,10 @@ TEST_F(CPULoadTest, The_room_grows_by_4096_bytes_until_the_block_fits_and_stays)
   EXPECT_EQ(machine.performanceData.Rooms, (std::vector<std::size_t>{4096, 8192, 12288, 12288}));
 }
 
-TEST_F(CPULoadTest, A_system_that_always_wants_more_room_has_no_data) {
+TEST_F(CPULoadTest, A_system_that_wants_more_room_than_1_MB_has_no_data) {
   machine.performanceData.Error = 234;
   EXPECT_EQ(RaisedBy([&] { load.CollectCPUData(); }), kNoData);
+  EXPECT_EQ(machine.performanceData.Rooms.back(), 1U << 20);
 }
 
 TEST_F(CPULoadTest, A_query_that_fails_is_told_by_the_missing_signature) {
@@ -130,6 +157,35 @@ TEST_F(CPULoadTest, Objects_before_the_one_of_processors_are_passed_over) {
 TEST_F(CPULoadTest, An_object_beyond_the_stated_number_is_not_looked_at) {
   Put(platform::PerformanceBlock::kNumObjectTypes, 0);
   EXPECT_EQ(RaisedBy([&] { load.CollectCPUData(); }).number, 0x80041F44U);
+}
+
+TEST_F(CPULoadTest, A_counter_beyond_the_stated_number_is_not_looked_at) {
+  Put(kObjectAt + platform::PerformanceObject::kNumCounters, 0);
+  EXPECT_EQ(RaisedBy([&] { load.CollectCPUData(); }).number, 0x80041F45U);
+}
+
+TEST_F(CPULoadTest, Counters_before_the_one_of_processor_time_are_passed_over_with_their_places) {
+  for (const std::uint64_t after : {std::uint64_t{0}, kSecond}) {
+    SetIdle(after, after, 0);
+    PutCounterBefore();
+    load.CollectCPUData();
+  }
+  EXPECT_EQ(load.GetCPUUsage(1), 0);
+  EXPECT_EQ(load.GetCPUUsage(2), 100);
+}
+
+TEST_F(CPULoadTest, An_object_that_says_it_has_no_instances_leaves_the_idle_times) {
+  Sample(0, 50, 50);
+  SetIdle(kSecond, 50 + kSecond, 50);
+  Put(kObjectAt + platform::PerformanceObject::kNumInstances, 0xFFFFFFFF);
+  load.CollectCPUData();
+  EXPECT_EQ(load.GetCPUUsage(1), 100);
+}
+
+TEST_F(CPULoadTest, An_idle_time_without_bounds_is_an_overflow) {
+  Sample(0, 0, 0);
+  Sample(kMillisecond, std::uint64_t{1} << 62, 0);
+  EXPECT_EQ(RaisedBy([&] { load.GetCPUUsage(1); }).number, static_cast<std::uint32_t>(Fault::kOverflow));
 }
 
 TEST_F(CPULoadTest, An_idle_counter_that_moves_as_much_as_the_time_gives_0) {
@@ -209,6 +265,27 @@ TEST_F(CPULoadTest, A_machine_without_versions_has_no_load) {
 
 // The older family.
 
+/// Tells which keys were opened, for what, and which values were read.
+class WatchedRegistry : public platform::simulated::SimulatedRegistry {
+ public:
+  std::vector<std::string> Uses;
+
+  std::uint32_t RegOpenKeyExA(platform::RegistryKey parent, const std::string& path, std::uint32_t access,
+                              platform::RegistryKey& key) override {
+    Uses.push_back("open " + path + (access == 0xF003F ? " wholly" : access == 0x20019 ? " to read" : " ?"));
+    return SimulatedRegistry::RegOpenKeyExA(parent, path, access, key);
+  }
+  std::uint32_t RegQueryValueExA(platform::RegistryKey key, const std::string& name, std::uint32_t& type,
+                                 std::span<std::uint8_t> data, std::uint32_t& size) override {
+    Uses.push_back("read " + name + ", " + std::to_string(size) + " bytes");
+    return SimulatedRegistry::RegQueryValueExA(key, name, type, data, size);
+  }
+  std::uint32_t RegCloseKey(platform::RegistryKey key) override {
+    Uses.emplace_back("close");
+    return SimulatedRegistry::RegCloseKey(key);
+  }
+};
+
 class CPULoadOf9xTest : public testing::Test {
  protected:
   static constexpr const char* kStart = "HKEY_DYN_DATA\\PerfStats\\StartStat";
@@ -275,6 +352,21 @@ TEST_F(CPULoadOf9xTest, The_statistics_key_stays_open_until_the_end_and_then_non
   EXPECT_EQ(OpenKeys(), 1U);
   load.reset();
   EXPECT_EQ(OpenKeys(), 0U);
+}
+
+TEST_F(CPULoadOf9xTest, Reading_a_value_once_switches_the_statistics_on_and_off) {
+  WatchedRegistry registry;
+  for (const char* key : {kStart, kData, kStop})
+    registry.SetValue(key, "KERNEL\\CPUUsage", {3, {9, 0, 0, 0}});
+  const std::string read = "read KERNEL\\CPUUsage, 4 bytes";
+  load.emplace(machine.system, machine.performanceData, registry);
+  load->CollectCPUData();
+  EXPECT_EQ(registry.Uses, (std::vector<std::string>{"open PerfStats\\StartStat wholly", read, "close",
+                                                     "open PerfStats\\StatData to read", read}));
+  registry.Uses.clear();
+  load.reset();
+  EXPECT_EQ(registry.Uses,
+            (std::vector<std::string>{"close", "open PerfStats\\StopStat wholly", read, "close"}));
 }
 
 TEST_F(CPULoadOf9xTest, The_end_is_silent_when_the_statistics_cannot_be_stopped_or_never_ran) {

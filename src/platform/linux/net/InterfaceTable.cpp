@@ -85,6 +85,7 @@ bool InterfaceTable::Read(std::vector<InterfaceRow>& rows) {
   std::vector<Link> links;
   if (!ReadLinks(links)) return false;
   std::ranges::sort(links, {}, [](const Link& link) { return link.row.Get(InterfaceRow::kIndex); });
+  links.resize(std::min(links.size(), kMostRows));
   const Descriptor socket(::socket(AF_INET, SOCK_DGRAM | SOCK_CLOEXEC, 0));
   rows.clear();
   for (Link& link : links) {

@@ -19,8 +19,11 @@ class InterfaceTable {
 
   static constexpr std::uint32_t kUnknownSpeed = 10'000'000;
   static constexpr std::uint64_t kMostSpeed = 0x7FFFFFFF;
-  /// A machine of many links shows the first of them.
+  /// More than any machine has.
   static constexpr std::size_t kMostLinks = 4096;
+  /// A machine of many links, such as one of many containers, shows the first of them: whoever reads the
+  /// table counts its bytes in 16 bits, and would end the program at the next row.
+  static constexpr std::size_t kMostRows = 39;
 
  private:
   static bool ReadLinks(std::vector<Link>& links);
