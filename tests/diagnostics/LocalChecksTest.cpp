@@ -34,6 +34,8 @@ TEST_P(Load, Is_shown_with_two_places_and_fails_above_40) {
 INSTANTIATE_TEST_SUITE_P(Figures, Load,
                          testing::Values(LoadCase{0, u"0.00%", Outcome::Passed},
                                          LoadCase{40, u"40.00%", Outcome::Passed},
+                                         LoadCase{39.996, u"40.00%", Outcome::Passed},
+                                         LoadCase{40.001, u"40.00%", Outcome::Failed},
                                          LoadCase{40.01, u"40.01%", Outcome::Failed},
                                          LoadCase{100, u"100.00%", Outcome::Failed},
                                          LoadCase{1234.5, u"1234.50%", Outcome::Failed},
@@ -146,6 +148,16 @@ TEST_F(Cache, Of_more_than_32767_entries_is_a_fault_before_anything_is_deleted) 
 
   EXPECT_EQ(number, Fault::kOverflow);
   EXPECT_TRUE(machine.urlCache.Deleted.empty());
+}
+
+TEST_F(Cache, Of_32767_entries_is_walked_to_the_last) {
+  machine.urlCache.Entries.assign(32'766, {"Cookie:user@a/"});
+  machine.urlCache.Add("http://a/");
+
+  Run();
+
+  EXPECT_EQ(Detail(1), u"32767/32767");
+  EXPECT_EQ(machine.urlCache.Deleted, (std::vector<std::string>{"", "http://a/"}));
 }
 
 TEST_F(Cache, Of_a_hundred_entries_of_one_name_is_emptied) {

@@ -178,6 +178,17 @@ TEST_F(Trace, A_name_that_cannot_be_resolved_ends_in_the_wrong_all_clear_after_t
   EXPECT_TRUE(IsReady());
 }
 
+TEST_F(Trace, A_name_that_cannot_be_resolved_goes_on_as_long_as_somebody_answers) {
+  machine.icmp.RouteTo("255.255.255.255").Hop("10.0.0.138").Hop("10.1.0.1").SilentHop();
+  EXPECT_EQ(Run(u"no.such.host"),
+            "Tracing to no.such.host ()...|Hop #\t1\t<10 ms\t10.1.0.1||Request timed out!!!");
+}
+
+TEST_F(Trace, A_name_service_that_fails_gives_the_same_all_clear) {
+  machine.hostNames.FailAddresses = true;
+  EXPECT_EQ(Run(), "Tracing to www.example.com ()...||Trace Route Complete");
+}
+
 TEST_F(Trace, Without_the_socket_library_it_says_so_asks_nothing_and_cleans_nothing) {
   machine.sockets.Fail("WSAStartup", 10091);
   form.result.Value = u"before";
