@@ -60,8 +60,8 @@ class TraceLeft : public testing::Test {
   }
   /// Presses the first button of the box that will stand.
   void AnswerBox() {
-    auto* timer = new QTimer(qApp);
-    QObject::connect(timer, &QTimer::timeout, qApp, [this, timer] {
+    auto* timer = new QTimer(&answers_);
+    QObject::connect(timer, &QTimer::timeout, &answers_, [this, timer] {
       auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
       if (!box) return;
       ++boxes;
@@ -100,6 +100,7 @@ class TraceLeft : public testing::Test {
     setenv("XDG_DATA_HOME", (folder_ + "/data").c_str(), 1);
   }
 
+  QObject answers_; ///< what waits for a box goes with the test
   int web_ = -1;
   std::string folder_;
 };

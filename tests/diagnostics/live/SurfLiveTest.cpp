@@ -1,6 +1,7 @@
 #include "diagnostics/live/SurfLiveFixture.h"
 #include "integration/SocketHelpers.h"
 
+#include <iterator>
 #include <sys/mount.h>
 
 namespace quendra::diagnostics {
@@ -132,6 +133,51 @@ TEST_F(SurfLive, The_dialog_of_port_checks_tells_an_answer_a_refusal_and_a_reset
   EXPECT_EQ(dialog.Label6.Caption(), u"ERROR: 10054 - Connection reset by peer.");
 }
 
+std::size_t OpenDescriptors() {
+  const std::filesystem::directory_iterator descriptors("/proc/self/fd");
+  return static_cast<std::size_t>(std::distance(begin(descriptors), end(descriptors)));
+}
+
+TEST_F(SurfLive, The_dialog_of_port_checks_is_closed_in_the_middle_of_its_probes_with_nothing_left_over) {
+  Serve({"80:silent", "25:full", "110:silent"});
+  program->Start();
+  ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));
+  auto& dialog = program->frmPortsChecks;
+  desktop.Show(dialog);
+  ASSERT_TRUE(Await([&] { return dialog.Sockets()->State(std::int16_t{3}) == foundation::sckConnected; }));
+  ASSERT_TRUE(desktop.Click(dialog.Command2));
+  const std::size_t before = OpenDescriptors();
+
+  for (int round = 0; round < 20; ++round) {
+    desktop.Show(dialog);
+    Await([] { return false; }, round % 4);
+    ASSERT_TRUE(desktop.Click(dialog.Command2));
+  }
+
+  // A look-up that was under way ends in its own time.
+  EXPECT_TRUE(Await([&] { return OpenDescriptors() == before; }));
+  EXPECT_EQ(dialog.Sockets(), nullptr);
+  for (const forms::Label* label : {&dialog.Label3, &dialog.Label4, &dialog.Label6})
+    EXPECT_EQ(label->Caption(), u"");
+}
+
+TEST_F(SurfLive, The_page_is_left_in_the_middle_of_each_of_many_runs_with_nothing_left_over) {
+  Serve({"80:answer", "110:silent"});
+  OpenPage();
+  ASSERT_TRUE(AwaitStep(3));
+  ASSERT_TRUE(desktop.Click(program->surfPage.surf_lblBack));
+  const std::size_t before = OpenDescriptors();
+
+  for (int round = 0; round < 20; ++round) {
+    ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[1]));
+    Await([] { return false; }, round % 8);
+    ASSERT_TRUE(desktop.Click(program->surfPage.surf_lblBack));
+  }
+
+  EXPECT_TRUE(Await([&] { return OpenDescriptors() == before; }));
+  EXPECT_EQ(program->surf.surfChecks.Sockets(), nullptr);
+}
+
 /// A system whose only source of names is what the test puts there. The thread and those that it starts see
 /// its files in place of the system's.
 class NameService : public SurfLive {
@@ -191,6 +237,22 @@ TEST_F(NameService, That_never_answers_fails_the_first_check_once_the_system_giv
 
   EXPECT_EQ(Detail(1), u"11002 - Nonauthoritative host not found.");
   EXPECT_EQ(Icon(2), kTick);
+  close(server);
+}
+
+TEST_F(NameService, That_never_answers_does_not_hold_who_leaves_the_page) {
+  const int server = socket(AF_INET, SOCK_DGRAM | SOCK_CLOEXEC, 0);
+  const sockaddr_in place = integration::InetAddress("127.0.0.1", 53);
+  ASSERT_EQ(bind(server, integration::Generic(place), sizeof place), 0);
+  OpenPage();
+  ASSERT_FALSE(Await([&] { return List().Count() > 1; }, 300));
+
+  ASSERT_TRUE(desktop.Click(program->surfPage.surf_lblBack));
+
+  // Longer than the system takes to give the name up: nobody hears of it.
+  EXPECT_FALSE(Await([&] { return List().Count() > 1; }, 3000));
+  EXPECT_EQ(Detail(1), u"");
+  EXPECT_FALSE(program->surfPage.frameSurfProb.Visible());
   close(server);
 }
 
