@@ -74,10 +74,11 @@ std::string Filled(std::string text, const std::string& folder) {
 } // namespace
 
 std::string MailAndWebPeers::Missing() {
+  const std::string advice = " isn't installed; scripts/setup installs it where nothing else serves mail";
   for (const char* program : {"nginx", "dovecot", "smtpd"})
-    if (PathOfProgram(program).empty())
-      return std::string(program) +
-             " isn't installed; scripts/setup installs it where nothing else serves mail";
+    if (PathOfProgram(program).empty()) return program + advice;
+  // A machine may serve mail without this protocol.
+  if (!std::filesystem::exists("/usr/lib/dovecot/pop3-login")) return "dovecot's pop3-login" + advice;
   return {};
 }
 
