@@ -34,6 +34,8 @@ TEST_P(Load, Is_shown_with_two_places_and_fails_above_40) {
 INSTANTIATE_TEST_SUITE_P(Figures, Load,
                          testing::Values(LoadCase{0, u"0.00%", Outcome::Passed},
                                          LoadCase{40, u"40.00%", Outcome::Passed},
+                                         LoadCase{39.996, u"40.00%", Outcome::Passed},
+                                         LoadCase{40.001, u"40.00%", Outcome::Failed},
                                          LoadCase{40.01, u"40.01%", Outcome::Failed},
                                          LoadCase{100, u"100.00%", Outcome::Failed},
                                          LoadCase{1234.5, u"1234.50%", Outcome::Failed},

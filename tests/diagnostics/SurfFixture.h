@@ -8,8 +8,20 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <functional>
 
 namespace quendra::diagnostics {
+
+/// Tells when something is drawn at once: what stands then is what the user sees.
+class WatchedDesktop : public forms::headless::HeadlessDesktop {
+ public:
+  std::function<void(const forms::Control&)> OnRepaint;
+
+  void Repaint(forms::Control& control) override {
+    HeadlessDesktop::Repaint(control);
+    if (OnRepaint) OnRepaint(control);
+  }
+};
 
 /// A whole program on a network whose web and mail servers the test plays.
 class SurfTest : public testing::Test {
@@ -55,6 +67,20 @@ class SurfTest : public testing::Test {
     IncomingMail().Greet("+OK\r\n");
     OutgoingMail().Greet("220 ready\r\n");
   }
+  /// That of a network check, from 1.
+  platform::simulated::SimulatedServer& ServerOf(int step) {
+    switch (step) {
+    case 1: return WebByName();
+    case 2: return WebByAddress();
+    case 3: return IncomingMail();
+    default: return OutgoingMail();
+    }
+  }
+  /// Every server is there. Those of the steps before this one answer, the others accept and wait.
+  void AnswerBefore(int step) {
+    for (int other = 1; other <= 4; ++other)
+      if (auto& server = ServerOf(other); other < step) server.Greet("x");
+  }
   static platform::simulated::SimulatedPeer& Connection(platform::simulated::SimulatedServer& server) {
     return *server.Connections.at(0);
   }
@@ -84,7 +110,7 @@ class SurfTest : public testing::Test {
   const std::string webName = ToUtf8(settings::ProbeWebHost);
   const std::string mailName = ToUtf8(settings::IspMailHost);
 
-  forms::headless::HeadlessDesktop desktop;
+  WatchedDesktop desktop;
   platform::simulated::SimulatedMachine machine{desktop};
   app::Program program{machine.Operations(), desktop};
   shell::frmMenu& menu = program.frmMenu;

@@ -224,22 +224,5 @@ TEST_F(AdvancedPanelTest, What_is_typed_into_the_target_is_mended_and_what_no_ho
   EXPECT_EQ(typed(0x1F600), 0);
 }
 
-TEST_F(SurfPageTest, A_trace_writes_its_report_and_frees_its_button_though_the_page_is_left_meanwhile) {
-  OpenPage();
-  desktop.Click(page.frmSurf_cmdAdvanced);
-  page.advanced.frmSurf_txtping.Value = u"127.0.0.1";
-  desktop.OnYield = [&] {
-    desktop.OnYield = nullptr;
-    checks.surf_StopChecks();
-  };
-
-  desktop.Click(page.advanced.frmSurf_cmdStart);
-
-  EXPECT_FALSE(page.frameSurfProb.Visible());
-  EXPECT_EQ(page.advanced.frmSurf_txtPingResult.Value().substr(0, 10), u"Tracing to");
-  EXPECT_EQ(page.advanced.frmSurf_cmdStart.Caption(), u"התחל");
-  EXPECT_TRUE(page.advanced.frmSurf_cmdStart.Enabled());
-}
-
 } // namespace
 } // namespace quendra::diagnostics

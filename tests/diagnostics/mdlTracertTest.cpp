@@ -5,6 +5,7 @@
 #include "forms/controls/TextBox.h"
 #include "forms/headless/HeadlessDesktop.h"
 #include "platform/simulated/SimulatedMachine.h"
+#include "platform/unavailable/UnavailableSockets.h"
 
 #include <gtest/gtest.h>
 
@@ -23,6 +24,24 @@ struct PanelForm : forms::Form {
 };
 
 const Box kQuestionAtTheEnd{u"המעקב הסתיים. \r\nהאם לשלוח דו\"ח?", 0x180024, u"זלמר בינלאומי@נט"};
+
+/// A socket library that keeps which of its versions was asked for.
+struct AskedSockets : platform::unavailable::UnavailableSockets {
+  std::int32_t WSAStartup(std::uint16_t asked) override {
+    version = asked;
+    return 0;
+  }
+  std::uint16_t version = 0;
+};
+
+/// Names that keep what was asked for.
+struct AskedHostNames : platform::simulated::SimulatedHostNames {
+  std::optional<std::vector<platform::Ipv4Address>> gethostbyname(const std::string& asked) override {
+    name = asked;
+    return SimulatedHostNames::gethostbyname(asked);
+  }
+  std::string name;
+};
 
 /// The panel as its button leaves it, and a web host "www.example.com" at 192.0.2.1.
 class Trace : public testing::Test {
@@ -176,6 +195,27 @@ TEST_F(Trace, A_name_that_cannot_be_resolved_ends_in_the_wrong_all_clear_after_t
   ASSERT_EQ(machine.icmp.Echoes.size(), 1u);
   EXPECT_EQ(machine.icmp.Echoes.front().address, platform::kNoAddress);
   EXPECT_TRUE(IsReady());
+}
+
+TEST_F(Trace, A_name_that_cannot_be_resolved_goes_on_as_long_as_somebody_answers) {
+  machine.icmp.RouteTo("255.255.255.255").Hop("10.0.0.138").Hop("10.1.0.1").SilentHop();
+  EXPECT_EQ(Run(u"no.such.host"),
+            "Tracing to no.such.host ()...|Hop #\t1\t<10 ms\t10.1.0.1||Request timed out!!!");
+}
+
+TEST_F(Trace, A_name_service_that_fails_gives_the_same_all_clear) {
+  machine.hostNames.FailAddresses = true;
+  EXPECT_EQ(Run(), "Tracing to www.example.com ()...||Trace Route Complete");
+}
+
+TEST_F(Trace, It_asks_for_version_1_1_of_the_socket_library_and_for_the_name_with_its_NUL) {
+  AskedSockets sockets;
+  AskedHostNames hostNames;
+
+  mdlTracert({sockets, hostNames, machine.icmp}, desktop, form.start).Trace(u"modem", form.result);
+
+  EXPECT_EQ(sockets.version, 0x0101);
+  EXPECT_EQ(hostNames.name, std::string("modem\0", 6));
 }
 
 TEST_F(Trace, Without_the_socket_library_it_says_so_asks_nothing_and_cleans_nothing) {

@@ -206,6 +206,72 @@ TEST_F(PortsChecks, The_close_button_unloads_the_dialog_and_ends_its_sockets) {
   EXPECT_FALSE(desktop.Ended);
 }
 
+TEST_F(PortsChecks, Is_closed_while_names_are_looked_up_and_connections_tried_with_nothing_left_over) {
+  machine.sockets.NeverAnswer(mailName);
+  OpenDialog();
+  ASSERT_GT(machine.sockets.LookUpsUnderWay(), 0);
+
+  desktop.CloseBox(dialog);
+  Run();
+
+  EXPECT_FALSE(dialog.IsLoaded());
+  EXPECT_EQ(machine.sockets.LookUpsUnderWay(), 0);
+  EXPECT_EQ(machine.sockets.OpenSockets(), 0);
+  EXPECT_EQ(Results(), std::vector<Text>(3));
+}
+
+TEST_F(PortsChecks, Is_closed_while_no_connection_is_answered_with_nothing_left_over) {
+  for (auto* server : {&WebByName(), &OutgoingMail(), &IncomingMail()}) server->StaySilent();
+  OpenDialog();
+  ASSERT_EQ(machine.sockets.OpenSockets(), 3);
+
+  desktop.Click(dialog.Command2);
+  Run();
+
+  EXPECT_EQ(machine.sockets.OpenSockets(), 0);
+}
+
+TEST_F(PortsChecks, Is_closed_as_its_answers_come_and_hears_of_none) {
+  WebByName();
+  OutgoingMail();
+  IncomingMail();
+  OpenDialog();
+  Connection(WebByName()).Send("x");
+  Connection(OutgoingMail()).Reset();
+  Connection(IncomingMail()).Close();
+
+  desktop.Click(dialog.Command2);
+  Run();
+
+  EXPECT_EQ(Results(), std::vector<Text>(3));
+  EXPECT_FALSE(desktop.Ended);
+}
+
+TEST_F(PortsChecks, Goes_with_the_program_that_ends_while_it_stands) {
+  WebByName();
+  desktop.OnModal = [&](forms::Form&) {
+    desktop.RunUntilIdle();
+    desktop.End();
+  };
+
+  OpenDialog();
+
+  EXPECT_TRUE(desktop.Ended);
+  EXPECT_EQ(desktop.EndStatus, 0);
+  EXPECT_TRUE(desktop.Boxes.empty());
+}
+
+TEST_F(PortsChecks, Without_any_socket_left_each_port_shows_its_error_at_once) {
+  machine.sockets.Fail("socket", 10024, 6);
+
+  OpenDialog();
+
+  EXPECT_EQ(Results(), std::vector<Text>(3, u"ERROR: 10024 - Too many open files."));
+  for (const forms::Label* label : {&dialog.Label3, &dialog.Label4, &dialog.Label6})
+    EXPECT_EQ(label->ForeColour(), 255u);
+  EXPECT_TRUE(desktop.Boxes.empty());
+}
+
 TEST_F(PortsChecks, A_dialog_that_was_closed_opens_afresh) {
   WebByName().Refuse();
   OpenDialog();

@@ -1,111 +1,71 @@
-#include "app/Program.h"
-#include "forms/headless/posix/PolledDesktop.h"
-#include "integration/NetworkNamespace.h"
+#include "diagnostics/live/SurfLiveFixture.h"
 #include "integration/SocketHelpers.h"
-#include "platform/linux/LinuxMachine.h"
-#include "report/live/Peer.h"
-#include "runtime/Settings.h"
 
-#include <gtest/gtest.h>
-
+#include <iterator>
 #include <sys/mount.h>
 
 namespace quendra::diagnostics {
 namespace {
 
-/// The whole program on this machine, in a network of its own with nothing but loopback.
-class SurfLive : public testing::Test {
- protected:
-  void SetUp() override {
-    if (!integration::NetworkNamespace::Possible())
-      GTEST_SKIP() << integration::NetworkNamespace::kSkipReason;
-    space_ = std::make_unique<integration::NetworkNamespace>();
-    integration::RunCommand("ip link set lo up");
-    integration::NetworkNamespace::Set("net/ipv4/ip_local_port_range", "1025 5000");
-    // A connection that nobody answers is given up after some three seconds instead of two minutes.
-    integration::NetworkNamespace::Set("net/ipv4/tcp_syn_retries", "1");
-    machine = std::make_unique<platform::linux_::LinuxMachine>(desktop, desktop);
-    program = std::make_unique<app::Program>(machine->Operations(), desktop);
-  }
-  void TearDown() override {
-    program.reset();
-    machine.reset();
-  }
-
-  /// Ports with their manners, as in "80:answer".
-  void Serve(const std::vector<std::string>& ports) {
-    std::vector<std::string> command{"python3", QUENDRA_SOURCE_DIR "/tests/standins/odd_server.py"};
-    command.insert(command.end(), ports.begin(), ports.end());
-    peer_ = std::make_unique<report::Peer>(command);
-    ASSERT_EQ(peer_->FirstLine(), "ready");
-  }
-  void OpenPage() {
-    program->Start();
-    ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));
-    ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[1]));
-  }
-  bool Await(const std::function<bool()>& condition, int milliseconds = 20'000) {
-    return desktop.WaitFor(condition, milliseconds);
-  }
-  /// A step begins when its row stands in the list.
-  bool AwaitStep(int step) {
-    return Await([&] { return List().Count() >= step; });
-  }
-
-  forms::ListView& List() { return program->surfPage.surf_ListView1; }
-  Text Detail(int row) { return List().Row(row).CellText(1); }
-  int Icon(int row) {
-    forms::ListRow& shown = List().Row(row);
-    return shown.CellCount() < 3 ? 0 : shown.CellIcon(3);
-  }
-
- private:
-  std::unique_ptr<integration::NetworkNamespace> space_;
-  std::unique_ptr<report::Peer> peer_;
-
- protected:
-  static constexpr int kTick = 1;
-  static constexpr int kCross = 2;
-  forms::headless::PolledDesktop desktop;
-  std::unique_ptr<platform::linux_::LinuxMachine> machine;
-  std::unique_ptr<app::Program> program;
-};
-
-struct Ending {
-  const char* manner; ///< of the server for incoming mail; none listens without one
+struct Manner {
+  const char* name; ///< what the stand-in calls it; nobody listens without one
   int icon;
   const char16_t* detail;
 };
 
-void PrintTo(const Ending& ending, std::ostream* out) { *out << ending.manner; }
+void PrintTo(const Manner& manner, std::ostream* out) { *out << manner.name; }
 
-/// What becomes of the third check; the fourth waits after it, so that no local check begins.
-class MailServer : public SurfLive, public testing::WithParamInterface<Ending> {};
+const Manner kManners[] = {{"answer", 1, u""},
+                           {"byte", 1, u""},
+                           {"garbage", 1, u""},
+                           {"close", 0, u""},
+                           {"reset", 2, u"10054 - Connection reset by peer."},
+                           {"full", 2, u"10060 - Connection timed out."},
+                           {"", 2, u"10061 - Connection refused."}};
 
-TEST_P(MailServer, Ends_its_check_as_it_behaves) {
-  std::vector<std::string> ports{"80:answer", "25:silent"};
-  if (*GetParam().manner != 0) ports.push_back(std::string("110:") + GetParam().manner);
-  Serve(ports);
+/// A network check and a server of any manner; the check behind it waits, and behind the last one all the
+/// local ones run.
+class LiveCheck : public SurfLive, public testing::WithParamInterface<std::tuple<int, Manner>> {
+ protected:
+  static std::vector<std::string> PortsFor(int step, const std::string& manner) {
+    const auto port = [](const char* number, const std::string& its) {
+      return its.empty() ? std::vector<std::string>() : std::vector<std::string>{number + (":" + its)};
+    };
+    // The web server is asked twice, by its name first; one that isn't there or is full is so both times.
+    const bool isBoth = manner.empty() || manner == "full";
+    if (step == 1) return Joined(port("80", isBoth ? manner : manner + ",silent"), {"110:silent"});
+    if (step == 2) return Joined(port("80", isBoth ? manner : "answer," + manner), {"110:silent"});
+    if (step == 3) return Joined(port("110", manner), {"80:answer", "25:silent"});
+    return Joined(port("25", manner), {"80:answer", "110:answer"});
+  }
+
+ private:
+  static std::vector<std::string> Joined(std::vector<std::string> some,
+                                         const std::vector<std::string>& more) {
+    some.insert(some.end(), more.begin(), more.end());
+    return some;
+  }
+};
+
+TEST_P(LiveCheck, Ends_as_its_server_behaves) {
+  const auto& [step, manner] = GetParam();
+  Serve(PortsFor(step, manner.name));
   OpenPage();
 
-  ASSERT_TRUE(AwaitStep(4));
+  ASSERT_TRUE(AwaitStep(step + 1));
 
-  EXPECT_EQ(Icon(1), kTick);
-  EXPECT_EQ(Icon(2), kTick);
-  EXPECT_EQ(Icon(3), GetParam().icon);
-  EXPECT_EQ(Detail(3), GetParam().detail);
-  EXPECT_EQ(program->surf.surfChecks.FailCount(), GetParam().icon == kCross ? 1 : 0);
+  EXPECT_EQ(Icon(step), manner.icon);
+  EXPECT_EQ(Detail(step), manner.detail);
+  EXPECT_EQ(List().Row(step).CellColour(1), manner.icon == kCross ? 255u : 0u);
+  EXPECT_EQ(program->surf.surfChecks.FailCount() > 0, manner.icon == kCross);
 }
 
-INSTANTIATE_TEST_SUITE_P(Manners, MailServer,
-                         testing::Values(Ending{"answer", 1, u""}, Ending{"byte", 1, u""},
-                                         Ending{"garbage", 1, u""}, Ending{"close", 0, u""},
-                                         Ending{"reset", 2, u"10054 - Connection reset by peer."},
-                                         Ending{"full", 2, u"10060 - Connection timed out."},
-                                         Ending{"", 2, u"10061 - Connection refused."}),
+INSTANTIATE_TEST_SUITE_P(Manners, LiveCheck,
+                         testing::Combine(testing::Values(1, 2, 3, 4), testing::ValuesIn(kManners)),
                          [](const auto& run) {
-                           const std::string manner = run.param.manner;
-                           return manner.empty() ? "none" : manner;
+                           const std::string manner = std::get<1>(run.param).name;
+                           return "Step_" + std::to_string(std::get<0>(run.param)) + "_" +
+                                  (manner.empty() ? "none" : manner);
                          });
 
 TEST_F(SurfLive, A_silent_server_holds_its_step_and_the_window_lives) {
@@ -122,17 +82,25 @@ TEST_F(SurfLive, A_silent_server_holds_its_step_and_the_window_lives) {
   EXPECT_EQ(program->surf.surfChecks.Sockets(), nullptr);
 }
 
-TEST_F(SurfLive, An_old_socket_that_is_reset_fails_the_step_that_waits) {
-  Serve({"80:late,answer", "110:silent", "25:silent"});
+/// The step that waits when the socket of the first one, open since then, is reset.
+class LiveOldSocket : public SurfLive, public testing::WithParamInterface<int> {};
+
+TEST_P(LiveOldSocket, That_is_reset_fails_the_step_that_waits) {
+  const int step = GetParam();
+  Serve({step == 2 ? "80:late,silent" : "80:late,answer", step == 3 ? "110:silent" : "110:answer",
+         "25:silent"});
   OpenPage();
-  ASSERT_TRUE(AwaitStep(3));
+  ASSERT_TRUE(AwaitStep(step));
+  ASSERT_FALSE(Await([&] { return List().Count() > step; }, 500));
 
-  ASSERT_TRUE(AwaitStep(4));
+  ASSERT_TRUE(AwaitStep(step + 1));
 
-  EXPECT_EQ(Detail(3), u"10054 - Connection reset by peer.");
-  EXPECT_EQ(Icon(3), kCross);
+  EXPECT_EQ(Detail(step), u"10054 - Connection reset by peer.");
+  EXPECT_EQ(Icon(step), kCross);
   EXPECT_EQ(Icon(1), kTick);
 }
+
+INSTANTIATE_TEST_SUITE_P(DuringEveryLaterStep, LiveOldSocket, testing::Values(2, 3, 4));
 
 TEST_F(SurfLive, All_eight_checks_come_to_their_end_and_an_old_socket_may_still_fail_after_it) {
   Serve({"80:late,answer", "110:answer", "25:answer"});
@@ -163,6 +131,51 @@ TEST_F(SurfLive, The_dialog_of_port_checks_tells_an_answer_a_refusal_and_a_reset
   EXPECT_EQ(dialog.Label3.Caption(), u"OK! (0.01 KB)");
   EXPECT_EQ(dialog.Label4.Caption(), u"ERROR: 10061 - Connection refused.");
   EXPECT_EQ(dialog.Label6.Caption(), u"ERROR: 10054 - Connection reset by peer.");
+}
+
+std::size_t OpenDescriptors() {
+  const std::filesystem::directory_iterator descriptors("/proc/self/fd");
+  return static_cast<std::size_t>(std::distance(begin(descriptors), end(descriptors)));
+}
+
+TEST_F(SurfLive, The_dialog_of_port_checks_is_closed_in_the_middle_of_its_probes_with_nothing_left_over) {
+  Serve({"80:silent", "25:full", "110:silent"});
+  program->Start();
+  ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));
+  auto& dialog = program->frmPortsChecks;
+  desktop.Show(dialog);
+  ASSERT_TRUE(Await([&] { return dialog.Sockets()->State(std::int16_t{3}) == foundation::sckConnected; }));
+  ASSERT_TRUE(desktop.Click(dialog.Command2));
+  const std::size_t before = OpenDescriptors();
+
+  for (int round = 0; round < 20; ++round) {
+    desktop.Show(dialog);
+    Await([] { return false; }, round % 4);
+    ASSERT_TRUE(desktop.Click(dialog.Command2));
+  }
+
+  // A look-up that was under way ends in its own time.
+  EXPECT_TRUE(Await([&] { return OpenDescriptors() == before; }));
+  EXPECT_EQ(dialog.Sockets(), nullptr);
+  for (const forms::Label* label : {&dialog.Label3, &dialog.Label4, &dialog.Label6})
+    EXPECT_EQ(label->Caption(), u"");
+}
+
+TEST_F(SurfLive, The_page_is_left_in_the_middle_of_each_of_many_runs_with_nothing_left_over) {
+  Serve({"80:answer", "110:silent"});
+  OpenPage();
+  ASSERT_TRUE(AwaitStep(3));
+  ASSERT_TRUE(desktop.Click(program->surfPage.surf_lblBack));
+  const std::size_t before = OpenDescriptors();
+
+  for (int round = 0; round < 20; ++round) {
+    ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[1]));
+    Await([] { return false; }, round % 8);
+    ASSERT_TRUE(desktop.Click(program->surfPage.surf_lblBack));
+  }
+
+  EXPECT_TRUE(Await([&] { return OpenDescriptors() == before; }));
+  EXPECT_EQ(program->surf.surfChecks.Sockets(), nullptr);
 }
 
 /// A system whose only source of names is what the test puts there. The thread and those that it starts see
@@ -224,6 +237,22 @@ TEST_F(NameService, That_never_answers_fails_the_first_check_once_the_system_giv
 
   EXPECT_EQ(Detail(1), u"11002 - Nonauthoritative host not found.");
   EXPECT_EQ(Icon(2), kTick);
+  close(server);
+}
+
+TEST_F(NameService, That_never_answers_does_not_hold_who_leaves_the_page) {
+  const int server = socket(AF_INET, SOCK_DGRAM | SOCK_CLOEXEC, 0);
+  const sockaddr_in place = integration::InetAddress("127.0.0.1", 53);
+  ASSERT_EQ(bind(server, integration::Generic(place), sizeof place), 0);
+  OpenPage();
+  ASSERT_FALSE(Await([&] { return List().Count() > 1; }, 300));
+
+  ASSERT_TRUE(desktop.Click(program->surfPage.surf_lblBack));
+
+  // Longer than the system takes to give the name up: nobody hears of it.
+  EXPECT_FALSE(Await([&] { return List().Count() > 1; }, 3000));
+  EXPECT_EQ(Detail(1), u"");
+  EXPECT_FALSE(program->surfPage.frameSurfProb.Visible());
   close(server);
 }
 

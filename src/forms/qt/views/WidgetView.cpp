@@ -65,6 +65,9 @@ void WidgetView::PlaceAt(const Geometry& geometry) {
 }
 
 void WidgetView::Repaint() {
+  // The toolkit leaves out what is opaque and not due itself, and what was just shown or moved is due only
+  // once the loop runs.
+  for (QWidget* held : widget_.findChildren<QWidget*>()) held->update();
   // What a scroll area shows is its viewport's.
   const auto* area = qobject_cast<QAbstractScrollArea*>(&widget_);
   (area ? *area->viewport() : widget_).repaint();
