@@ -22,7 +22,7 @@ template <typename Value> class Restored {
 
 } // namespace
 
-WindowHandle WindowProcedures::Add(WindowProcedure own) {
+WindowHandle WindowProcedures::Add(const WindowProcedure& own) {
   const WindowHandle window(++last_);
   windows_[window] = {own, own};
   return window;

@@ -24,7 +24,7 @@ class WindowProcedures {
   virtual ~WindowProcedures() = default;
 
   /// A window that answers by this procedure of its own.
-  WindowHandle Add(WindowProcedure own);
+  WindowHandle Add(const WindowProcedure& own);
   /// False for a handle that is no window.
   bool Remove(WindowHandle window);
 

@@ -17,7 +17,10 @@ std::int32_t Signed(const Memory& memory, Memory::Field field) {
   return static_cast<std::int32_t>(memory.Get(field));
 }
 
-Text SizeText(std::int32_t bytes) { return Format(bytes / kKilobyte, u"###,###,###") + u" Kb"; }
+Text SizeText(std::int32_t bytes) {
+  const std::int32_t kilobytes = bytes / kKilobyte; // cut, not rounded
+  return Format(kilobytes, u"###,###,###") + u" Kb";
+}
 
 double Quotient(std::int32_t dividend, std::int32_t divisor) {
   if (divisor == 0) throw Fault(dividend == 0 ? Fault::kOverflow : Fault::kDivision);

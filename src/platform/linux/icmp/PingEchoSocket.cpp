@@ -70,7 +70,7 @@ PingEchoSocket::PingEchoSocket(Descriptor socket) : EchoSocket(std::move(socket)
   sockaddr_in any{};
   any.sin_family = AF_INET;
   socklen_t size = sizeof any;
-  ::bind(Number(), reinterpret_cast<const sockaddr*>(&any), size);
+  if (::bind(Number(), reinterpret_cast<const sockaddr*>(&any), size) != 0) return;
   ::getsockname(Number(), reinterpret_cast<sockaddr*>(&any), &size);
   id_ = ntohs(any.sin_port);
 }

@@ -63,7 +63,8 @@ void SimulatedRegistry::AddKey(const std::string& path) { Made(path); }
 
 void SimulatedRegistry::RemoveKey(const std::string& path) { tree_.RemoveAll(NumberOf(path)); }
 
-void SimulatedRegistry::SetValue(const std::string& path, const std::string& name, RegistryValue value) {
+void SimulatedRegistry::SetValue(const std::string& path, const std::string& name,
+                                 const RegistryValue& value) {
   tree_.Write(Made(path), name, value);
 }
 

@@ -17,7 +17,7 @@ class SimulatedRegistry : public StoredRegistry {
   /// With all below it.
   void RemoveKey(const std::string& path);
   /// Makes the key, too.
-  void SetValue(const std::string& path, const std::string& name, RegistryValue value);
+  void SetValue(const std::string& path, const std::string& name, const RegistryValue& value);
   bool HasKey(const std::string& path) const;
   std::optional<RegistryValue> Value(const std::string& path, const std::string& name);
   /// Whatever is tried on the key gives the error. The key is made if it isn't there.
