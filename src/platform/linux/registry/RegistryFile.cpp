@@ -60,6 +60,22 @@ int OpenDatabase(const std::string& path, Database& database) {
   return PrepareSchema(opened);
 }
 
+/// Empty when another program has kept the lock for too long, or no file for it can be made.
+Descriptor LockBeside(const std::string& path, int kind) {
+  Descriptor lock(
+      ::open((path + ".lock").c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK, 0600));
+  for (int waits = 0; lock && ::flock(lock.Number(), kind | LOCK_NB) != 0; ++waits)
+    if (WaitForOther(nullptr, waits) == 0) return {};
+  return lock;
+}
+
+/// Not while another program puts the file aside, which would take away what belongs to a new one. Where
+/// there can be no lock nothing can be put aside either.
+int OpenUnmoved(const std::string& path, Database& database) {
+  const Descriptor lock = LockBeside(path, LOCK_SH);
+  return OpenDatabase(path, database);
+}
+
 /// Gives the file another name without taking that of a third: false when another program was faster.
 bool RenameToFree(const std::string& path, std::string& name) {
   for (int number = 1; number <= kMostDamagedFiles; ++number) {
@@ -105,8 +121,8 @@ std::uint32_t RegistryFile::Open(sqlite3*& database) {
 std::uint32_t RegistryFile::TryToOpen() {
   if (!MakeFolders(folder_)) return kRegistryAccessDenied;
   if (!IsNoPipeNorDevice(Path())) return kRegistryBroken;
-  int result = OpenDatabase(Path(), database_);
-  if (IsDamage(result) && PutAside()) result = OpenDatabase(Path(), database_);
+  int result = OpenUnmoved(Path(), database_);
+  if (IsDamage(result) && PutAside()) result = OpenUnmoved(Path(), database_);
   if (result != SQLITE_OK) database_.reset();
   return RegistryErrorOf(result);
 }
@@ -122,9 +138,8 @@ bool RegistryFile::PutAside() {
 
 bool RegistryFile::MoveAside(std::string& keptAs) {
   database_.reset();
-  const Descriptor lock(
-      ::open((Path() + ".lock").c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK, 0600));
-  if (!lock || ::flock(lock.Number(), LOCK_EX) != 0) return false;
+  const Descriptor lock = LockBeside(Path(), LOCK_EX);
+  if (!lock) return false;
   // Another program may have put it aside meanwhile.
   Database current;
   if (!IsDamage(OpenDatabase(Path(), current))) return true;
