@@ -1,6 +1,7 @@
 #include "app/Program.h"
 #include "forms/qt/QtDesktop.h"
 #include "integration/RouterChain.h"
+#include "integration/ScratchHome.h"
 #include "integration/SocketHelpers.h"
 #include "platform/linux/LinuxMachine.h"
 
@@ -9,9 +10,6 @@
 #include <QAbstractButton>
 #include <QMessageBox>
 #include <QTimer>
-
-#include <cstdlib>
-#include <filesystem>
 
 namespace quendra::integration {
 
@@ -25,7 +23,6 @@ class TraceLeft : public testing::Test {
     if (!NetworkNamespace::Possible()) GTEST_SKIP() << NetworkNamespace::kSkipReason;
     chain = std::make_unique<RouterChain>(3, [](const Bytes&) { return SlowLink::Passing{100}; });
     ListenSilently();
-    MakeFolder();
     qputenv("QT_QPA_PLATFORM", "offscreen");
     desktop = std::make_unique<forms::qt::QtDesktop>("integration_test");
     machine = std::make_unique<platform::linux_::LinuxMachine>(*desktop, *desktop);
@@ -37,7 +34,6 @@ class TraceLeft : public testing::Test {
     desktop.reset();
     chain.reset();
     if (web_ >= 0) close(web_);
-    if (!folder_.empty()) std::filesystem::remove_all(folder_);
   }
 
   /// Starts a trace, in which the user does something as soon as the first echo has come back. Gives the
@@ -91,18 +87,9 @@ class TraceLeft : public testing::Test {
     Check(bind(web_, Generic(place), sizeof place), "bind");
     Check(listen(web_, 8), "listen");
   }
-  /// Caches and registry of the user stay out of it.
-  void MakeFolder() {
-    std::string pattern = testing::TempDir() + "quendra-trace-XXXXXX";
-    if (!mkdtemp(pattern.data())) throw std::runtime_error("no temporary folder");
-    folder_ = pattern;
-    setenv("XDG_CACHE_HOME", (folder_ + "/caches").c_str(), 1);
-    setenv("XDG_DATA_HOME", (folder_ + "/data").c_str(), 1);
-  }
-
   QObject answers_; ///< what waits for a box goes with the test
   int web_ = -1;
-  std::string folder_;
+  ScratchHome home_;
 };
 
 } // namespace

@@ -1,15 +1,18 @@
 #include "shell/MonitorPage.h"
 
 #include "forms/view/Accessible.h"
+#include "platform/PassedOnSystem.h"
+#include "platform/ReplacedFamilies.h"
 #include "shell/ProgramFixture.h"
 
 namespace quendra::shell {
 namespace {
 
 /// Writes what the page's start asks of the machine and does to the table into one list.
-class Recorder : public forms::ListViewObserver, public platform::HostNames, public platform::System {
+class Recorder : public forms::ListViewObserver, public platform::HostNames, public platform::PassedOnSystem {
  public:
-  explicit Recorder(platform::simulated::SimulatedMachine& machine) : machine_(machine) {}
+  explicit Recorder(platform::simulated::SimulatedMachine& machine)
+      : PassedOnSystem(machine.system), machine_(machine) {}
 
   std::vector<std::string>& Lines() { return machine_.Calls; }
   void StartOver() {
@@ -33,20 +36,9 @@ class Recorder : public forms::ListViewObserver, public platform::HostNames, pub
   }
   std::int32_t LastError() override { return machine_.hostNames.LastError(); }
 
-  std::uint32_t GetTickCount() override { return machine_.system.GetTickCount(); }
-  bool GetVersionExA(platform::OsVersion& version) override { return machine_.system.GetVersionExA(version); }
-  void Sleep(std::uint32_t milliseconds) override { machine_.system.Sleep(milliseconds); }
-  void GetSystemInfo(platform::SystemInfo& info) override { machine_.system.GetSystemInfo(info); }
-  void GlobalMemoryStatus(platform::MemoryStatus& status) override {
-    machine_.system.GlobalMemoryStatus(status);
-  }
-  bool SystemTimeToFileTime(std::span<const std::uint8_t, 16> systemTime, std::uint64_t& fileTime) override {
-    return machine_.system.SystemTimeToFileTime(systemTime, fileTime);
-  }
-  std::int32_t SecondOfDay() override { return machine_.system.SecondOfDay(); }
   std::int32_t DayNumber() override {
     Note("day number");
-    return machine_.system.DayNumber();
+    return PassedOnSystem::DayNumber();
   }
 
  private:
@@ -70,12 +62,8 @@ TEST_F(MonitorPageSwitchTest,
        The_start_sets_up_table_and_sockets_reads_the_addresses_seeds_the_tick_makes_a_pass_and_captures) {
   machine.AddProcess({100, 1, "one.exe", ""});
   Recorder recorder(machine);
-  const platform::Machine original = machine.Operations();
-  app::Program other({original.captureControls, original.captureLibrary, original.handles, recorder,
-                      original.icmp, original.icons, original.ipHelper, original.keyboardLayout,
-                      original.performanceData, original.processes, original.registry, original.shellStart,
-                      original.sockets, recorder, original.tokens, original.urlCache, original.versionInfo},
-                     desktop);
+  app::Program other(
+      platform::WithReplaced(machine.Operations(), {.hostNames = &recorder, .system = &recorder}), desktop);
   other.Start();
   desktop.Click(other.frmSplash.Label2);
   desktop.Click(other.frmMenu.lblCaption[0]);

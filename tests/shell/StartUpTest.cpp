@@ -1,3 +1,5 @@
+#include "platform/PassedOnSystem.h"
+#include "platform/ReplacedFamilies.h"
 #include "shell/ProgramFixture.h"
 
 namespace quendra::shell {
@@ -10,26 +12,16 @@ class StartUp : public ProgramTest {
 };
 
 /// Writes down when the load asks for what, in one order with the desktop's calls.
-class RecordingSystem : public platform::System {
+class RecordingSystem : public platform::PassedOnSystem {
  public:
   RecordingSystem(platform::System& system, forms::headless::HeadlessDesktop& desktop)
-      : system_(system), desktop_(desktop) {}
-  std::uint32_t GetTickCount() override { return system_.GetTickCount(); }
+      : PassedOnSystem(system), desktop_(desktop) {}
   bool GetVersionExA(platform::OsVersion& version) override {
     desktop_.Calls.push_back("GetVersionExA");
-    return system_.GetVersionExA(version);
+    return PassedOnSystem::GetVersionExA(version);
   }
-  void Sleep(std::uint32_t milliseconds) override { system_.Sleep(milliseconds); }
-  void GetSystemInfo(platform::SystemInfo& info) override { system_.GetSystemInfo(info); }
-  void GlobalMemoryStatus(platform::MemoryStatus& status) override { system_.GlobalMemoryStatus(status); }
-  bool SystemTimeToFileTime(std::span<const std::uint8_t, 16> systemTime, std::uint64_t& fileTime) override {
-    return system_.SystemTimeToFileTime(systemTime, fileTime);
-  }
-  std::int32_t DayNumber() override { return system_.DayNumber(); }
-  std::int32_t SecondOfDay() override { return system_.SecondOfDay(); }
 
  private:
-  platform::System& system_;
   forms::headless::HeadlessDesktop& desktop_;
 };
 
@@ -54,25 +46,7 @@ TEST_F(StartUp, The_load_opens_the_capture_library_and_makes_the_control_and_doe
 
 TEST_F(StartUp, The_load_reads_the_version_before_it_stores_the_cursor_and_starts_no_timer) {
   RecordingSystem system(machine.system, desktop);
-  const platform::Machine original = machine.Operations();
-  const platform::Machine recorded{original.captureControls,
-                                   original.captureLibrary,
-                                   original.handles,
-                                   original.hostNames,
-                                   original.icmp,
-                                   original.icons,
-                                   original.ipHelper,
-                                   original.keyboardLayout,
-                                   original.performanceData,
-                                   original.processes,
-                                   original.registry,
-                                   original.shellStart,
-                                   original.sockets,
-                                   system,
-                                   original.tokens,
-                                   original.urlCache,
-                                   original.versionInfo};
-  app::Program other(recorded, desktop);
+  app::Program other(platform::WithReplaced(machine.Operations(), {.system = &system}), desktop);
   other.Start();
   desktop.Calls.clear();
   desktop.Click(other.frmSplash.Label2);

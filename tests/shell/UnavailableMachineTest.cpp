@@ -1,6 +1,7 @@
 #include "platform/unavailable/UnavailableMachine.h"
 
 #include "capture/CaptureState.h"
+#include "platform/ReplacedFamilies.h"
 #include "shell/ProgramFixture.h"
 
 namespace quendra::shell {
@@ -25,24 +26,7 @@ class UnavailableMachineTest : public testing::Test {
   }
   /// The machine with sockets of another.
   platform::Machine WithSockets(platform::Sockets& sockets) {
-    const platform::Machine all = machine.Operations();
-    return {all.captureControls,
-            all.captureLibrary,
-            all.handles,
-            all.hostNames,
-            all.icmp,
-            all.icons,
-            all.ipHelper,
-            all.keyboardLayout,
-            all.performanceData,
-            all.processes,
-            all.registry,
-            all.shellStart,
-            sockets,
-            all.system,
-            all.tokens,
-            all.urlCache,
-            all.versionInfo};
+    return platform::WithReplaced(machine.Operations(), {.sockets = &sockets});
   }
 
   platform::unavailable::UnavailableMachine machine;

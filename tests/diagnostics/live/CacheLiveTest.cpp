@@ -1,14 +1,13 @@
 #include "app/Program.h"
 #include "forms/headless/posix/PolledDesktop.h"
+#include "integration/ScratchHome.h"
 #include "platform/linux/LinuxMachine.h"
 #include "platform/linux/internet/CacheFilesFixture.h"
 
 #include <gtest/gtest.h>
 
-#include <cstdlib>
 #include <filesystem>
 #include <fstream>
-#include <stdexcept>
 
 namespace quendra::diagnostics {
 namespace {
@@ -23,10 +22,9 @@ class CacheLive : public testing::Test {
     files::create_directories(Chromium());
     rows.Add(u"cache", u"");
   }
-  ~CacheLive() override { files::remove_all(folder); }
 
-  std::string Firefox() const { return folder + "/cache/mozilla/firefox/a.default/cache2/entries/"; }
-  std::string Chromium() const { return folder + "/cache/chromium/Default/Cache/Cache_Data/"; }
+  std::string Firefox() const { return folder + "/caches/mozilla/firefox/a.default/cache2/entries/"; }
+  std::string Chromium() const { return folder + "/caches/chromium/Default/Cache/Cache_Data/"; }
   /// The name of an entry's file, by number.
   static std::string Digits(std::size_t length, int number) {
     const std::string digits = std::to_string(number);
@@ -40,7 +38,7 @@ class CacheLive : public testing::Test {
   }
   int FileCount() const {
     int count = 0;
-    for (const auto& entry : files::recursive_directory_iterator(folder + "/cache"))
+    for (const auto& entry : files::recursive_directory_iterator(folder + "/caches"))
       count += entry.is_regular_file() ? 1 : 0;
     return count;
   }
@@ -54,18 +52,8 @@ class CacheLive : public testing::Test {
     ASSERT_TRUE(desktop.WaitFor([&] { return hasRun || desktop.Ended; }, 30'000));
   }
 
- private:
-  /// The folder, which the machine below takes from its environment.
-  static std::string MakeFolder() {
-    std::string pattern = testing::TempDir() + "quendra-cache-XXXXXX";
-    if (!::mkdtemp(pattern.data())) throw std::runtime_error("no temporary folder");
-    ::setenv("XDG_CACHE_HOME", (pattern + "/cache").c_str(), 1);
-    ::setenv("XDG_DATA_HOME", (pattern + "/data").c_str(), 1);
-    return pattern;
-  }
-
- protected:
-  const std::string folder = MakeFolder();
+  const integration::ScratchHome home;
+  const std::string& folder = home.Path();
   forms::headless::PolledDesktop desktop;
   platform::linux_::LinuxMachine machine{desktop, desktop};
   app::Program program{machine.Operations(), desktop};

@@ -62,15 +62,9 @@ TEST_F(RealPeers, Answer_the_four_checks_and_take_their_requests_for_what_they_a
 }
 
 TEST_F(RealPeers, Answer_the_dialog_of_port_checks_with_their_whole_greetings) {
-  program->Start();
-  ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));
-  auto& dialog = program->frmPortsChecks;
-  desktop.Show(dialog);
+  const frmPortsChecks& dialog = OpenPortsDialog();
 
-  ASSERT_TRUE(Await([&] {
-    return !dialog.Label3.Caption().empty() && !dialog.Label4.Caption().empty() &&
-           !dialog.Label6.Caption().empty();
-  }));
+  ASSERT_TRUE(Await([&] { return HasAllResults(dialog); }));
 
   EXPECT_TRUE(dialog.Label3.Caption().starts_with(u"OK! (0.")) << ToUtf8(dialog.Label3.Caption());
   EXPECT_EQ(dialog.Label4.Caption(), u"OK! (0.03 KB)"); // "220 mail.test ESMTP" and the server's name

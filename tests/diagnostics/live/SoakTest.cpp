@@ -1,13 +1,18 @@
 #include "app/Program.h"
+#include "diagnostics/live/HurriedSystem.h"
+#include "diagnostics/live/PortsDialog.h"
 #include "forms/headless/posix/PolledDesktop.h"
-#include "integration/NetworkNamespace.h"
+#include "integration/LoopbackNetwork.h"
+#include "integration/ScratchHome.h"
 #include "integration/Steady.h"
+#include "platform/ReplacedFamilies.h"
 #include "platform/linux/LinuxMachine.h"
-#include "platform/linux/system/LinuxSystem.h"
 #include "platform/simulated/SimulatedMachine.h"
 #include "report/live/Peer.h"
 
 #include <gtest/gtest.h>
+
+#include <optional>
 
 namespace quendra::diagnostics {
 namespace {
@@ -17,23 +22,14 @@ using platform::Machine;
 constexpr int kOrdinaryRun = 200;
 constexpr int kWaitMilliseconds = 20'000;
 
-/// This system, save that nobody waits.
-class ImpatientSystem : public platform::linux_::LinuxSystem {
- public:
-  void Sleep(std::uint32_t) override {}
-};
-
 /// The whole program with real sockets and names, in a network of its own whose web and mail servers answer.
 class Soak : public testing::Test {
  protected:
   void SetUp() override {
     if (!integration::NetworkNamespace::Possible())
       GTEST_SKIP() << integration::NetworkNamespace::kSkipReason;
-    space_ = std::make_unique<integration::NetworkNamespace>();
-    integration::RunCommand("ip link set lo up");
-    integration::NetworkNamespace::Set("net/ipv4/ip_local_port_range", "1025 5000");
-    MakeFolder();
-    for (const auto& server : {Words{"support_server.py", "80", "--reports", folder_ + "/reports"},
+    network_.emplace();
+    for (const auto& server : {Words{"support_server.py", "80", "--reports", home_.Path() + "/reports"},
                                Words{"mail_greeter.py", "pop3"}, Words{"mail_greeter.py", "smtp"}})
       StartServer(server);
     here = std::make_unique<platform::linux_::LinuxMachine>(desktop, desktop);
@@ -43,27 +39,17 @@ class Soak : public testing::Test {
     if (program) desktop.CloseBox(program->frmMenu);
     program.reset();
     here.reset();
-    if (!folder_.empty()) std::filesystem::remove_all(folder_);
   }
 
   /// A machine that stands still, so that nothing but the program can grow.
   Machine QuietMachine() {
-    const Machine given = quiet.Operations();
     const Machine real = here->Operations();
-    return {given.captureControls, given.captureLibrary, given.handles,
-            real.hostNames,        given.icmp,           given.icons,
-            given.ipHelper,        given.keyboardLayout, given.performanceData,
-            given.processes,       given.registry,       given.shellStart,
-            real.sockets,          given.system,         given.tokens,
-            given.urlCache,        given.versionInfo};
+    return platform::WithReplaced(quiet.Operations(),
+                                  {.hostNames = &real.hostNames, .sockets = &real.sockets});
   }
   Machine ThisMachine() {
-    const Machine real = here->Operations();
-    return {
-        real.captureControls, real.captureLibrary, real.handles,        real.hostNames,       real.icmp,
-        real.icons,           real.ipHelper,       real.keyboardLayout, real.performanceData, real.processes,
-        real.registry,        real.shellStart,     real.sockets,        impatient_,           real.tokens,
-        real.urlCache,        real.versionInfo};
+    hurried_.emplace(here->Operations().system);
+    return platform::WithReplaced(here->Operations(), {.system = &*hurried_});
   }
   void Start(const Machine& machine) {
     program = std::make_unique<app::Program>(machine, desktop);
@@ -101,14 +87,6 @@ class Soak : public testing::Test {
  private:
   using Words = std::vector<std::string>;
 
-  /// The checks empty the caches of the user's browsers and write the registry: those of this folder.
-  void MakeFolder() {
-    std::string pattern = testing::TempDir() + "quendra-soak-XXXXXX";
-    if (!mkdtemp(pattern.data())) throw std::runtime_error("no temporary folder");
-    folder_ = pattern;
-    setenv("XDG_CACHE_HOME", (folder_ + "/caches").c_str(), 1);
-    setenv("XDG_DATA_HOME", (folder_ + "/data").c_str(), 1);
-  }
   void StartServer(const Words& words) {
     Words command{"python3", QUENDRA_SOURCE_DIR "/tests/standins/" + words.front()};
     command.insert(command.end(), words.begin() + 1, words.end());
@@ -126,10 +104,11 @@ class Soak : public testing::Test {
     quiet.performanceData.SetProcessors({{u"0", 5}}, 1);
   }
 
-  std::unique_ptr<integration::NetworkNamespace> space_;
-  std::string folder_;
+  std::optional<integration::LoopbackNetwork> network_;
+  /// The checks empty the caches of the user's browsers and write the registry.
+  integration::ScratchHome home_;
   std::vector<std::unique_ptr<report::Peer>> servers_;
-  ImpatientSystem impatient_;
+  std::optional<HurriedSystem> hurried_;
 
  protected:
   forms::headless::PolledDesktop desktop;
@@ -157,11 +136,7 @@ TEST_F(Soak, Openings_of_each_dialog_leave_memory_and_descriptors_as_they_were) 
     auto& ports = program->frmPortsChecks;
     const bool isPorts = &form == &ports;
     desktop.Advance(50);
-    const auto all = [&] {
-      return !ports.Label3.Caption().empty() && !ports.Label4.Caption().empty() &&
-             !ports.Label6.Caption().empty();
-    };
-    EXPECT_TRUE(!isPorts || desktop.WaitFor(all, kWaitMilliseconds));
+    EXPECT_TRUE(!isPorts || desktop.WaitFor([&] { return HasAllResults(ports); }, kWaitMilliseconds));
     closed += desktop.Click(isPorts ? ports.Command2 : program->frmMemInfo.cmdClose);
   };
 

@@ -1,39 +1,21 @@
 #pragma once
 
 #include "app/Program.h"
+#include "diagnostics/live/HurriedSystem.h"
+#include "diagnostics/live/PortsDialog.h"
 #include "forms/headless/posix/PolledDesktop.h"
-#include "integration/NetworkNamespace.h"
+#include "integration/LoopbackNetwork.h"
+#include "integration/ScratchHome.h"
+#include "platform/ReplacedFamilies.h"
 #include "platform/linux/LinuxMachine.h"
-#include "platform/system/System.h"
 #include "report/live/Peer.h"
 #include "runtime/Settings.h"
 
 #include <gtest/gtest.h>
 
-#include <cstdlib>
-#include <filesystem>
+#include <optional>
 
 namespace quendra::diagnostics {
-
-/// A machine's clock and memory, with pauses that take no time: the measurements' three seconds are theirs.
-class HurriedSystem : public platform::System {
- public:
-  explicit HurriedSystem(platform::System& system) : system_(system) {}
-
-  std::uint32_t GetTickCount() override { return system_.GetTickCount(); }
-  bool GetVersionExA(platform::OsVersion& version) override { return system_.GetVersionExA(version); }
-  void Sleep(std::uint32_t) override {}
-  void GetSystemInfo(platform::SystemInfo& info) override { system_.GetSystemInfo(info); }
-  void GlobalMemoryStatus(platform::MemoryStatus& status) override { system_.GlobalMemoryStatus(status); }
-  bool SystemTimeToFileTime(std::span<const std::uint8_t, 16> systemTime, std::uint64_t& fileTime) override {
-    return system_.SystemTimeToFileTime(systemTime, fileTime);
-  }
-  std::int32_t DayNumber() override { return system_.DayNumber(); }
-  std::int32_t SecondOfDay() override { return system_.SecondOfDay(); }
-
- private:
-  platform::System& system_;
-};
 
 /// The whole program on this machine, in a network of its own with nothing but loopback.
 class SurfLive : public testing::Test {
@@ -41,20 +23,17 @@ class SurfLive : public testing::Test {
   void SetUp() override {
     if (!integration::NetworkNamespace::Possible())
       GTEST_SKIP() << integration::NetworkNamespace::kSkipReason;
-    space_ = std::make_unique<integration::NetworkNamespace>();
-    integration::RunCommand("ip link set lo up");
-    integration::NetworkNamespace::Set("net/ipv4/ip_local_port_range", "1025 5000");
+    network_.emplace();
     // A connection that nobody answers is given up after some three seconds instead of two minutes.
     integration::NetworkNamespace::Set("net/ipv4/tcp_syn_retries", "1");
-    MakeFolder();
     machine = std::make_unique<platform::linux_::LinuxMachine>(desktop, desktop);
     hurried_ = std::make_unique<HurriedSystem>(machine->Operations().system);
-    program = std::make_unique<app::Program>(HurriedMachine(), desktop);
+    program = std::make_unique<app::Program>(
+        platform::WithReplaced(machine->Operations(), {.system = hurried_.get()}), desktop);
   }
   void TearDown() override {
     program.reset();
     machine.reset();
-    if (!folder.empty()) std::filesystem::remove_all(folder);
   }
 
   /// Ports with their manners, as in "80:answer".
@@ -84,31 +63,23 @@ class SurfLive : public testing::Test {
     return shown.CellCount() < 3 ? 0 : shown.CellIcon(3);
   }
 
+  frmPortsChecks& OpenPortsDialog() {
+    program->Start();
+    EXPECT_TRUE(desktop.Click(program->frmSplash.Label2));
+    desktop.Show(program->frmPortsChecks);
+    return program->frmPortsChecks;
+  }
+
  private:
-  /// The fifth check empties the caches of the user's browsers and writes the registry: those of this folder.
-  void MakeFolder() {
-    std::string pattern = testing::TempDir() + "quendra-surf-XXXXXX";
-    if (!mkdtemp(pattern.data())) throw std::runtime_error("no temporary folder");
-    folder = pattern;
-    setenv("XDG_CACHE_HOME", (folder + "/caches").c_str(), 1);
-    setenv("XDG_DATA_HOME", (folder + "/data").c_str(), 1);
-  }
-
-  platform::Machine HurriedMachine() {
-    const platform::Machine own = machine->Operations();
-    return {own.captureControls, own.captureLibrary, own.handles,        own.hostNames,       own.icmp,
-            own.icons,           own.ipHelper,       own.keyboardLayout, own.performanceData, own.processes,
-            own.registry,        own.shellStart,     own.sockets,        *hurried_,           own.tokens,
-            own.urlCache,        own.versionInfo};
-  }
-
-  std::unique_ptr<integration::NetworkNamespace> space_;
+  std::optional<integration::LoopbackNetwork> network_;
+  /// The fifth check empties the caches of the user's browsers and writes the registry.
+  integration::ScratchHome home_;
   std::unique_ptr<report::Peer> peer_;
 
  protected:
   static constexpr int kTick = 1;
   static constexpr int kCross = 2;
-  std::string folder;
+  const std::string& folder = home_.Path();
   forms::headless::PolledDesktop desktop;
   std::unique_ptr<platform::linux_::LinuxMachine> machine;
 

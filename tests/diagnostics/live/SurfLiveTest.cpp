@@ -118,15 +118,9 @@ TEST_F(SurfLive, All_eight_checks_come_to_their_end_and_an_old_socket_may_still_
 
 TEST_F(SurfLive, The_dialog_of_port_checks_tells_an_answer_a_refusal_and_a_reset_apart) {
   Serve({"80:answer", "110:reset"});
-  program->Start();
-  ASSERT_TRUE(desktop.Click(program->frmSplash.Label2));
-  auto& dialog = program->frmPortsChecks;
-  desktop.Show(dialog);
+  const frmPortsChecks& dialog = OpenPortsDialog();
 
-  ASSERT_TRUE(Await([&] {
-    return !dialog.Label3.Caption().empty() && !dialog.Label4.Caption().empty() &&
-           !dialog.Label6.Caption().empty();
-  }));
+  ASSERT_TRUE(Await([&] { return HasAllResults(dialog); }));
 
   EXPECT_EQ(dialog.Label3.Caption(), u"OK! (0.01 KB)");
   EXPECT_EQ(dialog.Label4.Caption(), u"ERROR: 10061 - Connection refused.");

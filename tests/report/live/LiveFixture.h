@@ -2,7 +2,8 @@
 
 #include "app/Program.h"
 #include "forms/headless/posix/PolledDesktop.h"
-#include "integration/NetworkNamespace.h"
+#include "integration/LoopbackNetwork.h"
+#include "integration/ScratchHome.h"
 #include "platform/linux/LinuxMachine.h"
 #include "report/SupportRequests.h"
 #include "report/live/Peer.h"
@@ -12,6 +13,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <optional>
 
 namespace quendra::report {
 
@@ -21,12 +23,7 @@ class LiveReportTest : public testing::Test {
   void SetUp() override {
     if (!integration::NetworkNamespace::Possible())
       GTEST_SKIP() << integration::NetworkNamespace::kSkipReason;
-    space_ = std::make_unique<integration::NetworkNamespace>();
-    integration::RunCommand("ip link set lo up");
-    integration::NetworkNamespace::Set("net/ipv4/ip_local_port_range", "1025 5000");
-    std::string pattern = testing::TempDir() + "quendra-report-XXXXXX";
-    if (!mkdtemp(pattern.data())) throw std::runtime_error("no temporary folder");
-    folder = pattern;
+    network_.emplace();
     // Servers that drop their rights write here.
     std::filesystem::permissions(folder, std::filesystem::perms::all);
     machine = std::make_unique<platform::linux_::LinuxMachine>(desktop, desktop);
@@ -36,7 +33,6 @@ class LiveReportTest : public testing::Test {
     if (program && program->monitorPage.frameMain.Visible()) desktop.CloseBox(program->frmMenu);
     program.reset();
     machine.reset();
-    if (!folder.empty()) std::filesystem::remove_all(folder);
   }
 
   void OpenPage() {
@@ -90,10 +86,11 @@ class LiveReportTest : public testing::Test {
   const Text kFailure = u"בעיה בשליחת הדו\"ח!";
 
  private:
-  std::unique_ptr<integration::NetworkNamespace> space_;
+  std::optional<integration::LoopbackNetwork> network_;
+  integration::ScratchHome home_;
 
  protected:
-  std::string folder;
+  const std::string& folder = home_.Path();
   std::string bodySent;
   forms::headless::PolledDesktop desktop;
   std::unique_ptr<platform::linux_::LinuxMachine> machine;

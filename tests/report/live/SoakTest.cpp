@@ -1,4 +1,5 @@
 #include "integration/Steady.h"
+#include "platform/ReplacedFamilies.h"
 #include "platform/simulated/SimulatedMachine.h"
 #include "report/live/LiveFixture.h"
 
@@ -16,13 +17,9 @@ class Soak : public LiveReportTest {
   void OpenQuietPage() {
     for (std::uint32_t id = 1; id <= 60; ++id)
       quiet.AddProcess({id, 0, "a process, number " + std::to_string(id) + ".exe", ""});
-    const platform::Machine given = quiet.Operations();
     const platform::Machine real = machine->Operations();
     program = std::make_unique<app::Program>(
-        platform::Machine{given.captureControls, given.captureLibrary, given.handles, real.hostNames,
-                          given.icmp, given.icons, given.ipHelper, given.keyboardLayout,
-                          given.performanceData, given.processes, given.registry, given.shellStart,
-                          real.sockets, given.system, given.tokens, given.urlCache, given.versionInfo},
+        platform::WithReplaced(quiet.Operations(), {.hostNames = &real.hostNames, .sockets = &real.sockets}),
         desktop);
     quiet.AddCaptureAdapter({"lo", "Loopback", "127.0.0.1"});
     OpenPage();

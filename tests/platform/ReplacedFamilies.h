@@ -1,0 +1,34 @@
+#pragma once
+
+#include "platform/Machine.h"
+
+namespace quendra::platform {
+
+/// What a test puts in the place of a machine's families; nullptr leaves the machine its own.
+struct Replacements {
+  HostNames* hostNames = nullptr;
+  Sockets* sockets = nullptr;
+  System* system = nullptr;
+};
+
+inline Machine WithReplaced(const Machine& own, const Replacements& by) {
+  return {own.captureControls,
+          own.captureLibrary,
+          own.handles,
+          by.hostNames ? *by.hostNames : own.hostNames,
+          own.icmp,
+          own.icons,
+          own.ipHelper,
+          own.keyboardLayout,
+          own.performanceData,
+          own.processes,
+          own.registry,
+          own.shellStart,
+          by.sockets ? *by.sockets : own.sockets,
+          by.system ? *by.system : own.system,
+          own.tokens,
+          own.urlCache,
+          own.versionInfo};
+}
+
+} // namespace quendra::platform
