@@ -11,13 +11,16 @@ give_back() {
   fi
 }
 
+# What configure_and_build hands to CMake beside the preset.
+cmake_options=()
+
 # configure_and_build PRESET [TARGET...]: says nothing where all is well, and the whole log where it is not.
 configure_and_build() {
   local preset=$1
   shift
   local log=build/$preset-configure.log
   mkdir -p build
-  if ! cmake --preset "$preset" >"$log" 2>&1; then
+  if ! cmake --preset "$preset" "${cmake_options[@]}" >"$log" 2>&1; then
     cat "$log" >&2
     return 1
   fi

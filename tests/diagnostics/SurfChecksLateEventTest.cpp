@@ -5,9 +5,6 @@
 namespace quendra::diagnostics {
 namespace {
 
-constexpr const char16_t* kEnd = u"הסתיים";
-constexpr const char16_t* kReset = u"10054 - Connection reset by peer.";
-
 /// A socket of a step that has ended, open since then, and the step that waits when something comes of it.
 struct Pair {
   int old;

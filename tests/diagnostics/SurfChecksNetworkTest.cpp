@@ -21,7 +21,6 @@ void PrintTo(const Manner& manner, std::ostream* out) { *out << manner.name; }
 constexpr int kNone = 0;
 constexpr int kTick = 1;
 constexpr int kCross = 2;
-constexpr const char16_t* kReset = u"10054 - Connection reset by peer.";
 
 const Manner kManners[] = {
     {"Refuses", [](auto& server) { server.Refuse(); }, true, kCross, u"10061 - Connection refused."},

@@ -17,7 +17,6 @@ const std::vector<Text> kCaptions = {
     u"ניצולת רשת",
     u"תוכנות שיתוף קבצים",
 };
-constexpr const char16_t* kEnd = u"הסתיים";
 
 TEST_F(SurfChecksTest, The_first_check_begins_when_the_page_opens_before_the_frame_is_shown) {
   ComeHome();

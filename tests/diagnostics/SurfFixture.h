@@ -12,6 +12,10 @@
 
 namespace quendra::diagnostics {
 
+/// The caption of the list's last row, and what the details say of a connection that was reset.
+inline constexpr const char16_t* kEnd = u"הסתיים";
+inline constexpr const char16_t* kReset = u"10054 - Connection reset by peer.";
+
 /// Tells when something is drawn at once: what stands then is what the user sees.
 class WatchedDesktop : public forms::headless::HeadlessDesktop {
  public:

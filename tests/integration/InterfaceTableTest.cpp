@@ -6,9 +6,9 @@
 #include "runtime/Text.h"
 
 #include <gtest/gtest.h>
+#include <linux/if_packet.h>
 #include <net/if.h>
 #include <netinet/in.h>
-#include <netpacket/packet.h>
 #include <sys/socket.h>
 
 #include <array>

@@ -6,8 +6,8 @@ namespace quendra::monitor {
 
 namespace {
 
-const char16_t* kTcp = u"\\Device\\Tcp";
-const char16_t* kUdp = u"\\Device\\Udp";
+const char16_t* kTcpDevice = u"\\Device\\Tcp";
+const char16_t* kUdpDevice = u"\\Device\\Udp";
 
 struct SocketHandles : MonitorFixture {
   SocketHandles() {
@@ -25,7 +25,7 @@ struct SocketHandles : MonitorFixture {
 struct OddHandles : platform::Handles {
   std::vector<std::uint32_t> TableStatuses{kStatusInfoLengthMismatch, 0};
   std::uint32_t Count = 1;
-  std::u16string Name = kTcp;
+  std::u16string Name = kTcpDevice;
   std::uint32_t NameStatus = 0;
   std::array<std::uint8_t, 2> Port{0, 80};
   std::uint32_t DriverStatus = 0;
@@ -101,8 +101,8 @@ TEST_F(SocketHandles, The_table_is_asked_for_with_20_bytes_and_then_with_what_it
 }
 
 TEST_F(SocketHandles, The_table_is_asked_for_again_when_handles_were_added_in_between) {
-  machine.AddHandle({10, 4, kTcp, 80});
-  machine.handles.AppearAfterNextQuery({{10, 8, kTcp, 443}});
+  machine.AddHandle({10, 4, kTcpDevice, 80});
+  machine.handles.AppearAfterNextQuery({{10, 8, kTcpDevice, 443}});
   EXPECT_TRUE(procPort.ScanSocketHandles());
   EXPECT_EQ(machine.handles.TableQueries, (std::vector<std::size_t>{20, 52, 20, 68}));
   EXPECT_EQ(TcpOwner(80), 10);
@@ -117,7 +117,7 @@ TEST(SocketHandlesOfABareMachine, A_table_that_fits_in_20_bytes_is_not_looked_at
   modProcPort procPort{
       machine.ipHelper, {machine.processes, machine.handles}, desktop, controls.main_ListView1, fileInfo};
   machine.AddProcess({10, 1, "a.exe", ""});
-  machine.AddHandle({10, 4, kTcp, 80});
+  machine.AddHandle({10, 4, kTcpDevice, 80});
   EXPECT_TRUE(procPort.ScanSocketHandles());
   EXPECT_EQ(machine.handles.TableQueries, (std::vector<std::size_t>{20}));
   EXPECT_EQ(procPort.PortOwnerTable[80].tcpOwner, 0);
@@ -145,36 +145,36 @@ TEST_F(OddSocketHandles, A_system_without_the_table_has_no_handles) {
 // Each handle.
 
 TEST_F(SocketHandles, A_tcp_socket_gives_its_port_a_tcp_owner) {
-  machine.AddHandle({70000, 4, kTcp, 1025});
+  machine.AddHandle({70000, 4, kTcpDevice, 1025});
   procPort.ScanSocketHandles();
   EXPECT_EQ(TcpOwner(1025), 70000);
   EXPECT_EQ(UdpOwner(1025), 0);
 }
 
 TEST_F(SocketHandles, A_udp_socket_gives_its_port_a_udp_owner) {
-  machine.AddHandle({10, 4, kUdp, 1025});
+  machine.AddHandle({10, 4, kUdpDevice, 1025});
   procPort.ScanSocketHandles();
   EXPECT_EQ(TcpOwner(1025), 0);
   EXPECT_EQ(UdpOwner(1025), 10);
 }
 
 TEST_F(SocketHandles, A_port_over_32767_comes_out_positive) {
-  machine.AddHandle({10, 4, kTcp, 65535});
-  machine.AddHandle({10, 8, kTcp, 32768});
+  machine.AddHandle({10, 4, kTcpDevice, 65535});
+  machine.AddHandle({10, 8, kTcpDevice, 32768});
   procPort.ScanSocketHandles();
   EXPECT_EQ(TcpOwner(65535), 10);
   EXPECT_EQ(TcpOwner(32768), 10);
 }
 
 TEST_F(SocketHandles, Of_two_owners_of_a_port_the_last_one_counts) {
-  machine.AddHandle({10, 4, kTcp, 80});
-  machine.AddHandle({70000, 4, kTcp, 80});
+  machine.AddHandle({10, 4, kTcpDevice, 80});
+  machine.AddHandle({70000, 4, kTcpDevice, 80});
   procPort.ScanSocketHandles();
   EXPECT_EQ(TcpOwner(80), 70000);
 }
 
 TEST_F(SocketHandles, A_port_keeps_its_last_owner_when_the_socket_has_gone) {
-  machine.AddHandle({70000, 4, kTcp, 80});
+  machine.AddHandle({70000, 4, kTcpDevice, 80});
   procPort.ScanSocketHandles();
   machine.EndProcess(70000);
   procPort.ScanSocketHandles();
@@ -182,14 +182,14 @@ TEST_F(SocketHandles, A_port_keeps_its_last_owner_when_the_socket_has_gone) {
 }
 
 TEST_F(SocketHandles, Handles_of_process_0_are_skipped) {
-  machine.AddHandle({0, 4, kTcp, 80});
+  machine.AddHandle({0, 4, kTcpDevice, 80});
   procPort.ScanSocketHandles();
   for (const auto& call : machine.processes.OpenCalls) EXPECT_NE(call.id, 0u);
   EXPECT_EQ(TcpOwner(80), 0);
 }
 
 TEST_F(SocketHandles, Owners_are_opened_with_the_right_to_duplicate) {
-  machine.AddHandle({70000, 4, kTcp, 80});
+  machine.AddHandle({70000, 4, kTcpDevice, 80});
   procPort.ScanSocketHandles();
   ASSERT_EQ(machine.processes.OpenCalls.size(), 3u);
   EXPECT_EQ(machine.processes.OpenCalls.back().id, 70000u);
@@ -197,7 +197,7 @@ TEST_F(SocketHandles, Owners_are_opened_with_the_right_to_duplicate) {
 }
 
 TEST_F(SocketHandles, An_owner_that_opens_as_the_invalid_handle_ends_the_step) {
-  machine.AddHandle({70000, 4, kTcp, 80});
+  machine.AddHandle({70000, 4, kTcpDevice, 80});
   machine.processes.FailOpen(70000, platform::kInvalidHandle);
   EXPECT_TRUE(procPort.ScanSocketHandles());
   EXPECT_EQ(TcpOwner(80), 0);
@@ -205,7 +205,7 @@ TEST_F(SocketHandles, An_owner_that_opens_as_the_invalid_handle_ends_the_step) {
 }
 
 TEST_F(SocketHandles, An_owner_that_does_not_open_leaves_its_ports_unknown) {
-  machine.AddHandle({70000, 4, kTcp, 80});
+  machine.AddHandle({70000, 4, kTcpDevice, 80});
   machine.processes.FailOpen(70000);
   EXPECT_TRUE(procPort.ScanSocketHandles());
   EXPECT_EQ(TcpOwner(80), 0);
@@ -213,7 +213,7 @@ TEST_F(SocketHandles, An_owner_that_does_not_open_leaves_its_ports_unknown) {
 }
 
 TEST_F(SocketHandles, A_handle_that_cannot_be_duplicated_is_left_and_its_owner_closed) {
-  machine.AddHandle({70000, 4, kTcp, 80, false});
+  machine.AddHandle({70000, 4, kTcpDevice, 80, false});
   procPort.ScanSocketHandles();
   EXPECT_EQ(TcpOwner(80), 0);
   EXPECT_EQ(machine.processes.OpenHandles(), 0);
@@ -233,21 +233,22 @@ TEST_F(SocketHandles, Only_names_of_22_bytes_cost_a_question_to_the_driver) {
 }
 
 TEST_F(SocketHandles, A_driver_that_refuses_leaves_the_port_unknown) {
-  machine.AddHandle({10, 4, kTcp, 80, true, 0xC0000008});
+  machine.AddHandle({10, 4, kTcpDevice, 80, true, 0xC0000008});
   procPort.ScanSocketHandles();
   EXPECT_EQ(TcpOwner(80), 0);
 }
 
 TEST_F(SocketHandles, Port_0_is_not_written) {
-  machine.AddHandle({10, 4, kTcp, 0});
+  machine.AddHandle({10, 4, kTcpDevice, 0});
   procPort.ScanSocketHandles();
   EXPECT_EQ(TcpOwner(0), 0);
 }
 
 TEST_F(SocketHandles, No_handle_stays_open) {
-  for (std::uint16_t i = 1; i < 50; ++i) machine.AddHandle({10, static_cast<std::uint16_t>(4 * i), kTcp, i});
+  for (std::uint16_t i = 1; i < 50; ++i)
+    machine.AddHandle({10, static_cast<std::uint16_t>(4 * i), kTcpDevice, i});
   machine.AddHandle({10, 0x404, u"\\Device\\Http\\Filter", 83});
-  machine.AddHandle({10, 0x408, kTcp, 84, true, 1});
+  machine.AddHandle({10, 0x408, kTcpDevice, 84, true, 1});
   procPort.ScanSocketHandles();
   EXPECT_EQ(machine.processes.OpenHandles(), 0);
   EXPECT_EQ(machine.processes.VainCloses, 0);

@@ -5,7 +5,7 @@
 namespace quendra::forms {
 namespace {
 
-constexpr Area kScreen{{0, 0}, {1024, 728}};
+constexpr Area kWorkArea{{0, 0}, {1024, 728}};
 
 TEST(FittingScale, Is_1_for_a_form_that_has_room_to_the_last_pixel) {
   EXPECT_DOUBLE_EQ(FittingScale({1000, 680}, {1000, 680}).scale, 1);
@@ -45,13 +45,13 @@ TEST(WindowExtent, Never_exceeds_the_room_for_the_sake_of_a_scroll_bar) {
 }
 
 TEST(WindowCorner, Is_in_the_middle_of_what_the_window_stands_over) {
-  EXPECT_EQ(CornerOver({1000, 700}, kScreen, kScreen), (Spot{12, 14}));
-  EXPECT_EQ(CornerOver({100, 100}, {{500, 300}, {200, 200}}, kScreen), (Spot{550, 350}));
+  EXPECT_EQ(CornerOver({1000, 700}, kWorkArea, kWorkArea), (Spot{12, 14}));
+  EXPECT_EQ(CornerOver({100, 100}, {{500, 300}, {200, 200}}, kWorkArea), (Spot{550, 350}));
 }
 
 TEST(WindowCorner, Stays_on_the_screen_when_its_owner_stands_at_an_edge) {
-  EXPECT_EQ(CornerOver({400, 300}, {{900, 600}, {100, 100}}, kScreen), (Spot{624, 428}));
-  EXPECT_EQ(CornerOver({400, 300}, {{-50, -50}, {100, 100}}, kScreen), (Spot{0, 0}));
+  EXPECT_EQ(CornerOver({400, 300}, {{900, 600}, {100, 100}}, kWorkArea), (Spot{624, 428}));
+  EXPECT_EQ(CornerOver({400, 300}, {{-50, -50}, {100, 100}}, kWorkArea), (Spot{0, 0}));
 }
 
 TEST(WindowCorner, Counts_from_where_panels_leave_the_screen) {
@@ -59,11 +59,11 @@ TEST(WindowCorner, Counts_from_where_panels_leave_the_screen) {
 }
 
 TEST(WindowCorner, Of_a_window_that_lies_on_the_screen_is_left_alone) {
-  EXPECT_EQ(CornerOnScreen({{24, 28}, {1000, 700}}, kScreen), (Spot{24, 28}));
+  EXPECT_EQ(CornerOnScreen({{24, 28}, {1000, 700}}, kWorkArea), (Spot{24, 28}));
 }
 
 TEST(WindowCorner, Of_a_window_larger_than_the_screen_shows_its_title_bar) {
-  EXPECT_EQ(CornerOnScreen({{-10, -40}, {1200, 800}}, kScreen), (Spot{0, 0}));
+  EXPECT_EQ(CornerOnScreen({{-10, -40}, {1200, 800}}, kWorkArea), (Spot{0, 0}));
 }
 
 } // namespace

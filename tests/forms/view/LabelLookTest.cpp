@@ -8,7 +8,7 @@
 namespace quendra::forms {
 namespace {
 
-constexpr Direction kHebrew = Direction::RightToLeft;
+constexpr Direction kHebrewText = Direction::RightToLeft;
 
 struct LabelLook : testing::Test {
   LabelLook() {
@@ -105,7 +105,7 @@ TEST_F(LabelLook, A_caption_is_shown_without_harm_and_reads_in_its_own_direction
   EXPECT_EQ(TextOf(text).text, u"evil\uFFFDtxt.exe");
   EXPECT_EQ(TextOf(text).direction, Direction::LeftToRight);
   text.Caption = Text(u"שלום");
-  EXPECT_EQ(TextOf(text).direction, kHebrew);
+  EXPECT_EQ(TextOf(text).direction, kHebrewText);
 }
 
 TEST_F(LabelLook, A_ring_is_there_for_those_who_use_the_keys) {
@@ -145,10 +145,10 @@ TEST_F(LabelLook, The_ring_of_a_link_lies_outside_of_its_letters_and_has_its_roo
 TEST_F(LabelLook, A_ring_goes_round_the_letters_of_a_link_at_their_side_and_round_any_other_label) {
   const Area place{{4, 4}, {100, 20}};
 
-  EXPECT_EQ(RingedArea(link, place, {30, 16}, kHebrew), (Area{{74, 6}, {30, 16}}));
+  EXPECT_EQ(RingedArea(link, place, {30, 16}, kHebrewText), (Area{{74, 6}, {30, 16}}));
   EXPECT_EQ(RingedArea(link, place, {30, 16}, Direction::LeftToRight), (Area{{4, 6}, {30, 16}}));
-  EXPECT_EQ(RingedArea(link, place, {300, 60}, kHebrew), place);
-  EXPECT_EQ(RingedArea(button, place, {30, 16}, kHebrew), place);
+  EXPECT_EQ(RingedArea(link, place, {300, 60}, kHebrewText), place);
+  EXPECT_EQ(RingedArea(button, place, {30, 16}, kHebrewText), place);
 }
 
 } // namespace

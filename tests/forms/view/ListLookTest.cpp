@@ -8,16 +8,16 @@
 namespace quendra::forms {
 namespace {
 
-const ListLook kHebrew(Scale(), Direction::RightToLeft);
-const ListLook kLatin(Scale(), Direction::LeftToRight);
+const ListLook kHebrewList(Scale(), Direction::RightToLeft);
+const ListLook kLatinList(Scale(), Direction::LeftToRight);
 const ListLook kSmaller(Scale().Zoomed(0.8), Direction::LeftToRight);
 constexpr Area kCell{{100, 50}, {200, 27}};
 
 TEST(ListRows, Are_as_high_as_their_letters_or_their_icon_need) {
-  EXPECT_EQ(kLatin.RowHeight(12), 26);
-  EXPECT_EQ(kLatin.RowHeight(17), 27);
+  EXPECT_EQ(kLatinList.RowHeight(12), 26);
+  EXPECT_EQ(kLatinList.RowHeight(17), 27);
   EXPECT_EQ(kSmaller.RowHeight(10), 21);
-  EXPECT_EQ(kLatin.HeaderHeight(17), 33);
+  EXPECT_EQ(kLatinList.HeaderHeight(17), 33);
 }
 
 TEST(ListRows, Take_turns_on_two_grounds_and_show_which_one_is_selected) {
@@ -28,20 +28,20 @@ TEST(ListRows, Take_turns_on_two_grounds_and_show_which_one_is_selected) {
 }
 
 TEST(ListCells, Keep_their_text_off_both_edges) {
-  EXPECT_EQ(kLatin.TextPlace(kCell, 1), (Area{{108, 50}, {184, 27}}));
-  EXPECT_EQ(kHebrew.TextPlace(kCell, 1), (Area{{108, 50}, {184, 27}}));
+  EXPECT_EQ(kLatinList.TextPlace(kCell, 1), (Area{{108, 50}, {184, 27}}));
+  EXPECT_EQ(kHebrewList.TextPlace(kCell, 1), (Area{{108, 50}, {184, 27}}));
 }
 
 TEST(ListCells, Have_the_icon_at_the_leading_edge_of_the_first_and_its_text_beside_it) {
-  EXPECT_EQ(kLatin.IconPlace(kCell), (Area{{108, 54}, {20, 20}}));
-  EXPECT_EQ(kLatin.TextPlace(kCell, 0), (Area{{136, 50}, {156, 27}}));
-  EXPECT_EQ(kHebrew.IconPlace(kCell), (Area{{272, 54}, {20, 20}}));
-  EXPECT_EQ(kHebrew.TextPlace(kCell, 0), (Area{{108, 50}, {156, 27}}));
+  EXPECT_EQ(kLatinList.IconPlace(kCell), (Area{{108, 54}, {20, 20}}));
+  EXPECT_EQ(kLatinList.TextPlace(kCell, 0), (Area{{136, 50}, {156, 27}}));
+  EXPECT_EQ(kHebrewList.IconPlace(kCell), (Area{{272, 54}, {20, 20}}));
+  EXPECT_EQ(kHebrewList.TextPlace(kCell, 0), (Area{{108, 50}, {156, 27}}));
 }
 
 TEST(ListCells, Align_their_texts_as_the_form_reads) {
-  EXPECT_EQ(kHebrew.SideOf(Alignment::Leading), Side::Right);
-  EXPECT_EQ(kLatin.SideOf(Alignment::Leading), Side::Left);
+  EXPECT_EQ(kHebrewList.SideOf(Alignment::Leading), Side::Right);
+  EXPECT_EQ(kLatinList.SideOf(Alignment::Leading), Side::Left);
 }
 
 TEST(ListCells, Have_the_ink_that_they_were_given) {
@@ -67,27 +67,27 @@ TEST(ListRing, Is_there_for_those_who_use_the_keys) {
 TEST(ListHeaders, End_in_a_line_towards_the_next) {
   const Area header{{100, 0}, {80, 33}};
 
-  EXPECT_EQ(kLatin.Divider(header), (Area{{179, 7}, {1, 19}}));
-  EXPECT_EQ(kHebrew.Divider(header), (Area{{100, 7}, {1, 19}}));
+  EXPECT_EQ(kLatinList.Divider(header), (Area{{179, 7}, {1, 19}}));
+  EXPECT_EQ(kHebrewList.Divider(header), (Area{{100, 7}, {1, 19}}));
   EXPECT_EQ(ListLook::HeaderEdge(header), (Area{{100, 32}, {80, 1}}));
 }
 
 TEST(ListHeaders, Show_icons_no_larger_than_the_form_and_no_larger_than_there_is_room) {
   const Area header{{0, 0}, {84, 32}};
 
-  EXPECT_DOUBLE_EQ(kLatin.IconShare(20, 20, header), 1);
+  EXPECT_DOUBLE_EQ(kLatinList.IconShare(20, 20, header), 1);
   EXPECT_DOUBLE_EQ(kSmaller.IconShare(20, 20, header), 0.8);
-  EXPECT_DOUBLE_EQ(kLatin.IconShare(48, 48, header), 0.5);
-  EXPECT_DOUBLE_EQ(kLatin.IconShare(160, 20, header), 0.5);
-  EXPECT_DOUBLE_EQ(kLatin.IconShare(20, 20, {{0, 0}, {2, 32}}), 0);
-  EXPECT_DOUBLE_EQ(kLatin.IconShare(0, 0, header), 0);
+  EXPECT_DOUBLE_EQ(kLatinList.IconShare(48, 48, header), 0.5);
+  EXPECT_DOUBLE_EQ(kLatinList.IconShare(160, 20, header), 0.5);
+  EXPECT_DOUBLE_EQ(kLatinList.IconShare(20, 20, {{0, 0}, {2, 32}}), 0);
+  EXPECT_DOUBLE_EQ(kLatinList.IconShare(0, 0, header), 0);
 }
 
 TEST(ListHeaders, Have_an_arrow_at_the_end_that_points_the_way_of_the_order) {
   const Area header{{100, 0}, {80, 33}};
 
-  const auto up = kLatin.Arrow(header, SortOrder::Ascending);
-  const auto down = kHebrew.Arrow(header, SortOrder::Descending);
+  const auto up = kLatinList.Arrow(header, SortOrder::Ascending);
+  const auto down = kHebrewList.Arrow(header, SortOrder::Descending);
 
   EXPECT_DOUBLE_EQ(up[2].x, 165);
   EXPECT_LT(up[2].y, up[0].y);

@@ -5,7 +5,7 @@ namespace quendra::platform {
 namespace {
 
 using Availability = CaptureLibrary::Availability;
-using Told = std::vector<Availability>;
+using Availabilities = std::vector<Availability>;
 
 /// A session whose adapter comes and goes.
 class ReturningAdapterTest : public LiveCaptureFixture {
@@ -21,7 +21,7 @@ class ReturningAdapterTest : public LiveCaptureFixture {
     EXPECT_EQ(taken, before + 2);
   }
 
-  Told told;
+  Availabilities told;
 };
 
 INSTANTIATE_TEST_SUITE_P(, ReturningAdapterTest, testing::Values(Pace::Bell, Pace::Timer),
@@ -32,7 +32,7 @@ INSTANTIATE_TEST_SUITE_P(, ReturningAdapterTest, testing::Values(Pace::Bell, Pac
 TEST_P(ReturningAdapterTest, One_that_goes_is_told_of_and_its_source_ends) {
   lines.Remove("line");
   Settle();
-  EXPECT_EQ(told, Told{Availability::AdapterGone});
+  EXPECT_EQ(told, Availabilities{Availability::AdapterGone});
   EXPECT_EQ(lines.openSources, 0);
 }
 
@@ -41,7 +41,7 @@ TEST_P(ReturningAdapterTest, One_that_returns_under_its_name_is_captured_from_ag
   Settle();
   lines.Add("line", "10.9.0.1");
   Settle();
-  EXPECT_EQ(told, (Told{Availability::AdapterGone, Availability::Available}));
+  EXPECT_EQ(told, (Availabilities{Availability::AdapterGone, Availability::Available}));
   ExpectFrames();
 }
 
@@ -49,7 +49,7 @@ TEST_P(ReturningAdapterTest, One_that_was_made_again_before_anybody_looked_is_ca
   lines.Remove("line");
   lines.Add("line", "10.9.0.1");
   Settle();
-  EXPECT_EQ(told, Told{Availability::Available});
+  EXPECT_EQ(told, Availabilities{Availability::Available});
   ExpectFrames();
 }
 
@@ -62,7 +62,7 @@ TEST_P(ReturningAdapterTest, One_that_comes_back_without_an_address_is_told_of_a
   lines.Change("line", [](auto& line) { line.address = Ipv4Address::FromHost(0x0A090001); });
   lines.Change("line", [](auto& line) { line.address = Ipv4Address::FromHost(0x0A090002); });
   Settle();
-  EXPECT_EQ(told, Told{Availability::Available});
+  EXPECT_EQ(told, Availabilities{Availability::Available});
 }
 
 TEST_P(ReturningAdapterTest, What_had_come_before_it_was_switched_off_is_delivered) {
@@ -75,14 +75,14 @@ TEST_P(ReturningAdapterTest, What_had_come_before_it_was_switched_off_is_deliver
   Arrive(200);
   Settle();
   EXPECT_EQ(taken, 200);
-  EXPECT_EQ(told, Told{Availability::AdapterGone});
+  EXPECT_EQ(told, Availabilities{Availability::AdapterGone});
 }
 
 TEST_P(ReturningAdapterTest, What_other_adapters_do_is_not_told) {
   lines.Add("other", "10.8.0.1");
   lines.Remove("other");
   Settle();
-  EXPECT_EQ(told, Told{});
+  EXPECT_EQ(told, Availabilities{});
   ExpectFrames();
 }
 
@@ -90,7 +90,7 @@ TEST_P(ReturningAdapterTest, A_source_that_fails_is_opened_again) {
   lines.Find("line")->fails = true;
   Arrive(1);
   Settle();
-  EXPECT_EQ(told, Told{Availability::Available});
+  EXPECT_EQ(told, Availabilities{Availability::Available});
   EXPECT_EQ(taken, 1);
   ExpectFrames();
 }
@@ -101,7 +101,7 @@ TEST_P(ReturningAdapterTest, A_source_that_fails_outside_of_an_event_is_opened_a
   CaptureHeader header{};
   EXPECT_EQ(capture->vpCapture(frame, header), -1);
   Settle();
-  EXPECT_EQ(told, Told{Availability::Available});
+  EXPECT_EQ(told, Availabilities{Availability::Available});
   ExpectFrames();
 }
 
@@ -124,7 +124,7 @@ TEST_P(ReturningAdapterTest, A_session_that_ended_while_it_was_gone_hears_nothin
   told.clear();
   lines.Add("line", "10.9.0.1");
   Settle();
-  EXPECT_EQ(told, Told{});
+  EXPECT_EQ(told, Availabilities{});
   EXPECT_EQ(lines.openSources, 0);
 }
 

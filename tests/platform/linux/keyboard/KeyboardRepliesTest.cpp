@@ -14,7 +14,7 @@ void Put(Bytes& bytes, std::size_t at, std::uint32_t value) {
 }
 
 /// A reply that tells the names of the groups in `mask` by the numbers.
-Bytes Names(std::uint8_t mask, const std::vector<std::uint32_t>& numbers) {
+Bytes NamesReply(std::uint8_t mask, const std::vector<std::uint32_t>& numbers) {
   Bytes reply(32 + 4 * numbers.size());
   Put(reply, 8, 0x1000);
   reply[15] = mask;
@@ -43,28 +43,28 @@ TEST(KeyboardRepliesTest, The_active_group_is_one_of_four) {
 }
 
 TEST(KeyboardRepliesTest, A_groups_name_is_found_among_those_that_are_told) {
-  EXPECT_EQ(NameNumberOf(Names(0b0011, {70, 71}), 0), 70U);
-  EXPECT_EQ(NameNumberOf(Names(0b0011, {70, 71}), 1), 71U);
+  EXPECT_EQ(NameNumberOf(NamesReply(0b0011, {70, 71}), 0), 70U);
+  EXPECT_EQ(NameNumberOf(NamesReply(0b0011, {70, 71}), 1), 71U);
   // The second group has no name of its own.
-  EXPECT_EQ(NameNumberOf(Names(0b1101, {70, 72, 73}), 2), 72U);
-  EXPECT_EQ(NameNumberOf(Names(0b1101, {70, 72, 73}), 3), 73U);
+  EXPECT_EQ(NameNumberOf(NamesReply(0b1101, {70, 72, 73}), 2), 72U);
+  EXPECT_EQ(NameNumberOf(NamesReply(0b1101, {70, 72, 73}), 3), 73U);
 }
 
 TEST(KeyboardRepliesTest, A_group_without_a_name_or_beyond_the_fourth_has_none) {
-  EXPECT_FALSE(NameNumberOf(Names(0b0001, {70}), 1));
-  EXPECT_FALSE(NameNumberOf(Names(0, {}), 0));
-  EXPECT_FALSE(NameNumberOf(Names(0xFF, {70, 71, 72, 73, 74}), 4));
+  EXPECT_FALSE(NameNumberOf(NamesReply(0b0001, {70}), 1));
+  EXPECT_FALSE(NameNumberOf(NamesReply(0, {}), 0));
+  EXPECT_FALSE(NameNumberOf(NamesReply(0xFF, {70, 71, 72, 73, 74}), 4));
 }
 
 TEST(KeyboardRepliesTest, A_reply_that_tells_more_than_names_of_groups_is_not_read) {
-  Bytes reply = Names(1, {70});
+  Bytes reply = NamesReply(1, {70});
   Put(reply, 8, 0x1001);
   EXPECT_FALSE(NameNumberOf(reply, 0));
 }
 
 TEST(KeyboardRepliesTest, Names_that_are_announced_and_not_there_are_not_read) {
-  EXPECT_FALSE(NameNumberOf(Names(0b1111, {70}), 3));
-  Bytes cut = Names(1, {70});
+  EXPECT_FALSE(NameNumberOf(NamesReply(0b1111, {70}), 3));
+  Bytes cut = NamesReply(1, {70});
   cut.pop_back();
   EXPECT_FALSE(NameNumberOf(cut, 0));
 }
