@@ -3,6 +3,7 @@
 #include "runtime/OpaqueHandle.h"
 
 #include <cstdint>
+#include <string>
 
 namespace quendra::forms {
 
@@ -25,6 +26,8 @@ class WindowOperations {
   virtual void ReleaseCapture() = 0;
   virtual std::int32_t SendMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
                                    std::uint32_t lParam) = 0;
+  /// The number of the window messages of that name, the same for whoever asks; 0 on failure.
+  virtual std::uint32_t RegisterWindowMessageA(const std::string& name) = 0;
   virtual double TwipsPerPixelX() const = 0;
   virtual double TwipsPerPixelY() const = 0;
   /// Pixels: left, top, right, bottom, width and height of the corner ellipses.

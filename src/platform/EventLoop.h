@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <functional>
 #include <memory>
+#include <string>
 
 namespace quendra::platform {
 
@@ -26,6 +27,8 @@ class EventLoop {
   /// from any thread. A loop without windows loses it, as one for a window that has gone is lost.
   virtual void PostMessage(WindowHandle /*window*/, std::uint32_t /*message*/, std::uint32_t /*wParam*/,
                            std::uint32_t /*lParam*/) {}
+  /// The number of the window messages of that name, the same for whoever asks; 0 on failure.
+  virtual std::uint32_t RegisterWindowMessageA(const std::string& /*name*/) { return 0; }
   [[nodiscard]] virtual std::unique_ptr<Subscription> StartTimer(int milliseconds,
                                                                  std::function<void()> tick) = 0;
   /// Handles what waits, without waiting for more.

@@ -12,7 +12,7 @@ struct Description {
   const char16_t* text;
 };
 
-constexpr std::array<Description, 12> kDescriptions{{
+constexpr std::array<Description, 17> kDescriptions{{
     {Fault::kInvalidCall, u"Invalid procedure call or argument"},
     {Fault::kOverflow, u"Overflow"},
     {Fault::kOutOfMemory, u"Out of memory"},
@@ -20,6 +20,11 @@ constexpr std::array<Description, 12> kDescriptions{{
     {Fault::kDivision, u"Division by zero"},
     {Fault::kTypeMismatch, u"Type mismatch"},
     {Fault::kOutOfStackSpace, u"Out of stack space"},
+    {Fault::kFileNotFound, u"File not found"},
+    {Fault::kDiskFull, u"Disk full"},
+    {Fault::kPermissionDenied, u"Permission denied"},
+    {Fault::kPathFileAccess, u"Path/File access error"},
+    {Fault::kPathNotFound, u"Path not found"},
     {Fault::kObjectNotSet, u"Object variable or With block variable not set"},
     {Fault::kInvalidPropertyValue, u"Invalid property value"},
     {Fault::kCannotCreateObject, u"ActiveX component can't create object"},

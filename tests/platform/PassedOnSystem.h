@@ -11,6 +11,10 @@ class PassedOnSystem : public System {
 
   std::uint32_t GetTickCount() override { return system_.GetTickCount(); }
   bool GetVersionExA(OsVersion& version) override { return system_.GetVersionExA(version); }
+  std::uint32_t FormatMessageA(std::uint32_t flags, std::uint32_t number, std::uint32_t language,
+                               std::span<char> buffer) override {
+    return system_.FormatMessageA(flags, number, language, buffer);
+  }
   void Sleep(std::uint32_t milliseconds) override { system_.Sleep(milliseconds); }
   void GetSystemInfo(SystemInfo& info) override { system_.GetSystemInfo(info); }
   void GlobalMemoryStatus(MemoryStatus& status) override { system_.GlobalMemoryStatus(status); }

@@ -12,15 +12,20 @@ struct Replacements {
 };
 
 inline Machine WithReplaced(const Machine& own, const Replacements& by) {
-  return {own.captureControls,
+  return {own.adapters,
+          own.captureControls,
           own.captureLibrary,
+          own.dialling,
+          own.files,
           own.handles,
           by.hostNames ? *by.hostNames : own.hostNames,
           own.icmp,
           own.icons,
+          own.installedProducts,
           own.ipHelper,
           own.keyboardLayout,
           own.performanceData,
+          own.phoneBook,
           own.processes,
           own.registry,
           own.shellStart,

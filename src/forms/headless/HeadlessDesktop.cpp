@@ -112,6 +112,11 @@ void HeadlessDesktop::DoEvents() {
   dispatcher_.UnwindIfEnded();
 }
 
+std::uint32_t HeadlessDesktop::RegisterWindowMessageA(const std::string& name) {
+  Record("RegisterWindowMessageA " + name);
+  return FailRegisterWindowMessage ? 0 : Windows.RegisterMessage(name);
+}
+
 CursorHandle HeadlessDesktop::LoadCursor(int id) {
   Record("LoadCursor " + std::to_string(id));
   return CursorHandleToGive;

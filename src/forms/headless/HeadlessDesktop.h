@@ -24,6 +24,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
                    std::uint32_t lParam) override {
     Post([=, this] { Windows.Dispatch(window, message, wParam, lParam); });
   }
+  std::uint32_t RegisterWindowMessageA(const std::string& name) override;
   int ModalDepth() const override { return StandingCount(); }
 
   /// Pixels: how wide each character and how high each line is in any font.
@@ -52,6 +53,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
 
   /// Boxes without a scripted answer are answered with 1 (OK).
   void AnswerNextBox(int answer) { answers_.push_back(answer); }
+  bool FailRegisterWindowMessage = false;
   CursorHandle CursorHandleToGive{5};
   /// Called at each DoEvents, before the queue is handled; not from within itself.
   std::function<void()> OnYield;

@@ -38,6 +38,9 @@ class QtDesktop : public Desktop, public platform::EventLoop, public platform::D
   void ReleaseCapture() override { mouse_.ReleaseCapture(); }
   std::int32_t SendMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
                            std::uint32_t lParam) override;
+  std::uint32_t RegisterWindowMessageA(const std::string& name) override {
+    return Windows.RegisterMessage(name);
+  }
   double TwipsPerPixelX() const override { return scale_.twipsPerPixelX; }
   double TwipsPerPixelY() const override { return scale_.twipsPerPixelY; }
   RegionHandle CreateRoundRectRgn(int left, int top, int right, int bottom, int ellipseWidth,

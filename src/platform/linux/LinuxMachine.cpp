@@ -1,4 +1,9 @@
 #include "platform/linux/LinuxMachine.h"
+#include "platform/unavailable/UnavailableAdapters.h"
+#include "platform/unavailable/UnavailableDialling.h"
+#include "platform/unavailable/UnavailableFiles.h"
+#include "platform/unavailable/UnavailableInstalledProducts.h"
+#include "platform/unavailable/UnavailablePhoneBook.h"
 
 #include "platform/linux/capture/LinuxCapture.h"
 #include "platform/linux/icmp/LinuxIcmp.h"
@@ -32,6 +37,11 @@ struct LinuxMachine::Parts {
   DesktopIndex desktopIndex{UserFolders::OfEnvironment()};
   IconTheme iconTheme{UserFolders::OfEnvironment()};
 
+  unavailable::UnavailableAdapters adapters;
+  unavailable::UnavailableDialling dialling;
+  unavailable::UnavailableFiles files;
+  unavailable::UnavailableInstalledProducts installedProducts;
+  unavailable::UnavailablePhoneBook phoneBook;
   LinuxCapture capture;
   unavailable::UnavailableHandles handles; // this system has no list of all handles
   LinuxHostNames hostNames{folder};
@@ -57,12 +67,12 @@ LinuxMachine::LinuxMachine(EventLoop& loop, DescriptorWatch& descriptors,
 LinuxMachine::~LinuxMachine() = default;
 
 Machine LinuxMachine::Operations() {
-  return {parts_->capture,   parts_->capture,        parts_->handles,
-          parts_->hostNames, parts_->icmp,           parts_->icons,
-          parts_->ipHelper,  parts_->keyboardLayout, parts_->performanceData,
-          parts_->processes, parts_->registry,       parts_->shellStart,
-          parts_->sockets,   parts_->system,         parts_->tokens,
-          parts_->urlCache,  parts_->versionInfo};
+  return {parts_->adapters,        parts_->capture,           parts_->capture,   parts_->dialling,
+          parts_->files,           parts_->handles,           parts_->hostNames, parts_->icmp,
+          parts_->icons,           parts_->installedProducts, parts_->ipHelper,  parts_->keyboardLayout,
+          parts_->performanceData, parts_->phoneBook,         parts_->processes, parts_->registry,
+          parts_->shellStart,      parts_->sockets,           parts_->system,    parts_->tokens,
+          parts_->urlCache,        parts_->versionInfo};
 }
 
 LinuxCapture& LinuxMachine::Capture() { return parts_->capture; }

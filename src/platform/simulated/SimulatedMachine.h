@@ -1,9 +1,12 @@
 #pragma once
 
 #include "platform/Machine.h"
+#include "platform/simulated/adapters/SimulatedAdapters.h"
 #include "platform/simulated/capture/SimulatedCapture.h"
+#include "platform/simulated/files/SimulatedFiles.h"
 #include "platform/simulated/icmp/SimulatedIcmp.h"
 #include "platform/simulated/internet/SimulatedUrlCache.h"
+#include "platform/simulated/mail/SimulatedInstalledProducts.h"
 #include "platform/simulated/net/SimulatedHostNames.h"
 #include "platform/simulated/net/SimulatedIpHelper.h"
 #include "platform/simulated/net/SimulatedSockets.h"
@@ -13,6 +16,7 @@
 #include "platform/simulated/process/SimulatedTokens.h"
 #include "platform/simulated/process/SimulatedVersionInfo.h"
 #include "platform/simulated/registry/SimulatedRegistry.h"
+#include "platform/simulated/remote_access/SimulatedRemoteAccess.h"
 #include "platform/simulated/system/SimulatedKeyboardLayout.h"
 #include "platform/simulated/system/SimulatedPerformanceData.h"
 #include "platform/simulated/system/SimulatedShellStart.h"
@@ -26,15 +30,16 @@ class SimulatedMachine {
  public:
   SimulatedMachine()
       : processes(core_), tokens(core_), handles(core_), icmp(core_), sockets(core_, hostNames),
-        capture(core_), system(core_), shellStart(core_) {}
+        capture(core_), system(core_), shellStart(core_), ras(core_), adapters(core_), files(core_) {}
   /// With sockets whose messages go through a loop.
   explicit SimulatedMachine(EventLoop& loop) : SimulatedMachine() { sockets.UseLoop(loop); }
   SimulatedMachine(const SimulatedMachine&) = delete;
 
   Machine Operations() {
-    return {capture,  capture,        handles,         hostNames, icmp,       icons,
-            ipHelper, keyboardLayout, performanceData, processes, registry,   shellStart,
-            sockets,  system,         tokens,          urlCache,  versionInfo};
+    return {adapters,   capture,  capture,           ras,      files,          handles,         hostNames,
+            icmp,       icons,    installedProducts, ipHelper, keyboardLayout, performanceData, ras,
+            processes,  registry, shellStart,        sockets,  system,         tokens,          urlCache,
+            versionInfo};
   }
 
  private:
@@ -58,6 +63,10 @@ class SimulatedMachine {
   SimulatedShellStart shellStart;
   SimulatedRegistry registry;
   SimulatedUrlCache urlCache;
+  SimulatedRemoteAccess ras;
+  SimulatedAdapters adapters;
+  SimulatedInstalledProducts installedProducts;
+  SimulatedFiles files;
 
   /// Calls whose order counts: capture library and control, Sleep, Shell, sockets.
   std::vector<std::string>& Calls = core_.calls;

@@ -9,6 +9,7 @@ class ShellStart {
  public:
   virtual ~ShellStart() = default;
 
+  static constexpr int kHiddenWindow = 0;
   static constexpr int kNormalWindow = 1;
   static constexpr int kAsItIsShown = 5;
   static constexpr int kMinimizedWithoutFocus = 6;

@@ -12,6 +12,7 @@ struct OsVersion {
   std::uint32_t platformId = 0;
   std::uint32_t majorVersion = 0;
   std::uint32_t minorVersion = 0;
+  std::uint32_t buildNumber = 0;
 };
 
 /// What GetSystemInfo tells, as far as the program asks.
@@ -28,6 +29,12 @@ class System {
   virtual std::uint32_t GetTickCount() = 0;
   /// False on failure.
   virtual bool GetVersionExA(OsVersion& version) = 0;
+  /// What FormatMessageA takes its texts from: the system.
+  static constexpr std::uint32_t kFromSystem = 4096;
+  /// The system's text for one of its error numbers, with its NUL, in the code page. Its length without the
+  /// NUL, 0 on failure.
+  virtual std::uint32_t FormatMessageA(std::uint32_t flags, std::uint32_t number, std::uint32_t language,
+                                       std::span<char> buffer) = 0;
   /// Blocks the thread.
   virtual void Sleep(std::uint32_t milliseconds) = 0;
   virtual void GetSystemInfo(SystemInfo& info) = 0;

@@ -1,15 +1,20 @@
 #pragma once
 
 #include "platform/Machine.h"
+#include "platform/unavailable/UnavailableAdapters.h"
 #include "platform/unavailable/UnavailableCaptureControls.h"
 #include "platform/unavailable/UnavailableCaptureLibrary.h"
+#include "platform/unavailable/UnavailableDialling.h"
+#include "platform/unavailable/UnavailableFiles.h"
 #include "platform/unavailable/UnavailableHandles.h"
 #include "platform/unavailable/UnavailableHostNames.h"
 #include "platform/unavailable/UnavailableIcmp.h"
 #include "platform/unavailable/UnavailableIcons.h"
+#include "platform/unavailable/UnavailableInstalledProducts.h"
 #include "platform/unavailable/UnavailableIpHelper.h"
 #include "platform/unavailable/UnavailableKeyboardLayout.h"
 #include "platform/unavailable/UnavailablePerformanceData.h"
+#include "platform/unavailable/UnavailablePhoneBook.h"
 #include "platform/unavailable/UnavailableProcesses.h"
 #include "platform/unavailable/UnavailableRegistry.h"
 #include "platform/unavailable/UnavailableShellStart.h"
@@ -29,11 +34,18 @@ class UnavailableMachine {
   UnavailableMachine(const UnavailableMachine&) = delete;
 
   Machine Operations() {
-    return {captureControls, captureLibrary, handles,         hostNames, icmp,       icons,
-            ipHelper,        keyboardLayout, performanceData, processes, registry,   shellStart,
-            sockets,         system,         tokens,          urlCache,  versionInfo};
+    return {
+        adapters,   captureControls, captureLibrary,    dialling, files,          handles,         hostNames,
+        icmp,       icons,           installedProducts, ipHelper, keyboardLayout, performanceData, phoneBook,
+        processes,  registry,        shellStart,        sockets,  system,         tokens,          urlCache,
+        versionInfo};
   }
 
+  UnavailableAdapters adapters;
+  UnavailableDialling dialling;
+  UnavailableFiles files;
+  UnavailableInstalledProducts installedProducts;
+  UnavailablePhoneBook phoneBook;
   UnavailableCaptureControls captureControls;
   UnavailableCaptureLibrary captureLibrary;
   UnavailableHandles handles;

@@ -9,6 +9,9 @@ class UnavailableSystem : public System {
  public:
   std::uint32_t GetTickCount() override { return 0; }
   bool GetVersionExA(OsVersion&) override { return false; }
+  std::uint32_t FormatMessageA(std::uint32_t, std::uint32_t, std::uint32_t, std::span<char>) override {
+    return 0;
+  }
   void Sleep(std::uint32_t) override {}
   void GetSystemInfo(SystemInfo& info) override { info = {}; }
   void GlobalMemoryStatus(MemoryStatus& status) override {

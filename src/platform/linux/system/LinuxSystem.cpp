@@ -3,7 +3,9 @@
 #include "platform/linux/system/Files.h"
 #include "platform/linux/system/MemoryFigures.h"
 #include "platform/linux/system/ProcessorFigures.h"
+#include "platform/linux/system/SystemMessages.h"
 
+#include <algorithm>
 #include <chrono>
 #include <ctime>
 #include <optional>
@@ -39,8 +41,16 @@ std::uint32_t LinuxSystem::GetTickCount() {
 }
 
 bool LinuxSystem::GetVersionExA(OsVersion& version) {
-  version = {2, 5, 1};
+  version = {2, 5, 1, 2600};
   return true;
+}
+
+std::uint32_t LinuxSystem::FormatMessageA(std::uint32_t flags, std::uint32_t number, std::uint32_t,
+                                          std::span<char> buffer) {
+  const std::string_view text = SystemMessage(number);
+  if (flags != kFromSystem || text.empty() || buffer.size() <= text.size()) return 0;
+  *std::ranges::copy(text, buffer.begin()).out = '\0';
+  return static_cast<std::uint32_t>(text.size());
 }
 
 void LinuxSystem::Sleep(std::uint32_t milliseconds) {

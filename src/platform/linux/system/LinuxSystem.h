@@ -19,6 +19,8 @@ class LinuxSystem : public System {
   /// some machines it would then find that no second has passed.
   std::uint32_t GetTickCount() override;
   bool GetVersionExA(OsVersion& version) override;
+  std::uint32_t FormatMessageA(std::uint32_t flags, std::uint32_t number, std::uint32_t language,
+                               std::span<char> buffer) override;
   void Sleep(std::uint32_t milliseconds) override;
   /// The processors that were switched on at the program's start.
   void GetSystemInfo(SystemInfo& info) override { info.numberOfProcessors = processors_; }

@@ -3,6 +3,8 @@
 #include "platform/simulated/SimulatedCore.h"
 #include "platform/system/System.h"
 
+#include <algorithm>
+
 namespace quendra::platform::simulated {
 
 /// A clock that moves when the test says so, and by what is slept.
@@ -13,13 +15,15 @@ class SimulatedSystem : public System {
   void SetTick(std::uint32_t tick) { core_.tickCount = tick; }
   void AdvanceTick(std::uint32_t milliseconds) { core_.tickCount += milliseconds; }
   /// Family 2, version 5.1 unless set.
-  OsVersion Version{2, 5, 1};
+  OsVersion Version{2, 5, 1, 2600};
   bool FailVersion = false;
   std::uint32_t ProcessorCount = 1;
   /// Half a gigabyte, half of it free, unless set.
   MemoryStatus Memory =
       MemoryOf({50, 0x20000000, 0x10000000, 0x40000000, 0x30000000, 0x7FFE0000, 0x7F000000});
   int MemoryQuestions = 0;
+  /// The system's texts by error number; no other has one.
+  std::map<std::uint32_t, std::string> MessageTexts{{5, "Access is denied.\r\n"}};
   std::int32_t Day = 38353;        ///< 1 January 2005
   std::int32_t Second = 12 * 3600; ///< of the day
 
@@ -27,6 +31,15 @@ class SimulatedSystem : public System {
   bool GetVersionExA(OsVersion& version) override {
     if (!FailVersion) version = Version;
     return !FailVersion;
+  }
+  std::uint32_t FormatMessageA(std::uint32_t flags, std::uint32_t number, std::uint32_t,
+                               std::span<char> buffer) override {
+    const auto found = MessageTexts.find(number);
+    if (flags != kFromSystem || found == MessageTexts.end() || buffer.empty()) return 0;
+    const std::string text = found->second.substr(0, buffer.size() - 1);
+    std::ranges::copy(text, buffer.begin());
+    buffer[text.size()] = '\0';
+    return static_cast<std::uint32_t>(text.size());
   }
   void Sleep(std::uint32_t milliseconds) override {
     core_.calls.push_back("Sleep " + std::to_string(milliseconds));
