@@ -7,6 +7,7 @@ namespace quendra::platform {
 /// What a test puts in the place of a machine's families; nullptr leaves the machine its own.
 struct Replacements {
   HostNames* hostNames = nullptr;
+  InstalledProducts* installedProducts = nullptr;
   Sockets* sockets = nullptr;
   System* system = nullptr;
 };
@@ -21,7 +22,7 @@ inline Machine WithReplaced(const Machine& own, const Replacements& by) {
           by.hostNames ? *by.hostNames : own.hostNames,
           own.icmp,
           own.icons,
-          own.installedProducts,
+          by.installedProducts ? *by.installedProducts : own.installedProducts,
           own.ipHelper,
           own.keyboardLayout,
           own.performanceData,

@@ -1,0 +1,165 @@
+"""The page of the first connection as a user goes through it, with the Hebrew layout on, once for each modem; and what
+the network manager then holds, as its own tools tell."""
+
+import time
+
+import stage
+from accessible import below, text_of, wait_for
+from gi.repository import Atspi
+
+MODEMS = ("Samsung AHT E300", "Alcatel 510", "Alcatel Speed Touch Home", "ECI B-FoCUS +270/312", "Aztech E600")
+BY_VPN = 2
+ENTRY = "097"
+# What is typed, key by key on the Hebrew layout, and what arrives.
+NAME_KEYS, NAME = "גשמש", "dana"
+PASSWORD_KEYS, PASSWORD = "דנ'/6", "sbwq6"
+CREATED = "החייגן נוצר בהצלחה."
+CARD, CARD_ADDRESS = "eth0", "10.200.1.1/8"
+
+
+class Boxes:
+    """Message boxes of the program, which a user reads and closes."""
+
+    def __init__(self, walk):
+        self.walk = walk
+        self.program = walk.program
+
+    def find(self, text):
+        for window in self.program.windows():
+            if any(text in said for said in self.program.texts(window)):
+                return window
+        return None
+
+    def press(self, text, picture):
+        """Waits for the box with the text, and presses its only button."""
+        box = wait_for(f"the box {text!r}", lambda: self.find(text), 30)
+        time.sleep(0.3)
+        self.walk.picture(picture)
+        button = next(control for control in below(box) if control.get_role() == Atspi.Role.PUSH_BUTTON)
+        self.walk.point_at(button)
+        self.walk.xdotool("click", 1)
+        wait_for(f"the box {text!r} to close", lambda: not self.find(text))
+
+
+class ConnectionStep:
+    """Makes the entry for every modem, one after the other, and stays on the page's mail step."""
+
+    def __init__(self, walk, manager):
+        self.walk = walk
+        self.program = walk.program
+        self.manager = manager
+        self.boxes = Boxes(walk)
+
+    def layout(self, name):
+        stage.run("setxkbmap", name)
+        time.sleep(0.3)
+
+    def type_into(self, field, keys):
+        self.walk.click(field)
+        self.walk.xdotool("key", "End", "shift+Home", "BackSpace")
+        self.walk.xdotool("type", "--delay", 60, keys)
+        return wait_for(f"what was typed into {field}", lambda: text_of(self.program.control(field)))
+
+    def fill(self):
+        """With the keys of the Hebrew layout; gives what is wrong with what arrives."""
+        self.layout("il")
+        typed = self.type_into("frsCon_txtUsername", NAME_KEYS)
+        self.type_into("frsCon_txtPassword", PASSWORD_KEYS)
+        self.layout("us")
+        return [] if typed == NAME else [f"the keys of {NAME_KEYS!r} arrive as {typed!r}"]
+
+    def choose_card(self):
+        """The list of network cards that comes before the box for one of the modems."""
+        self.program.control("lstNICs")
+        time.sleep(0.3)
+        self.walk.picture("network-cards")
+        self.walk.click("lstNICs")
+        self.walk.xdotool("key", "Home", "Down", "Up")
+        self.walk.click("Command1")
+
+    def create(self, modem):
+        self.walk.click("frsCon_lblCaption(1)")
+        wrong = self.fill()
+        self.walk.click(f"frsCon_lblModems({modem})")
+        time.sleep(0.3)
+        self.walk.picture(f"modem-{modem}")
+        self.walk.click("frsCon_cmdCreate")
+        if modem == BY_VPN:
+            self.choose_card()
+        self.boxes.press(CREATED, f"created-{modem}")
+        mail_name = wait_for("the mail step", lambda: text_of(self.program.control("frsCon_txtEmailUN")))
+        if mail_name != NAME:
+            wrong.append(f"the mail step has the name {mail_name!r}")
+        return wrong + self.lacks(modem)
+
+    def lacks(self, modem):
+        """What the network manager holds other than it should."""
+        kind = "vpn" if modem == BY_VPN else "pppoe"
+        entries = self.manager.entries()
+        wrong = [] if entries.get(ENTRY) == kind else [f"the modem {MODEMS[modem]} leaves the entries {entries}"]
+        if "tmp097" in entries:
+            wrong.append("the entry tmp097 is left")
+        if modem == BY_VPN and CARD_ADDRESS not in self.manager.addresses(CARD):
+            wrong.append(f"the card has {self.manager.addresses(CARD)!r}")
+        return wrong
+
+    def take(self):
+        """Gives what is wrong; what the network manager holds is printed after each modem."""
+        self.walk.click("lblCaption(2)")
+        self.program.control("frsCon_lblCaption(1)")
+        time.sleep(0.4)
+        self.walk.picture("first-connection")
+        wrong = []
+        for modem in range(len(MODEMS)):
+            wrong += self.create(modem)
+            print(f"connection: {MODEMS[modem]}: {self.manager.told(ENTRY)}")
+            self.walk.click("frsCon_lblBack")
+        return wrong
+
+
+class TroubleStep:
+    """Opens the troubleshooter, once with a number of an error and once with a real dial."""
+
+    def __init__(self, walk):
+        self.walk = walk
+        self.program = walk.program
+        self.boxes = Boxes(walk)
+
+    def open(self):
+        self.walk.click("frsCon_lblConnectProb")
+        self.program.control("cmdCheck")
+        time.sleep(0.3)
+
+    def choose(self, name):
+        """By the keyboard, as far down as the name stands."""
+        self.walk.click("cmbDialups")
+        self.walk.xdotool("key", "Escape")
+        for _ in range(20):
+            if self.chosen() == name:
+                return
+            self.walk.xdotool("key", "Down")
+            time.sleep(0.1)
+        raise RuntimeError(f"the troubleshooter has no connection {name}, but {self.chosen()!r}")
+
+    def chosen(self):
+        return self.program.control("cmbDialups").get_name() or ""
+
+    def status(self):
+        return text_of(self.program.control("txtStatus"))
+
+    def check(self, name, number, end, seconds):
+        """Gives what the status says once `end` stands in it."""
+        self.open()
+        self.choose(name)
+        if number:
+            self.walk.click("txtEmunrateError")
+            self.walk.xdotool("type", number)
+        self.walk.picture(f"trouble-{number or 'dial'}-before")
+        self.walk.click("cmdCheck")
+        said = wait_for(f"{end!r} in the status", lambda: self.status() if end in self.status() else "", seconds)
+        time.sleep(1)
+        self.walk.picture(f"trouble-{number or 'dial'}")
+        said = self.status()
+        self.walk.click("Command1")
+        wait_for("the troubleshooter to close", lambda: not self.program.find("cmdCheck"))
+        return said
