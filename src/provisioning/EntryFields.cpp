@@ -8,7 +8,7 @@ using Record = RasEntryRecord;
 
 /// A field and its value for entries of either kind.
 struct NumberField {
-  std::uint32_t Record::* field;
+  std::uint32_t Record::*field;
   std::uint32_t pppoe;
   std::uint32_t vpn;
 };
@@ -16,7 +16,7 @@ constexpr std::array<NumberField, 16> kNumbers{{
     {&Record::options, 0x0500021F, 0x7FBEFFFF},
     {&Record::countryId, 972, 972},
     {&Record::countryCode, 972, 972},
-    {&Record::netProtocols, 4, 4},   // IP
+    {&Record::netProtocols, 4, 4},    // IP
     {&Record::framingProtocol, 1, 1}, // PPP
     {&Record::subEntries, 1, 1},
     {&Record::dialMode, 1, 1},

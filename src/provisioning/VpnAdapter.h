@@ -14,8 +14,8 @@ class VpnAdapter {
 
   /// Whether a box stands before the system's management is asked for, after that and after its answer.
   enum class Steps { Silent, Told };
-  /// Where there are several cards the user picks one, in a form over `owner`; who picks none is told to do it
-  /// by hand. A choice that no card stands for raises fault 91.
+  /// Where there are several cards the user picks one, in a form over `owner`; who picks none is told to do
+  /// it by hand. A choice that no card stands for raises fault 91.
   void ConfigureVpnAdapter(forms::Form& owner, Steps steps);
 
  private:

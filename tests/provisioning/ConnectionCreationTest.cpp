@@ -25,13 +25,34 @@ std::vector<std::uint8_t> RecordOf(std::initializer_list<NumberAt> numbers, cons
   return record;
 }
 std::vector<std::uint8_t> PppoeRecord(std::uint32_t options = 0x0500021F) {
-  return RecordOf({{4, options}, {8, 972}, {12, 972}, {184, 4}, {188, 1}, {1768, 1}, {1772, 1}, {1776, 75},
-                   {1780, 120}, {1784, 120}, {1796, 5}, {1800, 3}},
+  return RecordOf({{4, options},
+                   {8, 972},
+                   {12, 972},
+                   {184, 4},
+                   {188, 1},
+                   {1768, 1},
+                   {1772, 1},
+                   {1776, 75},
+                   {1780, 120},
+                   {1784, 120},
+                   {1796, 5},
+                   {1800, 3}},
                   "pppoe", "");
 }
 std::vector<std::uint8_t> VpnRecord() {
-  return RecordOf({{4, 0x7FBEFFFF}, {8, 972}, {12, 972}, {184, 4}, {188, 1}, {1768, 1}, {1772, 1},
-                   {1776, 75}, {1780, 120}, {1784, 120}, {1796, 2}, {1800, 3}, {2084, 1}},
+  return RecordOf({{4, 0x7FBEFFFF},
+                   {8, 972},
+                   {12, 972},
+                   {184, 4},
+                   {188, 1},
+                   {1768, 1},
+                   {1772, 1},
+                   {1776, 75},
+                   {1780, 120},
+                   {1784, 120},
+                   {1796, 2},
+                   {1800, 3},
+                   {2084, 1}},
                   "vpn", "10.0.0.138");
 }
 
@@ -270,9 +291,9 @@ TEST_F(Creation, A_card_that_nobody_picks_is_told_and_the_entry_is_made_all_the_
 
   Create(2);
 
-  EXPECT_EQ(desktop.Boxes, (std::vector<Box>{
-                               TitledBox(u"לא בחרת כרטיס רשת להגדרה!\r\nעליך להגדירו באופן ידני.", 0x20),
-                               success}));
+  EXPECT_EQ(
+      desktop.Boxes,
+      (std::vector<Box>{TitledBox(u"לא בחרת כרטיס רשת להגדרה!\r\nעליך להגדירו באופן ידני.", 0x20), success}));
   EXPECT_EQ(machine.ras.Entry("097")->properties, VpnRecord());
   EXPECT_TRUE(CallsStartingWith("EnableStatic").empty());
 }

@@ -196,7 +196,9 @@ TEST_F(VpnAdapterSetUp, A_card_that_goes_while_the_form_stands_is_still_the_one_
 TEST_F(VpnAdapterSetUp, Tells_its_three_steps_where_asked_to_with_plain_boxes) {
   machine.adapters.Cards = {"First card"};
   std::vector<std::string> callsAtBoxes;
-  desktop.OnBox = [&] { callsAtBoxes.push_back(machine.Calls.empty() ? "" : machine.Calls.back().substr(0, 9)); };
+  desktop.OnBox = [&] {
+    callsAtBoxes.push_back(machine.Calls.empty() ? "" : machine.Calls.back().substr(0, 9));
+  };
 
   vpnAdapter.ConfigureVpnAdapter(mainWindow, VpnAdapter::Steps::Told);
 

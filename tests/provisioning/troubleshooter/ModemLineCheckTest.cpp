@@ -26,10 +26,9 @@ TEST_F(ModemLine, A_modem_that_answers_at_the_second_address_is_all_right) {
 
   FailWith("Home", 633);
 
-  EXPECT_EQ(Findings(), (std::vector<Text>{u"שגיאה: 633 - מטפל...",
-                                           u"פינג ל-10.0.0.138 - Request Timed Out",
-                                           u"פינג תקין ל-192.168.0.1",
-                                           u"פינג ל-10.0.0.1 - Request Timed Out"}));
+  EXPECT_EQ(Findings(),
+            (std::vector<Text>{u"שגיאה: 633 - מטפל...", u"פינג ל-10.0.0.138 - Request Timed Out",
+                               u"פינג תקין ל-192.168.0.1", u"פינג ל-10.0.0.1 - Request Timed Out"}));
   EXPECT_EQ(form.lblDiagnoze.Caption(), u"");
   EXPECT_FALSE(IsRed());
   EXPECT_TRUE(form.cmdCheck.Enabled());

@@ -64,7 +64,7 @@ class TroubleshooterTest : public ProvisioningTest {
     return addresses;
   }
   static std::string EntryNameOf(const platform::simulated::SimulatedRemoteAccess::DialRequest& dial) {
-    return CutAtNul(platform::simulated::TextOf(dial.params).substr(4));
+    return platform::simulated::CutText(platform::simulated::TextOf(dial.params).substr(4));
   }
 
   frmConnectProb form{desktop, dun};
@@ -77,8 +77,7 @@ class TroubleshooterTest : public ProvisioningTest {
   const Box alreadyOpen{u"There is currently already a connection open.", 0x30,
                         u"  Connection Already Opened"};
   static constexpr const char16_t* kModemSilent = u"נראה שהמודם לא מתקשר עם המחשב - בודק חיבורים...";
-  static constexpr const char16_t* kExchange =
-      u"לא מצליח להתחבר למרכזיה של \"זלמר\" - צלצל 1-800-000-000";
+  static constexpr const char16_t* kExchange = u"לא מצליח להתחבר למרכזיה של \"זלמר\" - צלצל 1-800-000-000";
 };
 
 } // namespace quendra::provisioning

@@ -158,11 +158,11 @@ TEST_F(Check, After_a_real_failure_another_check_can_be_made) {
   desktop.RunUntilIdle();
 
   EXPECT_EQ(machine.ras.Dials.size(), 2u);
-  EXPECT_EQ(Lines(), (std::vector<Text>{u"פעולה: 0 - פותח פורט תקשורת",
-                                        u"שגיאה: 720 - כרגע לא בערכת התקלות המטופלות - פנה לתומך...",
-                                        u"פעולה: 5 - מאמת שם משתמש וסיסמא",
-                                        u"פעולה: 5 - מאמת שם משתמש וסיסמא",
-                                        u"שגיאה: 720 - כרגע לא בערכת התקלות המטופלות - פנה לתומך..."}));
+  EXPECT_EQ(Lines(),
+            (std::vector<Text>{u"פעולה: 0 - פותח פורט תקשורת",
+                               u"שגיאה: 720 - כרגע לא בערכת התקלות המטופלות - פנה לתומך...",
+                               u"פעולה: 5 - מאמת שם משתמש וסיסמא", u"פעולה: 5 - מאמת שם משתמש וסיסמא",
+                               u"שגיאה: 720 - כרגע לא בערכת התקלות המטופלות - פנה לתומך..."}));
 }
 
 TEST_F(Check, The_name_under_check_stays_as_it_is_listed) {
