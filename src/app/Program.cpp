@@ -12,7 +12,7 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
       frmMenu(desktop, frmAbout, systemVersion, hostAddresses), frmSplash(desktop, frmMenu),
 
       monitorPage(frmMenu, kPageTable[shell::kMonitorPage]), surfPage(frmMenu, kPageTable[shell::kSurfPage]),
-      firstConnectionPage(frmMenu, kPageTable[shell::kFirstConnectionPage]),
+      firstConnectionPage(frmMenu, kPageTable[shell::kFirstConnectionPage], machine.keyboardLayout),
 
       mdlFileInfo(machine.processes, machine.tokens, machine.versionInfo, desktop),
       modProcPort(machine.ipHelper, {machine.processes, machine.handles}, desktop,

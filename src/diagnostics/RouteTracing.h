@@ -15,8 +15,6 @@ class RouteTracing {
                forms::MessageLoop& loop, platform::KeyboardLayout& layout);
 
  private:
-  void frmSurf_txtping_KeyPress(int& keyCode);
-
   mdlTracert mdlTracert_;
   foundation::InputNormaliser normaliser_;
 };

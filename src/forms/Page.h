@@ -21,6 +21,8 @@ class PageWindow : public Form {
 
   /// Puts the menu back to normal, stops the visible page and hides all.
   virtual void resetButtons() = 0;
+  /// For a handler of the mouse's moves: shows the system's hand, where it has one.
+  virtual void ShowHandCursor() = 0;
   /// Kept at each activation and deactivation; nothing reads it.
   Boolean16 InBackground = kFalse16;
 };

@@ -3,6 +3,7 @@
 #include "platform/system/KeyboardLayout.h"
 
 #include <array>
+#include <limits>
 #include <string_view>
 
 namespace quendra::foundation {
@@ -60,6 +61,15 @@ void InputNormaliser::NormaliseKey(std::int16_t& keyCode, std::int16_t& specialF
   } else if (c == kBackspace) {
     result = keyCode;
   }
+}
+
+void InputNormaliser::MendKeyPress(int& keyCode, std::int16_t specialFlag) {
+  std::int16_t result = 0;
+  if (keyCode >= 0 && keyCode <= std::numeric_limits<std::int16_t>::max()) {
+    auto pressed = static_cast<std::int16_t>(keyCode);
+    NormaliseKey(pressed, specialFlag, result);
+  }
+  keyCode = result;
 }
 
 /// The marks that stand on the Q and W keys of the Hebrew layout; on any other they are marks.

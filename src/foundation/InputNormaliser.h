@@ -17,6 +17,9 @@ class InputNormaliser {
   /// `result` is 0 for a key that has no place in a user name. A key code is its character's number in
   /// Unicode. With the special flag 0 the codes of some marks are cleared, which changes no result.
   void NormaliseKey(std::int16_t& keyCode, std::int16_t& specialFlag, std::int16_t& result);
+  /// Turns the key press of a field into what is typed there, 0 for a key that is refused. Characters beyond
+  /// 16 bits with a sign are.
+  void MendKeyPress(int& keyCode, std::int16_t specialFlag);
 
  private:
   std::int16_t OfHebrewLayout(char16_t onHebrewLayout);

@@ -50,6 +50,7 @@ class frmMenu : public forms::PageWindow {
       forms::ControlArray<PictureBox, kPageCount>(*this, u"picMenu3");
 
   void resetButtons() override { pages_.resetButtons(); }
+  void ShowHandCursor() override { handCursor_.Show(); }
   bool PageChosen() const { return pages_.PageChosen; }
 
  private:

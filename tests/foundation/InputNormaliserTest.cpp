@@ -120,6 +120,27 @@ TEST_F(InputNormaliserTest, Only_refused_marks_lose_their_key_code) {
   }
 }
 
+TEST_F(InputNormaliserTest, The_key_press_of_a_field_becomes_what_is_typed_or_nothing) {
+  TypeEnglish();
+  const auto typed = [this](int keyCode) {
+    normaliser.MendKeyPress(keyCode, 0);
+    return keyCode;
+  };
+
+  EXPECT_EQ(typed(u'ן'), u'i');
+  EXPECT_EQ(typed(u'A'), u'a');
+  EXPECT_EQ(typed(u'!'), 0);
+}
+
+TEST_F(InputNormaliserTest, The_key_press_of_a_character_beyond_16_bits_with_a_sign_is_refused) {
+  // The lower halves of some are characters that pass.
+  for (const int character : {0x8000, 0xFB2A, 0x10061, 0x1F600, 0x10FFFF, -1, -65439}) {
+    int keyCode = character;
+    normaliser.MendKeyPress(keyCode, 0);
+    EXPECT_EQ(keyCode, 0) << character;
+  }
+}
+
 } // namespace
 
 } // namespace quendra::foundation

@@ -121,6 +121,10 @@ class Container : public Control {
   const Container* AsContainer() const override { return this; }
   const std::vector<Control*>& Children() const { return children_; }
 
+  /// What stands in it is placed from its left edge, in a form that reads from right to left too. Read when
+  /// the form is loaded.
+  bool PlacesFromLeft = false;
+
  private:
   friend class Control;
   std::vector<Control*> children_;

@@ -8,6 +8,7 @@ class Image;
 class ImageList;
 class Label;
 class Line;
+class ListBox;
 class ListView;
 class PictureBox;
 class TextBox;
@@ -24,6 +25,7 @@ class ControlVisitor {
   virtual void Visit(ImageList& images) = 0;
   virtual void Visit(Label& label) = 0;
   virtual void Visit(Line& line) = 0;
+  virtual void Visit(ListBox& list) = 0;
   virtual void Visit(ListView& list) = 0;
   virtual void Visit(PictureBox& box) = 0;
   virtual void Visit(TextBox& box) = 0;

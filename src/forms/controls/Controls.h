@@ -8,6 +8,7 @@
 #include "forms/controls/ImageList.h"
 #include "forms/controls/Label.h"
 #include "forms/controls/Line.h"
+#include "forms/controls/ListBox.h"
 #include "forms/controls/ListView.h"
 #include "forms/controls/PictureBox.h"
 #include "forms/controls/TextBox.h"

@@ -18,7 +18,9 @@ class Label : public Control {
   /// How a label that acts as a button is drawn: as plain text, a link, or a button with a face.
   enum class Look { Plain, Link, Button };
   Property<Look, Aspect::Look> Style{*this, Look::Plain};
-  bool IsButton() const { return Click || Style() == Look::Button; }
+  /// Clicked by the mouse alone: another control does the same for the keyboard and assistive technology.
+  bool MouseOnly = false;
+  bool IsButton() const { return !MouseOnly && (Click || Style() == Look::Button); }
   bool TakesFocus() const override { return IsButton(); }
   /// The accessible name where the caption is empty.
   Text Description;

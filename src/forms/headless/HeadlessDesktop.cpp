@@ -36,6 +36,7 @@ class HeadlessDesktop::FormView : public ControlView, private ControlVisitor {
   void Visit(ImageList& /*images*/) override {}
   void Visit(Label& /*label*/) override {}
   void Visit(Line& /*line*/) override {}
+  void Visit(ListBox& /*list*/) override {}
   void Visit(ListView& /*list*/) override {}
   void Visit(PictureBox& box) override { boxes_.push_back(&box); }
   void Visit(TextBox& /*box*/) override {}

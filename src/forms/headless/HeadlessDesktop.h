@@ -79,6 +79,7 @@ class HeadlessDesktop : public Desktop, public HeadlessLoop {
   bool CloseBox(Form& form);
   /// An item from 0; one that the list lacks can't be chosen.
   bool ChooseItem(ComboBox& combo, int index);
+  bool ChooseItem(ListBox& list, int index);
   /// A header from 1.
   bool ClickHeader(ListView& list, int header);
   /// A row from 1: selects it, then clicks the list.

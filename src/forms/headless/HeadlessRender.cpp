@@ -20,14 +20,14 @@ std::string StateOf(const TextBox& box) {
   return std::string(box.MultiLine ? " lines" : "") + (box.ReadOnly() ? " read-only" : "");
 }
 
-std::string ItemsOf(const ComboBox& combo) {
+template <typename Kind> std::string ItemsOf(const Kind& list) {
   std::string items = " [";
-  for (int i = 0; i < combo.ListCount(); ++i) {
+  for (int i = 0; i < list.ListCount(); ++i) {
     if (i > 0) items += ", ";
-    if (i == combo.ListIndex()) items += "*";
-    items += ToUtf8(combo.List(i));
+    if (i == list.ListIndex()) items += "*";
+    items += ToUtf8(list.List(i));
   }
-  return items + "]" + (combo.FreeText ? Quoted(combo.Value) : "");
+  return items + "]";
 }
 
 std::string HeadersOf(const ListView& list) {
@@ -71,7 +71,9 @@ class Renderer : public ControlVisitor {
     }
   }
 
-  void Visit(ComboBox& combo) override { Write("ComboBox", combo, ItemsOf(combo)); }
+  void Visit(ComboBox& combo) override {
+    Write("ComboBox", combo, ItemsOf(combo) + (combo.FreeText ? Quoted(combo.Value) : ""));
+  }
   void Visit(Frame& frame) override { Write("Frame", frame, Quoted(frame.Caption)); }
   void Visit(Image& image) override { Write("Image", image, PictureText(image.Contents)); }
   void Visit(ImageList& /*images*/) override {}
@@ -80,6 +82,7 @@ class Renderer : public ControlVisitor {
     Write(isButton ? "CommandButton" : "Label", label, Quoted(label.Caption) + ColourState(label));
   }
   void Visit(Line& line) override { Write("Line", line); }
+  void Visit(ListBox& list) override { Write("ListBox", list, ItemsOf(list)); }
   void Visit(ListView& list) override {
     Write("ListView", list);
     AppendTable(text_, list, margin_ + "  ");

@@ -78,6 +78,12 @@ bool HeadlessDesktop::PressKey(Form& form, int keyCode, int shift) {
       if (HearsOf(form, key, focused)) form.Form_KeyDown(keyCode, shift);
       TypeInto(*focused, character);
     });
+  if (auto* list = dynamic_cast<ListBox*>(focused))
+    if (const auto item = ItemReachedBy(*list, key))
+      return Act(*list, [&] {
+        if (HearsOf(form, key, focused)) form.Form_KeyDown(keyCode, shift);
+        if (*item != list->ListIndex()) list->SelectItem(*item);
+      });
   if (!tabs && !presses) return KeyDown(form, keyCode, shift);
   return Act(form, [&] {
     if (HearsOf(form, key, focused)) form.Form_KeyDown(keyCode, shift);
@@ -113,6 +119,11 @@ bool HeadlessDesktop::CloseBox(Form& form) {
 bool HeadlessDesktop::ChooseItem(ComboBox& combo, int index) {
   if (index < 0 || index >= combo.ListCount()) return false;
   return Act(combo, [&] { combo.SelectItem(index); });
+}
+
+bool HeadlessDesktop::ChooseItem(ListBox& list, int index) {
+  if (index < 0 || index >= list.ListCount()) return false;
+  return Act(list, [&] { list.SelectItem(index); });
 }
 
 bool HeadlessDesktop::ClickHeader(ListView& list, int header) {

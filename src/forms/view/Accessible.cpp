@@ -31,8 +31,8 @@ Text LabelBefore(const Control& control) {
   return nearest;
 }
 
-Text NameOfField(const Control& control, const TextEntry& entry) {
-  if (!entry.Description.empty()) return VisibleText(entry.Description);
+Text NameOfField(const Control& control, const Text& description) {
+  if (!description.empty()) return VisibleText(description);
   const Text label = LabelBefore(control);
   return label.empty() ? NameOfFrame(control) : label;
 }
@@ -44,7 +44,7 @@ class Describer : public ControlVisitor {
 
   // It has no caption of its own; that of the frame around it tells what is chosen here.
   void Visit(ComboBox& combo) override {
-    Description.name = combo.FreeText ? NameOfField(combo, combo) : NameOfFrame(combo);
+    Description.name = combo.FreeText ? NameOfField(combo, combo.Description) : NameOfFrame(combo);
   }
   void Visit(Frame& frame) override {
     Description.role = Role::Grouping;
@@ -58,9 +58,10 @@ class Describer : public ControlVisitor {
     Description.name = VisibleText(caption.empty() ? label.Description : caption, LineBreaks::Keep);
   }
   void Visit(Line& /*line*/) override { Description.role = Role::Separator; }
+  void Visit(ListBox& list) override { Description.name = NameOfField(list, list.Description); }
   void Visit(ListView& list) override { Description.name = VisibleText(list.Description); }
   void Visit(PictureBox& /*box*/) override { Description.role = Role::Graphic; }
-  void Visit(TextBox& box) override { Description.name = NameOfField(box, box); }
+  void Visit(TextBox& box) override { Description.name = NameOfField(box, box.Description); }
   void Visit(Timer& /*timer*/) override {}
 };
 

@@ -19,8 +19,8 @@ struct Accessible {
 };
 
 /// A label with a handler is a button, and one without a caption has its description for a name. A combo box
-/// is named by the frame around it, a field by its description, else by the label that stands before it, else
-/// by that frame. Asked for anew each time: a label becomes a button with its handler.
+/// is named by the frame around it, a field or a list box by its description, else by the label that stands
+/// before it, else by that frame. Asked for anew each time: a label becomes a button with its handler.
 Accessible AccessibleOf(Control& control);
 
 /// The name of a column: its caption, or what stands for the icon in place of one.

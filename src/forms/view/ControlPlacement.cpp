@@ -11,6 +11,11 @@ Direction DirectionOf(const Form& form) {
   return form.RightToLeft ? Direction::RightToLeft : Direction::LeftToRight;
 }
 
+Direction PlacingOf(const Control& control) {
+  const Container* holder = control.Parent();
+  return holder && holder->PlacesFromLeft ? Direction::LeftToRight : DirectionOf(control.OwnerForm());
+}
+
 Area PlaceOf(const Geometry& control, int container, const Scale& scale, Direction direction) {
   const Extent extent = ExtentOf(control, scale);
   int left = scale.PixelsX(control.left);

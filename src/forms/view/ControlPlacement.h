@@ -13,8 +13,12 @@ namespace quendra::forms {
 /// How a form is read, and with it all that stands in it.
 Direction DirectionOf(const Form& form);
 
-/// The place of a control in its container, of which `container` is the width in twips. Mirrored in a form
-/// that reads from right to left.
+/// The direction in which a control is placed in its container: that of the form, save where the container
+/// says otherwise.
+Direction PlacingOf(const Control& control);
+
+/// The place of a control in its container, of which `container` is the width in twips. Mirrored from right
+/// to left.
 Area PlaceOf(const Geometry& control, int container, const Scale& scale, Direction direction);
 
 /// What a control takes of its container. Both edges are rounded, not the width: controls that touch in twips

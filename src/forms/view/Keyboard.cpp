@@ -28,6 +28,18 @@ bool PressesLabel(const Label& label, const KeyPress& key) {
   return label.IsButton() && !key.repeated && (key.code == kEnterKey || key.code == kSpaceKey);
 }
 
+std::optional<int> ItemReachedBy(const ListBox& list, const KeyPress& key) {
+  const int last = list.ListCount() - 1;
+  if (last < 0 || key.shift != kNoShift) return std::nullopt;
+  switch (key.code) {
+  case kUpKey: return std::max(list.ListIndex() - 1, 0);
+  case kDownKey: return std::min(list.ListIndex() + 1, last);
+  case kHomeKey: return 0;
+  case kEndKey: return last;
+  default: return std::nullopt;
+  }
+}
+
 bool PassesList(int shift, bool givesCharacter) { return (shift & (kCtrl | kAlt)) != 0 && givesCharacter; }
 
 Control* ControlPressedBy(const Form& form, int keyCode, int shift) {

@@ -2,6 +2,9 @@
 
 #include "forms/Form.h"
 #include "forms/controls/Label.h"
+#include "forms/controls/ListBox.h"
+
+#include <optional>
 
 namespace quendra::forms {
 
@@ -53,6 +56,10 @@ bool HearsOf(const Form& form, const KeyPress& key, bool aControlHasFocus);
 
 /// Whether the key presses the label that has the focus. A key held down is one press.
 bool PressesLabel(const Label& label, const KeyPress& key);
+
+/// The item of a list box that a key goes to from the selected one: Up, Down, Home and End, without
+/// modifiers. None for any other key and in an empty list.
+std::optional<int> ItemReachedBy(const ListBox& list, const KeyPress& key);
 
 /// Whether a list leaves the key to its form: Ctrl or Alt and a character, which would else search its rows.
 bool PassesList(int shift, bool givesCharacter);

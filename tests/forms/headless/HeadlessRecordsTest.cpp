@@ -126,6 +126,16 @@ TEST_F(HeadlessDesktopTest, A_repaint_and_a_new_place_are_recorded) {
                                   "SetWindowPos " + ToUtf8(form.Name()) + " -2 0 0 0 0 3"}));
 }
 
+TEST_F(HeadlessDesktopTest, A_list_box_is_rendered_with_its_items_and_the_chosen_one) {
+  ListBox list(form, u"lstNICs");
+  for (const char16_t* item : {u"one", u"two"}) list.AddItem(item);
+  desktop.Show(form);
+  EXPECT_TRUE(desktop.ChooseItem(list, 0));
+  EXPECT_FALSE(desktop.ChooseItem(list, 2));
+
+  EXPECT_NE(desktop.Render(form).find("  ListBox lstNICs [*one, two]\n"), std::string::npos);
+}
+
 TEST_F(HeadlessDesktopTest, Fields_buttons_and_cell_icons_are_rendered) {
   TextBox box(form, u"box");
   CommandButton button(form, u"button");

@@ -96,6 +96,21 @@ TEST_F(LabelButton, Keeps_no_hand_cursor_when_it_is_disabled_under_the_mouse) {
   EXPECT_EQ(WidgetOf(button).cursor().shape(), Qt::ArrowCursor);
 }
 
+TEST_F(LabelButton, For_the_mouse_alone_takes_clicks_and_is_no_stop_of_Tab_and_no_button) {
+  Label row(form, u"row");
+  int rowClicks = 0;
+  row.Click = [&] { ++rowClicks; };
+  row.MouseOnly = true;
+  form.design = [&] { row.Move(0, 1500, 1500, 450); };
+  ShowActive();
+
+  Click(WidgetOf(row));
+
+  EXPECT_EQ(rowClicks, 1);
+  EXPECT_EQ(WidgetOf(row).focusPolicy(), Qt::NoFocus);
+  EXPECT_EQ(InterfaceOf(row).role(), QAccessible::StaticText);
+}
+
 TEST_F(LabelButton, Without_a_handler_is_still_a_button_to_assistive_technology) {
   Label later(form, u"later");
   later.Style = Label::Look::Button;

@@ -23,6 +23,10 @@ Key KeyOf(int code, int shift) {
   case kTabKey: return {code, shift & kShift ? Qt::Key_Backtab : Qt::Key_Tab, u'\t'};
   case kEnterKey: return {code, Qt::Key_Return, u'\r'};
   case kEscapeKey: return {code, Qt::Key_Escape, u'\x1b'};
+  case kHomeKey: return {code, Qt::Key_Home, {}};
+  case kEndKey: return {code, Qt::Key_End, {}};
+  case kUpKey: return {code, Qt::Key_Up, {}};
+  case kDownKey: return {code, Qt::Key_Down, {}};
   case kBackspaceKey: return {code, Qt::Key_Backspace, u'\b'};
   default: return {code, static_cast<Qt::Key>(code), static_cast<char16_t>(code)};
   }
@@ -87,7 +91,8 @@ class QtDriver : public DesktopDriver {
     if (!window.isActiveWindow()) QApplication::setActiveWindow(&window);
     QWidget* focused = window.focusWidget();
     const Key key = KeyOf(keyCode, shift);
-    QtFixture::PressKey(focused ? *focused : window, key.key, QString(QChar(key.text)), ModifiersOf(shift));
+    QtFixture::PressKey(focused ? *focused : window, key.key, key.text ? QString(QChar(key.text)) : QString(),
+                        ModifiersOf(shift));
   }
   void PressCloseBox(Form& form) override { QtFixture::WidgetOf(form).close(); }
   void AnswerBox(SeenBox& seen, int button) override {

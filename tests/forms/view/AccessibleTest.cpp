@@ -73,6 +73,17 @@ TEST_F(AccessibleTest, A_list_is_named_by_its_description) {
   EXPECT_EQ(AccessibleOf(list).name, u"תהליכים\uFFFD");
 }
 
+TEST_F(AccessibleTest, A_list_box_is_named_as_fields_are) {
+  label.Caption = Text(u"כרטיסי רשת:");
+  ListBox list(form, u"lstNICs");
+  EXPECT_EQ(AccessibleOf(list).name, u"כרטיסי רשת:");
+
+  list.Description = u"רשימה";
+
+  EXPECT_EQ(AccessibleOf(list).name, u"רשימה");
+  EXPECT_EQ(AccessibleOf(list).role, Role::Toolkits);
+}
+
 TEST_F(AccessibleTest, A_command_button_is_a_button) {
   CommandButton button(form, u"button");
   button.Caption = Text(u"התחל");

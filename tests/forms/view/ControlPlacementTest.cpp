@@ -1,5 +1,8 @@
 #include "forms/view/ControlPlacement.h"
 
+#include "forms/controls/Controls.h"
+#include "forms/view/BareForm.h"
+
 #include <gtest/gtest.h>
 
 namespace quendra::forms {
@@ -17,6 +20,20 @@ TEST(ControlPlace, Counts_from_the_left_edge_in_a_form_that_reads_from_left_to_r
 TEST(ControlPlace, Counts_from_the_right_edge_in_a_mirrored_form) {
   // 400 pixels wide, less 10 from the right edge, less its own 100.
   EXPECT_EQ(PlaceOf({150, 300, 1500, 450}, kContainer, kScreen, kHebrew), (Area{{290, 20}, {100, 30}}));
+}
+
+TEST(ControlPlace, Counts_from_the_left_edge_in_a_container_that_says_so_and_not_in_what_that_holds) {
+  BareForm form;
+  Frame tiles(form, u"tiles");
+  PictureBox tile(tiles, u"tile");
+  Label caption(tile, u"caption");
+  EXPECT_EQ(PlacingOf(tile), Direction::RightToLeft);
+
+  tiles.PlacesFromLeft = true;
+
+  EXPECT_EQ(PlacingOf(tiles), Direction::RightToLeft);
+  EXPECT_EQ(PlacingOf(tile), Direction::LeftToRight);
+  EXPECT_EQ(PlacingOf(caption), Direction::RightToLeft);
 }
 
 TEST(ControlPlace, Touches_in_pixels_what_it_touches_in_twips) {

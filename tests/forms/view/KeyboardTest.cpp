@@ -120,6 +120,23 @@ TEST_F(FormKeys, The_first_focus_goes_to_lists_too) {
   EXPECT_EQ(FirstFocus(form), &combo);
 }
 
+TEST_F(FormKeys, Keys_go_to_items_of_a_list_box_and_stop_at_its_ends) {
+  ListBox list(form, u"list");
+  EXPECT_FALSE(ItemReachedBy(list, {kDownKey}));
+  for (const char16_t* item : {u"one", u"two", u"three"}) list.AddItem(item);
+  EXPECT_EQ(ItemReachedBy(list, {kDownKey}), 0);
+  EXPECT_EQ(ItemReachedBy(list, {kUpKey}), 0);
+  EXPECT_EQ(ItemReachedBy(list, {kEndKey}), 2);
+
+  list.SelectItem(2);
+
+  EXPECT_EQ(ItemReachedBy(list, {kDownKey}), 2);
+  EXPECT_EQ(ItemReachedBy(list, {kUpKey}), 1);
+  EXPECT_EQ(ItemReachedBy(list, {kHomeKey}), 0);
+  EXPECT_FALSE(ItemReachedBy(list, {kHomeKey, kShift}));
+  EXPECT_FALSE(ItemReachedBy(list, {'A'}));
+}
+
 TEST(KeyCodes, Are_those_of_characters_with_Latin_letters_as_upper_case) {
   EXPECT_EQ(CodeOfCharacter(u'a'), 'A');
   EXPECT_EQ(CodeOfCharacter(u'z'), 'Z');

@@ -21,7 +21,7 @@ void LineView::paintEvent(QPaintEvent* /*event*/) {
   const QRect box = rect().adjusted(margin, margin, -margin, -margin);
   const int right = box.left() + box.width();
   const int bottom = box.top() + box.height();
-  const Stroke stroke = StrokeOf(TheLine().Ends(), ReadingDirection());
+  const Stroke stroke = StrokeOf(TheLine().Ends(), PlacingOf(TheLine()));
   QPainter painter(this);
   painter.setPen(QPen(ToQColor(TheLine().ForeColour()), TheLine().BorderWidth()));
   painter.setRenderHint(QPainter::Antialiasing, stroke != Stroke::Straight);

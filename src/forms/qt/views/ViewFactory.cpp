@@ -5,6 +5,7 @@
 #include "forms/qt/views/ImageView.h"
 #include "forms/qt/views/LabelView.h"
 #include "forms/qt/views/LineView.h"
+#include "forms/qt/views/ListBoxView.h"
 #include "forms/qt/views/ListViewView.h"
 #include "forms/qt/views/PictureBoxView.h"
 #include "forms/qt/views/TextAreaView.h"
@@ -26,6 +27,7 @@ class ViewMaker : public ControlVisitor {
   void Visit(ImageList& /*images*/) override {} // lists show its pictures
   void Visit(Label& label) override { Make<LabelView>(label); }
   void Visit(Line& line) override { Make<LineView>(line); }
+  void Visit(ListBox& list) override { Make<ListBoxView>(list); }
   void Visit(ListView& list) override { Make<ListViewView>(list); }
   void Visit(PictureBox& box) override { Make<PictureBoxView>(box); }
   void Visit(TextBox& box) override {

@@ -61,7 +61,7 @@ void WidgetView::Show() { widget_.setVisible(control_->Visible()); }
 
 void WidgetView::PlaceAt(const Geometry& geometry) {
   const int container = control_->Parent()->Position().width;
-  widget_.setGeometry(ToQRect(PlaceOf(geometry, container, context_.scale, direction_)));
+  widget_.setGeometry(ToQRect(PlaceOf(geometry, container, context_.scale, PlacingOf(*control_))));
 }
 
 void WidgetView::Repaint() {

@@ -1,0 +1,90 @@
+#include "provisioning/page/MailPanel.h"
+
+#include "provisioning/page/StepLooks.h"
+
+#include <algorithm>
+
+namespace quendra::provisioning {
+
+using foundation::Px;
+
+namespace {
+
+// Twips: where the first tile stands, and how far the next one from it.
+constexpr int kFirstTileLeft = 6525;
+constexpr int kTilePitch = 1266;
+
+constexpr int kTileWidth = 82;
+constexpr int kTileHeight = 136;
+constexpr int kPictureHeight = 66;
+/// What is left of a tile round its picture and its caption.
+constexpr int kEdge = 2;
+
+struct MailProgram {
+  const char16_t* token;
+  const char16_t* caption;
+  const char* artwork;
+};
+constexpr std::array<MailProgram, MailPanel::kTiles> kPrograms{{
+    {u"OE", u" אאוטלוק אקספרס", "mail_0"},
+    {u"MSO XP", u"מיקרוסופט אאוטלוק XP", "mail_1"},
+    {u"MSO 2k", u"מיקרוסופט אאוטלוק 2000", "mail_2"},
+    {u"MSO 97", u"מיקרוסופט אאוטלוק 97", "mail_3"},
+    {u"MSO 2k3", u"מיקרוסופט אאוטלוק 2003", "mail_4"},
+}};
+
+} // namespace
+
+void MailPanel::Design(const forms::Geometry& place) {
+  looks::StepFrame(frsCon_Frame2, place);
+  looks::StepTitle(Title, u"פרטי הדואר");
+  looks::StepField(FullNamePrompt, u"שם מלא:", frsCon_txtFullName, 66);
+  looks::StepField(EmailUNPrompt, u"שם משתמש בדואר:", frsCon_txtEmailUN, kEmailUNTop);
+  DesignTiles();
+  looks::StepButton(frsCon_Picture12, "create_mail", frsCon_cmdCreateEmail, u"צור חשבון דואר", place.height);
+}
+
+void MailPanel::DesignTiles() {
+  looks::ChoicePrompt(MailsPrompt, u"בחר את תוכנת הדואר שלך:");
+  Tiles.Caption = Text();
+  Tiles.Border = false;
+  Tiles.BackColour = looks::kStepGround;
+  Tiles.Move(Px(looks::kChoiceLeft), Px(56), Px(524), Px(kTileHeight));
+  for (std::size_t tile = 0; tile < kTiles; ++tile) DesignTile(tile);
+}
+
+void MailPanel::DesignTile(std::size_t tile) {
+  frsCon_lblMailsBG[tile].BackColour = looks::kStepGround;
+  frsCon_lblMailsBG[tile].Visible = false;
+  frsCon_lblMailsBG[tile].Move(kFirstTileLeft, 0, Px(kTileWidth), Px(kTileHeight));
+  frsCon_lblMailBG2[tile].Transparent = true;
+  frsCon_lblMailBG2[tile].BackColour = forms::kWhite;
+  frsCon_lblMailBG2[tile].Move(0, 0, Px(kTileWidth), Px(kTileHeight));
+  frsCon_imgMails[tile].Contents = forms::Picture::Artwork(kPrograms[tile].artwork);
+  frsCon_imgMails[tile].Move(Px(kEdge), Px(kEdge), Px(kTileWidth - 2 * kEdge), Px(kPictureHeight));
+  looks::PlainText(frsCon_lblMails[tile], kPrograms[tile].caption, looks::kSmall, looks::kForest);
+  frsCon_lblMails[tile].WordWrap = true;
+  frsCon_lblMails[tile].Align = forms::Alignment::Centre;
+  frsCon_lblMails[tile].Move(Px(kEdge), Px(kEdge + kPictureHeight), Px(kTileWidth - 2 * kEdge),
+                             Px(kTileHeight - kPictureHeight - 2 * kEdge));
+}
+
+void MailPanel::PlaceTiles(TextView tokens) {
+  int left = kFirstTileLeft;
+  while (!tokens.empty()) {
+    const std::size_t end = std::min(tokens.find(u'|'), tokens.size());
+    const auto program = std::find_if(kPrograms.begin(), kPrograms.end(), [&](const MailProgram& known) {
+      return tokens.substr(0, end) == known.token;
+    });
+    tokens.remove_prefix(std::min(end + 1, tokens.size()));
+    if (program == kPrograms.end()) continue;
+    forms::PictureBox& tile = frsCon_lblMailsBG[static_cast<std::size_t>(program - kPrograms.begin())];
+    forms::Geometry place = tile.Position;
+    place.left = left;
+    tile.Position = place;
+    tile.Visible = true;
+    left -= kTilePitch;
+  }
+}
+
+} // namespace quendra::provisioning
