@@ -5,18 +5,20 @@ namespace quendra::app {
 namespace {
 
 provisioning::ConnectionStep StepOf(provisioning::FirstConnectionPage& page) {
+  provisioning::ConnectionPanel& panel = page.connection;
   return {page.SelectedModem,
-          page.frsCon_txtUsername,
-          page.frsCon_txtPassword,
-          page.frsCon_cmdCreate,
+          panel.frsCon_txtUsername,
+          panel.frsCon_txtPassword,
+          panel.frsCon_cmdCreate,
           {&page.frsCon_lblError[0], &page.frsCon_lblError[1]},
-          page.frsCon_Frame1,
-          page.frsCon_Frame2,
-          page.frsCon_txtEmailUN};
+          panel.frsCon_Frame1,
+          page.mail.frsCon_Frame2,
+          page.mail.frsCon_txtEmailUN};
 }
 
 mail::MailForm MailFormOf(provisioning::FirstConnectionPage& page) {
-  return {page.SelectedMail, page.frsCon_txtEmailUN, page.frsCon_txtFullName, page.frsCon_txtUsername};
+  return {page.SelectedMail, page.mail.frsCon_txtEmailUN, page.mail.frsCon_txtFullName,
+          page.connection.frsCon_txtUsername};
 }
 
 } // namespace
@@ -35,6 +37,7 @@ ConnectionWing::ConnectionWing(const platform::Machine& machine, forms::Desktop&
       troubleshooter(frmConnectProb, mdlDun, connectionDiagnosis), expressAccount(machine.registry),
       outlookProfile(machine.files, machine.shellStart, machine.processes),
       mdlEmail(MailFormOf(page), desktop, expressAccount, outlookProfile) {
+  page.DetectMailClients = [this] { return mailClients.DetectMailClients(); };
   page.CreateConnection = [this] { connectionCreation.CreateConnection(); };
   page.CreateMailAccount = [this] { mdlEmail.CreateMailAccount(); };
 }
