@@ -30,17 +30,19 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
       modSocketPlus(machine.sockets, machine.hostNames, desktop),
       supportExchange(modSocketPlus, desktop, monitorPage.reporting, processTable, monitorPage.main_Timer1),
 
-      surf(machine, desktop, modSocketPlus, surfPage), frmPortsChecks(desktop, modSocketPlus),
+      surf(machine, desktop, modSocketPlus, surfPage), connection(machine, desktop, firstConnectionPage),
+      frmPortsChecks(desktop, modSocketPlus),
 
       captureSetup(machine.shellStart, frmSplash, frmMenu, captureSession, packetControl),
       monitorWork(monitorPage, processTable, supportExchange, ownAddresses, captureSession),
       processActions(monitorPage, portSource, machine.processes, machine.shellStart, desktop),
-      monitorDialogs(desktop, frmMenu) {
+      pageDialogs(desktop, frmMenu) {
   frmMenu.Add(monitorPage);
   frmMenu.Add(surfPage);
   frmMenu.Add(firstConnectionPage);
-  monitorDialogs.Offer(monitorPage.main_cmdChecks, frmPortsChecks);
-  monitorDialogs.Offer(monitorPage.main_cmdMemInfo, frmMemInfo);
+  pageDialogs.Offer(monitorPage.main_cmdChecks, frmPortsChecks);
+  pageDialogs.Offer(monitorPage.main_cmdMemInfo, frmMemInfo);
+  pageDialogs.Offer(firstConnectionPage.menu.frsCon_lblConnectProb, connection.frmConnectProb);
   monitorWork.TearDownSniffer = [this] { sniffer.Teardown(); };
   surfPage.surf_Timer1.Tick = [this] { modProcPort.surf_Timer1_Timer(); };
 }

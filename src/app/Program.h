@@ -1,5 +1,6 @@
 #pragma once
 
+#include "app/ConnectionWing.h"
 #include "app/SurfWing.h"
 #include "capture/CaptureSession.h"
 #include "capture/HostAddresses.h"
@@ -13,12 +14,11 @@
 #include "foundation/modSocketPlus.h"
 #include "monitor/ProcessTable.h"
 #include "platform/Machine.h"
-#include "provisioning/FirstConnectionPage.h"
 #include "report/SupportExchange.h"
 #include "shell/CaptureSetup.h"
-#include "shell/MonitorDialogs.h"
 #include "shell/MonitorPage.h"
 #include "shell/MonitorWork.h"
+#include "shell/PageDialogs.h"
 #include "shell/ProcessActions.h"
 #include "shell/frmMenu.h"
 #include "shell/frmSplash.h"
@@ -72,12 +72,13 @@ class Program {
   report::SupportExchange supportExchange;
 
   SurfWing surf;
+  ConnectionWing connection;
   diagnostics::frmPortsChecks frmPortsChecks;
 
   shell::CaptureSetup captureSetup;
   shell::MonitorWork monitorWork;
   shell::ProcessActions processActions;
-  shell::MonitorDialogs monitorDialogs;
+  shell::PageDialogs pageDialogs;
 };
 
 } // namespace quendra::app

@@ -4,10 +4,10 @@
 
 namespace quendra::shell {
 
-/// The dialogs that buttons of the monitor page show over the main window.
-class MonitorDialogs {
+/// The dialogs that buttons of pages show over the main window.
+class PageDialogs {
  public:
-  MonitorDialogs(forms::Desktop& desktop, forms::Form& owner) : desktop_(desktop), owner_(owner) {}
+  PageDialogs(forms::Desktop& desktop, forms::Form& owner) : desktop_(desktop), owner_(owner) {}
 
   /// A click on the button shows the dialog.
   void Offer(forms::Label& button, forms::Form& dialog) {
