@@ -8,7 +8,7 @@ import subprocess
 import stage
 
 TRAFFIC = f"{os.path.dirname(os.path.abspath(__file__))}/traffic.py"
-SECONDS = 150
+SECONDS = 300
 
 # Where, name, role, address, port, bytes a second. Servers stand before their clients. Each runs from a file of its own
 # name, so that its row can be told from the others; those that talk run from the interpreter itself, which has an icon.

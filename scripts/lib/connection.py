@@ -9,7 +9,7 @@ from gi.repository import Atspi
 
 MODEMS = ("Samsung AHT E300", "Alcatel 510", "Alcatel Speed Touch Home", "ECI B-FoCUS +270/312", "Aztech E600")
 BY_VPN = 2
-ENTRY = "097"
+ENTRY, TEST_ENTRY = "097", "097tmp"
 # What is typed, key by key on the Hebrew layout, and what arrives.
 NAME_KEYS, NAME = "גשמש", "dana"
 PASSWORD_KEYS, PASSWORD = "דנ'/6", "sbwq6"
@@ -117,6 +117,39 @@ class ConnectionStep:
         return wrong
 
 
+class MailStep:
+    """On the page's mail step: the account for every program that has a tile."""
+
+    MADE = "חשבון דואר אלקטרוני נוצר בהצלחה."
+    FULL_NAME = "דנה לוי"
+
+    def __init__(self, walk):
+        self.walk = walk
+        self.program = walk.program
+        self.boxes = Boxes(walk)
+
+    def tiles(self):
+        """Their numbers in the code."""
+        return [number for number in range(5) if self.program.find(f"frsCon_lblMails({number})")]
+
+    def take(self, wanted):
+        """Gives what is wrong."""
+        self.walk.click("frsCon_txtFullName")
+        self.walk.xdotool("key", "End", "shift+Home", "BackSpace")
+        self.walk.xdotool("type", "--delay", 40, self.FULL_NAME)
+        if not text_of(self.program.control("frsCon_txtEmailUN")):
+            self.walk.click("frsCon_txtEmailUN")
+            self.walk.xdotool("type", "--delay", 40, NAME)
+        tiles = self.tiles()
+        for tile in tiles:
+            self.walk.click(f"frsCon_lblMails({tile})")
+            time.sleep(0.3)
+            self.walk.picture(f"mail-{tile}")
+            self.walk.click("frsCon_cmdCreateEmail")
+            self.boxes.press(self.MADE, f"mail-made-{tile}")
+        return [] if tiles == list(wanted) else [f"the mail step has the tiles {tiles}, not {list(wanted)}"]
+
+
 class TroubleStep:
     """Opens the troubleshooter, once with a number of an error and once with a real dial."""
 
@@ -148,7 +181,7 @@ class TroubleStep:
         return text_of(self.program.control("txtStatus"))
 
     def check(self, name, number, end, seconds):
-        """Gives what the status says once `end` stands in it."""
+        """Gives what the status says once `end` stands in it. The form stays."""
         self.open()
         self.choose(name)
         if number:
@@ -156,10 +189,26 @@ class TroubleStep:
             self.walk.xdotool("type", number)
         self.walk.picture(f"trouble-{number or 'dial'}-before")
         self.walk.click("cmdCheck")
-        said = wait_for(f"{end!r} in the status", lambda: self.status() if end in self.status() else "", seconds)
+        wait_for(f"{end!r} in the status", lambda: end in self.status(), seconds)
         time.sleep(1)
         self.walk.picture(f"trouble-{number or 'dial'}")
-        said = self.status()
+        return self.status()
+
+    def close(self):
         self.walk.click("Command1")
         wait_for("the troubleshooter to close", lambda: not self.program.find("cmdCheck"))
-        return said
+
+    def simulate(self, name, manager):
+        """A login that failed; gives the status and what is wrong."""
+        said = self.check(name, "691", "מנסה חיבור לזלמר...", 30)
+        wrong = [] if TEST_ENTRY in manager.entries() else [f"no {TEST_ENTRY} among {manager.entries()}"]
+        self.close()
+        return said, wrong
+
+    def dial(self, name):
+        """A real dial, which no line answers; gives the status and what is wrong."""
+        said = self.check(name, "", "שגיאה: ", 60)
+        wait_for("the button to check", lambda: self.program.control("cmdCheck"), 60)
+        self.walk.picture("trouble-end")
+        self.close()
+        return said, [] if "פעולה: 0 - " in said else [f"the dial tells {said!r}"]

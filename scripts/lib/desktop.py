@@ -1,5 +1,5 @@
 """What a desktop offers to programs, each a stand-in that writes down what it is asked: a file manager on the session
-bus, and a software centre among the programs."""
+bus, and among the programs a software centre and the opener of files."""
 
 import os
 import subprocess
@@ -10,13 +10,14 @@ from accessible import wait_for
 
 FILE_MANAGER = f"{os.path.dirname(os.path.abspath(__file__))}/../../tests/standins/file_manager.py"
 SOFTWARE_CENTRE = "gnome-software"
+OPENER = "xdg-open"
 
 
 class Desktop:
     def __init__(self, stack, seconds):
         self.folder = stack.enter_context(stage.private_directory())
         self.start_file_manager(stack, seconds)
-        self.add_software_centre()
+        self.add_programs()
 
     def start_file_manager(self, stack, seconds):
         said = stack.enter_context(open(f"{self.folder}/file-manager", "w"))
@@ -24,14 +25,17 @@ class Desktop:
         stack.enter_context(stage.started(command, stdout=said, stderr=subprocess.STDOUT))
         wait_for("the stand-in file manager", lambda: "ready" in self.asked("file-manager"))
 
-    def add_software_centre(self):
-        """A program of that name stands before all others in PATH."""
-        programs = f"{self.folder}/bin"
-        os.mkdir(programs)
-        with open(f"{programs}/{SOFTWARE_CENTRE}", "w") as script:
-            script.write(f'#!/bin/sh\necho "started with $# words" >>"{self.folder}/software-centre"\n')
-        os.chmod(f"{programs}/{SOFTWARE_CENTRE}", 0o755)
-        os.environ["PATH"] = f"{programs}:{os.environ['PATH']}"
+    def add_programs(self):
+        """Programs of these names stand before all others in PATH."""
+        os.mkdir(f"{self.folder}/bin")
+        self.add_program(SOFTWARE_CENTRE, f'echo "started with $# words" >>"{self.folder}/software-centre"')
+        self.add_program(OPENER, f'echo "opens $1" >>"{self.folder}/opener"')
+        os.environ["PATH"] = f"{self.folder}/bin:{os.environ['PATH']}"
+
+    def add_program(self, name, command):
+        with open(f"{self.folder}/bin/{name}", "w") as script:
+            script.write(f"#!/bin/sh\n{command}\n")
+        os.chmod(script.name, 0o755)
 
     def asked(self, name):
         """What a stand-in wrote down so far, line by line."""

@@ -66,6 +66,10 @@ class NetworkManager:
     def nmcli(self, *words):
         return stage.run("nmcli", *words)
 
+    def add_entry(self, name):
+        """A connection that is not the program's."""
+        self.nmcli("connection", "add", "type", "pppoe", "con-name", name, "ifname", "eth1", "username", "clerk")
+
     def entries(self):
         """The connections by which one dials, with their kinds."""
         lines = self.nmcli("-t", "-f", "NAME,TYPE", "connection", "show").splitlines()
@@ -75,8 +79,9 @@ class NetworkManager:
     def told(self, name):
         """What a connection holds, its secrets too, in one line."""
         fields = ("pppoe.username", "pppoe.password", "vpn.data", "vpn.secrets", "user.data")
-        lines = self.nmcli("--show-secrets", "-t", "-f", ",".join(field.split(".")[0] for field in fields), "connection", "show", name)
-        return ", ".join(line for line in lines.splitlines() if line.split(":")[0] in fields)
+        lines = self.nmcli("--show-secrets", "-t", "connection", "show", name)
+        found = {line for line in lines.splitlines() if line.split(":")[0] in fields and not line.endswith(":")}
+        return ", ".join(sorted(found))
 
     def addresses(self, card):
         return stage.run("ip", "-n", self.space, "-4", "-o", "address", "show", "dev", card)

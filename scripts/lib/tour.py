@@ -1,12 +1,13 @@
 #!/usr/bin/python3
 """Walks through the program on a virtual display as a user would, with real clicks and keys, while real clients and
 servers exchange data over a link of its own: sends a report to a stand-in support server, has a file shown and a process
-ended, opens every dialog, runs the checks of the page for surf problems and traces a route. Leaves screenshots in
-build/screens, prints what the table, the report, each row and each dialog say, and ends non-zero when something isn't as
-it should be.
+ended, opens every dialog, runs the checks of the page for surf problems and traces a route, makes the first connection
+for each modem and the mail account for each mail program, and looks for what is wrong with a connection. Leaves
+screenshots in build/screens, prints what the table, the report, each row and each dialog say and what other tools find
+afterwards, and ends non-zero when something isn't as it should be.
 
-The link, the traffic and the route need root. Without it the program runs on this machine as it is, the table has no
-rates and no route is traced."""
+The link, the traffic, the route and the network manager need root. Without it the program runs on this machine as it is, the table has no
+rates, no route is traced and no connection is made."""
 
 import contextlib
 import dataclasses
@@ -21,9 +22,12 @@ from gi.repository import GLib
 
 import actions
 import cast
+import connection
 import desktop
 import dialogs
 import keys
+import mail
+import network_manager
 import report
 import stage
 import surf
@@ -35,6 +39,9 @@ from walk import Walk
 
 ROOT = os.path.dirname(os.path.dirname(os.path.dirname(os.path.abspath(__file__))))
 PROGRAM = os.environ.get("QUENDRA", f"{ROOT}/build/linux/quendra")
+# The same on a machine that has mail programs.
+OFFICE = os.environ.get("QUENDRA_OFFICE", f"{ROOT}/build/linux/quendra_office")
+MAIL_DOMAIN = "localhost"
 SCREENS = f"{ROOT}/build/screens"
 
 
@@ -107,10 +114,49 @@ def check_surfing(walk, scene):
     return wrong
 
 
-def tour(scene, child):
+def connect(walk, scene):
+    """The page of the first connection; gives what is wrong with it."""
+    if not scene.manager:
+        walk.first_connection()
+        return []
+    scene.manager.add_entry("Office")
+    wrong = connection.ConnectionStep(walk, scene.manager).take()
+    wrong += look_for_trouble(walk, scene.manager)
+    walk.click("frsCon_lblCaption(0)")
+    wrong += connection.MailStep(walk).take([0])
+    print("\n".join(mail.lines()))
+    walk.click("frsCon_lblBack")
+    walk.click("frsCon_lblBack")
+    return wrong
+
+
+def look_for_trouble(walk, manager):
+    step = connection.TroubleStep(walk)
+    said, wrong = step.simulate(connection.ENTRY, manager)
+    print(f"trouble: {said}")
+    said, lacks = step.dial(connection.ENTRY)
+    print(f"trouble: {said}")
+    return wrong + lacks
+
+
+def make_mail_accounts(walk, scene):
+    """In a program on a machine that has the mail programs; gives what is wrong with the accounts."""
+    walk.splash()
+    walk.click("lblCaption(2)")
+    walk.click("frsCon_lblCaption(0)")
+    step = connection.MailStep(walk)
+    wrong = step.take([0, 1, 2, 4])
+    print("\n".join(mail.lines()))
+    print(f"the desktop {scene.desktop.wait_for_request('opener')}")
+    return wrong + mail.wrong_with(connection.NAME, step.FULL_NAME, MAIL_DOMAIN)
+
+
+def tour(child, pictures, take, scene):
+    """Gives what is wrong with a walk through the program and with its end."""
     walk = Walk(Program(child.pid), SCREENS)
+    walk.pictures = pictures
     try:
-        return walk_through(walk, scene) + end_of(walk, child)
+        return take(walk, scene) + end_of(walk, child), walk.pictures
     except RuntimeError:
         walk.picture("where-it-failed")
         raise
@@ -135,7 +181,7 @@ def walk_through(walk, scene):
     wrong += read_memory(walk)
     wrong += go_round(walk, "main_ListView1", *actions.BUTTONS, "main_cmbAdapters")
     wrong += check_surfing(walk, scene)
-    walk.first_connection()
+    wrong += connect(walk, scene)
     walk.monitor()
     time.sleep(3)
     walk.picture("monitor-again")
@@ -177,11 +223,12 @@ class Scene:
     ports: dict = dataclasses.field(default_factory=dict)
     route: trace.Route | None = None
     support: report.Support | None = None
+    manager: network_manager.NetworkManager | None = None
     servers_are_there: bool = False
 
-    def command(self):
-        """The program's, on this side of the link where there is one."""
-        return stage.in_namespace(self.spaces[0], PROGRAM) if self.spaces else [PROGRAM]
+    def command(self, program):
+        """A program's, on this side of the link where there is one."""
+        return stage.in_namespace(self.spaces[0], program) if self.spaces else [program]
 
 
 def add_network(stack, scene):
@@ -193,6 +240,15 @@ def add_network(stack, scene):
     scene.ports = cast.start_traffic(stack, {"here": here, "there": there})
     scene.route = stack.enter_context(trace.route(there))
     say("traffic runs, local ports " + ", ".join(f"{name} {port}" for name, port in scene.ports.items()))
+
+
+def add_network_manager(stack, scene):
+    """The one by which connections are made."""
+    missing = network_manager.missing()
+    if missing:
+        say(f"no connection is made, for there is no network manager: {missing}")
+    else:
+        scene.manager = network_manager.start(stack)
 
 
 def add_servers(stack, scene):
@@ -214,7 +270,10 @@ def perform():
         surf.fill_cache()
         add_network(stack, scene)
         add_servers(stack, scene)
-        return tour(scene, stack.enter_context(stage.started(scene.command())))
+        add_network_manager(stack, scene)
+        wrong, pictures = tour(stack.enter_context(stage.started(scene.command(PROGRAM))), 0, walk_through, scene)
+        office = stack.enter_context(stage.started(scene.command(OFFICE)))
+        return wrong + tour(office, pictures, make_mail_accounts, scene)[0]
 
 
 def too_late(*_):
