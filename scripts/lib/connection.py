@@ -78,7 +78,6 @@ class ConnectionStep:
         self.walk.click("Command1")
 
     def create(self, modem):
-        self.walk.click("frsCon_lblCaption(1)")
         wrong = self.fill()
         self.walk.click(f"frsCon_lblModems({modem})")
         time.sleep(0.3)
@@ -111,6 +110,7 @@ class ConnectionStep:
         self.walk.picture("first-connection")
         wrong = []
         for modem in range(len(MODEMS)):
+            self.walk.click("frsCon_lblCaption(1)")
             wrong += self.create(modem)
             print(f"connection: {MODEMS[modem]}: {self.manager.told(ENTRY)}")
             self.walk.click("frsCon_lblBack")
@@ -175,7 +175,8 @@ class TroubleStep:
         raise RuntimeError(f"the troubleshooter has no connection {name}, but {self.chosen()!r}")
 
     def chosen(self):
-        return self.program.control("cmbDialups").get_name() or ""
+        """Without the marks that keep Latin letters in their order."""
+        return self.program.control("cmbDialups").get_name().strip("\u2066\u2067\u2068\u2069")
 
     def status(self):
         return text_of(self.program.control("txtStatus"))
