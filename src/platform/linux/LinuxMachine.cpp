@@ -1,8 +1,8 @@
 #include "platform/linux/LinuxMachine.h"
-#include "platform/unavailable/UnavailableAdapters.h"
 #include "platform/unavailable/UnavailableFiles.h"
 #include "platform/unavailable/UnavailableInstalledProducts.h"
 
+#include "platform/linux/adapters/LinuxAdapters.h"
 #include "platform/linux/capture/LinuxCapture.h"
 #include "platform/linux/icmp/LinuxIcmp.h"
 #include "platform/linux/internet/LinuxUrlCache.h"
@@ -40,7 +40,7 @@ struct LinuxMachine::Parts {
   NetworkManagerBus networkManager;
   ConnectionBook connectionBook{networkManager};
 
-  unavailable::UnavailableAdapters adapters;
+  LinuxAdapters adapters{networkManager};
   LinuxDialling dialling;
   unavailable::UnavailableFiles files;
   unavailable::UnavailableInstalledProducts installedProducts;
