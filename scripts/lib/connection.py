@@ -41,6 +41,20 @@ class Boxes:
         wait_for(f"the box {text!r} to close", lambda: not self.find(text))
 
 
+class Typist:
+    """Types into fields, and waits until what was typed has arrived."""
+
+    def __init__(self, walk):
+        self.walk = walk
+        self.program = walk.program
+
+    def type_into(self, field, keys, arrives):
+        self.walk.click(field)
+        self.walk.xdotool("key", "End", "shift+Home", "BackSpace")
+        self.walk.xdotool("type", "--delay", 60, keys)
+        wait_for(f"{arrives!r} in {field}", lambda: text_of(self.program.control(field)) == arrives)
+
+
 class ConnectionStep:
     """Makes the entry for every modem, one after the other, and stays on the page's mail step."""
 
@@ -49,24 +63,18 @@ class ConnectionStep:
         self.program = walk.program
         self.manager = manager
         self.boxes = Boxes(walk)
+        self.typist = Typist(walk)
 
     def layout(self, name):
         stage.run("setxkbmap", name)
         time.sleep(0.3)
 
-    def type_into(self, field, keys):
-        self.walk.click(field)
-        self.walk.xdotool("key", "End", "shift+Home", "BackSpace")
-        self.walk.xdotool("type", "--delay", 60, keys)
-        return wait_for(f"what was typed into {field}", lambda: text_of(self.program.control(field)))
-
     def fill(self):
-        """With the keys of the Hebrew layout; gives what is wrong with what arrives."""
+        """With the keys of the Hebrew layout."""
         self.layout("il")
-        typed = self.type_into("frsCon_txtUsername", NAME_KEYS)
-        self.type_into("frsCon_txtPassword", PASSWORD_KEYS)
+        self.typist.type_into("frsCon_txtUsername", NAME_KEYS, NAME)
+        self.typist.type_into("frsCon_txtPassword", PASSWORD_KEYS, PASSWORD)
         self.layout("us")
-        return [] if typed == NAME else [f"the keys of {NAME_KEYS!r} arrive as {typed!r}"]
 
     def choose_card(self):
         """The list of network cards that comes before the box for one of the modems."""
@@ -78,7 +86,7 @@ class ConnectionStep:
         self.walk.click("Command1")
 
     def create(self, modem):
-        wrong = self.fill()
+        self.fill()
         self.walk.click(f"frsCon_lblModems({modem})")
         time.sleep(0.3)
         self.walk.picture(f"modem-{modem}")
@@ -87,8 +95,7 @@ class ConnectionStep:
             self.choose_card()
         self.boxes.press(CREATED, f"created-{modem}")
         mail_name = wait_for("the mail step", lambda: text_of(self.program.control("frsCon_txtEmailUN")))
-        if mail_name != NAME:
-            wrong.append(f"the mail step has the name {mail_name!r}")
+        wrong = [] if mail_name == NAME else [f"the mail step has the name {mail_name!r}"]
         return wrong + self.lacks(modem)
 
     def lacks(self, modem):
@@ -134,12 +141,9 @@ class MailStep:
 
     def take(self, wanted):
         """Gives what is wrong."""
-        self.walk.click("frsCon_txtFullName")
-        self.walk.xdotool("key", "End", "shift+Home", "BackSpace")
-        self.walk.xdotool("type", "--delay", 40, self.FULL_NAME)
-        if not text_of(self.program.control("frsCon_txtEmailUN")):
-            self.walk.click("frsCon_txtEmailUN")
-            self.walk.xdotool("type", "--delay", 40, NAME)
+        typist = Typist(self.walk)
+        typist.type_into("frsCon_txtFullName", self.FULL_NAME, self.FULL_NAME)
+        typist.type_into("frsCon_txtEmailUN", NAME, NAME)
         tiles = self.tiles()
         for tile in tiles:
             self.walk.click(f"frsCon_lblMails({tile})")

@@ -1,7 +1,7 @@
 #include "platform/linux/LinuxMachine.h"
-#include "platform/unavailable/UnavailableAdapters.h"
 #include "platform/unavailable/UnavailableInstalledProducts.h"
 
+#include "platform/linux/adapters/LinuxAdapters.h"
 #include "platform/linux/capture/LinuxCapture.h"
 #include "platform/linux/files/LinuxFiles.h"
 #include "platform/linux/icmp/LinuxIcmp.h"
@@ -41,7 +41,7 @@ struct LinuxMachine::Parts {
   NetworkManagerBus networkManager;
   ConnectionBook connectionBook{networkManager};
 
-  unavailable::UnavailableAdapters adapters;
+  LinuxAdapters adapters{networkManager};
   LinuxDialling dialling;
   LinuxFiles files{drive};
   unavailable::UnavailableInstalledProducts installedProducts; // this system's packages are no such products

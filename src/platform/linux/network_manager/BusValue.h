@@ -21,6 +21,9 @@ struct BusValue {
   static BusValue Path(std::string path) { return {'o', {}, 0, std::move(path), {}}; }
   static BusValue Number(std::uint32_t number) { return {'u', {}, number, {}, {}}; }
   static BusValue Wide(std::uint64_t number) { return {'t', {}, number, {}, {}}; }
+  static BusValue Signed(std::int64_t number) {
+    return {'x', {}, static_cast<std::uint64_t>(number), {}, {}};
+  }
   static BusValue Truth(bool truth) { return {'b', {}, truth ? 1U : 0U, {}, {}}; }
   static BusValue Array(std::string contents, std::vector<BusValue> items) {
     return {'a', std::move(contents), 0, {}, std::move(items)};

@@ -23,7 +23,7 @@ inline constexpr const char* kNoObject = "/";
 inline constexpr const char* kPptpService = "org.freedesktop.NetworkManager.pptp";
 
 /// NMDeviceType.
-enum DeviceType : std::uint32_t { kEthernet = 1, kWifi = 2, kVeth = 20 };
+enum DeviceType : std::uint32_t { kEthernet = 1, kWifi = 2, kVeth = 20, kLoopback = 32 };
 
 /// NMDeviceState.
 enum DeviceState : std::uint32_t {

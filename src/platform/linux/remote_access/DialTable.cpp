@@ -20,8 +20,8 @@ struct Meaning {
 constexpr std::array kDeviceStates{
     Meaning{nm::kPrepare, kRasPortOpened},        // NMDeviceState: preparing the connection
     Meaning{nm::kConfig, kRasConnectDevice},      // connecting to the requested network
-    Meaning{nm::kIpConfig, kRasAuthenticate},     // requesting addresses: PPP runs in this state
-    Meaning{nm::kIpCheck, kRasAuthenticated},     // checking whether further action is required
+    Meaning{nm::kIpConfig, kRasAuthenticated},    // requesting addresses, which follows PPP
+    Meaning{nm::kIpCheck, kRasProjected},         // checking whether further action is required
     Meaning{nm::kSecondaries, kRasProjected},     // waiting for a secondary connection
     Meaning{nm::kDeviceActivated, kRasConnected}, // the device has a connection
 };

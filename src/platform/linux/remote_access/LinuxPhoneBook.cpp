@@ -1,10 +1,10 @@
 #include "platform/linux/remote_access/LinuxPhoneBook.h"
 
+#include "platform/linux/network_manager/NewConnection.h"
 #include "platform/linux/remote_access/DialParamsImage.h"
 #include "platform/linux/remote_access/DialParamsStore.h"
 #include "platform/linux/remote_access/DialSettings.h"
 #include "platform/linux/remote_access/EntrySettings.h"
-#include "platform/linux/remote_access/NewConnection.h"
 #include "platform/linux/remote_access/RecordList.h"
 #include "platform/linux/remote_access/RemoteDevices.h"
 #include "platform/process/SystemErrors.h"

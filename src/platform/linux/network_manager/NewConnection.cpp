@@ -1,4 +1,4 @@
-#include "platform/linux/remote_access/NewConnection.h"
+#include "platform/linux/network_manager/NewConnection.h"
 
 #include <pwd.h>
 #include <unistd.h>
