@@ -36,11 +36,24 @@ inline std::string FieldBytes(std::span<const std::uint8_t> field) {
 }
 inline Text FieldText(std::span<const std::uint8_t> field) { return FromCodePage(FieldBytes(field)); }
 
-/// Fills a field with a text, cut so that a NUL stands behind it.
-inline void PutFieldText(std::span<std::uint8_t> field, const Text& text) {
+/// Values in fields and out of them. A text is cut so that a NUL stands behind it.
+inline void PutValue(std::span<std::uint8_t> field, std::uint32_t number) { PutLittle32(field, 0, number); }
+inline void PutValue(std::span<std::uint8_t> field, const Text& text) {
   const std::string bytes = ToCodePage(text);
   std::ranges::fill(field, std::uint8_t{0});
   std::copy_n(bytes.begin(), std::min(bytes.size(), field.size() - 1), field.begin());
+}
+template <std::size_t Count>
+void PutValue(std::span<std::uint8_t> field, const std::array<std::uint8_t, Count>& bytes) {
+  std::copy_n(bytes.begin(), Count, field.begin());
+}
+inline void TakeValue(std::span<const std::uint8_t> field, std::uint32_t& number) {
+  number = Little32(field, 0);
+}
+inline void TakeValue(std::span<const std::uint8_t> field, Text& text) { text = FieldText(field); }
+template <std::size_t Count>
+void TakeValue(std::span<const std::uint8_t> field, std::array<std::uint8_t, Count>& bytes) {
+  std::copy_n(field.begin(), Count, bytes.begin());
 }
 
 /// Where a member of a record lies in the platform's byte image.
@@ -71,31 +84,13 @@ template <typename Record> struct RecordField {
 template <typename Record>
 void PutField(const Record& record, const RecordField<Record>& field, std::span<std::uint8_t> image) {
   const auto bytes = image.subspan(field.at, field.width);
-  struct Writer {
-    const Record& record;
-    std::span<std::uint8_t> bytes;
-    void operator()(std::uint32_t Record::*number) const { PutLittle32(bytes, 0, record.*number); }
-    void operator()(Text Record::*text) const { PutFieldText(bytes, record.*text); }
-    void operator()(std::array<std::uint8_t, 4> Record::*address) const { Copy(record.*address); }
-    void operator()(std::array<std::uint8_t, 16> Record::*guid) const { Copy(record.*guid); }
-    void Copy(std::span<const std::uint8_t> from) const { std::ranges::copy(from, bytes.begin()); }
-  };
-  std::visit(Writer{record, bytes}, field.member);
+  std::visit([&](auto member) { PutValue(bytes, record.*member); }, field.member);
 }
 
 template <typename Record>
 void TakeField(Record& record, const RecordField<Record>& field, std::span<const std::uint8_t> image) {
   const auto bytes = image.subspan(field.at, field.width);
-  struct Reader {
-    Record& record;
-    std::span<const std::uint8_t> bytes;
-    void operator()(std::uint32_t Record::*number) const { record.*number = Little32(bytes, 0); }
-    void operator()(Text Record::*text) const { record.*text = FieldText(bytes); }
-    void operator()(std::array<std::uint8_t, 4> Record::*address) const { Copy(record.*address); }
-    void operator()(std::array<std::uint8_t, 16> Record::*guid) const { Copy(record.*guid); }
-    void Copy(std::span<std::uint8_t> to) const { std::ranges::copy(bytes, to.begin()); }
-  };
-  std::visit(Reader{record, bytes}, field.member);
+  std::visit([&](auto member) { TakeValue(bytes, record.*member); }, field.member);
 }
 
 } // namespace quendra::provisioning
