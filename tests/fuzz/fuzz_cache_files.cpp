@@ -20,7 +20,7 @@ void Require(bool holds) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const std::string_view file(reinterpret_cast<const char*>(data), size);
   int reads = 0;
-  const ReadAt read = [&](std::uint64_t at, std::span<std::uint8_t> bytes) -> std::size_t {
+  const CacheFileReader read = [&](std::uint64_t at, std::span<std::uint8_t> bytes) -> std::size_t {
     Require(++reads <= 3 && bytes.size() <= kLongestCacheKey);
     if (at >= size) return 0;
     const std::size_t count = std::min<std::size_t>(bytes.size(), size - at);

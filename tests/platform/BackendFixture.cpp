@@ -4,6 +4,7 @@
 #include "platform/linux/LinuxFixture.h"
 #include "platform/linux/LinuxMachine.h"
 #include "platform/linux/internet/CacheFilesFixture.h"
+#include "platform/linux/system/Files.h"
 #include "platform/simulated/SimulatedMachine.h"
 
 #include <arpa/inet.h>
@@ -12,6 +13,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
 #include <filesystem>
 #include <fstream>
@@ -65,6 +67,11 @@ class SimulatedBackend : public Backend {
     return process == kNoHandle;
   }
   void KeepInCache(const std::string& url) override { machine_.urlCache.Add(url); }
+  std::optional<std::string> ContentOf(const std::string& path) override {
+    const auto found = machine_.files.Contents.find(path);
+    if (found == machine_.files.Contents.end()) return {};
+    return found->second;
+  }
   std::optional<std::string> Layout() const override { return machine_.keyboardLayout.Name; }
   std::uint16_t Listen() override {
     machine_.AddConnection({.state = 2, .localAddress = "127.0.0.1", .localPort = 1025, .owner = OwnId()});
@@ -181,6 +188,11 @@ class LinuxBackend : public Backend {
     std::string name = std::to_string(++cached_);
     name.insert(0, 40 - name.size(), '0');
     folder_.Write("cache/mozilla/firefox/profile/cache2/entries/" + name, linux_::FirefoxFile(":" + url));
+  }
+  std::optional<std::string> ContentOf(const std::string& path) override {
+    std::string file = path.substr(std::string("C:").size());
+    std::ranges::replace(file, '\\', '/');
+    return linux_::ReadFile(folder_ / "data/quendra/drive_c" + file, 1'000'000);
   }
   std::optional<std::string> Layout() const override { return {}; }
   std::uint16_t Listen() override {

@@ -45,6 +45,8 @@ class Backend {
 
   /// A browser has kept what it loaded from there.
   virtual void KeepInCache(const std::string& url) = 0;
+  /// What a file holds that has a path as the machine names it; nothing where there is no such file.
+  virtual std::optional<std::string> ContentOf(const std::string& path) = 0;
   /// The layout with which the user types now; nothing where the machine can't tell it.
   virtual std::optional<std::string> Layout() const = 0;
 

@@ -1,11 +1,11 @@
 #include "platform/linux/LinuxMachine.h"
 #include "platform/unavailable/UnavailableAdapters.h"
 #include "platform/unavailable/UnavailableDialling.h"
-#include "platform/unavailable/UnavailableFiles.h"
 #include "platform/unavailable/UnavailableInstalledProducts.h"
 #include "platform/unavailable/UnavailablePhoneBook.h"
 
 #include "platform/linux/capture/LinuxCapture.h"
+#include "platform/linux/files/LinuxFiles.h"
 #include "platform/linux/icmp/LinuxIcmp.h"
 #include "platform/linux/internet/LinuxUrlCache.h"
 #include "platform/linux/keyboard/LinuxKeyboardLayout.h"
@@ -34,13 +34,14 @@ struct LinuxMachine::Parts {
   ProcFolder folder;
   HandleTable handleTable;
   SystemPaths paths;
+  DriveFolder drive{UserFolders::OfEnvironment().dataHome + "/quendra/drive_c"};
   DesktopIndex desktopIndex{UserFolders::OfEnvironment()};
   IconTheme iconTheme{UserFolders::OfEnvironment()};
 
   unavailable::UnavailableAdapters adapters;
   unavailable::UnavailableDialling dialling;
-  unavailable::UnavailableFiles files;
-  unavailable::UnavailableInstalledProducts installedProducts;
+  LinuxFiles files{drive};
+  unavailable::UnavailableInstalledProducts installedProducts; // this system's packages are no such products
   unavailable::UnavailablePhoneBook phoneBook;
   LinuxCapture capture;
   unavailable::UnavailableHandles handles; // this system has no list of all handles
@@ -52,7 +53,7 @@ struct LinuxMachine::Parts {
   LinuxKeyboardLayout keyboardLayout;
   LinuxProcesses processes{folder, handleTable, paths};
   LinuxRegistry registry;
-  LinuxShellStart shellStart{paths};
+  LinuxShellStart shellStart{paths, drive};
   LinuxSockets sockets;
   LinuxSystem system;
   LinuxTokens tokens{handleTable};

@@ -165,6 +165,19 @@ TEST_F(UnavailableFamilies, No_echo_can_be_sent_for_want_of_a_handle) {
   EXPECT_EQ(machine.icmp.MissingRight(), "");
 }
 
+TEST_F(UnavailableFamilies, There_is_no_Windows_directory_no_folder_to_write_into_and_no_product) {
+  std::string buffer = "before";
+  EXPECT_EQ(machine.files.GetWindowsDirectoryA(buffer), 0u);
+  try {
+    machine.files.Output("C:\\WINDOWS\\name", "text");
+    ADD_FAILURE() << "written";
+  } catch (const Fault& fault) {
+    EXPECT_EQ(fault.number, 76);
+  }
+  EXPECT_EQ(machine.installedProducts.MsiEnumProductsA(0, buffer), 259u);
+  EXPECT_EQ(buffer, "before");
+}
+
 TEST_F(UnavailableFamilies, The_keyboard_layout_has_no_name) {
   EXPECT_FALSE(machine.keyboardLayout.GetKeyboardLayoutNameA());
 }

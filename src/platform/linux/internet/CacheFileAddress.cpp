@@ -26,7 +26,7 @@ constexpr std::size_t kFirstRead = 1024;
 
 /// `length` bytes from a place on, those that were read before taken from there; nothing when the file ends
 /// earlier.
-std::optional<std::string> TextAt(const ReadAt& read, std::uint64_t at, std::size_t length,
+std::optional<std::string> TextAt(const CacheFileReader& read, std::uint64_t at, std::size_t length,
                                   std::span<const std::uint8_t> known) {
   if (known.size() >= length)
     return std::string(known.begin(), known.begin() + static_cast<std::ptrdiff_t>(length));
@@ -53,7 +53,7 @@ std::optional<std::string> AddressOfFirefoxKey(const std::string& key) {
   return key.substr(at + 1);
 }
 
-std::optional<std::string> FirefoxCacheAddress(const ReadAt& read, std::uint64_t fileSize) {
+std::optional<std::string> FirefoxCacheAddress(const CacheFileReader& read, std::uint64_t fileSize) {
   std::array<std::uint8_t, 4> last{};
   if (fileSize < last.size() || read(fileSize - last.size(), last) != last.size()) return {};
   const std::uint64_t contentBytes = Big32(last, 0);
@@ -90,7 +90,7 @@ std::string AddressOfChromiumKey(const std::string& key) {
   return address;
 }
 
-std::optional<std::string> ChromiumCacheAddress(const ReadAt& read) {
+std::optional<std::string> ChromiumCacheAddress(const CacheFileReader& read) {
   std::array<std::uint8_t, kFirstRead> start{};
   const std::size_t count = read(0, start);
   if (count < kSimpleHeaderBytes || Little64(start, 0) != kSimpleMark) return {};

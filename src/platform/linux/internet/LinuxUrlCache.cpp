@@ -14,7 +14,7 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-ReadAt ReaderOf(int file) {
+CacheFileReader ReaderOf(int file) {
   return [file](std::uint64_t at, std::span<std::uint8_t> bytes) -> std::size_t {
     ssize_t count = 0;
     do count = ::pread(file, bytes.data(), bytes.size(), static_cast<off_t>(at));
@@ -24,7 +24,7 @@ ReadAt ReaderOf(int file) {
 }
 
 std::optional<std::string> AddressIn(CacheForm form, int file, std::uint64_t size) {
-  const ReadAt read = ReaderOf(file);
+  const CacheFileReader read = ReaderOf(file);
   return form == CacheForm::Firefox ? FirefoxCacheAddress(read, size) : ChromiumCacheAddress(read);
 }
 

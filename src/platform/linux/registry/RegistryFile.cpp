@@ -2,6 +2,7 @@
 
 #include "platform/linux/registry/RegistrySchema.h"
 #include "platform/linux/system/Descriptor.h"
+#include "platform/linux/system/Files.h"
 #include "platform/registry/RegistryNumbers.h"
 
 #include <fcntl.h>
@@ -23,15 +24,6 @@ constexpr int kMostDamagedFiles = 1000;
 bool IsDamage(int result) {
   const int kind = result & 0xFF;
   return kind == SQLITE_CORRUPT || kind == SQLITE_NOTADB;
-}
-
-/// Every folder of the path, readable by the user alone where it is made here.
-bool MakeFolders(const std::string& path) {
-  for (std::size_t end = path.find('/', 1);; end = path.find('/', end + 1)) {
-    if (::mkdir(path.substr(0, end).c_str(), 0700) != 0 && errno != EEXIST && end == std::string::npos)
-      return false;
-    if (end == std::string::npos) return true;
-  }
 }
 
 /// A pipe or a device at the file's place would be waited on.
@@ -119,7 +111,7 @@ std::uint32_t RegistryFile::Open(sqlite3*& database) {
 }
 
 std::uint32_t RegistryFile::TryToOpen() {
-  if (!MakeFolders(folder_)) return kRegistryAccessDenied;
+  if (MakeFolders(folder_) != 0) return kRegistryAccessDenied;
   if (!IsNoPipeNorDevice(Path())) return kRegistryBroken;
   int result = OpenUnmoved(Path(), database_);
   if (IsDamage(result) && PutAside()) result = OpenUnmoved(Path(), database_);

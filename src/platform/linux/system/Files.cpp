@@ -39,6 +39,17 @@ std::optional<std::string> ReadFile(const std::string& path, std::size_t limit) 
   return {};
 }
 
+int MakeFolders(const std::string& path) {
+  // What may not be made may be there all the same, so only the last folder decides, and the first failure
+  // says why.
+  int firstError = 0;
+  for (std::size_t end = path.find('/', 1);; end = path.find('/', end + 1)) {
+    const bool isThere = ::mkdir(path.substr(0, end).c_str(), 0700) == 0 || errno == EEXIST;
+    if (!isThere && firstError == 0) firstError = errno;
+    if (end == std::string::npos) return isThere ? 0 : firstError;
+  }
+}
+
 std::optional<std::uint32_t> WholeNumber(std::string_view text) {
   std::uint32_t value = 0;
   const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);

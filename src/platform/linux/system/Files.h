@@ -13,6 +13,9 @@ namespace quendra::platform::linux_ {
 /// more than `limit` bytes. Never waits on a pipe or a device.
 std::optional<std::string> ReadFile(const std::string& path, std::size_t limit);
 
+/// Makes every folder of the path that is missing, for the user alone. 0, or the system's error number.
+int MakeFolders(const std::string& path);
+
 /// The decimal number that `text` is as a whole; nothing for any other text.
 std::optional<std::uint32_t> WholeNumber(std::string_view text);
 

@@ -75,6 +75,7 @@ std::vector<std::string> CommandWords(std::string_view commandLine) {
 namespace {
 
 constexpr std::string_view kShowFile = "explorer.exe /n, /e, /select, ";
+constexpr std::string_view kCommand = "CMD /c \"";
 constexpr std::string_view kAddRemove = "rundll32.exe shell32.dll,Control_RunDLL appwiz.cpl,,";
 /// What adds and removes programs, the desktops' own before others.
 constexpr std::array kSoftwareCentres{"gnome-software", "plasma-discover", "pamac-manager", "mintinstall",
@@ -112,12 +113,29 @@ bool Start(std::vector<std::string> words) {
   return StaysSilent(reading.Number());
 }
 
+/// The path on drive C: that the command interpreter is given as its whole command; empty for other command
+/// lines.
+std::string CommandOf(std::string_view line) {
+  if (!line.starts_with(kCommand) || line.size() <= kCommand.size() || line.back() != '"') return {};
+  const std::string_view path = line.substr(kCommand.size(), line.size() - kCommand.size() - 1);
+  return path.starts_with("C:\\") && path.find('"') == std::string_view::npos ? std::string(path) : "";
+}
+
+/// Nobody waits for it, and nobody hears when there is no such file or nothing that opens it.
+void OpenByAssociation(const std::string& file) {
+  if (!file.empty()) Start({"xdg-open", file});
+}
+
 } // namespace
 
 bool LinuxShellStart::Shell(const std::string& commandLine, int) {
   const std::string_view line(commandLine.c_str()); // up to its NUL
   if (line.starts_with(kShowFile)) return ShowFile(paths_.ToRaw(std::string(line.substr(kShowFile.size()))));
   if (line == kAddRemove) return StartSoftwareCentre();
+  if (const std::string file = CommandOf(line); !file.empty()) {
+    OpenByAssociation(drive_.FileOf(file));
+    return true;
+  }
   return Start(CommandWords(ToUtf8(FromCodePage(line))));
 }
 

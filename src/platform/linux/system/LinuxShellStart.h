@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/linux/files/DriveFolder.h"
 #include "platform/linux/system/SystemPaths.h"
 #include "platform/system/ShellStart.h"
 
@@ -11,15 +12,18 @@ namespace quendra::platform::linux_ {
 /// Starts programs found through PATH, without a shell between, in a session of their own and as nobody's
 /// children.
 /// The system's own command lines for a file in its folder and for adding programs have what stands for them
-/// here: the session's file manager, else the folder itself, and its software centre.
+/// here: the session's file manager, else the folder itself, and its software centre. The command interpreter
+/// is told of files alone, as in CMD /c "C:\WINDOWS\file": the desktop's opener opens them. Like any
+/// interpreter it starts whether or not there is such a file and something that opens it.
 class LinuxShellStart : public ShellStart {
  public:
-  explicit LinuxShellStart(const SystemPaths& paths) : paths_(paths) {}
+  LinuxShellStart(const SystemPaths& paths, const DriveFolder& drive) : paths_(paths), drive_(drive) {}
 
   bool Shell(const std::string& commandLine, int windowStyle) override;
 
  private:
   const SystemPaths& paths_;
+  const DriveFolder& drive_;
 };
 
 /// The words of a command line: parted by blanks, which double quotes keep together.

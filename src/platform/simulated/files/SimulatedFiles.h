@@ -6,10 +6,12 @@
 
 #include <algorithm>
 #include <optional>
+#include <set>
 
 namespace quendra::platform::simulated {
 
-/// Files by their paths. Writing stands in the machine's Calls, as in "Output C:\WINDOWS\file.txt".
+/// Files by their paths, in folders that are there. Writing stands in the machine's Calls, as in "Output
+/// C:\WINDOWS\file.txt".
 class SimulatedFiles : public Files {
  public:
   explicit SimulatedFiles(Core& core) : core_(core) {}
@@ -18,6 +20,8 @@ class SimulatedFiles : public Files {
   /// A length that the directory query gives whatever the directory is.
   std::optional<std::uint32_t> DirectoryAnswer;
   std::map<std::string, std::string> Contents;
+  /// Folders beside the Windows directory and that of its drive.
+  std::set<std::string> Folders;
   /// The fault that writing raises, 0 for none.
   int OutputFault = 0;
 
@@ -29,12 +33,21 @@ class SimulatedFiles : public Files {
     return DirectoryAnswer.value_or(length);
   }
   void Output(const std::string& path, const std::string& bytes) override {
-    core_.calls.push_back("Output " + path);
+    const std::string file = CutText(path);
+    core_.calls.push_back("Output " + file);
     if (OutputFault != 0) throw Fault(OutputFault);
-    Contents[path] = bytes;
+    const std::size_t end = file.rfind('\\');
+    if (end == std::string::npos || end + 1 == file.size() || !IsFolder(file.substr(0, end)))
+      throw Fault(Fault::kPathNotFound);
+    if (IsFolder(file)) throw Fault(Fault::kPathFileAccess);
+    Contents[file] = bytes;
   }
 
  private:
+  bool IsFolder(const std::string& path) const {
+    return path == WindowsDirectory || path == WindowsDirectory.substr(0, 2) || Folders.contains(path);
+  }
+
   Core& core_;
 };
 

@@ -9,7 +9,7 @@
 namespace quendra::platform::linux_ {
 namespace {
 
-ReadAt ReaderOf(const std::string& file) {
+CacheFileReader ReaderOf(const std::string& file) {
   return [&file](std::uint64_t at, std::span<std::uint8_t> bytes) {
     if (at >= file.size()) return std::size_t{0};
     const std::size_t count = std::min(bytes.size(), file.size() - static_cast<std::size_t>(at));

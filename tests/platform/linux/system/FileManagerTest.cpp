@@ -30,7 +30,8 @@ struct FileManagerTest : SessionTest {
   }
 
   SystemPaths paths;
-  LinuxShellStart shell{paths};
+  DriveFolder drive{"/nowhere"};
+  LinuxShellStart shell{paths, drive};
 };
 
 TEST_F(FileManagerTest, The_file_manager_is_asked_for_the_file_and_no_folder_is_opened) {

@@ -4,6 +4,8 @@
 #include <gtest/gtest.h>
 #include <sys/stat.h>
 
+#include <cerrno>
+
 namespace quendra::platform::linux_ {
 
 namespace {
@@ -34,6 +36,24 @@ TEST(LinuxFiles, A_file_that_says_it_is_empty_is_read_up_to_the_limit_all_the_sa
   ASSERT_TRUE(text);
   EXPECT_FALSE(text->empty());
   EXPECT_FALSE(ReadFile("/proc/self/stat", 10));
+}
+
+TEST(LinuxFiles, Folders_are_made_with_all_above_them_for_the_user_alone) {
+  const TemporaryFolder folder;
+  EXPECT_EQ(MakeFolders(folder / "one/two"), 0);
+  EXPECT_EQ(MakeFolders(folder / "one/two"), 0);
+  struct stat made {};
+  for (const char* name : {"one", "one/two"}) {
+    ASSERT_EQ(::stat((folder / name).c_str(), &made), 0);
+    EXPECT_EQ(made.st_mode & 0777U, 0700U);
+  }
+}
+
+TEST(LinuxFiles, A_folder_that_cannot_be_made_says_why_the_first_one_could_not) {
+  const TemporaryFolder folder;
+  folder.Write("file", "");
+  EXPECT_EQ(MakeFolders(folder / "file/two/three"), ENOTDIR);
+  EXPECT_EQ(MakeFolders("/proc/one/two/three"), ENOENT);
 }
 
 TEST(LinuxFiles, A_number_is_all_of_its_text) {

@@ -24,7 +24,8 @@ TEST(LinuxShellStartTest, A_command_line_is_parted_at_blanks_that_are_not_in_quo
 
 TEST(LinuxShellStartTest, A_program_that_does_not_exist_cannot_be_started) {
   SystemPaths paths;
-  LinuxShellStart shell{paths};
+  DriveFolder drive{"/nowhere"};
+  LinuxShellStart shell{paths, drive};
   EXPECT_FALSE(shell.Shell("quendra-no-such-program.exe -s \"x.dll\"", ShellStart::kNormalWindow));
   EXPECT_FALSE(shell.Shell("", ShellStart::kNormalWindow));
   EXPECT_FALSE(shell.Shell("\"\"", ShellStart::kNormalWindow));
@@ -33,7 +34,8 @@ TEST(LinuxShellStartTest, A_program_that_does_not_exist_cannot_be_started) {
 TEST(LinuxShellStartTest, A_file_that_is_no_program_cannot_be_started) {
   const TemporaryFolder folder;
   SystemPaths paths;
-  LinuxShellStart shell{paths};
+  DriveFolder drive{"/nowhere"};
+  LinuxShellStart shell{paths, drive};
   EXPECT_FALSE(shell.Shell(folder.Write("text", "touch x\n", true), ShellStart::kNormalWindow));
   EXPECT_FALSE(shell.Shell(folder.Path(), ShellStart::kNormalWindow));
 }
@@ -42,7 +44,8 @@ TEST(LinuxShellStartTest, A_program_that_has_not_ended_is_not_waited_for) {
   const TemporaryFolder folder;
   ASSERT_EQ(::mkfifo((folder / "pipe").c_str(), 0600), 0);
   SystemPaths paths;
-  LinuxShellStart shell{paths};
+  DriveFolder drive{"/nowhere"};
+  LinuxShellStart shell{paths, drive};
   // It waits until somebody opens the pipe's other end, which the test does only after the call.
   ASSERT_TRUE(shell.Shell("cat " + (folder / "pipe"), ShellStart::kNormalWindow));
   const Descriptor end(::open((folder / "pipe").c_str(), O_WRONLY | O_CLOEXEC));
@@ -53,7 +56,8 @@ TEST(LinuxShellStartTest, A_program_that_was_started_leaves_no_child_behind) {
   const TemporaryFolder folder;
   const std::string done = folder / "with blank";
   SystemPaths paths;
-  LinuxShellStart shell{paths};
+  DriveFolder drive{"/nowhere"};
+  LinuxShellStart shell{paths, drive};
   ASSERT_TRUE(shell.Shell("touch \"" + done + "\"", ShellStart::kNormalWindow));
   for (int i = 0; i < 5000 && !std::filesystem::exists(done); ++i) ::usleep(1000);
   EXPECT_TRUE(std::filesystem::exists(done));
@@ -64,7 +68,8 @@ TEST(LinuxShellStartTest, A_program_that_was_started_leaves_no_child_behind) {
 TEST(LinuxShellStartTest, Signs_that_a_shell_would_understand_are_plain_words) {
   const TemporaryFolder folder;
   SystemPaths paths;
-  LinuxShellStart shell{paths};
+  DriveFolder drive{"/nowhere"};
+  LinuxShellStart shell{paths, drive};
   ASSERT_TRUE(shell.Shell("touch " + (folder / "a;b") + " " + (folder / "$HOME"), ShellStart::kNormalWindow));
   for (int i = 0; i < 5000 && !std::filesystem::exists(folder / "$HOME"); ++i) ::usleep(1000);
   EXPECT_TRUE(std::filesystem::exists(folder / "a;b"));
@@ -74,7 +79,8 @@ TEST(LinuxShellStartTest, Signs_that_a_shell_would_understand_are_plain_words) {
 /// In a session without a bus.
 struct LinuxShellStartInSessionTest : SessionTest {
   SystemPaths paths;
-  LinuxShellStart shell{paths};
+  DriveFolder drive{folder / "drive_c"};
+  LinuxShellStart shell{paths, drive};
 };
 
 TEST_F(LinuxShellStartInSessionTest,
@@ -102,6 +108,44 @@ TEST_F(LinuxShellStartInSessionTest, A_session_without_such_programs_starts_noth
   EXPECT_FALSE(shell.Shell("explorer.exe /n, /e, /select, /usr/file", ShellStart::kNormalWindow));
   EXPECT_FALSE(shell.Shell("explorer.exe /n, /e, /select, //9/file", ShellStart::kNormalWindow));
   EXPECT_FALSE(shell.Shell("rundll32.exe shell32.dll,Control_RunDLL appwiz.cpl,,", ShellStart::kAsItIsShown));
+}
+
+TEST_F(LinuxShellStartInSessionTest, A_file_given_to_the_command_interpreter_is_opened_by_the_desktop) {
+  AddProgram("xdg-open");
+  const std::string file = folder.Write("drive_c/WINDOWS/bi.prf", "text");
+  EXPECT_TRUE(shell.Shell("CMD /c \"C:\\WINDOWS\\bi.prf\"", ShellStart::kHiddenWindow));
+  EXPECT_EQ(GivenTo("xdg-open"), file + "\n");
+}
+
+TEST_F(LinuxShellStartInSessionTest,
+       A_file_with_blanks_signs_and_Hebrew_in_its_name_is_one_word_to_the_opener) {
+  AddProgram("xdg-open");
+  const std::string file = folder.Write("drive_c/a b/$(x) `;\u05D0", "text");
+  EXPECT_TRUE(shell.Shell("CMD /c \"C:\\a b\\$(x) `;\xE0\"", ShellStart::kHiddenWindow));
+  EXPECT_EQ(GivenTo("xdg-open"), file + "\n");
+}
+
+TEST_F(LinuxShellStartInSessionTest, The_command_interpreter_starts_also_where_nothing_opens_files) {
+  folder.Write("drive_c/WINDOWS/bi.prf", "text");
+  EXPECT_TRUE(shell.Shell("CMD /c \"C:\\WINDOWS\\bi.prf\"", ShellStart::kHiddenWindow));
+}
+
+TEST_F(LinuxShellStartInSessionTest, What_is_no_file_of_the_drive_is_opened_by_nothing) {
+  AddProgram("xdg-open");
+  folder.Write("outside", "text");
+  folder.Write("drive_c/here", "text");
+  std::filesystem::create_symlink(folder / "outside", folder / "drive_c/link");
+  for (const char* path : {"C:\\missing", "C:\\link", "C:\\..\\outside", "C:\\", "C:\\/here"})
+    EXPECT_TRUE(shell.Shell(std::string("CMD /c \"") + path + "\"", ShellStart::kHiddenWindow)) << path;
+  EXPECT_EQ(GivenTo("xdg-open"), "not started");
+}
+
+TEST_F(LinuxShellStartInSessionTest, Nothing_else_of_the_command_interpreter_is_understood) {
+  folder.Write("drive_c/bi.prf", "text");
+  for (const char* line : {"CMD", "CMD /c", "CMD /c \"", "CMD /c C:\\bi.prf", "cmd /c \"C:\\bi.prf\"",
+                           "CMD /k \"C:\\bi.prf\"", "CMD /c \"C:\\bi.prf\" & \"C:\\bi.prf\"",
+                           "CMD /c \"D:\\bi.prf\"", "CMD /c \"bi.prf\"", "CMD /c \"/bin/true\""})
+    EXPECT_FALSE(shell.Shell(line, ShellStart::kHiddenWindow)) << line;
 }
 
 } // namespace
