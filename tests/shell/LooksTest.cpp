@@ -49,8 +49,12 @@ class Looks : public ProgramTest {
             << ToUtf8(placed[i]->Name()) << " and " << ToUtf8(placed[j]->Name());
   }
 
-  std::vector<forms::Form*> forms{&program.frmSplash, &program.frmMenu, &program.frmAbout,
-                                  &program.frmPortsChecks};
+  std::vector<forms::Form*> forms{&program.frmSplash,
+                                  &program.frmMenu,
+                                  &program.frmAbout,
+                                  &program.frmPortsChecks,
+                                  &program.connection.frmConnectProb,
+                                  &program.connection.frmNetworkAdapters};
 };
 
 TEST_F(Looks, Every_control_has_a_size_and_lies_within_its_container) {

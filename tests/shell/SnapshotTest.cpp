@@ -68,5 +68,18 @@ TEST_F(Snapshot, Of_the_about_box) {
   ExpectScreen(program.frmAbout, "about");
 }
 
+TEST_F(Snapshot, Of_the_dialog_for_connection_problems) {
+  machine.ras.AddEntry("097").SetDevice("pppoe", "pppoe");
+  machine.ras.AddEntry("Office");
+  ComeHome();
+  ClickEntry(2);
+  desktop.Click(program.firstConnectionPage.menu.frsCon_lblConnectProb);
+  provisioning::frmConnectProb& dialog = program.connection.frmConnectProb;
+  desktop.ChooseItem(dialog.cmbDialups, 0);
+  dialog.txtEmunrateError.Value = u"678";
+  desktop.Click(dialog.cmdCheck);
+  ExpectScreen(dialog, "connect_prob");
+}
+
 } // namespace
 } // namespace quendra::shell

@@ -60,7 +60,7 @@ void frmConnectProb::DesignOutcome() {
   txtStatus.TextFont = looks::kBody;
   txtStatus.Value = Text();
   txtStatus.Move(Px(kFieldLeft), Px(kStatusTop), Px(kFieldWidth), Px(kStatusHeight));
-  PlaceLabel(Label4, u"אבחון:", kDiagnosisTop);
+  PlaceLabel(Label4, u"אבחון:", kDiagnosisTop - 3); // level with the first of two lines
   looks::PlainText(lblDiagnoze, u"", looks::kStrong);
   lblDiagnoze.WordWrap = true;
   lblDiagnoze.Move(Px(kFieldLeft), Px(kDiagnosisTop), Px(kFieldWidth), Px(kDiagnosisHeight));

@@ -120,6 +120,19 @@ TEST_F(Fields, A_report_has_letters_of_one_width_and_reads_each_line_in_its_dire
   EXPECT_TRUE(Lines().verticalScrollBar()->isVisible());
 }
 
+TEST_F(Fields, Lines_begin_on_the_side_that_the_first_letter_of_them_all_reads_from) {
+  const auto beginning = [this] {
+    return Lines().cursorRect(QTextCursor(Lines().document()->lastBlock())).left();
+  };
+  lines.Value = u"\r\nstate 5";
+  ShowActive();
+  EXPECT_LT(beginning(), 20);
+
+  lines.Value = u"\r\nפעולה: 5";
+
+  EXPECT_GT(beginning(), Lines().viewport()->width() - 20);
+}
+
 TEST_F(Fields, A_field_is_named_by_the_label_before_it) {
   ShowActive();
 

@@ -2,6 +2,7 @@
 
 #include "forms/qt/drawing/FieldPainting.h"
 #include "forms/qt/input/MouseEvents.h"
+#include "forms/view/VisibleText.h"
 #include "forms/view/fields/FieldText.h"
 
 #include <QContextMenuEvent>
@@ -36,6 +37,7 @@ TextAreaView::TextAreaView(ViewContext& context, TextBox& box, QWidget* parent)
   document()->setDefaultTextOption(reading);
   Context().mouse.Watch(*viewport(), *this);
   connect(this, &QPlainTextEdit::textChanged, this, [this] {
+    AlignLines();
     if (!showing_) keys_.Edited(toPlainText(), textCursor().position());
   });
   connect(this, &QPlainTextEdit::cursorPositionChanged, this, [this] { TellSelection(); });
@@ -62,6 +64,17 @@ void TextAreaView::Apply(Aspect aspect) {
 void TextAreaView::SetLetters() {
   if (Box().Monospaced()) setFont(Monospaced(font()));
   setTabStopDistance(kLettersOfTab * fontMetrics().horizontalAdvance(u'0'));
+}
+
+// Each line reads by its own first letter; on which side all begin is decided by the first of them. A changed
+// option lays the text out again, which tells of a change too.
+void TextAreaView::AlignLines() {
+  QTextOption reading = document()->defaultTextOption();
+  const bool fromRight = DirectionOf(ToText(toPlainText())) == Direction::RightToLeft;
+  const Qt::Alignment side = fromRight ? Qt::AlignRight : Qt::AlignLeft;
+  if (reading.alignment() == side) return;
+  reading.setAlignment(side);
+  document()->setDefaultTextOption(reading);
 }
 
 void TextAreaView::ShowText() {

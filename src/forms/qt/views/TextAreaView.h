@@ -27,6 +27,7 @@ class TextAreaView : public QPlainTextEdit, public WidgetView {
  private:
   const TextBox& Box() const { return static_cast<const TextBox&>(*TheControl()); }
   void SetLetters();
+  void AlignLines();
   void ShowText();
   void ShowCaret();
   void TellSelection();
