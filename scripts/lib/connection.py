@@ -48,8 +48,15 @@ class Typist:
         self.walk = walk
         self.program = walk.program
 
+    def has_focus(self, field):
+        focused = self.program.focused()
+        return focused and focused.get_description() == field
+
     def type_into(self, field, keys, arrives):
+        """In place of what the field holds."""
         self.walk.click(field)
+        # The window manager may hold a click up, but no key.
+        wait_for(f"the focus in {field}", lambda: self.has_focus(field))
         self.walk.xdotool("key", "End", "shift+Home", "BackSpace")
         self.walk.xdotool("type", "--delay", 60, keys)
         wait_for(f"{arrives!r} in {field}", lambda: text_of(self.program.control(field)) == arrives)
