@@ -155,7 +155,7 @@ TEST_P(RemoteAccessBehaviourTest, The_errors_of_dials_have_a_text_each_that_ends
 
 TEST_P(RemoteAccessBehaviourTest, A_number_that_is_not_one_of_its_own_has_no_text) {
   std::array<char, 512> text{};
-  for (const std::uint32_t error : {0U, 5U, 600U, 99999U, 0xFFFFFFFFU})
+  for (const std::uint32_t error : {0U, 5U, 99999U, 0xFFFFFFFFU})
     EXPECT_EQ(Dials().RasGetErrorStringA(error, text), kInvalidParameter) << error;
 }
 
