@@ -1,19 +1,13 @@
 #include "monitor/SystemVersion.h"
 
-#include "monitor/OsVersionCode.h"
+#include "foundation/OsVersion.h"
 
 namespace quendra::monitor {
 
 void SystemVersion::Read() {
-  OsVersionCode = 0;
-  platform::OsVersion version;
-  if (system_.GetVersionExA(version)) {
-    OsVersionCode = OsVersionCodeOf(version);
-    return;
-  }
-  loop_.MessageBox(
-      u"An error occured while trying to get the OS version and information.\r\nClick OK to continue.",
-      forms::kExclamation, u"  Error Getting OS Information");
+  foundation::OsVersion version;
+  foundation::ReadOsVersion(system_, loop_, version);
+  OsVersionCode = version.code;
 }
 
 } // namespace quendra::monitor

@@ -89,7 +89,7 @@ TEST_F(StartUp, A_version_that_cannot_be_read_is_told_in_a_box_and_the_load_goes
   machine.system.FailVersion = true;
   ComeHome();
   ASSERT_EQ(desktop.Boxes.size(), 1U);
-  EXPECT_EQ(desktop.Boxes[0].text, u"An error occured while trying to get the OS version and information.\r\n"
+  EXPECT_EQ(desktop.Boxes[0].text, u"An error occured while trying to get the OS version and information.\r"
                                    u"Click OK to continue.");
   EXPECT_EQ(desktop.Boxes[0].title, u"  Error Getting OS Information");
   EXPECT_EQ(desktop.Boxes[0].flags, 0x30);

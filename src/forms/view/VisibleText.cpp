@@ -36,6 +36,11 @@ char16_t VisibleUnit(char16_t unit) {
   return ChangesDirectionOrHides(unit) ? kReplacement : unit;
 }
 
+bool IsLineBreak(char16_t unit) { return unit == u'\r' || unit == u'\n'; }
+
+/// Carriage return and line feed are one line break, and so is either alone.
+bool EndsPair(TextView text, std::size_t at) { return text[at] == u'\n' && at > 0 && text[at - 1] == u'\r'; }
+
 } // namespace
 
 Text VisibleText(TextView text, LineBreaks lineBreaks, std::size_t limit) {
@@ -48,9 +53,9 @@ Text VisibleText(TextView text, LineBreaks lineBreaks, std::size_t limit) {
     const char16_t unit = text[i];
     if (IsHighSurrogate(unit) && i + 1 < text.size() && IsLowSurrogate(text[i + 1]))
       visible.append({unit, text[++i]});
-    else if (keepsLines && unit == u'\n')
-      visible.push_back(unit);
-    else if (!keepsLines || unit != u'\r')
+    else if (keepsLines && IsLineBreak(unit))
+      visible.append(EndsPair(text, i) ? 0 : 1, u'\n');
+    else
       visible.push_back(VisibleUnit(unit));
   }
   if (cut) visible.push_back(kEllipsis);

@@ -31,8 +31,11 @@ class SimulatedMachine {
   SimulatedMachine()
       : processes(core_), tokens(core_), handles(core_), icmp(core_), sockets(core_, hostNames),
         capture(core_), system(core_), shellStart(core_), ras(core_), adapters(core_), files(core_) {}
-  /// With sockets whose messages go through a loop.
-  explicit SimulatedMachine(EventLoop& loop) : SimulatedMachine() { sockets.UseLoop(loop); }
+  /// With sockets and dials whose messages go through a loop.
+  explicit SimulatedMachine(EventLoop& loop) : SimulatedMachine() {
+    sockets.UseLoop(loop);
+    ras.UseLoop(loop);
+  }
   SimulatedMachine(const SimulatedMachine&) = delete;
 
   Machine Operations() {
@@ -68,7 +71,8 @@ class SimulatedMachine {
   SimulatedInstalledProducts installedProducts;
   SimulatedFiles files;
 
-  /// Calls whose order counts: capture library and control, Sleep, Shell, sockets.
+  /// Calls whose order counts: capture library and control, Sleep, Shell, sockets, remote access, network
+  /// cards, files.
   std::vector<std::string>& Calls = core_.calls;
 
   // What tests say most.

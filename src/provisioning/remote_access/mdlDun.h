@@ -7,7 +7,10 @@
 #include "runtime/Integers.h"
 
 #include <functional>
+#include <memory>
 #include <optional>
+#include <span>
+#include <string>
 #include <vector>
 
 namespace quendra::forms {
@@ -33,6 +36,10 @@ class mdlDun {
     platform::Dialling& dialling;
   };
   mdlDun(const RemoteAccess& remoteAccess, platform::System& system, forms::Desktop& desktop);
+  /// A window that is still hooked goes on by its own procedure.
+  ~mdlDun();
+  mdlDun(const mdlDun&) = delete;
+  mdlDun& operator=(const mdlDun&) = delete;
 
   // Dials.
 
@@ -76,6 +83,43 @@ class mdlDun {
   WindowHandle HookedWindow;
   forms::WindowProcedure PreviousWndProc;
   std::uint32_t RasDialEventMessage = 0;
+
+ private:
+  using Bytes = std::vector<std::uint8_t>;
+  struct Hook;
+
+  bool HasNamedPhoneBooks();
+  /// The phone book as the platform takes it: a NUL behind it, and none but the user's own on a system that
+  /// has no other.
+  std::string PhoneBookOf(Text& phoneBook);
+
+  std::uint32_t Dial(const Bytes& params, std::optional<WindowHandle> window);
+  std::vector<platform::RasConnection> OpenConnections(bool& told);
+
+  Boolean16 ListEntries(std::vector<Text>& names, std::int32_t& count, Text& phoneBook);
+  void ListAll(Bytes block, const std::string& phoneBook, std::vector<Text>& names);
+  std::uint32_t EntryRecordBytes(std::uint32_t& bytes);
+  Boolean16 ReadEntry(RasEntryRecord& record, Text& entryName, Text& phoneBook);
+  Boolean16 WriteEntry(const Text& entryName, const RasEntryRecord& record, RasDialParamsRecord& dialParams,
+                       Text& phoneBook);
+  Boolean16 SaveDialParams(const Text& entryName, RasDialParamsRecord& dialParams);
+  bool AcceptsDialParamsOf(std::uint32_t bytes);
+
+  Text RasErrorText(std::uint32_t result, std::span<const char> told) const;
+  Text SystemErrorText(std::uint32_t number);
+  void ShowExclamation(const Text& title, const Text& text);
+  /// Runs an operation. A fault in it is told in a box behind these words and makes it fail.
+  Boolean16 Trapping(const Text& words, const std::function<Boolean16()>& operation);
+
+  std::int32_t DialEventWndProc(WindowHandle window, std::uint32_t message, std::uint32_t wParam,
+                                std::uint32_t lParam);
+
+  platform::PhoneBook& phoneBook_;
+  platform::Dialling& dialling_;
+  platform::System& system_;
+  forms::Desktop& desktop_;
+  std::shared_ptr<Hook> hook_;
+  forms::WindowProcedure hookProcedure_;
 };
 
 /// The cleared record.

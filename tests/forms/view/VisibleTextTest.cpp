@@ -40,6 +40,10 @@ TEST(VisibleText, Keeps_line_breaks_where_there_is_more_than_one_line) {
   EXPECT_EQ(VisibleText(u"a\r\nb"), u"a\u240D\u240Ab");
 }
 
+TEST(VisibleText, A_carriage_return_breaks_a_line_as_well_alone_as_with_a_line_feed) {
+  EXPECT_EQ(VisibleText(u"a\r\rb\rc\r\n\r\nd", LineBreaks::Keep), u"a\n\nb\nc\n\nd");
+}
+
 TEST(VisibleText, Cuts_at_its_limit_with_an_ellipsis) {
   EXPECT_EQ(VisibleText(u"12345", LineBreaks::Show, 5), u"12345");
   EXPECT_EQ(VisibleText(u"123456", LineBreaks::Show, 5), u"12345\u2026");

@@ -1,0 +1,45 @@
+#include "provisioning/remote_access/RasConnectionImage.h"
+
+#include "platform/remote_access/RemoteAccessNumbers.h"
+#include "provisioning/remote_access/RecordFields.h"
+
+namespace quendra::provisioning {
+
+using Record = platform::RasConnectionRecord;
+
+const std::array<std::uint32_t, 4> kRasConnectionSizes{
+    Record::kBytes, Record::kBytesWithoutGuid, Record::kBytesWithoutPhoneBook, Record::kBytesOfShortNames};
+
+namespace {
+
+using Fields = RasConnectionFields;
+using Field = RecordField<Fields>;
+
+constexpr Field kFields[] = {
+    {&Fields::handle, Record::kHandle},
+    {&Fields::entryName, Record::kEntryName, Record::kEntryNameBytes},
+    {&Fields::deviceType, Record::kDeviceType, Record::kDeviceTypeBytes, Record::kBytesOfShortNames},
+    {&Fields::deviceName, Record::kDeviceName, Record::kDeviceNameBytes, Record::kBytesOfShortNames},
+    {&Fields::phoneBook, Record::kPhoneBook, Record::kPhoneBookBytes, Record::kBytesWithoutPhoneBook},
+    {&Fields::subEntry, Record::kSubEntry, Record::kBytesWithoutPhoneBook},
+    {&Fields::guid, Record::kGuid, Record::kBytesWithoutGuid},
+};
+
+Field PlacedIn(std::uint32_t bytes, Field field) {
+  if (bytes == Record::kBytesOfShortNames && field.at == Record::kEntryName)
+    field.width = Record::kShortEntryNameBytes;
+  return field;
+}
+
+} // namespace
+
+RasConnectionFields RasConnectionOf(std::span<const std::uint8_t> record) {
+  const auto bytes = static_cast<std::uint32_t>(record.size());
+  RasConnectionFields connection;
+  for (const Field& listed : kFields)
+    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes, record.size()))
+      TakeField(connection, field, record);
+  return connection;
+}
+
+} // namespace quendra::provisioning
