@@ -61,17 +61,17 @@ void Dial::TakeProperties(const BusAnswer& answer) {
   const BusValue& devices = properties["Devices"];
   if (!devices.items.empty()) devicePath_ = devices.items.front().text;
   isKnown_ = true;
-  bool hasFailed = !answer.IsGiven();
+  const bool hasGone = !answer.IsGiven();
   for (const BusSignal& signal : std::exchange(early_, {})) {
     // Where the connection has gone already, the last device that failed was its own.
-    if (hasFailed && signal.interface == nm::kDevice && NumberAt(signal.values, 0) == nm::kDeviceFailed)
+    if (hasGone && signal.interface == nm::kDevice && NumberAt(signal.values, 0) == nm::kDeviceFailed)
       devicePath_ = signal.path;
     Take(signal);
   }
-  if (hasFailed) End(answer.kind == BusAnswer::Kind::NobodyThere ? kRasManagerCannotStart : kRasNoAnswer);
+  if (answer.kind == BusAnswer::Kind::NobodyThere) return End(kRasManagerCannotStart);
   // What was reached before anybody listened.
-  if (properties["State"].number == nm::kActivated) Reach(kRasConnected);
-  if (properties["State"].number == nm::kDeactivated) TakeFromActive(nm::kDeactivated, 0);
+  const std::uint64_t state = hasGone ? std::uint64_t{nm::kDeactivated} : properties["State"].number;
+  if (state == nm::kActivated || state == nm::kDeactivated) TakeFromActive(state, 0);
 }
 
 void Dial::Take(const BusSignal& signal) {
@@ -90,11 +90,13 @@ void Dial::Take(const BusSignal& signal) {
 }
 
 void Dial::TakeFromDevice(std::uint64_t state, std::uint64_t reason) {
-  if (const auto reached = RasStateOfDevice(state)) return Reach(*reached);
-  const bool isOver = state == nm::kDeviceFailed || state == nm::kDeactivating ||
-                      state == nm::kDeviceDisconnected || state == nm::kUnavailable ||
-                      state == nm::kUnmanaged;
-  if (isOver) End(RasErrorOfDevice(reason, kernel_()));
+  // The device may still be ending another connection: that this one has ended, it tells by itself.
+  if (const auto reached = RasStateOfDevice(state)) {
+    deviceReason_.reset();
+    Reach(*reached);
+  } else if (!deviceReason_) {
+    deviceReason_ = reason;
+  }
 }
 
 void Dial::TakeFromVpn(std::uint64_t state, std::uint64_t reason) {
@@ -104,7 +106,8 @@ void Dial::TakeFromVpn(std::uint64_t state, std::uint64_t reason) {
 
 void Dial::TakeFromActive(std::uint64_t state, std::uint64_t reason) {
   if (state == nm::kActivated) Reach(kRasConnected);
-  if (state == nm::kDeactivated) End(RasErrorOfActive(reason));
+  if (state == nm::kDeactivated)
+    End(deviceReason_ ? RasErrorOfDevice(*deviceReason_, kernel_()) : RasErrorOfActive(reason));
 }
 
 void Dial::Reach(std::uint32_t state) {
@@ -142,7 +145,7 @@ void Dial::CheckAlive() {
   // What brought a connection to its end has been told before this answer.
   if (answer.kind == BusAnswer::Kind::Refused) {
     bus_.HandleArrived();
-    End(kRasNoAnswer);
+    TakeFromActive(nm::kDeactivated, 0);
   }
 }
 

@@ -54,6 +54,7 @@ class Dial : public std::enable_shared_from_this<Dial> {
   bool isKnown_ = false; ///< which device it uses
   std::uint32_t state_ = 0;
   std::uint32_t error_ = 0;
+  std::optional<std::uint64_t> deviceReason_; ///< of what ends it
   std::string activePath_;
   std::string devicePath_;
   std::vector<BusSignal> early_; ///< what came before it was known whom it concerns

@@ -106,10 +106,7 @@ std::uint32_t LinuxDialling::RasHangUpA(RasConnection connection) {
     return kRasManagerCannotStart;
   }
   const auto found = std::ranges::find(calls_, connection, &Call::handle);
-  if (found == calls_.end()) {
-    const bool wasGivenOut = connection != kNoRasConnection && connection.Value() <= lastHandle_;
-    return wasGivenOut ? std::uint32_t{kRasSuccess} : std::uint32_t{kErrorInvalidHandle};
-  }
+  if (found == calls_.end()) return kErrorInvalidHandle;
   const Call call = *found;
   Forget(connection);
   if (call.dial) return call.dial->HangUp();

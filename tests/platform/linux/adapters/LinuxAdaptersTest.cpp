@@ -16,6 +16,11 @@ struct AdaptersTest : testing::Test {
   std::vector<std::shared_ptr<NetworkCard>> Cards() {
     return adapters.GetObject(Adapters::kMoniker)->ExecQuery(Adapters::kCards);
   }
+  NetworkCard& Card(const std::string& description) {
+    for (const auto& card : cards = Cards())
+      if (card->Description() == description) return *card;
+    throw std::runtime_error("there is no " + description);
+  }
   std::vector<std::string> Descriptions() {
     std::vector<std::string> texts;
     for (const auto& card : Cards()) texts.push_back(card->Description());
@@ -25,6 +30,7 @@ struct AdaptersTest : testing::Test {
   forms::headless::PolledDesktop loop;
   NetworkManagerBus connection{loop, loop};
   LinuxAdapters adapters{connection};
+  std::vector<std::shared_ptr<NetworkCard>> cards;
 };
 
 struct ManagedCardsTest : AdaptersTest {
@@ -46,6 +52,11 @@ struct ManagedCardsTest : AdaptersTest {
 struct KernelCardsTest : AdaptersTest {
   void SetUp() override {
     if (::geteuid() != 0) GTEST_SKIP() << "needs root for namespaces";
+  }
+  /// The results of both changes.
+  static std::string Configure(NetworkCard& card, std::uint16_t metric) {
+    const std::string address = std::to_string(card.EnableStatic({"10.200.1.1"}, {"255.0.0.0"}));
+    return address + " " + std::to_string(card.SetGateways({"10.0.0.138"}, {metric})) + "\n";
   }
   static void EnterNetwork() {
     if (::unshare(CLONE_NEWNET) != 0 ||
@@ -74,11 +85,9 @@ TEST_F(ManagedCardsTest, Cards_are_the_devices_with_an_address_without_loopback)
 
 TEST_F(ManagedCardsTest, A_static_address_and_a_gateway_land_on_the_device_and_are_kept) {
   ASSERT_TRUE(Wait([&] { return Cards().size() == 2; }));
-  for (const auto& card : Cards()) {
-    if (card->Description() != "Ethernet (qn0)") continue;
-    EXPECT_EQ(card->EnableStatic({"10.200.1.1"}, {"255.0.0.0"}), kCardChanged);
-    EXPECT_EQ(card->SetGateways({"10.0.0.138"}, {1}), kCardChanged);
-  }
+  NetworkCard& card = Card("Ethernet (qn0)");
+  EXPECT_EQ(card.EnableStatic({"10.200.1.1"}, {"255.0.0.0"}), kCardChanged);
+  EXPECT_EQ(card.SetGateways({"10.0.0.138"}, {1}), kCardChanged);
   EXPECT_TRUE(HasLanded("10.200.1.1/8"));
   EXPECT_EQ(OwnAddresses().find("10.77.0.2"), std::string::npos) << OwnAddresses();
   EXPECT_TRUE(Wait([&] {
@@ -96,12 +105,9 @@ TEST_F(ManagedCardsTest, A_connection_of_the_user_keeps_what_is_not_changed) {
   manager.Nmcli(
       "con add type ethernet con-name mine ifname qn0 ipv4.method manual ipv4.addresses 10.5.0.1/24 "
       "ipv4.dns 10.5.0.9 802-3-ethernet.mtu 1400");
+  manager.Nmcli("con up mine");
   ASSERT_TRUE(HasLanded("10.5.0.1/24"));
-  const auto cards = Cards();
-  ASSERT_FALSE(cards.empty());
-  for (const auto& card : cards)
-    if (card->Description() == "Ethernet (qn0)")
-      EXPECT_EQ(card->EnableStatic({"10.200.1.1"}, {"255.0.0.0"}), kCardChanged);
+  EXPECT_EQ(Card("Ethernet (qn0)").EnableStatic({"10.200.1.1"}, {"255.0.0.0"}), kCardChanged);
   EXPECT_TRUE(HasLanded("10.200.1.1/8"));
   EXPECT_EQ(manager.Nmcli("-g ipv4.dns,802-3-ethernet.mtu,ipv4.addresses con show mine"),
             "10.5.0.9\n1400\n10.200.1.1/8\n");
@@ -109,11 +115,11 @@ TEST_F(ManagedCardsTest, A_connection_of_the_user_keeps_what_is_not_changed) {
 
 TEST_F(ManagedCardsTest, A_card_of_a_manager_that_has_gone_tells_a_failure) {
   ASSERT_TRUE(Wait([&] { return Cards().size() == 2; }));
-  const auto cards = Cards();
+  NetworkCard& card = Card("Ethernet (qn0)");
   manager.Kill();
-  EXPECT_EQ(cards.front()->EnableStatic({"10.200.1.1"}, {"255.0.0.0"}), kCardUnknownFailure);
-  EXPECT_EQ(cards.front()->SetGateways({"10.0.0.138"}, {1}), kCardUnknownFailure);
-  EXPECT_EQ(cards.front()->EnableStatic({"x"}, {"255.0.0.0"}), kCardInvalidAddress);
+  EXPECT_EQ(card.EnableStatic({"10.200.1.1"}, {"255.0.0.0"}), kCardUnknownFailure);
+  EXPECT_EQ(card.SetGateways({"10.0.0.138"}, {1}), kCardUnknownFailure);
+  EXPECT_EQ(card.EnableStatic({"x"}, {"255.0.0.0"}), kCardInvalidAddress);
 }
 
 TEST_F(KernelCardsTest, Without_a_manager_the_links_with_an_address_are_the_cards) {
@@ -131,11 +137,8 @@ TEST_F(KernelCardsTest, Without_a_manager_root_gives_the_link_its_address_and_ga
   const Child child([&] {
     EnterNetwork();
     const auto card = Cards().back();
-    std::string results = std::to_string(card->EnableStatic({"10.200.1.1"}, {"255.0.0.0"})) + " " +
-                          std::to_string(card->SetGateways({"10.0.0.138"}, {1})) + "\n";
-    // Once more is no failure.
-    results += std::to_string(card->EnableStatic({"10.200.1.1"}, {"255.0.0.0"})) + " " +
-               std::to_string(card->SetGateways({"10.0.0.138"}, {7})) + "\n";
+    std::string results = Configure(*card, 1);
+    results += Configure(*card, 7);
     return results + OutputOf("ip -4 -o addr show dev qn0 | awk '{print $4}'; ip route show default");
   });
   EXPECT_EQ(child.Answer(),
@@ -147,9 +150,8 @@ TEST_F(KernelCardsTest, Without_a_manager_another_user_is_told_that_it_may_not) 
     EnterNetwork();
     const auto card = Cards().back();
     if (::setuid(65534) != 0) return std::string("still root");
-    return std::to_string(card->EnableStatic({"10.200.1.1"}, {"255.0.0.0"})) + " " +
-           std::to_string(card->SetGateways({"10.0.0.138"}, {1})) + "\n" +
-           OutputOf("ip -4 -o addr show dev qn0 | awk '{print $4}'");
+    const std::string results = Configure(*card, 1);
+    return results + OutputOf("ip -4 -o addr show dev qn0 | awk '{print $4}'");
   });
   EXPECT_EQ(child.Answer(), "91 91\n10.77.0.2/24\n10.78.0.2/24\n");
 }

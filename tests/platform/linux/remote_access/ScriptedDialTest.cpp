@@ -146,6 +146,14 @@ TEST_F(ScriptedDialTest, A_second_client_sees_the_connection_and_ends_it) {
   EXPECT_EQ(Connections().size(), 0U);
 }
 
+TEST_F(ScriptedDialTest, A_device_that_ends_another_connection_does_not_end_this_one) {
+  BeginDial("097");
+  Play("device 110 60, device 30 60, device 40 0, device 50 0");
+  EXPECT_TRUE(Comes(kRasConnectDevice, 0));
+  Play("active 4 2");
+  EXPECT_TRUE(Comes(kRasConnectDevice, kRasUserDisconnection));
+}
+
 TEST_F(ScriptedDialTest, A_line_that_is_hung_up_while_it_is_dialled_tells_nothing_more) {
   BeginDial("097");
   Play("device 40 0");
@@ -163,13 +171,12 @@ TEST_F(ScriptedDialTest, A_line_that_is_hung_up_at_once_ends_as_soon_as_it_is_kn
   EXPECT_EQ(loop.changes, (Changes{{kRasOpenPort, 0}}));
 }
 
-TEST_F(ScriptedDialTest,
-       A_handle_that_was_hung_up_is_hung_up_again_without_complaint_and_an_unknown_one_fails) {
+TEST_F(ScriptedDialTest, A_handle_is_hung_up_once_also_when_its_line_has_ended) {
   BeginDial("097");
+  Play("device 120 13, active 4 3, forget");
+  ASSERT_TRUE(loop.WaitFor([&] { return loop.changes.back().second != 0; }, 20'000));
   EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
-  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
-  EXPECT_EQ(dialling.RasHangUpA(RasConnection(4321)), kErrorInvalidHandle);
-  EXPECT_EQ(dialling.RasHangUpA(kNoRasConnection), kErrorInvalidHandle);
+  EXPECT_EQ(dialling.RasHangUpA(handle), kErrorInvalidHandle);
 }
 
 TEST_F(ScriptedDialTest, A_dial_without_a_window_returns_when_the_line_stands) {
