@@ -11,7 +11,7 @@ struct mdlDun::Hook {
 
 mdlDun::mdlDun(const RemoteAccess& remoteAccess, platform::System& system, forms::Desktop& desktop)
     : phoneBook_(remoteAccess.phoneBook), dialling_(remoteAccess.dialling), system_(system),
-      desktop_(desktop), hook_(std::make_shared<Hook>(this, desktop.Windows)) {
+      desktop_(desktop), hook_(std::make_shared<Hook>(Hook{this, desktop.Windows})) {
   using Procedure = forms::WindowProcedure::element_type;
   hookProcedure_ = std::make_shared<Procedure>(
       [hook = hook_](WindowHandle window, std::uint32_t message, std::uint32_t wParam, std::uint32_t lParam) {

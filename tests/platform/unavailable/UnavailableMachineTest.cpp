@@ -182,6 +182,60 @@ TEST_F(UnavailableFamilies, The_keyboard_layout_has_no_name) {
   EXPECT_FALSE(machine.keyboardLayout.GetKeyboardLayoutNameA());
 }
 
+TEST_F(UnavailableFamilies, The_phone_book_cannot_be_opened_for_want_of_remote_access) {
+  std::array<std::uint8_t, 1060> record{};
+  record.fill(0xEE);
+  const auto before = record;
+  std::uint32_t bytes = 77;
+  std::uint32_t count = 77;
+  EXPECT_EQ(machine.phoneBook.RasEnumEntriesA(nullptr, record, bytes, count), kRasManagerCannotStart);
+  EXPECT_EQ(count, 0u);
+  count = 77;
+  EXPECT_EQ(machine.phoneBook.RasEnumDevicesA(record, bytes, count), kRasManagerCannotStart);
+  EXPECT_EQ(count, 0u);
+  EXPECT_EQ(machine.phoneBook.RasGetEntryPropertiesA(nullptr, "097", record, bytes), kRasManagerCannotStart);
+  EXPECT_EQ(machine.phoneBook.RasSetEntryPropertiesA(nullptr, "097", record), kRasManagerCannotStart);
+  EXPECT_EQ(machine.phoneBook.RasDeleteEntryA(nullptr, "097"), kRasManagerCannotStart);
+  EXPECT_EQ(bytes, 77u);
+  EXPECT_EQ(record, before);
+}
+
+TEST_F(UnavailableFamilies, What_dials_are_made_with_cannot_be_read_or_kept_for_want_of_remote_access) {
+  std::array<std::uint8_t, 1060> params{};
+  bool hasPassword = true;
+  EXPECT_EQ(machine.phoneBook.RasGetEntryDialParamsA(nullptr, params, hasPassword), kRasManagerCannotStart);
+  EXPECT_FALSE(hasPassword);
+  EXPECT_EQ(machine.phoneBook.RasSetEntryDialParamsA(nullptr, params, false), kRasManagerCannotStart);
+}
+
+TEST_F(UnavailableFamilies, Nothing_is_dialled_nor_hung_up_and_no_failure_has_a_text) {
+  std::array<std::uint8_t, 692> record{};
+  RasConnection connection(77);
+  std::uint32_t bytes = 4;
+  std::uint32_t count = 77;
+  std::array<char, 512> text{};
+  EXPECT_EQ(machine.dialling.RasDialA({}, nullptr, record, {}, connection), kRasManagerCannotStart);
+  EXPECT_EQ(connection, RasConnection(77));
+  EXPECT_EQ(machine.dialling.RasHangUpA(connection), kRasManagerCannotStart);
+  EXPECT_EQ(machine.dialling.RasEnumConnectionsA(record, bytes, count), kRasManagerCannotStart);
+  EXPECT_EQ(count, 0u);
+  EXPECT_EQ(machine.dialling.RasGetErrorStringA(kRasManagerCannotStart, text), kCallNotImplemented);
+}
+
+TEST_F(UnavailableFamilies, Network_cards_have_no_management) {
+  try {
+    machine.adapters.GetObject(Adapters::kMoniker);
+    ADD_FAILURE();
+  } catch (const Fault& fault) {
+    EXPECT_EQ(fault.number, Fault::kCannotCreateObject);
+  }
+}
+
+TEST_F(UnavailableFamilies, An_error_of_the_system_has_no_text) {
+  std::array<char, 512> text{};
+  EXPECT_EQ(machine.system.FormatMessageA(System::kFromSystem, 5, 0, text), 0u);
+}
+
 } // namespace
 
 } // namespace quendra::platform::unavailable

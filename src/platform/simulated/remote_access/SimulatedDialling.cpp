@@ -61,10 +61,16 @@ std::uint32_t SimulatedRemoteAccess::RasEnumConnectionsA(std::span<std::uint8_t>
 
 std::uint32_t SimulatedRemoteAccess::RasGetErrorStringA(std::uint32_t error, std::span<char> text) {
   if (const auto refused = Enter("RasGetErrorStringA")) return refused;
+  constexpr std::uint32_t kFirst = 600;
+  constexpr std::uint32_t kLast = 799;
   const auto found = ErrorTexts.find(error);
-  if (found == ErrorTexts.end()) return kInvalidParameter;
-  if (text.size() <= found->second.size()) return kRasBufferTooSmall;
-  *std::ranges::copy(found->second, text.begin()).out = '\0';
+  const bool isOwn = found != ErrorTexts.end() || (error >= kFirst && error <= kLast);
+  if (!isOwn) return kInvalidParameter;
+  const std::string told = found == ErrorTexts.end()
+                               ? "Remote access failed by number " + std::to_string(error) + "."
+                               : found->second;
+  if (text.size() <= told.size()) return kRasBufferTooSmall;
+  *std::ranges::copy(told, text.begin()).out = '\0';
   return kRasSuccess;
 }
 

@@ -30,7 +30,7 @@ class SimulatedRemoteAccess : public PhoneBook, public Dialling {
   std::vector<std::uint32_t> ConnectionSizes{
       RasConnectionRecord::kBytes, RasConnectionRecord::kBytesWithoutGuid,
       RasConnectionRecord::kBytesWithoutPhoneBook, RasConnectionRecord::kBytesOfShortNames};
-  /// Texts of remote access's own numbers; no other number has one.
+  /// Texts of its own numbers. Others from 600 to 799 have a plain one.
   std::map<std::uint32_t, std::string> ErrorTexts{
       {kRasCannotFindPhonebookEntry, "The phone book entry was not found."},
       {kRasPortNotAvailable, "The port is in use or not ready."},
