@@ -16,6 +16,9 @@ class TextBox : public Control, public TextEntry {
   bool MultiLine = false;
   /// The user can read, select and copy, and change nothing.
   Property<bool, Aspect::Look> ReadOnly{*this, false};
+  /// On a field of a single line: each character shows as the same sign, and assistive technology doesn't
+  /// read it.
+  Property<bool, Aspect::Look> Masked{*this, false};
   /// On a field of many lines: always there, else never.
   Property<bool, Aspect::Look> VerticalScrollBar{*this, false};
   /// In letters that are all as wide.

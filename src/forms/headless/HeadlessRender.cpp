@@ -88,7 +88,10 @@ class Renderer : public ControlVisitor {
     AppendTable(text_, list, margin_ + "  ");
   }
   void Visit(PictureBox& box) override { Write("PictureBox", box, PictureText(box.Contents)); }
-  void Visit(TextBox& box) override { Write("TextBox", box, Quoted(box.Value) + StateOf(box)); }
+  void Visit(TextBox& box) override {
+    const Text shown = box.Masked() ? Text(box.Value().size(), u'*') : box.Value();
+    Write("TextBox", box, Quoted(shown) + StateOf(box));
+  }
   void Visit(Timer& /*timer*/) override {}
 
  private:

@@ -11,6 +11,7 @@ namespace quendra::forms {
 namespace {
 
 constexpr int kLinkRingRoom = 4;
+constexpr int kTextInset = 8;
 
 bool IsLink(const Label& label) { return label.Style() == Label::Look::Link; }
 bool HasButtonFace(const Label& label) { return label.Style() == Label::Look::Button; }
@@ -59,6 +60,12 @@ Area RingedArea(const Label& label, Area place, Extent letters, Direction direct
   const Extent shown{std::min(letters.width, place.extent.width),
                      std::min(letters.height, place.extent.height)};
   return AlignedIn(SideOf(label.Align(), direction), shown, place);
+}
+
+int TextInset(const Label& label) {
+  const bool underRing =
+      label.IsButton() && label.Style() == Label::Look::Plain && label.Align() != Alignment::Centre;
+  return underRing ? kTextInset : 0;
 }
 
 int RingRoom(const Label& label) { return IsLink(label) ? kLinkRingRoom : 0; }

@@ -53,6 +53,10 @@ std::vector<Ring> RingsOf(const Label& label, const LabelState& state);
 /// What the ring goes round: the label, or the letters of a link, which may take up a small part of it.
 Area RingedArea(const Label& label, Area place, Extent letters, Direction direction);
 
+/// How far a text keeps from the sides of its label: a text that acts as a button and stands at a side would
+/// lie under the ring.
+int TextInset(const Label& label);
+
 /// How far a label's view reaches beyond the label on each side: a ring within would cover the letters of a
 /// link, which is as wide as its text.
 int RingRoom(const Label& label);

@@ -34,6 +34,7 @@ void ConnectionPanel::Design(const forms::Geometry& place) {
   looks::StepTitle(Title, u"פרטי החיבור");
   looks::StepField(UsernamePrompt, u"שם משתמש:", frsCon_txtUsername, kUsernameTop);
   looks::StepField(PasswordPrompt, u"סיסמה:", frsCon_txtPassword, kPasswordTop);
+  frsCon_txtPassword.Masked = true;
   DesignModems();
   looks::StepButton(frsCon_Picture5, "create_connection", frsCon_cmdCreate, u"צור חיבור", place.height);
 }

@@ -15,7 +15,7 @@ constexpr int kFirstTileLeft = 6525;
 constexpr int kTilePitch = 1266;
 
 constexpr int kTileWidth = 82;
-constexpr int kTileHeight = 136;
+constexpr int kTileHeight = 124;
 constexpr int kPictureHeight = 66;
 /// What is left of a tile round its picture and its caption.
 constexpr int kEdge = 2;

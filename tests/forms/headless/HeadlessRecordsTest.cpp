@@ -126,6 +126,15 @@ TEST_F(HeadlessDesktopTest, A_repaint_and_a_new_place_are_recorded) {
                                   "SetWindowPos " + ToUtf8(form.Name()) + " -2 0 0 0 0 3"}));
 }
 
+TEST_F(HeadlessDesktopTest, A_masked_field_is_rendered_without_its_text) {
+  TextBox box(form, u"box");
+  box.Masked = true;
+  box.Value = u"secret";
+  desktop.Show(form);
+
+  EXPECT_NE(desktop.Render(form).find("  TextBox box \"******\"\n"), std::string::npos);
+}
+
 TEST_F(HeadlessDesktopTest, A_list_box_is_rendered_with_its_items_and_the_chosen_one) {
   ListBox list(form, u"lstNICs");
   for (const char16_t* item : {u"one", u"two"}) list.AddItem(item);

@@ -63,6 +63,25 @@ TEST_F(Fields, Copy_is_a_command_that_the_handler_hears_of_by_its_control_charac
   EXPECT_EQ(line.Value(), u"text");
 }
 
+TEST_F(Fields, A_masked_field_shows_one_sign_a_character_and_keeps_the_text_to_itself) {
+  line.Masked = true;
+  line.Value = u"secret";
+  ShowActive();
+  line.SelLength = 6;
+  QGuiApplication::clipboard()->setText(QStringLiteral("before"));
+
+  PressKey(Line(), Qt::Key_C, QStringLiteral("\x03"), Qt::ControlModifier);
+  PressKey(Line(), Qt::Key_End);
+  PressKey(Line(), Qt::Key_9, QStringLiteral("9"));
+
+  EXPECT_EQ(line.Value(), u"secret9");
+  EXPECT_EQ(Line().displayText().size(), 7);
+  EXPECT_FALSE(Line().displayText().contains(QStringLiteral("secret")));
+  EXPECT_EQ(QGuiApplication::clipboard()->text(), QStringLiteral("before"));
+  line.Masked = false;
+  EXPECT_EQ(Line().displayText(), QStringLiteral("secret9"));
+}
+
 TEST_F(Fields, A_refused_control_character_pastes_nothing) {
   QGuiApplication::clipboard()->setText(QStringLiteral("pasted"));
   line.KeyPress = [](int& keyCode) { keyCode = 0; };

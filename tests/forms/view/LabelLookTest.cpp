@@ -33,6 +33,18 @@ TEST_F(LabelLook, A_text_has_its_own_ground_only_where_it_is_opaque) {
   EXPECT_FALSE(FaceOf(text, state).border);
 }
 
+TEST_F(LabelLook, A_text_that_acts_as_a_button_keeps_clear_of_the_ring_at_its_sides) {
+  EXPECT_EQ(TextInset(text), 0);
+
+  text.Click = [] {};
+
+  EXPECT_EQ(TextInset(text), 8);
+  text.Align = Alignment::Centre;
+  EXPECT_EQ(TextInset(text), 0);
+  EXPECT_EQ(TextInset(link), 0);
+  EXPECT_EQ(TextInset(button), 0);
+}
+
 TEST_F(LabelLook, A_button_without_a_colour_of_its_own_is_a_page_with_a_border) {
   const LabelFace face = FaceOf(button, state);
 

@@ -21,6 +21,11 @@ TEST_F(ModemRows, Bear_the_models_with_the_blanks_in_their_captions) {
     EXPECT_EQ(connection.frsCon_lblModems[row].Caption(), captions[row]) << row;
 }
 
+TEST_F(ModemRows, Stand_beside_fields_of_which_the_password_is_masked) {
+  EXPECT_TRUE(connection.frsCon_txtPassword.Masked());
+  EXPECT_FALSE(connection.frsCon_txtUsername.Masked());
+}
+
 TEST_F(ModemRows, Under_the_mouse_are_painted_one_at_a_time_by_each_of_their_parts) {
   for (std::size_t row = 0; row < 5; ++row)
     for (forms::Control* part : PartsOf(row)) {

@@ -79,7 +79,8 @@ void LabelView::PaintText(QPainter& painter, const LabelState& state) const {
   painter.setFont(drawn);
   painter.setPen(ToQColor(InkOf(*TheLabel(), state)));
   painter.setLayoutDirection(ToQt(set.direction));
-  const QRect place = ToQRect(LabelPlace());
+  const int inset = TextInset(*TheLabel());
+  const QRect place = ToQRect(LabelPlace()).adjusted(inset, 0, -inset, 0);
   const auto flags =
       ToQt(SideOf(set.align, ReadingDirection())) | (set.fromTop ? Qt::AlignTop : Qt::AlignVCenter);
   if (set.wraps) return painter.drawText(place, static_cast<int>(flags) | Qt::TextWordWrap, text);

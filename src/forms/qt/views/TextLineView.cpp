@@ -20,7 +20,10 @@ void TextLineView::ControlGone() {
 
 void TextLineView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Font) && Box().Monospaced()) setFont(Monospaced(font()));
-  if (Concerns(aspect, Aspect::Look)) setReadOnly(Box().ReadOnly());
+  if (Concerns(aspect, Aspect::Look)) {
+    setReadOnly(Box().ReadOnly());
+    setEchoMode(Box().Masked() ? QLineEdit::Password : QLineEdit::Normal);
+  }
   if (Concerns(aspect, Aspect::Entry)) ShowText();
   if (aspect == Aspect::Caret) ShowCaret();
 }
