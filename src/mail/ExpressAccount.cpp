@@ -62,13 +62,6 @@ std::uint32_t OpenAccounts(Registry& registry, OpenKey& accounts) {
   return registry.RegOpenKeyExA(root, kAccounts, platform::kSetValue, accounts.key);
 }
 
-/// The domain with its first letter in upper case.
-std::string AccountKey() {
-  std::string name = ToCodePage(settings::IspMailDomain);
-  if (!name.empty() && name[0] >= 'a' && name[0] <= 'z') name[0] = static_cast<char>(name[0] - 'a' + 'A');
-  return name;
-}
-
 void WriteNumber(Registry& registry, RegistryKey key, const Number& number) {
   std::array<std::uint8_t, 4> bytes{};
   PutLittle32(bytes, 0, number.data);
@@ -95,11 +88,18 @@ void WriteValues(Registry& registry, RegistryKey key, const Text& userName, cons
 
 } // namespace
 
+Text AccountKeyOf(Text domain) {
+  if (!domain.empty() && domain[0] >= u'a' && domain[0] <= u'z')
+    domain[0] = static_cast<char16_t>(domain[0] - u'a' + u'A');
+  return domain;
+}
+
 std::int32_t ExpressAccount::CreateExpressAccount(const Text& userName, const Text& fullName) {
   OpenKey accounts(registry_);
   if (const auto error = OpenAccounts(registry_, accounts)) return static_cast<std::int32_t>(error);
   OpenKey account(registry_);
-  if (const auto error = registry_.RegCreateKeyA(accounts.key, AccountKey(), account.key))
+  if (const auto error = registry_.RegCreateKeyA(
+          accounts.key, ToCodePage(AccountKeyOf(settings::IspMailDomain)), account.key))
     return static_cast<std::int32_t>(error);
   WriteValues(registry_, account.key, userName, fullName);
   return 0;

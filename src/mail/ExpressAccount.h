@@ -23,4 +23,7 @@ class ExpressAccount {
   platform::Registry& registry_;
 };
 
+/// What the account's key is named: the domain with its first letter in upper case.
+Text AccountKeyOf(Text domain);
+
 } // namespace quendra::mail

@@ -210,14 +210,20 @@ constexpr Line kProfile[] = {
     {u"ConnectOID=PT_UNICODE,0x0010"},
 };
 
+/// A value ends where it would begin a line of its own: what was pasted into a field may hold anything.
+TextView OneLine(TextView value) {
+  constexpr TextView ends(u"\r\n\0", 3);
+  return value.substr(0, value.find_first_of(ends));
+}
+
 Text ValueOf(Blank blank, const ProfileValues& values) {
   switch (blank) {
   case Blank::None: break;
   case Blank::MailHost: return values.mailHost;
-  case Blank::UserName: return values.userName;
+  case Blank::UserName: return Text(OneLine(values.userName));
   // With a blank before the "@".
-  case Blank::MailAddress: return values.userName + u" @" + values.mailDomain;
-  case Blank::FullName: return values.fullName;
+  case Blank::MailAddress: return Text(OneLine(values.userName)) + u" @" + values.mailDomain;
+  case Blank::FullName: return Text(OneLine(values.fullName));
   }
   return {};
 }

@@ -136,6 +136,14 @@ TEST_F(ExpressAccountTest, Where_accounts_are_the_calls_are_one_opening_one_key_
   EXPECT_EQ(registry.OpenCount(), 0u);
 }
 
+TEST(AccountKeyOfTest, The_first_letter_of_the_domain_is_raised_and_nothing_else_changes) {
+  EXPECT_EQ(AccountKeyOf(u"example.net"), u"Example.net");
+  EXPECT_EQ(AccountKeyOf(u"a.aa"), u"A.aa");
+  EXPECT_EQ(AccountKeyOf(u"z"), u"Z");
+  for (const char16_t* domain : {u"", u"Example.net", u"1and.one", u"`x", u"{x", u"דואר.net"})
+    EXPECT_EQ(AccountKeyOf(domain), domain) << ToUtf8(domain);
+}
+
 TEST_F(ExpressAccountTest, The_account_s_key_is_the_domain_with_its_first_letter_in_upper_case) {
   Create();
 

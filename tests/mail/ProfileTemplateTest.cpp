@@ -40,6 +40,20 @@ TEST(ProfileTemplate, Empty_values_leave_their_lines) {
     EXPECT_NE(text.find(u"\r\n" + Text(line) + u"\r\n"), Text::npos) << ToUtf8(line);
 }
 
+TEST(ProfileTemplate, A_value_makes_no_line_of_its_own) {
+  for (const Text& end : {Text(u"\r\n"), Text(u"\r"), Text(u"\n"), Text(1, u'\0')}) {
+    const Text tail = end + u"POP3Server = elsewhere";
+    EXPECT_EQ(ProfileText({u"mail.example.net", u"example.net", u"dana" + tail, u"דנה כהן" + tail}),
+              ProfileText(kDana));
+  }
+}
+
+TEST(ProfileTemplate, Other_signs_of_a_value_stand_as_they_are) {
+  const Text text = ProfileText({u"", u"", u"a=[b]", u"\t%d;#\"x\""});
+  EXPECT_NE(text.find(u"\r\nPOP3UserName = a=[b]\r\n"), Text::npos);
+  EXPECT_NE(text.find(u"\r\nDisplayName = \t%d;#\"x\"\r\n"), Text::npos);
+}
+
 TEST(ProfileTemplate, No_line_holds_a_password) {
   const Text text = ProfileText(kDana);
   for (std::size_t at = 0; (at = text.find(u"Password", at)) != Text::npos; ++at) {
