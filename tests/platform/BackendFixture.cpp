@@ -149,13 +149,14 @@ class RealFarEnd : public FarEnd {
   int socket_;
 };
 
-/// What the user of this machine keeps is left alone: registry and caches are in a folder of the test, and no
-/// display tells a layout.
+/// What the user of this machine keeps is left alone: registry and caches are in a folder of the test, no
+/// display tells a layout and no network manager is asked.
 class LinuxBackend : public Backend {
  public:
   LinuxBackend() {
     environment_.Set("XDG_DATA_HOME", folder_ / "data");
     environment_.Set("XDG_CACHE_HOME", folder_ / "cache");
+    environment_.Set("DBUS_SYSTEM_BUS_ADDRESS", "unix:path=" + (folder_ / "no-bus"));
     for (const char* name : {"DISPLAY", "XDG_SESSION_TYPE"}) environment_.Set(name, {});
     machine_.emplace(loop_, loop_);
   }

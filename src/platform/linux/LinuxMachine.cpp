@@ -1,9 +1,7 @@
 #include "platform/linux/LinuxMachine.h"
-#include "platform/unavailable/UnavailableAdapters.h"
-#include "platform/unavailable/UnavailableDialling.h"
 #include "platform/unavailable/UnavailableInstalledProducts.h"
-#include "platform/unavailable/UnavailablePhoneBook.h"
 
+#include "platform/linux/adapters/LinuxAdapters.h"
 #include "platform/linux/capture/LinuxCapture.h"
 #include "platform/linux/files/LinuxFiles.h"
 #include "platform/linux/icmp/LinuxIcmp.h"
@@ -18,6 +16,8 @@
 #include "platform/linux/programs/LinuxIcons.h"
 #include "platform/linux/programs/LinuxVersionInfo.h"
 #include "platform/linux/registry/LinuxRegistry.h"
+#include "platform/linux/remote_access/LinuxDialling.h"
+#include "platform/linux/remote_access/LinuxPhoneBook.h"
 #include "platform/linux/system/LinuxPerformanceData.h"
 #include "platform/linux/system/LinuxShellStart.h"
 #include "platform/linux/system/LinuxSystem.h"
@@ -27,7 +27,8 @@ namespace quendra::platform::linux_ {
 
 struct LinuxMachine::Parts {
   Parts(EventLoop& loop, DescriptorWatch& descriptors, DamagedFileNotice tellOfDamagedRegistry)
-      : capture(loop, descriptors),
+      : networkManager(loop, descriptors), dialling(connectionBook, networkManager, loop),
+        capture(loop, descriptors),
         registry(UserFolders::OfEnvironment().dataHome + "/quendra", std::move(tellOfDamagedRegistry)),
         sockets(loop, descriptors, hostNames) {}
 
@@ -37,12 +38,14 @@ struct LinuxMachine::Parts {
   DriveFolder drive{UserFolders::OfEnvironment().dataHome + "/quendra/drive_c"};
   DesktopIndex desktopIndex{UserFolders::OfEnvironment()};
   IconTheme iconTheme{UserFolders::OfEnvironment()};
+  NetworkManagerBus networkManager;
+  ConnectionBook connectionBook{networkManager};
 
-  unavailable::UnavailableAdapters adapters;
-  unavailable::UnavailableDialling dialling;
+  LinuxAdapters adapters{networkManager};
+  LinuxDialling dialling;
   LinuxFiles files{drive};
   unavailable::UnavailableInstalledProducts installedProducts; // this system's packages are no such products
-  unavailable::UnavailablePhoneBook phoneBook;
+  LinuxPhoneBook phoneBook{connectionBook, networkManager};
   LinuxCapture capture;
   unavailable::UnavailableHandles handles; // this system has no list of all handles
   LinuxHostNames hostNames{folder};

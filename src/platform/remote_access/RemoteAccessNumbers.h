@@ -18,6 +18,7 @@ enum RasErrorNumber : std::uint32_t {
   kRasBufferTooSmall = 603,
   kRasBufferInvalid = 610,
   kRasCannotFindPhonebookEntry = 623,
+  kRasPortDisconnected = 628,
   kRasUserDisconnection = 631,
   kRasInvalidSize = 632,
   kRasPortNotAvailable = 633,

@@ -11,7 +11,7 @@
 namespace quendra::platform {
 namespace {
 
-struct Kind {
+struct SocketBackend {
   const char* name;
   std::unique_ptr<Backend> (*make)();
 };
@@ -27,7 +27,7 @@ void PrintTo(const Told& told, std::ostream* out) {
 }
 
 /// One socket, a window that writes down what is told of it, and the far end of its connection.
-class SocketsBehaviour : public testing::TestWithParam<Kind> {
+class SocketsBehaviour : public testing::TestWithParam<SocketBackend> {
  protected:
   static constexpr std::uint32_t kMessage = 32769;
 
@@ -166,8 +166,8 @@ TEST_P(SocketsBehaviour, A_connection_that_was_reset_keeps_both_addresses_and_re
 }
 
 INSTANTIATE_TEST_SUITE_P(, SocketsBehaviour,
-                         testing::Values(Kind{"Simulated", MakeSimulatedBackend},
-                                         Kind{"Linux", MakeLinuxBackend}),
+                         testing::Values(SocketBackend{"Simulated", MakeSimulatedBackend},
+                                         SocketBackend{"Linux", MakeLinuxBackend}),
                          [](const auto& kind) { return std::string(kind.param.name); });
 
 } // namespace

@@ -1,0 +1,95 @@
+#pragma once
+
+#include "platform/DescriptorWatch.h"
+#include "platform/linux/network_manager/BusValue.h"
+
+#include <cstdint>
+#include <deque>
+#include <functional>
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace quendra::platform::linux_ {
+
+struct BusQuestion {
+  std::string path;
+  const char* interface;
+  const char* member;
+  std::vector<BusValue> arguments{};
+};
+
+struct BusAnswer {
+  enum class Kind { Given, Refused, NobodyThere };
+
+  Kind kind = Kind::NobodyThere;
+  std::vector<BusValue> values{};
+  std::string error{}; ///< the name of a refusal
+
+  bool IsGiven() const { return kind == Kind::Given; }
+  /// An empty text where there is none.
+  const BusValue& First() const;
+};
+
+struct BusSignal {
+  std::string path{};
+  std::string interface {};
+  std::string member{};
+  std::vector<BusValue> values{};
+
+  /// NetworkManager, or the bus with it, has come or gone: nothing that was known of it holds any more.
+  bool TellsOfAnotherManager() const { return member == "NameOwnerChanged"; }
+};
+
+/// NetworkManager on the system's bus. The connection is made by the first question; one that breaks is made
+/// anew by the next. Each question waits a few seconds at most for its answer.
+class NetworkManagerBus {
+ public:
+  using Reply = std::function<void(const BusAnswer&)>;
+  using Listener = std::function<void(const BusSignal&)>;
+
+  NetworkManagerBus(EventLoop& loop, DescriptorWatch& descriptors);
+  ~NetworkManagerBus();
+  NetworkManagerBus(const NetworkManagerBus&) = delete;
+
+  BusAnswer Ask(const BusQuestion& question);
+  /// Many at a time.
+  std::vector<BusAnswer> AskAll(const std::vector<BusQuestion>& questions);
+  /// The reply comes from the loop, or from one of the next two calls.
+  void AskLater(const BusQuestion& question, Reply reply);
+  /// Hands on what has come.
+  void HandleArrived();
+  /// Waits for something to come, that long at most, and hands it on.
+  void Wait(std::uint64_t microseconds);
+  /// Hears of changes from now on, as long as this object lives.
+  void Listen(Listener listener);
+
+ private:
+  struct Pending;
+
+  static int TakeReply(void* message, void* pending, BusFailure* failure);
+  static int TakeSignal(void* message, void* self, BusFailure* failure);
+
+  bool IsOpen();
+  bool Open();
+  void Drop();
+  void Process();
+  BusAnswer::Kind Start(const BusQuestion& question, Reply reply, bool isQueued);
+  void HandleSoon();
+  BusAnswer AnswerOf(void* message) const;
+  std::vector<BusValue> ValuesOf(void* message) const;
+
+  EventLoop& loop_;
+  DescriptorWatch& descriptors_;
+  std::optional<BusLibrary> library_;
+  std::unique_ptr<void, void* (*)(void*)> bus_{nullptr, nullptr};
+  std::vector<std::unique_ptr<Pending>> pending_;
+  std::deque<std::function<void()>> arrived_;
+  std::vector<Listener> listeners_;
+  std::unique_ptr<EventLoop::Subscription> watch_;
+  std::unique_ptr<EventLoop::Subscription> timer_;
+  std::shared_ptr<bool> isHandledSoon_ = std::make_shared<bool>(false);
+};
+
+} // namespace quendra::platform::linux_

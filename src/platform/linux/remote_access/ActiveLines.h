@@ -1,0 +1,19 @@
+#pragma once
+
+#include "platform/linux/remote_access/ConnectionBook.h"
+
+#include <string>
+#include <vector>
+
+namespace quendra::platform::linux_ {
+
+/// A connection that stands or is being made, by whomever.
+struct ActiveLine {
+  std::string path;
+  Line line;
+};
+
+/// The error number of NetworkManager's answer.
+std::uint32_t ReadActiveLines(NetworkManagerBus& bus, ConnectionBook& book, std::vector<ActiveLine>& active);
+
+} // namespace quendra::platform::linux_
