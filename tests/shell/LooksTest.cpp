@@ -101,7 +101,7 @@ TEST_F(Looks, The_controls_of_a_page_lie_beside_each_other) {
   ExpectApart(program.firstConnectionPage.frameFirstConnection);
   ExpectApart(program.firstConnectionPage.connection.frsCon_Frame1);
   ExpectApart(program.firstConnectionPage.mail.frsCon_Frame2);
-  ExpectApart(frmNetworkAdapters);
+  ExpectApart(program.connection.frmNetworkAdapters);
 }
 
 TEST_F(Looks, The_menu_stays_clear_of_the_pages) {

@@ -165,6 +165,23 @@ TEST_F(Check, After_a_real_failure_another_check_can_be_made) {
                                u"שגיאה: 720 - כרגע לא בערכת התקלות המטופלות - פנה לתומך..."}));
 }
 
+TEST_F(Check, After_a_connection_that_ended_with_its_dialog_another_check_dials) {
+  machine.ras.Dial("Home").ThenConnected();
+  Open();
+  Pick("Home");
+  ClickCheck();
+  desktop.RunUntilIdle();
+  desktop.Click(form.Command1);
+  Open();
+  Pick("Away");
+
+  ClickCheck();
+
+  EXPECT_TRUE(desktop.Boxes.empty());
+  ASSERT_EQ(machine.ras.Dials.size(), 2u);
+  EXPECT_EQ(EntryNameOf(machine.ras.Dials[1]), "Away");
+}
+
 TEST_F(Check, The_name_under_check_stays_as_it_is_listed) {
   machine.ras.Dial("Home").Then(0);
   Open();
