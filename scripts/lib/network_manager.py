@@ -60,6 +60,8 @@ exec NetworkManager --no-daemon --config={directory}/settings --config-dir={dire
 class NetworkManager:
     """As its own tool shows it."""
 
+    cards = tuple(CARDS)
+
     def __init__(self, space):
         self.space = space
 
