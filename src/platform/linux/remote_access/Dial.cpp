@@ -62,12 +62,12 @@ void Dial::TakeProperties(const BusAnswer& answer) {
   if (!devices.items.empty()) devicePath_ = devices.items.front().text;
   isKnown_ = true;
   const bool hasGone = !answer.IsGiven();
-  for (const BusSignal& signal : std::exchange(early_, {})) {
-    // Where the connection has gone already, the last device that failed was its own.
+  const auto early = std::exchange(early_, {});
+  // Where the connection has gone already, the last device that failed was its own.
+  for (const BusSignal& signal : early)
     if (hasGone && signal.interface == nm::kDevice && NumberAt(signal.values, 0) == nm::kDeviceFailed)
       devicePath_ = signal.path;
-    Take(signal);
-  }
+  for (const BusSignal& signal : early) Take(signal);
   if (answer.kind == BusAnswer::Kind::NobodyThere) return End(kRasManagerCannotStart);
   // What was reached before anybody listened.
   const std::uint64_t state = hasGone ? std::uint64_t{nm::kDeactivated} : properties["State"].number;
