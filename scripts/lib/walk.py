@@ -97,6 +97,13 @@ class Walk:
         self.program.control("frsCon_lblBack")
         time.sleep(0.4)
         self.picture("first-connection")
+        for step, first in ((1, "frsCon_txtUsername"), (0, "frsCon_txtFullName")):
+            self.click(f"frsCon_lblCaption({step})")
+            self.program.control(first)
+            time.sleep(0.4)
+            self.picture(f"first-connection-step-{2 - step}")
+            self.click("frsCon_lblBack")
+        self.program.control("frsCon_lblCaption(1)")
         self.click("frsCon_lblBack")
 
     def close(self):
