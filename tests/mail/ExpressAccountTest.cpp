@@ -35,19 +35,16 @@ RegistryValue TextValue(const std::string& bytes) {
 /// Keeps with which access keys are opened, and refuses as often as it is told.
 struct WatchedRegistry : platform::simulated::SimulatedRegistry {
   std::vector<std::uint32_t> access;
-  std::vector<std::uint32_t> openErrors; ///< of the next calls, 0 for none
+  std::vector<std::uint32_t> openErrors; ///< of the next calls
   std::uint32_t createError = 0;         ///< of keys below the accounts
   bool refuseValues = false;
 
   std::uint32_t RegOpenKeyExA(platform::RegistryKey parent, const std::string& path, std::uint32_t asked,
                               platform::RegistryKey& key) override {
     access.push_back(asked);
-    const auto error = SimulatedRegistry::RegOpenKeyExA(parent, path, asked, key);
-    if (openErrors.empty() || openErrors.front() == 0) return error;
-    if (error == 0) StoredRegistry::RegCloseKey(key);
+    if (openErrors.empty()) return SimulatedRegistry::RegOpenKeyExA(parent, path, asked, key);
     const auto told = openErrors.front();
     openErrors.erase(openErrors.begin());
-    key = {};
     return told;
   }
   std::uint32_t RegCreateKeyA(platform::RegistryKey parent, const std::string& path,

@@ -11,8 +11,11 @@
 #include "platform/linux/system/SessionFixture.h"
 #include "runtime/Settings.h"
 
+#include <sched.h>
 #include <sqlite3.h>
+#include <sys/mount.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 #include <array>
 #include <cctype>
@@ -50,6 +53,13 @@ struct RealAccountTest : platform::linux_::SessionTest {
     std::vector<int> icons;
     for (const auto& box : desktop.Boxes) icons.push_back(box.flags & 0xF0);
     return icons;
+  }
+
+  /// How the program ends when making the account fails, with the text of its last box.
+  std::string EndOf(std::int16_t tile) {
+    desktop.Dispatch([&] { Create(tile); });
+    return (desktop.Ended ? "ended with " + std::to_string(desktop.EndStatus) : std::string("goes on")) +
+           ": " + (desktop.Boxes.empty() ? std::string("no box") : ToUtf8(desktop.Boxes.back().text));
   }
 
   /// A line a value in their order of names, "type hexadecimal-bytes name", as the database's library reads
@@ -171,6 +181,35 @@ TEST_F(RealAccountTest, Without_an_opener_the_profile_file_is_there_and_the_acco
   EXPECT_EQ(Create(kOutlookXp), std::vector<int>{forms::kInformation});
 
   EXPECT_TRUE(std::filesystem::exists(folder / "data/quendra/drive_c/WINDOWS/bi.prf"));
+}
+
+TEST_F(RealAccountTest, A_full_disk_ends_the_program_with_fault_61_and_leaves_nothing_of_the_file) {
+  if (::geteuid() != 0)
+    GTEST_SKIP() << "needs root: mounts a small disk, seen by a process of the test alone";
+  const std::string data = folder / "data";
+  std::filesystem::create_directory(data);
+  const platform::linux_::Child other([&] {
+    if (::unshare(CLONE_NEWNS) != 0 || ::mount("none", "/", nullptr, MS_REC | MS_PRIVATE, nullptr) != 0 ||
+        ::mount("tmpfs", data.c_str(), "tmpfs", 0, "size=4k") != 0)
+      return std::string("no disk");
+    const std::string said = EndOf(kOutlook2000);
+    return said + (std::filesystem::is_empty(data + "/quendra/drive_c/WINDOWS") ? ", empty" : ", something");
+  });
+
+  EXPECT_EQ(other.Answer(), "ended with 1: Run-time error '61':\n\nDisk full, empty");
+}
+
+TEST_F(RealAccountTest, A_folder_without_rights_ends_the_program_with_fault_70) {
+  std::filesystem::create_directories(folder / "data/quendra/drive_c/WINDOWS");
+  ASSERT_EQ(::chmod((folder / "data/quendra/drive_c/WINDOWS").c_str(), 0555), 0);
+  for (const char* above : {"", "data", "data/quendra", "data/quendra/drive_c"})
+    ASSERT_EQ(::chmod((folder / above).c_str(), 0755), 0);
+  const platform::linux_::Child other([&] {
+    if (::geteuid() == 0 && (::setgid(65534) != 0 || ::setuid(65534) != 0)) return std::string("no user");
+    return EndOf(kOutlook2003);
+  });
+
+  EXPECT_EQ(other.Answer(), "ended with 1: Run-time error '70':\n\nPermission denied");
 }
 
 TEST_F(RealAccountTest, A_registry_that_cannot_be_opened_is_told_with_its_number) {
