@@ -18,11 +18,11 @@ using Field = RecordField<Fields>;
 constexpr Field kFields[] = {
     {&Fields::handle, Record::kHandle},
     {&Fields::entryName, Record::kEntryName, Record::kEntryNameBytes},
-    {&Fields::deviceType, Record::kDeviceType, Record::kDeviceTypeBytes, Record::kBytesOfShortNames},
-    {&Fields::deviceName, Record::kDeviceName, Record::kDeviceNameBytes, Record::kBytesOfShortNames},
-    {&Fields::phoneBook, Record::kPhoneBook, Record::kPhoneBookBytes, Record::kBytesWithoutPhoneBook},
-    {&Fields::subEntry, Record::kSubEntry, Record::kBytesWithoutPhoneBook},
-    {&Fields::guid, Record::kGuid, Record::kBytesWithoutGuid},
+    {&Fields::deviceType, Record::kDeviceType, Record::kDeviceTypeBytes},
+    {&Fields::deviceName, Record::kDeviceName, Record::kDeviceNameBytes},
+    {&Fields::phoneBook, Record::kPhoneBook, Record::kPhoneBookBytes},
+    {&Fields::subEntry, Record::kSubEntry},
+    {&Fields::guid, Record::kGuid},
 };
 
 Field PlacedIn(std::uint32_t bytes, Field field) {
@@ -37,8 +37,7 @@ RasConnectionFields RasConnectionOf(std::span<const std::uint8_t> record) {
   const auto bytes = static_cast<std::uint32_t>(record.size());
   RasConnectionFields connection;
   for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes, record.size()))
-      TakeField(connection, field, record);
+    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes)) TakeField(connection, field, record);
   return connection;
 }
 

@@ -20,7 +20,6 @@ constexpr std::size_t kCallbackNumber = kPhoneNumber + RasDialParams::kPhoneNumb
 constexpr std::size_t kUserName = kCallbackNumber + RasDialParams::kCallbackNumberBytes;
 constexpr std::size_t kPassword = kUserName + RasDialParams::kUserNameBytes;
 constexpr std::size_t kDomain = kPassword + RasDialParams::kPasswordBytes;
-constexpr std::uint32_t kWithoutNumbers = RasDialParams::kBytesWithoutNumbers;
 
 constexpr Field kFields[] = {
     {&Params::size, 0},
@@ -30,8 +29,8 @@ constexpr Field kFields[] = {
     {&Params::userName, kUserName, RasDialParams::kUserNameBytes},
     {&Params::password, kPassword, RasDialParams::kPasswordBytes},
     {&Params::domain, kDomain, RasDialParams::kDomainBytes},
-    {&Params::subEntry, RasDialParams::kSubEntry, kWithoutNumbers},
-    {&Params::callbackId, RasDialParams::kCallbackId, kWithoutNumbers},
+    {&Params::subEntry, RasDialParams::kSubEntry},
+    {&Params::callbackId, RasDialParams::kCallbackId},
 };
 
 /// The oldest record has a shorter entry name, and all behind it comes so much earlier.
@@ -54,8 +53,7 @@ std::vector<std::uint8_t> EmptyRasDialParams(std::uint32_t bytes, const Text& en
 void PutRasDialParams(const RasDialParamsRecord& record, std::span<std::uint8_t> image) {
   const auto bytes = static_cast<std::uint32_t>(image.size());
   for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes, image.size()))
-      PutField(record, field, image);
+    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes)) PutField(record, field, image);
   PutLittle32(image, 0, bytes);
 }
 
@@ -65,8 +63,7 @@ bool TakeRasDialParams(RasDialParamsRecord& record, std::span<const std::uint8_t
   if (std::ranges::find(kRasDialParamsSizes, bytes) == kRasDialParamsSizes.end()) return false;
   if (image.size() < bytes) throw Fault(Fault::kSubscript);
   for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes, image.size()))
-      TakeField(record, field, image);
+    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes)) TakeField(record, field, image);
   return true;
 }
 

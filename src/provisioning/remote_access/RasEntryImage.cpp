@@ -16,8 +16,6 @@ constexpr std::size_t kX25Address = kPadType + RasEntry::kPadTypeBytes;
 constexpr std::size_t kX25Facilities = kX25Address + RasEntry::kX25TextBytes;
 constexpr std::size_t kX25UserData = kX25Facilities + RasEntry::kX25TextBytes;
 constexpr std::size_t kChannels = kX25UserData + RasEntry::kChannelsFromUserData;
-constexpr std::uint32_t kWithoutSubEntries = RasEntry::kBytesWithoutSubEntries;
-constexpr std::uint32_t kWithoutEntryType = RasEntry::kBytesWithoutEntryType;
 
 constexpr Field kFields[] = {
     {&Entry::options, RasEntry::kOptions},
@@ -43,19 +41,19 @@ constexpr Field kFields[] = {
     {&Entry::x25Facilities, kX25Facilities, RasEntry::kX25TextBytes},
     {&Entry::x25UserData, kX25UserData, RasEntry::kX25TextBytes},
     {&Entry::channels, kChannels},
-    {&Entry::subEntries, RasEntry::kSubEntries, kWithoutSubEntries},
-    {&Entry::dialMode, RasEntry::kDialMode, kWithoutSubEntries},
-    {&Entry::dialExtraPercent, RasEntry::kDialExtraPercent, kWithoutSubEntries},
-    {&Entry::dialExtraSampleSeconds, RasEntry::kDialExtraSampleSeconds, kWithoutSubEntries},
-    {&Entry::hangUpExtraPercent, RasEntry::kHangUpExtraPercent, kWithoutSubEntries},
-    {&Entry::hangUpExtraSampleSeconds, RasEntry::kHangUpExtraSampleSeconds, kWithoutSubEntries},
-    {&Entry::idleDisconnectSeconds, RasEntry::kIdleDisconnectSeconds, kWithoutSubEntries},
-    {&Entry::entryType, RasEntry::kEntryType, kWithoutEntryType},
-    {&Entry::encryptionType, RasEntry::kEncryptionType, kWithoutEntryType},
-    {&Entry::customAuthenticationKey, RasEntry::kCustomAuthKey, kWithoutEntryType},
-    {&Entry::guid, RasEntry::kGuid, kWithoutEntryType},
-    {&Entry::customDialLibrary, RasEntry::kCustomDialLibrary, RasEntry::kPathBytes, kWithoutEntryType},
-    {&Entry::vpnStrategy, RasEntry::kVpnStrategy, kWithoutEntryType},
+    {&Entry::subEntries, RasEntry::kSubEntries},
+    {&Entry::dialMode, RasEntry::kDialMode},
+    {&Entry::dialExtraPercent, RasEntry::kDialExtraPercent},
+    {&Entry::dialExtraSampleSeconds, RasEntry::kDialExtraSampleSeconds},
+    {&Entry::hangUpExtraPercent, RasEntry::kHangUpExtraPercent},
+    {&Entry::hangUpExtraSampleSeconds, RasEntry::kHangUpExtraSampleSeconds},
+    {&Entry::idleDisconnectSeconds, RasEntry::kIdleDisconnectSeconds},
+    {&Entry::entryType, RasEntry::kEntryType},
+    {&Entry::encryptionType, RasEntry::kEncryptionType},
+    {&Entry::customAuthenticationKey, RasEntry::kCustomAuthKey},
+    {&Entry::guid, RasEntry::kGuid},
+    {&Entry::customDialLibrary, RasEntry::kCustomDialLibrary, RasEntry::kPathBytes},
+    {&Entry::vpnStrategy, RasEntry::kVpnStrategy},
 };
 
 /// The oldest record has a shorter device name, and all behind it comes so much earlier.
@@ -84,7 +82,7 @@ std::vector<std::uint8_t> RasEntryImageOf(const RasEntryRecord& record, std::uin
   auto image = RecordBlock(std::uint64_t{recordBytes} + alternates.size() + 1);
   PutLittle32(image, 0, recordBytes);
   for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(recordBytes, listed); field.IsIn(recordBytes, image.size()))
+    if (const Field field = PlacedIn(recordBytes, listed); field.IsIn(recordBytes))
       PutField(record, field, image);
   if (alternates.empty()) return image;
   PutLittle32(image, RasEntry::kAlternateOffset, recordBytes);
@@ -94,9 +92,9 @@ std::vector<std::uint8_t> RasEntryImageOf(const RasEntryRecord& record, std::uin
 
 void TakeRasEntryImage(RasEntryRecord& record, std::span<const std::uint8_t> image,
                        std::uint32_t recordBytes) {
+  const std::size_t held = std::min<std::size_t>(recordBytes, image.size());
   for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(recordBytes, listed); field.IsIn(recordBytes, image.size()))
-      TakeField(record, field, image);
+    if (const Field field = PlacedIn(recordBytes, listed); field.IsIn(held)) TakeField(record, field, image);
   record.alternateNumbers = AlternatesIn(image);
 }
 

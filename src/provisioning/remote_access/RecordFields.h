@@ -56,29 +56,25 @@ void TakeValue(std::span<const std::uint8_t> field, std::array<std::uint8_t, Cou
   std::copy_n(field.begin(), Count, bytes.begin());
 }
 
-/// Where a member of a record lies in the platform's byte image.
+/// Where a member of a record lies in the platform's byte image. A shorter record of an older system has what
+/// lies within it.
 template <typename Record> struct RecordField {
   using Number = std::uint32_t Record::*;
   using Words = Text Record::*;
   using Address = std::array<std::uint8_t, 4> Record::*;
   using Guid = std::array<std::uint8_t, 16> Record::*;
 
-  constexpr RecordField(Number member_, std::size_t at_, std::uint32_t above_ = 0)
-      : member(member_), at(at_), width(4), above(above_) {}
-  constexpr RecordField(Words member_, std::size_t at_, std::size_t width_, std::uint32_t above_ = 0)
-      : member(member_), at(at_), width(width_), above(above_) {}
+  constexpr RecordField(Number member_, std::size_t at_) : member(member_), at(at_), width(4) {}
+  constexpr RecordField(Words member_, std::size_t at_, std::size_t width_)
+      : member(member_), at(at_), width(width_) {}
   constexpr RecordField(Address member_, std::size_t at_) : member(member_), at(at_), width(4) {}
-  constexpr RecordField(Guid member_, std::size_t at_, std::uint32_t above_)
-      : member(member_), at(at_), width(16), above(above_) {}
+  constexpr RecordField(Guid member_, std::size_t at_) : member(member_), at(at_), width(16) {}
 
-  bool IsIn(std::uint32_t recordBytes, std::size_t imageBytes) const {
-    return recordBytes > above && at + width <= std::min<std::size_t>(recordBytes, imageBytes);
-  }
+  bool IsIn(std::size_t bytes) const { return at + width <= bytes; }
 
   std::variant<Number, Words, Address, Guid> member;
   std::size_t at;
   std::size_t width;
-  std::uint32_t above = 0; ///< it exists where the record has more bytes than these
 };
 
 template <typename Record>

@@ -76,6 +76,15 @@ TEST_F(HostilePlatform, A_count_of_entries_beyond_the_block_ends_with_it) {
   EXPECT_EQ(names[1], Text(257, u'x'));
 }
 
+TEST_F(HostilePlatform, Entries_that_went_between_two_questions_are_not_listed) {
+  lying.answers = {{603, 792, 3}, {0, 264, 1}};
+
+  EXPECT_EQ(dun.EnumEntries(names, count, none), kTrue16);
+
+  EXPECT_EQ(names.size(), 1U);
+  EXPECT_EQ(count, 1);
+}
+
 TEST_F(HostilePlatform, A_size_of_entries_without_measure_is_told_as_a_want_of_memory) {
   lying.answers = {{603, 0xFFFFFFFF, 0}};
 
