@@ -177,6 +177,25 @@ TEST_F(Views, A_combo_box_shows_its_items_and_the_selected_one) {
   EXPECT_EQ(box.currentIndex(), -1);
 }
 
+TEST_F(Views, A_container_may_place_what_stands_in_it_from_its_left_edge) {
+  Frame tiles(form, u"tiles");
+  Frame mirrored(form, u"mirrored");
+  PictureBox tile(tiles, u"tile");
+  PictureBox other(mirrored, u"other");
+  tiles.PlacesFromLeft = true;
+  form.design = [&] {
+    for (Frame* frame : {&tiles, &mirrored}) frame->Move(0, 0, 6000, 1500);
+    for (PictureBox* box : {&tile, &other}) box->Move(150, 0, 1500, 450);
+  };
+
+  desktop.Load(form);
+
+  EXPECT_EQ(WidgetOf(tile).x(), 10);
+  EXPECT_EQ(WidgetOf(other).x(), 290);
+  tile.Move(1500, 0, 1500, 450);
+  EXPECT_EQ(WidgetOf(tile).x(), 100);
+}
+
 TEST_F(Views, The_users_choice_in_a_combo_box_selects_and_clicks_once) {
   ComboBox combo(form, u"combo");
   int clicks = 0;
