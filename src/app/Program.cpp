@@ -40,11 +40,15 @@ Program::Program(const platform::Machine& machine, forms::Desktop& desktop)
   frmMenu.Add(monitorPage);
   frmMenu.Add(surfPage);
   frmMenu.Add(firstConnectionPage);
+  OfferDialogs();
+  monitorWork.TearDownSniffer = [this] { sniffer.Teardown(); };
+  surfPage.surf_Timer1.Tick = [this] { modProcPort.surf_Timer1_Timer(); };
+}
+
+void Program::OfferDialogs() {
   pageDialogs.Offer(monitorPage.main_cmdChecks, frmPortsChecks);
   pageDialogs.Offer(monitorPage.main_cmdMemInfo, frmMemInfo);
   pageDialogs.Offer(firstConnectionPage.menu.frsCon_lblConnectProb, connection.frmConnectProb);
-  monitorWork.TearDownSniffer = [this] { sniffer.Teardown(); };
-  surfPage.surf_Timer1.Tick = [this] { modProcPort.surf_Timer1_Timer(); };
 }
 
 void Program::Start() { desktop_.Show(frmSplash); }

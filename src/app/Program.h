@@ -36,6 +36,8 @@ class Program {
   void Start();
 
  private:
+  void OfferDialogs();
+
   forms::Desktop& desktop_;
 
  public:

@@ -24,6 +24,8 @@ class Dialling {
   virtual std::uint32_t RasDialA(std::span<const std::uint8_t> extensions, const char* phoneBook,
                                  std::span<const std::uint8_t> params, const Notifier& notifier,
                                  RasConnection& connection) = 0;
+  /// Ends a connection or a dial. Its end takes the system a while, in which it may be hung up again: what
+  /// this program has hung up before gives success. kErrorInvalidHandle for what another has ended.
   virtual std::uint32_t RasHangUpA(RasConnection connection) = 0;
   /// Fills records of RasConnectionRecord, in the size that the first word of the buffer tells, and counts
   /// them. kRasInvalidSize for a size that this system hasn't.

@@ -102,7 +102,18 @@ TEST_F(ConnectProb, Hangs_everything_up_when_it_closes) {
   desktop.CloseBox(form);
 
   EXPECT_TRUE(machine.ras.Connections().empty());
+  EXPECT_EQ(dun.ActiveRasConn, platform::kNoRasConnection);
   EXPECT_TRUE(desktop.Boxes.empty());
+}
+
+TEST_F(ConnectProb, The_log_takes_many_lines_and_nothing_that_is_typed) {
+  Open();
+
+  EXPECT_TRUE(form.txtStatus.MultiLine);
+  EXPECT_TRUE(form.txtStatus.ReadOnly());
+  EXPECT_TRUE(form.txtStatus.VerticalScrollBar());
+  EXPECT_FALSE(form.txtEmunrateError.ReadOnly());
+  EXPECT_FALSE(form.cmbDialups.FreeText);
 }
 
 TEST_F(ConnectProb, Undoes_a_hook_that_its_window_still_has_when_it_closes) {

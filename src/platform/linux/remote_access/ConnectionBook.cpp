@@ -66,9 +66,10 @@ std::uint32_t ConnectionBook::ReadLines(std::vector<Line>& lines) {
     if (known.kind && !known.name.empty()) lines.push_back({path, known.name, *known.kind});
   std::ranges::sort(lines, {},
                     [](const Line& line) { return std::tuple(Lowered(FromCodePage(line.name)), line.path); });
-  const auto repeated = std::ranges::unique(
-      lines, [](const Line& left, const Line& right) { return SameName(left.name, right.name); });
-  lines.erase(repeated.begin(), repeated.end());
+  const auto repeated = std::unique(lines.begin(), lines.end(), [](const Line& left, const Line& right) {
+    return SameName(left.name, right.name);
+  });
+  lines.erase(repeated, lines.end());
   return kRasSuccess;
 }
 

@@ -97,7 +97,8 @@ LinuxDialling::Call& LinuxDialling::Add(const Line& line) {
 }
 
 void LinuxDialling::Forget(RasConnection handle) {
-  std::erase_if(calls_, [&](const Call& call) { return call.handle == handle; });
+  if (std::erase_if(calls_, [&](const Call& call) { return call.handle == handle; }) > 0)
+    hungUp_.insert(handle);
 }
 
 std::uint32_t LinuxDialling::RasHangUpA(RasConnection connection) {
@@ -106,7 +107,8 @@ std::uint32_t LinuxDialling::RasHangUpA(RasConnection connection) {
     return kRasManagerCannotStart;
   }
   const auto found = std::ranges::find(calls_, connection, &Call::handle);
-  if (found == calls_.end()) return kErrorInvalidHandle;
+  if (found == calls_.end())
+    return hungUp_.contains(connection) ? std::uint32_t{kRasSuccess} : std::uint32_t{kErrorInvalidHandle};
   const Call call = *found;
   Forget(connection);
   if (call.dial) return call.dial->HangUp();

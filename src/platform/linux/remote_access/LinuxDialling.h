@@ -6,6 +6,7 @@
 
 #include <map>
 #include <memory>
+#include <set>
 
 namespace quendra::platform::linux_ {
 
@@ -48,6 +49,7 @@ class LinuxDialling : public Dialling {
   EventLoop& loop_;
   const std::string kernelFolder_;
   std::vector<Call> calls_;
+  std::set<RasConnection> hungUp_; ///< by this program, or given up by it
   std::uint32_t lastHandle_ = 0;
 };
 

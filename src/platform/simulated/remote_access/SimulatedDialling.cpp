@@ -44,7 +44,8 @@ std::uint32_t SimulatedRemoteAccess::RasHangUpA(RasConnection connection) {
   const SimulatedConnection* standing = dials_.Find(connection);
   Record("RasHangUpA", standing ? standing->entryName : std::to_string(connection.Value()));
   if (const auto error = Enter("RasHangUpA")) return error;
-  return dials_.End(connection) ? std::uint32_t{kRasSuccess} : std::uint32_t{kErrorInvalidHandle};
+  if (dials_.End(connection)) hungUp_.insert(connection);
+  return hungUp_.contains(connection) ? std::uint32_t{kRasSuccess} : std::uint32_t{kErrorInvalidHandle};
 }
 
 std::uint32_t SimulatedRemoteAccess::RasEnumConnectionsA(std::span<std::uint8_t> connections,

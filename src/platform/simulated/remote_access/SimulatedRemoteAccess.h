@@ -8,6 +8,7 @@
 #include "platform/simulated/remote_access/SimulatedDials.h"
 
 #include <optional>
+#include <set>
 
 namespace quendra::platform::simulated {
 
@@ -125,6 +126,7 @@ class SimulatedRemoteAccess : public PhoneBook, public Dialling {
   RasRefusals refusals_;
   EntryBook book_;
   SimulatedDials dials_;
+  std::set<RasConnection> hungUp_; ///< by this program
 };
 
 } // namespace quendra::platform::simulated

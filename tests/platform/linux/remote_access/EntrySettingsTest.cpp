@@ -12,7 +12,7 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-NetworkSettings Line(const char* type, const TextMap& userData) {
+NetworkSettings LineSettingsOf(const char* type, const TextMap& userData) {
   NetworkSettings settings;
   PutText(settings, "connection", "type", type);
   PutText(settings, "vpn", "service-type", "org.freedesktop.NetworkManager.pptp");
@@ -30,14 +30,15 @@ std::vector<std::uint8_t> ImageFor(std::string_view deviceType) {
 } // namespace
 
 TEST(EntrySettings, User_data_that_others_have_spoilt_gives_an_entry_all_the_same) {
-  const auto image = EntryImageOf(Line("pppoe", {{"quendra.entry.version", "1"},
-                                                 {"quendra.entry.options", "99999999999999999999"},
-                                                 {"quendra.entry.country-id", "-1"},
-                                                 {"quendra.entry.guid", "zz"},
-                                                 {"quendra.entry.addresses", std::string(5000, 'a')},
-                                                 {"quendra.entry.script", std::string(8000, 'x')},
-                                                 {"quendra.entry.alternate-numbers", "3"}}),
-                                  LineKind::Pppoe);
+  const auto image =
+      EntryImageOf(LineSettingsOf("pppoe", {{"quendra.entry.version", "1"},
+                                            {"quendra.entry.options", "99999999999999999999"},
+                                            {"quendra.entry.country-id", "-1"},
+                                            {"quendra.entry.guid", "zz"},
+                                            {"quendra.entry.addresses", std::string(5000, 'a')},
+                                            {"quendra.entry.script", std::string(8000, 'x')},
+                                            {"quendra.entry.alternate-numbers", "3"}}),
+                   LineKind::Pppoe);
   EXPECT_EQ(image.size(), RasEntry::kBytes);
   EXPECT_EQ(Little32(image, 0), RasEntry::kBytes);
   EXPECT_EQ(Little32(image, RasEntry::kOptions), 0U);
@@ -50,7 +51,7 @@ TEST(EntrySettings, User_data_that_others_have_spoilt_gives_an_entry_all_the_sam
 
 TEST(EntrySettings, A_device_of_no_kind_changes_nothing) {
   for (const char* type : {"", "modem", "PPPoE", "vpn "}) {
-    NetworkSettings settings = Line("pppoe", {});
+    NetworkSettings settings = LineSettingsOf("pppoe", {});
     const NetworkSettings before = settings;
     EXPECT_FALSE(PutEntryImage(settings, ImageFor(type))) << type;
     EXPECT_EQ(settings, before);
@@ -58,7 +59,7 @@ TEST(EntrySettings, A_device_of_no_kind_changes_nothing) {
 }
 
 TEST(EntrySettings, Alternate_numbers_longer_than_user_data_may_be_are_refused) {
-  NetworkSettings settings = Line("pppoe", {});
+  NetworkSettings settings = LineSettingsOf("pppoe", {});
   auto image = ImageFor("pppoe");
   PutLittle32(image, RasEntry::kAlternateOffset, RasEntry::kBytes);
   image.resize(RasEntry::kBytes + 4000, '1');
@@ -88,7 +89,7 @@ TEST(EntrySettings, A_line_that_changes_its_kind_keeps_nothing_of_the_former) {
 }
 
 TEST(EntrySettings, A_tunnel_of_another_kind_is_no_entry) {
-  NetworkSettings settings = Line("vpn", {});
+  NetworkSettings settings = LineSettingsOf("vpn", {});
   EXPECT_EQ(LineKindOf(settings), LineKind::Vpn);
   PutText(settings, "vpn", "service-type", "org.freedesktop.NetworkManager.openvpn");
   EXPECT_FALSE(LineKindOf(settings));
