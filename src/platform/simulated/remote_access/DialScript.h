@@ -29,7 +29,7 @@ class DialScript {
 
   bool IsEmpty() const { return steps_.empty(); }
   Step TakeFirst() {
-    const Step first = std::move(steps_.front());
+    Step first = std::move(steps_.front());
     steps_.pop_front();
     return first;
   }
