@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Sanitized.h"
+
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -10,14 +12,6 @@
 #include <functional>
 #include <string>
 #include <unistd.h>
-
-#ifdef __SANITIZE_ADDRESS__
-#define QUENDRA_SANITIZED 1
-#elif defined(__has_feature)
-#if __has_feature(address_sanitizer)
-#define QUENDRA_SANITIZED 1
-#endif
-#endif
 
 namespace quendra::integration {
 
@@ -36,12 +30,8 @@ struct Footprint {
   }
 };
 
-#ifdef QUENDRA_SANITIZED
-// The sanitizer keeps what was freed for a while, so memory grows here; leaks it finds by itself.
-inline constexpr long kMarginKilobytes = 1 << 20;
-#else
-inline constexpr long kMarginKilobytes = 1024;
-#endif
+// Under sanitizers memory grows here; leaks they find by themselves.
+inline constexpr long kMarginKilobytes = kSanitized ? 1 << 20 : 1024;
 /// Until everything that is made once has been made.
 inline constexpr int kWarmUp = 100;
 

@@ -59,7 +59,7 @@ Text ConnectionDiagnosis::TestLogin() {
     TellFailure(boxes_, u"שגיאה!");
     return {};
   }
-  const Text entryBefore = CurrentDialEntry;
+  Text entryBefore = CurrentDialEntry;
   form_.Append(u"מנסה חיבור לזלמר...");
   Text entry = kTestEntry;
   Text phoneNumber;

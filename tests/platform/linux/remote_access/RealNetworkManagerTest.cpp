@@ -1,3 +1,4 @@
+#include "Sanitized.h"
 #include "platform/linux/remote_access/RasFixture.h"
 #include "platform/linux/system/Files.h"
 
@@ -295,9 +296,11 @@ TEST_F(RealNetworkManagerTest, A_thousand_entries_are_listed_and_one_more_is_mad
   std::printf("first entry %.3f s, 1,001st %.3f s, listing 1,001: %.3f s for the first time (the best of "
               "three), then %.3f s\n",
               first, last, listing, again);
-  EXPECT_LT(last, first + 0.1);
-  EXPECT_LT(listing, 0.3);
-  EXPECT_LT(again, 0.3);
+  // At rest a third of this is enough; other tests run at the same time.
+  constexpr double kListing = kSanitized ? 5 : 1;
+  EXPECT_LT(last, first + kListing / 3);
+  EXPECT_LT(listing, kListing);
+  EXPECT_LT(again, kListing);
 }
 
 } // namespace quendra::platform::linux_
