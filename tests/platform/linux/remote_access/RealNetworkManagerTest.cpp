@@ -163,7 +163,7 @@ TEST_F(RealNetworkManagerTest, The_password_lies_in_no_file_that_others_can_read
 }
 
 TEST_F(RealNetworkManagerTest, What_nmcli_made_appears_is_changed_without_loss_and_goes) {
-  manager.Nmcli("con add type pppoe con-name theirs username dan pppoe.service isp autoconnect yes "
+  manager.Nmcli("con add type pppoe con-name theirs username dan pppoe.service isp autoconnect no "
                 "802-3-ethernet.mtu 1400 ipv4.dns 10.1.1.1 ipv4.route-metric 50 ppp.lcp-echo-interval 7");
   manager.Nmcli("con modify theirs pppoe.password secret ipv4.routes '10.5.0.0/16 10.1.1.9'");
   const auto shown = [&] { return manager.Nmcli("-s con show theirs | grep -v -e user.data -e timestamp"); };
