@@ -1,12 +1,13 @@
 #!/usr/bin/env python3
 """Stands in for NetworkManager on the system's bus that the environment names, with one Ethernet device.
 
-    network_manager.py LOG accepts|refuses|silent
+    network_manager.py LOG
 
 LOG gets the line "ready" once it can be asked, and a line for each question that changes something: never a
 secret. It dials as it is told: org.quendra.Script.Play at /script takes steps, separated by commas, each
-"device STATE REASON", "vpn STATE REASON" or "active STATE REASON" of the latest connection, or "forget". Asked to
-activate a connection it refuses, or never answers, if its last argument says so.
+"device STATE REASON", "vpn STATE REASON" or "active STATE REASON" of the latest connection, or "forget". Other
+steps change its answers: "refuse METHOD ERROR" until "allow METHOD", and "hold METHOD", after which it does what it
+is asked and answers at "release".
 """
 
 import signal
@@ -20,7 +21,6 @@ from gi.repository import Gio, GLib
 NAME = "org.freedesktop.NetworkManager"
 ROOT = "/org/freedesktop/NetworkManager"
 DEVICE = ROOT + "/Devices/1"
-UNKNOWN = NAME + ".UnknownDevice"
 NOT_ACTIVE = NAME + ".ConnectionNotActive"
 
 INTERFACES = """<node>
@@ -28,6 +28,8 @@ INTERFACES = """<node>
 <method name="GetDevices"><arg type="ao" direction="out"/></method>
 <method name="ActivateConnection"><arg type="o" direction="in"/><arg type="o" direction="in"/>
 <arg type="o" direction="in"/><arg type="o" direction="out"/></method>
+<method name="AddAndActivateConnection"><arg type="a{sa{sv}}" direction="in"/><arg type="o" direction="in"/>
+<arg type="o" direction="in"/><arg type="o" direction="out"/><arg type="o" direction="out"/></method>
 <method name="DeactivateConnection"><arg type="o" direction="in"/></method>
 <property name="ActiveConnections" type="ao" access="read"/>
 </interface>
@@ -44,7 +46,7 @@ INTERFACES = """<node>
 </interface>
 <interface name="org.freedesktop.NetworkManager.Device">
 <property name="DeviceType" type="u" access="read"/><property name="State" type="u" access="read"/>
-<property name="Interface" type="s" access="read"/>
+<property name="Interface" type="s" access="read"/><property name="ActiveConnection" type="o" access="read"/>
 <signal name="StateChanged"><arg type="u"/><arg type="u"/><arg type="u"/></signal>
 </interface>
 <interface name="org.freedesktop.NetworkManager.Connection.Active">
@@ -64,8 +66,9 @@ class Refusal(Exception):
 
 
 class Manager:
-    def __init__(self, log, mode):
-        self.log, self.mode = log, mode
+    def __init__(self, log):
+        self.log = log
+        self.refusals, self.held, self.waiting = {}, set(), []
         self.settings, self.secrets, self.active, self.ids = {}, {}, {}, {}
         self.made = 0
         self.device_state = 30
@@ -95,8 +98,12 @@ class Manager:
 
     def on_call(self, _bus, _sender, path, _interface, method, parameters, invocation):
         try:
+            if method in self.refusals:
+                raise Refusal(self.refusals[method])
             answer = getattr(self, "do_" + method)(path, parameters)
-            if answer != "never":
+            if method in self.held:
+                self.waiting.append((invocation, answer))
+            else:
                 invocation.return_value(answer)
         except Refusal as refusal:
             invocation.return_dbus_error(str(refusal), "refused")
@@ -108,6 +115,7 @@ class Manager:
             "CanModify": lambda: GLib.Variant("b", True),
             "DeviceType": lambda: GLib.Variant("u", 1),
             "Interface": lambda: GLib.Variant("s", "eth0"),
+            "ActiveConnection": lambda: GLib.Variant("o", "/"),
             "Connection": lambda: GLib.Variant("o", active["connection"]),
             "Devices": lambda: GLib.Variant("ao", [DEVICE]),
             "Vpn": lambda: GLib.Variant("b", active["vpn"]),
@@ -158,6 +166,8 @@ class Manager:
         self.secrets.pop(path, None)
 
     def do_Delete(self, path, _parameters):
+        for active in [path_ for path_, one in self.active.items() if one["connection"] == path]:
+            self.end(active, 38, 11)
         self.tell("Delete " + self.settings.pop(path)["connection"]["id"].get_string())
         self.drop(path)
 
@@ -168,10 +178,6 @@ class Manager:
 
     def do_ActivateConnection(self, _path, parameters):
         connection = parameters.unpack()[0]
-        if self.mode == "silent":
-            return "never"
-        if self.mode == "refuses" or connection not in self.settings:
-            raise Refusal(UNKNOWN)
         settings = self.settings[connection]["connection"]
         self.made += 1
         path = ROOT + "/ActiveConnection/" + str(self.made)
@@ -188,9 +194,12 @@ class Manager:
             raise Refusal(NOT_ACTIVE)
         connection = self.settings.get(self.active[path]["connection"])
         self.tell("DeactivateConnection " + (connection["connection"]["id"].get_string() if connection else ""))
+        self.end(path, 39, 2)
+
+    def end(self, path, device_reason, reason):
         is_vpn = self.active[path]["vpn"]
-        self.play(path, "vpn 7 2" if is_vpn else "device 110 39")
-        self.play(path, "active 4 2")
+        self.play(path, f"vpn 7 {reason}" if is_vpn else f"device 110 {device_reason}")
+        self.play(path, f"active 4 {reason}")
         self.play(path, "forget")
 
     def do_Play(self, _path, parameters):
@@ -199,9 +208,19 @@ class Manager:
             self.play(path, step.strip())
 
     def play(self, path, step):
-        kind, *numbers = step.split()
-        numbers = [int(number) for number in numbers]
-        if kind == "device":
+        kind, *words = step.split()
+        numbers = [int(word) for word in words if word.isdigit()]
+        if kind == "refuse":
+            self.refusals[words[0]] = words[1]
+        elif kind == "allow":
+            self.refusals.pop(words[0])
+        elif kind == "hold":
+            self.held.add(words[0])
+        elif kind == "release":
+            waiting, self.waiting, self.held = self.waiting, [], set()
+            for invocation, answer in waiting:
+                invocation.return_value(answer)
+        elif kind == "device":
             old, self.device_state = self.device_state, numbers[0]
             self.emit(DEVICE, ".Device", "StateChanged", "(uuu)", numbers[0], old, numbers[1])
         elif kind == "vpn":
@@ -214,9 +233,9 @@ class Manager:
             self.drop(path)
 
 
-def main(log, mode):
+def main(log):
     signal.alarm(60)
-    manager = Manager(log, mode)
+    manager = Manager(log)
     Gio.bus_own_name(Gio.BusType.SYSTEM, NAME, 0, lambda bus, _name: manager.start(bus),
                      lambda *_: manager.tell("ready"), None)
     GLib.MainLoop().run()

@@ -7,8 +7,8 @@
 
 #include <net/if.h>
 
-#include <algorithm>
 #include <cerrno>
+#include <map>
 
 namespace quendra::platform::linux_ {
 
@@ -46,12 +46,12 @@ class KernelCard : public NetworkCard {
 } // namespace
 
 NetworkCards ReadKernelCards() {
-  auto interfaces = ReadNetworkInterfaces(ProcFolder("/proc"));
-  std::ranges::sort(interfaces, {}, [](const auto& one) { return ::if_nametoindex(one.name.c_str()); });
-  NetworkCards cards;
-  for (const NetworkInterface& interface : interfaces)
+  std::multimap<unsigned, std::string> names; ///< by index
+  for (const NetworkInterface& interface : ReadNetworkInterfaces(ProcFolder("/proc")))
     if (!interface.isLoopback && !interface.addresses.empty())
-      cards.push_back(std::make_shared<KernelCard>(interface.name));
+      names.emplace(::if_nametoindex(interface.name.c_str()), interface.name);
+  NetworkCards cards;
+  for (const auto& [index, name] : names) cards.push_back(std::make_shared<KernelCard>(name));
   return cards;
 }
 

@@ -14,9 +14,7 @@ constexpr std::uint64_t kIsExternal = 0x80;
 
 std::uint32_t ResultOf(const BusAnswer& answer) {
   if (answer.IsGiven()) return kCardChanged;
-  const bool isForbidden =
-      answer.error.ends_with("PermissionDenied") || answer.error.ends_with("AccessDenied");
-  return isForbidden ? kCardAccessDenied : kCardUnknownFailure;
+  return answer.IsForbidden() ? kCardAccessDenied : kCardUnknownFailure;
 }
 
 BusValue AddressData(const std::vector<CardAddress>& addresses) {
@@ -74,11 +72,11 @@ std::uint32_t ManagedCard::Change(const std::function<void(ValueMap& ipv4)>& cha
   if (active == nm::kNoObject) {
     NetworkSettings settings = NewCardConnection(device_.interface);
     change(settings["ipv4"]);
-    return ResultOf(
-        bus_.Ask({nm::kManagerPath,
-                  nm::kManager,
-                  "AddAndActivateConnection",
-                  {ValueOf(settings), BusValue::Path(device_.path), BusValue::Path(nm::kNoObject)}}));
+    return ResultOf(bus_.AskForChange(
+        {nm::kManagerPath,
+         nm::kManager,
+         "AddAndActivateConnection",
+         {ValueOf(settings), BusValue::Path(device_.path), BusValue::Path(nm::kNoObject)}}));
   }
   const std::string connection = PropertyOf(active, nm::kActive, "Connection").text;
   const auto answer = bus_.Ask({connection, nm::kConnection, "GetSettings"});
@@ -87,24 +85,25 @@ std::uint32_t ManagedCard::Change(const std::function<void(ValueMap& ipv4)>& cha
   if (PropertyOf(active, nm::kActive, "StateFlags").number & kIsExternal)
     settings["connection"]["autoconnect"] = BusValue::Truth(true);
   change(settings["ipv4"]);
-  if (const auto updated = bus_.Ask({connection, nm::kConnection, "Update", {ValueOf(settings)}});
+  if (const auto updated = bus_.AskForChange({connection, nm::kConnection, "Update", {ValueOf(settings)}});
       !updated.IsGiven())
     return ResultOf(updated);
   return Apply(connection);
 }
 
 std::uint32_t ManagedCard::Apply(const std::string& connection) {
-  const auto reapplied = bus_.Ask({device_.path,
-                                   nm::kDevice,
-                                   "Reapply",
-                                   {ValueOf(NetworkSettings()), BusValue::Wide(0), BusValue::Number(0)}});
+  const auto reapplied =
+      bus_.AskForChange({device_.path,
+                         nm::kDevice,
+                         "Reapply",
+                         {ValueOf(NetworkSettings()), BusValue::Wide(0), BusValue::Number(0)}});
   if (reapplied.IsGiven()) return kCardChanged;
   // Some changes are made by beginning anew only.
-  return ResultOf(
-      bus_.Ask({nm::kManagerPath,
-                nm::kManager,
-                "ActivateConnection",
-                {BusValue::Path(connection), BusValue::Path(device_.path), BusValue::Path(nm::kNoObject)}}));
+  return ResultOf(bus_.AskForChange(
+      {nm::kManagerPath,
+       nm::kManager,
+       "ActivateConnection",
+       {BusValue::Path(connection), BusValue::Path(device_.path), BusValue::Path(nm::kNoObject)}}));
 }
 
 } // namespace quendra::platform::linux_

@@ -17,9 +17,10 @@ struct Device {
   std::string interface;
   std::uint64_t type = 0;
   std::string addresses; ///< the object that tells them
+  unsigned index = 0;    ///< the kernel's, as it was when the device was read
 
   /// The order of their indexes, and in another network namespace that in which they came.
-  auto Order() const { return std::tuple(::if_nametoindex(interface.c_str()), path.size(), path); }
+  auto Order() const { return std::tuple(index, path.size(), path); }
 };
 
 std::vector<BusAnswer> AskForAll(NetworkManagerBus& bus, const std::vector<std::string>& paths,
@@ -39,8 +40,9 @@ std::vector<Device> ReadDevices(NetworkManagerBus& bus, const BusValue& listed) 
     ValueMap properties = ValueMapOf(answers[i].First());
     const std::string addresses = properties["Ip4Config"].text;
     const std::uint64_t type = properties["DeviceType"].number;
+    const std::string interface = properties["Interface"].text;
     if (type != nm::kLoopback && !addresses.empty() && addresses != nm::kNoObject)
-      devices.push_back({paths[i], properties["Interface"].text, type, addresses});
+      devices.push_back({paths[i], interface, type, addresses, ::if_nametoindex(interface.c_str())});
   }
   return devices;
 }

@@ -16,7 +16,7 @@ using Time = std::chrono::steady_clock;
 
 constexpr std::uint64_t kSecond = 1'000'000;
 constexpr std::uint64_t kPatience = 5 * kSecond;
-/// A question whose answer nobody waits for may be put to the user first.
+/// Of a question that may be put to the user first.
 constexpr std::uint64_t kLongPatience = 120 * kSecond;
 constexpr int kTickMilliseconds = 250;
 /// A bus lets each of its clients have so many open questions and no more; its own limit is 128.
@@ -42,6 +42,9 @@ constexpr std::array<std::string_view, 6> kNobodyThere{
     "org.freedesktop.DBus.Error.Disconnected",   "org.freedesktop.DBus.Error.NoServer",
 };
 
+/// How each of NetworkManager's interfaces, and the bus, end the name of a refusal for want of a right.
+constexpr std::array<std::string_view, 3> kForbidden{".PermissionDenied", ".AccessDenied", ".NotAuthorized"};
+
 BusAnswer Refusal(const std::string& name) {
   const bool nobody = name.starts_with("System.Error.") ||
                       name.starts_with("org.freedesktop.DBus.Error.Spawn.") ||
@@ -55,6 +58,11 @@ std::uint64_t LeftUntil(Time::time_point end) {
 }
 
 } // namespace
+
+bool BusAnswer::IsForbidden() const {
+  return kind == Kind::Refused &&
+         std::ranges::any_of(kForbidden, [this](std::string_view ending) { return error.ends_with(ending); });
+}
 
 const BusValue& BusAnswer::First() const {
   static const BusValue nothing;
@@ -159,7 +167,8 @@ BusAnswer NetworkManagerBus::AnswerOf(void* message) const {
   return {BusAnswer::Kind::Given, ValuesOf(message), {}};
 }
 
-BusAnswer::Kind NetworkManagerBus::Start(const BusQuestion& question, Reply reply, bool isQueued) {
+BusAnswer::Kind NetworkManagerBus::Start(const BusQuestion& question, Reply reply, bool isQueued,
+                                         std::uint64_t patience) {
   if (!IsOpen()) return BusAnswer::Kind::NobodyThere;
   void* made = nullptr;
   if (library_->message_new_method_call(bus_.get(), &made, nm::kService, question.path.c_str(),
@@ -170,8 +179,7 @@ BusAnswer::Kind NetworkManagerBus::Start(const BusQuestion& question, Reply repl
     if (!AppendValue(*library_, made, argument)) return BusAnswer::Kind::Refused;
   auto pending = std::make_unique<Pending>(Pending{*this, std::move(reply), isQueued});
   void* slot = nullptr;
-  if (library_->call_async(bus_.get(), &slot, made, TakeReply, pending.get(),
-                           isQueued ? kLongPatience : kPatience) < 0) {
+  if (library_->call_async(bus_.get(), &slot, made, TakeReply, pending.get(), patience) < 0) {
     Drop();
     return BusAnswer::Kind::NobodyThere;
   }
@@ -180,17 +188,26 @@ BusAnswer::Kind NetworkManagerBus::Start(const BusQuestion& question, Reply repl
   return BusAnswer::Kind::Given;
 }
 
-BusAnswer NetworkManagerBus::Ask(const BusQuestion& question) { return AskAll({question}).front(); }
+BusAnswer NetworkManagerBus::Ask(const BusQuestion& question) { return Await({question}, kPatience).front(); }
+
+BusAnswer NetworkManagerBus::AskForChange(const BusQuestion& question) {
+  return Await({question}, kLongPatience).front();
+}
 
 std::vector<BusAnswer> NetworkManagerBus::AskAll(const std::vector<BusQuestion>& questions) {
+  return Await(questions, kPatience);
+}
+
+std::vector<BusAnswer> NetworkManagerBus::Await(const std::vector<BusQuestion>& questions,
+                                                std::uint64_t patience) {
   std::vector<BusAnswer> answers(questions.size());
-  const auto end = Time::now() + std::chrono::microseconds(kPatience);
+  const auto end = Time::now() + std::chrono::microseconds(patience);
   std::size_t started = 0, done = 0;
   while (done < questions.size()) {
     while (started < questions.size() && started - done < kMostOpen) {
       const std::size_t at = started++;
       const auto kind = Start(
-          questions[at], [&, at](const BusAnswer& answer) { answers[at] = answer, ++done; }, false);
+          questions[at], [&, at](const BusAnswer& answer) { answers[at] = answer, ++done; }, false, patience);
       if (kind != BusAnswer::Kind::Given) answers[at].kind = kind, ++done;
     }
     Process();
@@ -205,7 +222,7 @@ std::vector<BusAnswer> NetworkManagerBus::AskAll(const std::vector<BusQuestion>&
 }
 
 void NetworkManagerBus::AskLater(const BusQuestion& question, Reply reply) {
-  const auto kind = Start(question, reply, true);
+  const auto kind = Start(question, reply, true, kLongPatience);
   if (kind != BusAnswer::Kind::Given)
     arrived_.push_back([reply = std::move(reply), kind] { reply(BusAnswer{kind, {}, {}}); });
   // What is never answered is told of when its time is over.

@@ -28,6 +28,8 @@ struct BusAnswer {
   std::string error{}; ///< the name of a refusal
 
   bool IsGiven() const { return kind == Kind::Given; }
+  /// Refused for want of a right.
+  bool IsForbidden() const;
   /// An empty text where there is none.
   const BusValue& First() const;
 };
@@ -43,7 +45,8 @@ struct BusSignal {
 };
 
 /// NetworkManager on the system's bus. The connection is made by the first question; one that breaks is made
-/// anew by the next. Each question waits a few seconds at most for its answer.
+/// anew by the next. A question waits a few seconds at most for its answer, and two minutes at most where the
+/// system may put it to the user first.
 class NetworkManagerBus {
  public:
   using Reply = std::function<void(const BusAnswer&)>;
@@ -54,9 +57,12 @@ class NetworkManagerBus {
   NetworkManagerBus(const NetworkManagerBus&) = delete;
 
   BusAnswer Ask(const BusQuestion& question);
+  /// The same for one that the system may put to the user first.
+  BusAnswer AskForChange(const BusQuestion& question);
   /// Many at a time.
   std::vector<BusAnswer> AskAll(const std::vector<BusQuestion>& questions);
-  /// The reply comes from the loop, or from one of the next two calls.
+  /// For one that may be put to the user, too. The reply comes from the loop, or from one of the next two
+  /// calls.
   void AskLater(const BusQuestion& question, Reply reply);
   /// Hands on what has come.
   void HandleArrived();
@@ -75,7 +81,8 @@ class NetworkManagerBus {
   bool Open();
   void Drop();
   void Process();
-  BusAnswer::Kind Start(const BusQuestion& question, Reply reply, bool isQueued);
+  std::vector<BusAnswer> Await(const std::vector<BusQuestion>& questions, std::uint64_t patience);
+  BusAnswer::Kind Start(const BusQuestion& question, Reply reply, bool isQueued, std::uint64_t patience);
   void HandleSoon();
   BusAnswer AnswerOf(void* message) const;
   std::vector<BusValue> ValuesOf(void* message) const;

@@ -1,6 +1,7 @@
 #include "platform/linux/remote_access/ActiveLines.h"
 
 #include "platform/linux/network_manager/NetworkManagerNames.h"
+#include "platform/process/SystemErrors.h"
 #include "platform/remote_access/RemoteAccessNumbers.h"
 
 #include <algorithm>
@@ -29,6 +30,16 @@ std::uint32_t ReadActiveLines(NetworkManagerBus& bus, ConnectionBook& book, std:
       active.push_back({questions[i].path, *line});
   }
   return kRasSuccess;
+}
+
+BusQuestion QuestionOfEnd(const std::string& path) {
+  return {nm::kManagerPath, nm::kManager, "DeactivateConnection", {BusValue::Path(path)}};
+}
+
+std::uint32_t EndActiveLine(NetworkManagerBus& bus, const std::string& path) {
+  const std::uint32_t error = ErrorOf(bus.AskForChange(QuestionOfEnd(path)));
+  // It is told so of one that NetworkManager knows no more.
+  return error == kInvalidParameter ? std::uint32_t{kRasSuccess} : error;
 }
 
 } // namespace quendra::platform::linux_

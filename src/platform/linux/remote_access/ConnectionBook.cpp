@@ -21,9 +21,7 @@ bool SameName(std::string_view left, std::string_view right) {
 std::uint32_t ErrorOf(const BusAnswer& answer) {
   if (answer.IsGiven()) return kRasSuccess;
   if (answer.kind == BusAnswer::Kind::NobodyThere) return kRasManagerCannotStart;
-  const bool isForbidden = answer.error.ends_with("PermissionDenied") ||
-                           answer.error.ends_with("AccessDenied") || answer.error.ends_with("NotAuthorized");
-  return isForbidden ? kAccessDenied : kInvalidParameter;
+  return answer.IsForbidden() ? kAccessDenied : kInvalidParameter;
 }
 
 ConnectionBook::ConnectionBook(NetworkManagerBus& bus) : bus_(bus) {
@@ -41,22 +39,24 @@ std::uint32_t ConnectionBook::Refresh() {
   std::map<std::string, Known> known;
   for (const BusValue& path : answer.First().items) known[path.text] = std::move(known_[path.text]);
   known_ = std::move(known);
-  ReadUnknown();
-  return kRasSuccess;
+  return ReadUnknown();
 }
 
-void ConnectionBook::ReadUnknown() {
+std::uint32_t ConnectionBook::ReadUnknown() {
   std::vector<BusQuestion> questions;
   for (const auto& [path, known] : known_)
     if (!known.isRead) questions.push_back({path, nm::kConnection, "GetSettings"});
   const auto answers = bus_.AskAll(questions);
   for (std::size_t i = 0; i < answers.size(); ++i) {
+    // One that nobody answers for may be any entry.
+    if (answers[i].kind == BusAnswer::Kind::NobodyThere) return kRasManagerCannotStart;
     // One that is private to another user, or gone by now, is none.
     if (!answers[i].IsGiven()) continue;
     const NetworkSettings settings = NetworkSettingsOf(answers[i].First());
     known_[questions[i].path] = {true, LineKindOf(settings),
                                  Shown(TextIn(settings, "connection", "id"), RasEntryName::kNameBytes)};
   }
+  return kRasSuccess;
 }
 
 std::uint32_t ConnectionBook::ReadLines(std::vector<Line>& lines) {
@@ -97,26 +97,28 @@ std::uint32_t ConnectionBook::ReadSettings(const Line& line, NetworkSettings& se
   return ErrorOf(answer);
 }
 
-NetworkSettings ConnectionBook::ReadSecrets(const Line& line) {
-  return NetworkSettingsOf(
-      bus_.Ask({line.path, nm::kConnection, "GetSecrets", {BusValue::Text(DeviceTypeOf(line.kind))}})
-          .First());
+std::uint32_t ConnectionBook::ReadSecrets(const Line& line, NetworkSettings& secrets) {
+  const auto answer = bus_.AskForChange(
+      {line.path, nm::kConnection, "GetSecrets", {BusValue::Text(DeviceTypeOf(line.kind))}});
+  secrets = NetworkSettingsOf(answer.First());
+  const std::uint32_t error = ErrorOf(answer);
+  return error == kInvalidParameter ? std::uint32_t{kRasSuccess} : error;
 }
 
 std::uint32_t ConnectionBook::Add(const NetworkSettings& settings) {
-  return ErrorOf(bus_.Ask({nm::kSettingsPath, nm::kSettings, "AddConnection", {ValueOf(settings)}}));
+  return ErrorOf(bus_.AskForChange({nm::kSettingsPath, nm::kSettings, "AddConnection", {ValueOf(settings)}}));
 }
 
 std::uint32_t ConnectionBook::Update(const Line& line, const NetworkSettings& settings) {
-  return ErrorOf(bus_.Ask({line.path, nm::kConnection, "Update", {ValueOf(settings)}}));
+  return ErrorOf(bus_.AskForChange({line.path, nm::kConnection, "Update", {ValueOf(settings)}}));
 }
 
 std::uint32_t ConnectionBook::ClearSecrets(const Line& line) {
-  return ErrorOf(bus_.Ask({line.path, nm::kConnection, "ClearSecrets"}));
+  return ErrorOf(bus_.AskForChange({line.path, nm::kConnection, "ClearSecrets"}));
 }
 
 std::uint32_t ConnectionBook::Delete(const Line& line) {
-  return ErrorOf(bus_.Ask({line.path, nm::kConnection, "Delete"}));
+  return ErrorOf(bus_.AskForChange({line.path, nm::kConnection, "Delete"}));
 }
 
 } // namespace quendra::platform::linux_

@@ -31,10 +31,10 @@ class ConnectionBook {
   /// kRasCannotFindPhonebookEntry where there is none of that name; case makes no difference.
   std::uint32_t Find(std::string_view name, Line& line);
   std::uint32_t ReadSettings(const Line& line, NetworkSettings& settings);
-  /// Nothing where nobody keeps any, or this user mustn't know them.
-  NetworkSettings ReadSecrets(const Line& line);
+  /// Success with nothing where nobody keeps any.
+  std::uint32_t ReadSecrets(const Line& line, NetworkSettings& secrets);
   std::uint32_t Add(const NetworkSettings& settings);
-  /// Keeps the secrets where `settings` has none.
+  /// Keeps the secrets where `settings` has none, and none but those where it has any.
   std::uint32_t Update(const Line& line, const NetworkSettings& settings);
   std::uint32_t ClearSecrets(const Line& line);
   std::uint32_t Delete(const Line& line);
@@ -47,7 +47,7 @@ class ConnectionBook {
   };
 
   std::uint32_t Refresh();
-  void ReadUnknown();
+  std::uint32_t ReadUnknown();
 
   NetworkManagerBus& bus_;
   std::map<std::string, Known> known_; ///< by path

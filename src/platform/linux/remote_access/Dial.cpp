@@ -1,7 +1,7 @@
 #include "platform/linux/remote_access/Dial.h"
 
 #include "platform/linux/network_manager/NetworkManagerNames.h"
-#include "platform/linux/remote_access/ConnectionBook.h"
+#include "platform/linux/remote_access/ActiveLines.h"
 #include "platform/process/SystemErrors.h"
 #include "platform/remote_access/RemoteAccessNumbers.h"
 
@@ -37,7 +37,8 @@ void Dial::AskLater(const BusQuestion& question, void (Dial::*take)(const BusAns
 
 void Dial::Start(const std::string& connectionPath) {
   change_(kRasOpenPort, 0);
-  // One that is hung up meanwhile lives until the answer has come, so that what it asked for ends.
+  // One that is hung up or given up meanwhile lives until the answer has come, so that what it asked for
+  // ends.
   bus_.AskLater(
       {nm::kManagerPath,
        nm::kManager,
@@ -49,9 +50,9 @@ void Dial::Start(const std::string& connectionPath) {
 void Dial::TakeActive(const BusAnswer& answer) {
   if (!answer.IsGiven()) return End(ErrorOfRefusal(answer));
   activePath_ = answer.First().text;
-  if (isHungUp_) {
-    HangUp();
-    return;
+  if (isHungUp_ || stage_ == Stage::Ended) {
+    stage_ = Stage::Ended;
+    return bus_.AskLater(QuestionOfEnd(activePath_), [](const BusAnswer&) {});
   }
   AskLater({activePath_, nm::kProperties, "GetAll", {BusValue::Text(nm::kActive)}}, &Dial::TakeProperties);
 }
@@ -94,20 +95,20 @@ void Dial::TakeFromDevice(std::uint64_t state, std::uint64_t reason) {
   if (const auto reached = RasStateOfDevice(state)) {
     deviceReason_.reset();
     Reach(*reached);
-  } else if (!deviceReason_) {
+  } else if (EndsLine(state) && !deviceReason_) {
     deviceReason_ = reason;
   }
 }
 
 void Dial::TakeFromVpn(std::uint64_t state, std::uint64_t reason) {
   if (const auto reached = RasStateOfVpn(state)) return Reach(*reached);
-  if (state == nm::kVpnFailed || state == nm::kVpnDisconnected) End(RasErrorOfActive(reason));
+  if (state == nm::kVpnFailed || state == nm::kVpnDisconnected) End(RasErrorOfActive(reason, kernel_()));
 }
 
 void Dial::TakeFromActive(std::uint64_t state, std::uint64_t reason) {
   if (state == nm::kActivated) Reach(kRasConnected);
   if (state == nm::kDeactivated)
-    End(deviceReason_ ? RasErrorOfDevice(*deviceReason_, kernel_()) : RasErrorOfActive(reason));
+    End(deviceReason_ ? RasErrorOfDevice(*deviceReason_, kernel_()) : RasErrorOfActive(reason, kernel_()));
 }
 
 void Dial::Reach(std::uint32_t state) {
@@ -128,22 +129,23 @@ void Dial::End(std::uint32_t error) {
 }
 
 std::uint32_t Dial::HangUp() {
+  if (stage_ != Stage::Ended && !activePath_.empty()) {
+    if (const std::uint32_t error = EndActiveLine(bus_, activePath_)) return error;
+    stage_ = Stage::Ended;
+  }
   isHungUp_ = true;
-  if (stage_ == Stage::Ended || activePath_.empty()) return kRasSuccess;
-  stage_ = Stage::Ended;
-  const auto answer =
-      bus_.Ask({nm::kManagerPath, nm::kManager, "DeactivateConnection", {BusValue::Path(activePath_)}});
-  // One that NetworkManager knows no more has ended by itself.
-  const std::uint32_t error = ErrorOf(answer);
-  return error == kInvalidParameter ? std::uint32_t{kRasSuccess} : error;
+  return kRasSuccess;
 }
 
 void Dial::CheckAlive() {
-  if (!isKnown_ || stage_ == Stage::Ended) return;
-  const auto answer = bus_.Ask({activePath_, nm::kProperties, "GetAll", {BusValue::Text(nm::kActive)}});
+  if (stage_ == Stage::Ended) return;
+  // Before it has answered it may be asking the user: then it answers others all the same.
+  const auto answer = isKnown_
+                          ? bus_.Ask({activePath_, nm::kProperties, "GetAll", {BusValue::Text(nm::kActive)}})
+                          : bus_.Ask({nm::kManagerPath, nm::kManager, "GetDevices"});
   if (answer.kind == BusAnswer::Kind::NobodyThere) End(kRasManagerCannotStart);
   // What brought a connection to its end has been told before this answer.
-  if (answer.kind == BusAnswer::Kind::Refused) {
+  if (isKnown_ && answer.kind == BusAnswer::Kind::Refused) {
     bus_.HandleArrived();
     TakeFromActive(nm::kDeactivated, 0);
   }

@@ -24,7 +24,8 @@ class Dial : public std::enable_shared_from_this<Dial> {
   /// Asks NetworkManager for the connection at that path.
   void Start(const std::string& connectionPath);
   void Take(const BusSignal& signal);
-  /// Nothing is told from now on. The connection ends, if need be as soon as it is known. The error number.
+  /// The connection ends, if need be as soon as it is known, and nothing is told from now on. The error
+  /// number: with one, nothing has changed.
   std::uint32_t HangUp();
 
   Stage CurrentStage() const { return stage_; }

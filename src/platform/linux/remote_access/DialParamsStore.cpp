@@ -2,6 +2,7 @@
 
 #include "platform/linux/remote_access/DialParamsImage.h"
 #include "platform/linux/remote_access/DialSettings.h"
+#include "platform/process/SystemErrors.h"
 #include "platform/remote_access/RemoteAccessNumbers.h"
 #include "runtime/ByteFields.h"
 
@@ -12,7 +13,11 @@ std::uint32_t ReadDialParams(ConnectionBook& book, const Line& line, std::span<s
   if (const std::uint32_t error = book.ReadSettings(line, settings)) return error;
   PutLittle32(full, 0, RasDialParams::kBytes);
   ShowDialParams(settings, line.kind, full);
-  PutPasswordField(full, PasswordIn(book.ReadSecrets(line), line.kind));
+  NetworkSettings secrets;
+  const std::uint32_t error = book.ReadSecrets(line, secrets);
+  // One that this user mustn't know is none.
+  if (error != kRasSuccess && error != kAccessDenied) return error;
+  PutPasswordField(full, PasswordIn(secrets, line.kind));
   return kRasSuccess;
 }
 
@@ -26,14 +31,17 @@ std::uint32_t SaveDialParams(ConnectionBook& book, const Line& line, std::span<c
   const NetworkSettings before = settings;
   PutDialParams(settings, line.kind, full);
 
-  const NetworkSettings secrets = book.ReadSecrets(line);
+  NetworkSettings secrets;
+  if (const std::uint32_t error = book.ReadSecrets(line, secrets)) return error;
   const std::string kept = PasswordIn(secrets, line.kind);
   const std::string shown = removePassword ? std::string() : std::string(PasswordField(full));
   const std::string password = Kept(kept, shown, RasDialParams::kPasswordBytes);
-  if (password.empty()) {
-    if (const std::uint32_t error = kept.empty() ? 0 : book.ClearSecrets(line)) return error;
-  } else if (password != kept) {
+  if (password == kept) return settings == before ? kRasSuccess : book.Update(line, settings);
+  if (!password.empty()) {
     PutPassword(settings, line.kind, secrets, password);
+  } else if (!PutOtherSecrets(settings, line.kind, secrets)) {
+    // An update without any would keep those that there are.
+    if (const std::uint32_t error = book.ClearSecrets(line)) return error;
   }
   return settings == before ? kRasSuccess : book.Update(line, settings);
 }
@@ -44,8 +52,9 @@ std::uint32_t SaveUserAndPassword(ConnectionBook& book, const Line& line,
   TakeDialParams(params, given);
   if (!HasUserOrPassword(given)) return kRasSuccess;
   if (const std::uint32_t error = ReadDialParams(book, line, full)) return error;
+  const auto before = full;
   PutUserAndPassword(full, given);
-  return SaveDialParams(book, line, full, false);
+  return full == before ? kRasSuccess : SaveDialParams(book, line, full, false);
 }
 
 } // namespace quendra::platform::linux_

@@ -91,14 +91,30 @@ std::string PasswordIn(const NetworkSettings& secrets, LineKind kind) {
                                  : At(TextsIn(secrets, "vpn", "secrets"), "password");
 }
 
+bool PutOtherSecrets(NetworkSettings& settings, LineKind kind, const NetworkSettings& secrets) {
+  NetworkSettings others = secrets;
+  if (kind == LineKind::Pppoe) {
+    others["pppoe"].erase("password");
+  } else {
+    TextMap held = TextsIn(secrets, "vpn", "secrets");
+    held.erase("password");
+    PutTexts(others, "vpn", "secrets", held);
+  }
+  bool hasAny = false;
+  for (const auto& [setting, values] : others)
+    for (const auto& [key, value] : values) settings[setting][key] = value, hasAny = true;
+  return hasAny;
+}
+
 void PutPassword(NetworkSettings& settings, LineKind kind, const NetworkSettings& secrets,
                  const std::string& password) {
+  PutOtherSecrets(settings, kind, secrets);
   if (kind == LineKind::Pppoe) {
     PutText(settings, "pppoe", "password", password);
     settings["pppoe"].erase("password-flags");
     return;
   }
-  TextMap held = TextsIn(secrets, "vpn", "secrets");
+  TextMap held = TextsIn(settings, "vpn", "secrets");
   held["password"] = password;
   PutTexts(settings, "vpn", "secrets", held);
   TextMap data = TextsIn(settings, "vpn", "data");

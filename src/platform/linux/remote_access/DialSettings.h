@@ -16,6 +16,8 @@ std::string PasswordIn(const NetworkSettings& secrets, LineKind kind);
 /// Puts the password among the secrets that the connection has, to be kept by NetworkManager itself.
 void PutPassword(NetworkSettings& settings, LineKind kind, const NetworkSettings& secrets,
                  const std::string& password);
+/// Puts the secrets without the password. False where there are no others.
+bool PutOtherSecrets(NetworkSettings& settings, LineKind kind, const NetworkSettings& secrets);
 
 /// Of RasDialParams::kBytes, as the operations below.
 bool HasUserOrPassword(std::span<const std::uint8_t> params);

@@ -51,6 +51,10 @@ constexpr std::array kDeviceReasons{
     Meaning{40, kRasNoAnswer},          // the carrier or link changed
     Meaning{60, kRasUserDisconnection}, // a new activation was enqueued
 };
+/// NMDeviceState: unmanaged, unavailable, disconnected, deactivating, failed.
+constexpr std::array<std::uint64_t, 5> kEnds{nm::kUnmanaged, nm::kUnavailable, nm::kDeviceDisconnected,
+                                             nm::kDeactivating, nm::kDeviceFailed};
+
 /// NMDeviceStateReason: PPP failed.
 constexpr std::uint64_t kPppFailed = 14;
 
@@ -83,13 +87,16 @@ std::optional<std::uint32_t> RasStateOfDevice(std::uint64_t deviceState) {
 
 std::optional<std::uint32_t> RasStateOfVpn(std::uint64_t vpnState) { return Look(kVpnStates, vpnState); }
 
+bool EndsLine(std::uint64_t deviceState) { return std::ranges::find(kEnds, deviceState) != kEnds.end(); }
+
 std::uint32_t RasErrorOfDevice(std::uint64_t reason, KernelPpp kernel) {
   if (reason == kPppFailed && kernel == KernelPpp::Missing) return kRasPortNotAvailable;
   return Look(kDeviceReasons, reason).value_or(kRasNoAnswer);
 }
 
-std::uint32_t RasErrorOfActive(std::uint64_t reason) {
-  return Look(kActiveReasons, reason).value_or(kRasNoAnswer);
+std::uint32_t RasErrorOfActive(std::uint64_t reason, KernelPpp kernel) {
+  const std::uint32_t error = Look(kActiveReasons, reason).value_or(kRasNoAnswer);
+  return error == kRasNoAnswer && kernel == KernelPpp::Missing ? std::uint32_t{kRasPortNotAvailable} : error;
 }
 
 std::uint32_t RasErrorOfDrop(std::uint32_t errorOfDial) {

@@ -8,6 +8,7 @@
 #include "runtime/Text.h"
 
 #include <algorithm>
+#include <array>
 
 namespace quendra::platform::linux_ {
 
@@ -94,10 +95,14 @@ void ShowForeign(Image image, LineKind kind) {
   PutFieldText(image, RasEntry::kDeviceName, RasEntry::kDeviceNameBytes, DeviceTypeOf(kind));
 }
 
+/// With the empty text that ends them. What a caller has behind it is none of theirs.
 ConstImage AlternatesOf(ConstImage image) {
   const std::size_t offset = Little32(image, RasEntry::kAlternateOffset);
   if (offset < RasEntry::kBytes || offset >= image.size()) return {};
-  return image.subspan(offset);
+  const auto rest = image.subspan(offset);
+  constexpr std::array<std::uint8_t, 2> kEnd{};
+  const auto end = std::ranges::search(rest, kEnd).end();
+  return rest.first(static_cast<std::size_t>(end - rest.begin()));
 }
 
 /// A connection that changes its kind keeps nothing of the former.

@@ -102,29 +102,37 @@ void LinuxDialling::Forget(RasConnection handle) {
 }
 
 std::uint32_t LinuxDialling::RasHangUpA(RasConnection connection) {
-  if (!book_.IsThere()) {
-    Forget(connection);
-    return kRasManagerCannotStart;
-  }
+  if (hungUp_.contains(connection)) return kRasSuccess;
+  bus_.HandleArrived();
   const auto found = std::ranges::find(calls_, connection, &Call::handle);
-  if (found == calls_.end())
-    return hungUp_.contains(connection) ? std::uint32_t{kRasSuccess} : std::uint32_t{kErrorInvalidHandle};
+  const bool hasEnded = found != calls_.end() && found->HasEnded();
+  if (!hasEnded && !book_.IsThere()) return kRasManagerCannotStart;
+  if (found == calls_.end()) return kErrorInvalidHandle;
   const Call call = *found;
-  Forget(connection);
-  if (call.dial) return call.dial->HangUp();
-  const std::uint32_t error = ErrorOf(
-      bus_.Ask({nm::kManagerPath, nm::kManager, "DeactivateConnection", {BusValue::Path(call.activePath)}}));
-  return error == kInvalidParameter ? std::uint32_t{kRasSuccess} : error;
+  const std::uint32_t error = call.dial ? call.dial->HangUp() : EndActiveLine(bus_, call.activePath);
+  if (error == kRasSuccess) Forget(connection);
+  return error;
+}
+
+/// Also while NetworkManager hasn't told which connection the dial makes.
+bool LinuxDialling::Call::Makes(const ActiveLine& active) const {
+  if (!dial) return false;
+  const bool isAnswered = !dial->ActivePath().empty();
+  return isAnswered ? dial->ActivePath() == active.path : !HasEnded() && line.path == active.line.path;
 }
 
 std::uint32_t LinuxDialling::AddActive() {
   std::vector<ActiveLine> active;
   if (const std::uint32_t error = ReadActiveLines(bus_, book_, active)) return error;
+  std::erase_if(active, [this](const ActiveLine& one) {
+    return std::ranges::any_of(calls_, [&](const Call& call) { return call.Makes(one); });
+  });
   std::erase_if(calls_, [&](const Call& call) {
     return !call.dial && std::ranges::find(active, call.activePath, &ActiveLine::path) == active.end();
   });
   for (const ActiveLine& one : active)
-    if (std::ranges::find(calls_, one.path, &Call::Path) == calls_.end()) Add(one.line).activePath = one.path;
+    if (std::ranges::find(calls_, one.path, &Call::activePath) == calls_.end())
+      Add(one.line).activePath = one.path;
   return kRasSuccess;
 }
 

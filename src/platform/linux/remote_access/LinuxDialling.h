@@ -23,6 +23,7 @@ class LinuxDialling : public Dialling {
   std::uint32_t RasHangUpA(RasConnection connection) override;
   std::uint32_t RasEnumConnectionsA(std::span<std::uint8_t> connections, std::uint32_t& bytes,
                                     std::uint32_t& count) override;
+  /// Needs no NetworkManager: that there is none is told, too.
   std::uint32_t RasGetErrorStringA(std::uint32_t error, std::span<char> text) override;
 
  private:
@@ -33,8 +34,8 @@ class LinuxDialling : public Dialling {
     std::shared_ptr<Dial> dial{}; ///< nothing for one of another program's
     std::string activePath{};     ///< of that
 
-    const std::string& Path() const { return dial ? dial->ActivePath() : activePath; }
     bool HasEnded() const { return dial && dial->CurrentStage() == Dial::Stage::Ended; }
+    bool Makes(const ActiveLine& active) const;
   };
 
   void Hear(const BusSignal& signal);
@@ -49,7 +50,7 @@ class LinuxDialling : public Dialling {
   EventLoop& loop_;
   const std::string kernelFolder_;
   std::vector<Call> calls_;
-  std::set<RasConnection> hungUp_; ///< by this program, or given up by it
+  std::set<RasConnection> hungUp_; ///< by this program
   std::uint32_t lastHandle_ = 0;
 };
 

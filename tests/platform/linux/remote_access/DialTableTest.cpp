@@ -23,6 +23,12 @@ TEST(DialTable, States_of_a_device_become_states_of_a_dial) {
     EXPECT_FALSE(RasStateOfDevice(other)) << other;
 }
 
+TEST(DialTable, A_device_without_its_line_tells_why_and_one_that_waits_for_a_secret_does_not) {
+  for (const std::uint64_t state : {10U, 20U, 30U, 110U, 120U}) EXPECT_TRUE(EndsLine(state)) << state;
+  for (const std::uint64_t state : {0U, 40U, 50U, 60U, 70U, 100U, 4'000'000'000U})
+    EXPECT_FALSE(EndsLine(state)) << state;
+}
+
 TEST(DialTable, States_of_a_VPN_become_states_of_a_dial) {
   for (const Row& row : {Row{1, 1}, {3, 2}, {4, 5}, {5, 8192}})
     EXPECT_EQ(RasStateOfVpn(row.theirs), row.ours) << row.theirs;
@@ -55,6 +61,10 @@ TEST(DialTable, A_kernel_without_PPP_changes_the_meaning_of_its_failure_alone) {
   EXPECT_EQ(RasErrorOfDevice(14, KernelPpp::Missing), 633U);
   EXPECT_EQ(RasErrorOfDevice(13, KernelPpp::Missing), 691U);
   EXPECT_EQ(RasErrorOfDevice(40, KernelPpp::Missing), 678U);
+  for (const std::uint64_t reason : {0U, 1U, 4U, 6U})
+    EXPECT_EQ(RasErrorOfActive(reason, KernelPpp::Missing), 633U) << reason;
+  EXPECT_EQ(RasErrorOfActive(2, KernelPpp::Missing), 631U);
+  EXPECT_EQ(RasErrorOfActive(10, KernelPpp::Missing), 691U);
 }
 
 TEST(DialTable, Reasons_of_a_connection_become_error_numbers) {
@@ -71,9 +81,9 @@ TEST(DialTable, Reasons_of_a_connection_become_error_numbers) {
                          {12, 633},
                          {13, 633},
                          {14, 633}})
-    EXPECT_EQ(RasErrorOfActive(row.theirs), row.ours) << row.theirs;
+    EXPECT_EQ(RasErrorOfActive(row.theirs, KernelPpp::There), row.ours) << row.theirs;
   for (const std::uint64_t other : {0U, 1U, 15U, 4'000'000'000U})
-    EXPECT_EQ(RasErrorOfActive(other), 678U) << other;
+    EXPECT_EQ(RasErrorOfActive(other, KernelPpp::There), 678U) << other;
 }
 
 TEST(DialTable, A_line_that_stood_was_disconnected_by_the_user_or_otherwise) {
@@ -84,10 +94,11 @@ TEST(DialTable, A_line_that_stood_was_disconnected_by_the_user_or_otherwise) {
 
 TEST(DialTable, Every_number_that_can_come_has_a_text) {
   for (std::uint64_t reason = 0; reason < 100; ++reason) {
-    for (const KernelPpp kernel : {KernelPpp::There, KernelPpp::Missing})
+    for (const KernelPpp kernel : {KernelPpp::There, KernelPpp::Missing}) {
       EXPECT_NE(RasErrorText(RasErrorOfDevice(reason, kernel)), "") << reason;
-    EXPECT_NE(RasErrorText(RasErrorOfActive(reason)), "") << reason;
-    EXPECT_NE(RasErrorText(RasErrorOfDrop(RasErrorOfActive(reason))), "") << reason;
+      EXPECT_NE(RasErrorText(RasErrorOfActive(reason, kernel)), "") << reason;
+      EXPECT_NE(RasErrorText(RasErrorOfDrop(RasErrorOfActive(reason, kernel))), "") << reason;
+    }
   }
   EXPECT_EQ(RasErrorText(691), "Access denied because username and/or password is invalid on the domain.");
   EXPECT_EQ(RasErrorText(600), "");

@@ -68,6 +68,23 @@ TEST(EntrySettings, Alternate_numbers_longer_than_user_data_may_be_are_refused) 
   EXPECT_FALSE(PutEntryImage(settings, image));
 }
 
+TEST(EntrySettings, Alternate_numbers_read_and_written_again_do_not_grow) {
+  const std::string numbers("03-1\0"
+                            "03-2\0\0",
+                            11);
+  auto image = ImageFor("pppoe");
+  PutLittle32(image, RasEntry::kAlternateOffset, RasEntry::kBytes);
+  image.insert(image.end(), numbers.begin(), numbers.end());
+  const auto once = image;
+  NetworkSettings settings;
+  for (int round = 0; round < 3; ++round) {
+    image.push_back(0); // as whoever writes a text with its end does
+    ASSERT_TRUE(PutEntryImage(settings, image));
+    image = EntryImageOf(settings, LineKind::Pppoe);
+    EXPECT_EQ(image, once) << round;
+  }
+}
+
 TEST(EntrySettings, An_offset_within_the_record_is_no_place_of_alternate_numbers) {
   auto image = ImageFor("pppoe");
   PutLittle32(image, RasEntry::kAlternateOffset, 4);
@@ -119,6 +136,22 @@ TEST(DialSettings, The_password_of_a_tunnel_leaves_its_other_secrets) {
   PutTexts(secrets, "vpn", "secrets", {{"password", "old"}, {"other", "kept"}});
   PutPassword(settings, LineKind::Vpn, secrets, "new");
   EXPECT_EQ(TextsIn(settings, "vpn", "secrets"), (TextMap{{"other", "kept"}, {"password", "new"}}));
+}
+
+TEST(DialSettings, A_password_that_goes_leaves_the_other_secrets_of_its_connection) {
+  NetworkSettings tunnel, line, none, secrets;
+  PutTexts(secrets, "vpn", "secrets", {{"password", "old"}, {"other", "kept"}});
+  EXPECT_TRUE(PutOtherSecrets(tunnel, LineKind::Vpn, secrets));
+  EXPECT_EQ(TextsIn(tunnel, "vpn", "secrets"), (TextMap{{"other", "kept"}}));
+
+  NetworkSettings ofLine;
+  PutText(ofLine, "pppoe", "password", "old");
+  EXPECT_FALSE(PutOtherSecrets(none, LineKind::Pppoe, ofLine));
+  EXPECT_TRUE(none.empty());
+  PutText(ofLine, "802-1x", "password", "kept");
+  EXPECT_TRUE(PutOtherSecrets(line, LineKind::Pppoe, ofLine));
+  EXPECT_EQ(TextIn(line, "802-1x", "password"), "kept");
+  EXPECT_EQ(TextIn(line, "pppoe", "password"), "");
 }
 
 TEST(DialSettings, Values_of_other_types_than_texts_are_none) {

@@ -198,6 +198,19 @@ TEST_F(RealNetworkManagerTest, A_tunnel_of_another_program_keeps_its_own_data) {
             "gateway = vpn.test, password-flags = 0, require-mppe = yes, user = dana\n");
 }
 
+TEST_F(RealNetworkManagerTest, Removing_a_tunnels_password_leaves_its_other_secrets) {
+  manager.Nmcli("con add type vpn vpn-type pptp con-name theirs autoconnect no");
+  manager.Nmcli("con modify theirs vpn.data 'gateway = vpn.test, user = dan' "
+                "vpn.secrets 'password = old, other = kept'");
+  ASSERT_EQ(TextAt(Saved("theirs"), kPasswordAt), "old");
+  const auto secrets = [&] { return manager.Nmcli("-s -g vpn.secrets con show theirs"); };
+  EXPECT_EQ(phoneBook.RasSetEntryDialParamsA(nullptr, DialParamsFor("theirs", "dan"), true), 0U);
+  EXPECT_EQ(TextAt(Saved("theirs"), kPasswordAt), "");
+  EXPECT_EQ(secrets(), "other = kept\n");
+  EXPECT_EQ(Save("theirs", "dan", "new"), 0U);
+  EXPECT_EQ(secrets(), "other = kept, password = new\n");
+}
+
 TEST_F(RealNetworkManagerTest, What_another_program_changes_shows_at_once) {
   ASSERT_EQ(Put("097", EntryFor("pppoe")), 0U);
   EXPECT_EQ(Names(), std::vector<std::string>{"097"});

@@ -1,0 +1,135 @@
+#include "platform/linux/remote_access/ScriptedManagerFixture.h"
+
+#include <signal.h>
+
+#include <array>
+
+namespace quendra::platform::linux_ {
+
+namespace {
+
+using ScriptedHangUpTest = ScriptedManagerTest;
+
+} // namespace
+
+TEST_F(ScriptedHangUpTest, A_line_that_is_hung_up_while_it_is_dialled_tells_nothing_more) {
+  BeginDial("097");
+  Play("device 40 0");
+  ASSERT_TRUE(Comes(kRasPortOpened, 0));
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  EXPECT_TRUE(WasAsked("DeactivateConnection 097"));
+  Settle();
+  EXPECT_EQ(loop.changes.back(), std::pair(std::uint32_t{kRasPortOpened}, 0U));
+}
+
+TEST_F(ScriptedHangUpTest, A_line_that_is_hung_up_at_once_ends_as_soon_as_it_is_known) {
+  ASSERT_EQ(Dial("097"), 0U);
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  EXPECT_TRUE(WasAsked("DeactivateConnection 097"));
+  EXPECT_EQ(loop.changes, (Changes{{kRasOpenPort, 0}}));
+}
+
+TEST_F(ScriptedHangUpTest, A_handle_may_be_hung_up_again_also_when_its_line_has_ended) {
+  BeginDial("097");
+  Play("device 120 13, active 4 3, forget");
+  ASSERT_TRUE(loop.WaitFor([&] { return loop.changes.back().second != 0; }, 20'000));
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+}
+
+TEST_F(ScriptedHangUpTest, A_second_client_sees_the_connection_and_ends_it) {
+  BeginDial("097");
+  Play("device 100 0, active 2 1");
+  ASSERT_TRUE(Comes(kRasConnected, 0));
+  forms::headless::PolledDesktop otherLoop;
+  NetworkManagerBus otherConnection(otherLoop, otherLoop);
+  ConnectionBook otherBook(otherConnection);
+  LinuxDialling other(otherBook, otherConnection, otherLoop);
+  Bytes record(RasConnectionRecord::kBytes);
+  PutLittle32(record, 0, RasConnectionRecord::kBytes);
+  std::uint32_t bytes = RasConnectionRecord::kBytes, count = 0;
+  ASSERT_EQ(other.RasEnumConnectionsA(record, bytes, count), 0U);
+  ASSERT_EQ(count, 1U);
+  EXPECT_EQ(TextAt(record, RasConnectionRecord::kEntryName), "097");
+  EXPECT_EQ(TextAt(record, RasConnectionRecord::kDeviceType), "pppoe");
+
+  EXPECT_EQ(other.RasHangUpA(RasConnection(Little32(record, RasConnectionRecord::kHandle))), 0U);
+
+  EXPECT_TRUE(Comes(kRasDisconnected, kRasUserDisconnection));
+  EXPECT_EQ(Connections().size(), 0U);
+}
+
+TEST_F(ScriptedHangUpTest, A_hang_up_that_is_not_permitted_keeps_the_handle) {
+  BeginDial("097");
+  Play("device 40 0");
+  ASSERT_TRUE(Comes(kRasPortOpened, 0));
+  Play("refuse DeactivateConnection org.freedesktop.NetworkManager.PermissionDenied");
+  EXPECT_EQ(dialling.RasHangUpA(handle), kAccessDenied);
+  EXPECT_EQ(dialling.RasHangUpA(handle), kAccessDenied) << "also when it is tried again";
+
+  Play("device 100 0, active 2 1");
+  EXPECT_TRUE(Comes(kRasConnected, 0)) << "the window hears of the line as before";
+  ASSERT_EQ(Connections().size(), 1U);
+  EXPECT_EQ(Connections().front().second, handle);
+  Play("allow DeactivateConnection");
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  EXPECT_TRUE(WasAsked("DeactivateConnection 097"));
+  EXPECT_EQ(Connections().size(), 0U);
+}
+
+TEST_F(ScriptedHangUpTest, A_line_of_another_program_that_may_not_be_hung_up_keeps_its_handle) {
+  BeginDial("097");
+  Play("device 100 0, active 2 1, refuse DeactivateConnection "
+       "org.freedesktop.NetworkManager.PermissionDenied");
+  forms::headless::PolledDesktop otherLoop;
+  NetworkManagerBus otherConnection(otherLoop, otherLoop);
+  ConnectionBook otherBook(otherConnection);
+  LinuxDialling other(otherBook, otherConnection, otherLoop);
+  Bytes record(RasConnectionRecord::kBytes);
+  PutLittle32(record, 0, RasConnectionRecord::kBytes);
+  std::uint32_t bytes = RasConnectionRecord::kBytes, count = 0;
+  ASSERT_EQ(other.RasEnumConnectionsA(record, bytes, count), 0U);
+  const RasConnection theirs(Little32(record, RasConnectionRecord::kHandle));
+  EXPECT_EQ(other.RasHangUpA(theirs), kAccessDenied);
+  EXPECT_EQ(other.RasHangUpA(theirs), kAccessDenied);
+}
+
+TEST_F(ScriptedHangUpTest, A_line_whose_manager_has_gone_can_be_hung_up) {
+  BeginDial("097");
+  manager->End();
+  ASSERT_TRUE(Comes(kRasOpenPort, kRasManagerCannotStart));
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+}
+
+TEST_F(ScriptedHangUpTest, A_manager_that_stands_still_keeps_the_handle_until_it_goes_on) {
+  BeginDial("097");
+  Play("device 40 0");
+  ASSERT_TRUE(Comes(kRasPortOpened, 0));
+  ::kill(manager->Id(), SIGSTOP);
+  EXPECT_EQ(dialling.RasHangUpA(handle), kRasManagerCannotStart);
+  ::kill(manager->Id(), SIGCONT);
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  EXPECT_TRUE(WasAsked("DeactivateConnection 097"));
+}
+
+TEST_F(ScriptedHangUpTest, A_line_that_is_listed_before_its_answer_has_one_handle) {
+  Play("hold ActivateConnection");
+  BeginDial("097");
+  ASSERT_EQ(Connections().size(), 1U);
+  EXPECT_EQ(Connections().front().second, handle);
+
+  Play("release, device 100 0, active 2 1");
+  EXPECT_TRUE(Comes(kRasConnected, 0));
+  ASSERT_EQ(Connections().size(), 1U);
+  EXPECT_EQ(Connections().front().second, handle);
+}
+
+TEST_F(ScriptedHangUpTest, The_text_that_there_is_no_manager_needs_none) {
+  manager->End();
+  std::array<char, 512> text{};
+  EXPECT_EQ(dialling.RasGetErrorStringA(kRasManagerCannotStart, text), 0U);
+  EXPECT_EQ(std::string_view(text.data()), "The Remote Access Service Manager could not start.");
+}
+
+} // namespace quendra::platform::linux_
