@@ -47,16 +47,17 @@ std::uint32_t ConnectionBook::ReadUnknown() {
   for (const auto& [path, known] : known_)
     if (!known.isRead) questions.push_back({path, nm::kConnection, "GetSettings"});
   const auto answers = bus_.AskAll(questions);
+  std::uint32_t error = kRasSuccess;
   for (std::size_t i = 0; i < answers.size(); ++i) {
     // One that nobody answers for may be any entry.
-    if (answers[i].kind == BusAnswer::Kind::NobodyThere) return kRasManagerCannotStart;
+    if (answers[i].kind == BusAnswer::Kind::NobodyThere) error = kRasManagerCannotStart;
     // One that is private to another user, or gone by now, is none.
     if (!answers[i].IsGiven()) continue;
     const NetworkSettings settings = NetworkSettingsOf(answers[i].First());
     known_[questions[i].path] = {true, LineKindOf(settings),
                                  Shown(TextIn(settings, "connection", "id"), RasEntryName::kNameBytes)};
   }
-  return kRasSuccess;
+  return error;
 }
 
 std::uint32_t ConnectionBook::ReadLines(std::vector<Line>& lines) {

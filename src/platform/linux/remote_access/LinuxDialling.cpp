@@ -1,6 +1,5 @@
 #include "platform/linux/remote_access/LinuxDialling.h"
 
-#include "platform/linux/network_manager/NetworkManagerNames.h"
 #include "platform/linux/remote_access/DialParamsImage.h"
 #include "platform/linux/remote_access/DialParamsStore.h"
 #include "platform/linux/remote_access/RasErrorTexts.h"
