@@ -11,7 +11,6 @@ using foundation::Px;
 frmNetworkAdapters::frmNetworkAdapters(forms::FormHost& forms) : Form(u"frmNetworkAdapters") {
   Command1.Click = [this] { Command1_Click(); };
   cmdClose.Click = [this, &forms] { forms.Unload(*this); };
-  Default = &Command1;
   Cancel = &cmdClose;
 }
 

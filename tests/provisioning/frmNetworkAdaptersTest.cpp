@@ -91,10 +91,20 @@ TEST_F(NetworkAdapters, A_card_is_chosen_by_keys_alone) {
   desktop.Show(owner);
 
   const Text choice = Ask({u"eth0", u"eth1"}, [&] {
-    for (const int key : {forms::kDownKey, forms::kDownKey, forms::kEnterKey}) desktop.PressKey(dialog, key);
+    for (const int key : {forms::kDownKey, forms::kDownKey, forms::kTabKey, forms::kSpaceKey})
+      desktop.PressKey(dialog, key);
   });
 
   EXPECT_EQ(choice, u"1");
+}
+
+TEST_F(NetworkAdapters, Enter_in_the_list_confirms_nothing) {
+  desktop.Show(owner);
+
+  const Text choice = Ask({u"eth0", u"eth1"}, [&] { desktop.PressKey(dialog, forms::kEnterKey); });
+
+  EXPECT_EQ(choice, u"");
+  EXPECT_TRUE(dialog.Visible());
 }
 
 } // namespace

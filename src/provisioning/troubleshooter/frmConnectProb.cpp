@@ -8,7 +8,6 @@ namespace quendra::provisioning {
 frmConnectProb::frmConnectProb(forms::Desktop& desktop, mdlDun& dun)
     : Form(u"frmConnectProb"), desktop_(desktop), dun_(dun) {
   Command1.Click = [this] { desktop_.Unload(*this); };
-  Default = &cmdCheck;
   Cancel = &Command1;
 }
 

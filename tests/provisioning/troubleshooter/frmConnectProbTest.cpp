@@ -1,5 +1,6 @@
 #include "provisioning/troubleshooter/frmConnectProb.h"
 
+#include "forms/view/Keyboard.h"
 #include "provisioning/troubleshooter/TroubleshooterFixture.h"
 
 namespace quendra::provisioning {
@@ -11,6 +12,11 @@ class ConnectProb : public TroubleshooterTest {
     std::vector<Text> items;
     for (int row = 0; row < form.cmbDialups.ListCount(); ++row) items.push_back(form.cmbDialups.List(row));
     return items;
+  }
+  void TabTo(const forms::Control& control) {
+    for (int stops = 0; stops < 10 && desktop.Focused(form) != &control; ++stops)
+      desktop.PressKey(form, forms::kTabKey);
+    ASSERT_EQ(desktop.Focused(form), &control);
   }
   const Box failure = TitledBox(u"נכשל!", 0x10);
 };
@@ -52,6 +58,17 @@ TEST_F(ConnectProb, Opens_after_the_box_of_failure_where_entries_cannot_be_liste
   ASSERT_EQ(desktop.Boxes.size(), 2u);
   EXPECT_EQ(desktop.Boxes[0].title, u"  RAS API Error");
   EXPECT_EQ(desktop.Boxes[1], failure);
+  EXPECT_TRUE(form.Visible());
+  EXPECT_TRUE(Items().empty());
+}
+
+TEST_F(ConnectProb, Opens_empty_with_the_layers_box_alone_where_the_second_listing_fails) {
+  machine.ras.Refuse("RasEnumEntriesA", 5, 1);
+
+  Open();
+
+  ASSERT_EQ(desktop.Boxes.size(), 1u);
+  EXPECT_EQ(desktop.Boxes[0].title, u"  RAS API Error");
   EXPECT_TRUE(form.Visible());
   EXPECT_TRUE(Items().empty());
 }
@@ -145,15 +162,29 @@ TEST_F(ConnectProb, The_log_shows_its_end) {
   EXPECT_EQ(form.txtStatus.SelStart(), 10);
 }
 
-TEST_F(ConnectProb, Enter_checks_and_Escape_closes) {
+TEST_F(ConnectProb, Is_used_by_keys_alone) {
   Open();
   Pick("Home");
   form.txtEmunrateError.Value = u"720";
+  TabTo(form.cmdCheck);
 
-  ASSERT_TRUE(desktop.KeyDown(form, 13));
+  ASSERT_TRUE(desktop.PressKey(form, forms::kSpaceKey));
   EXPECT_EQ(Lines().size(), 1u);
-  ASSERT_TRUE(desktop.KeyDown(form, 27));
+  ASSERT_TRUE(desktop.PressKey(form, forms::kEscapeKey));
   EXPECT_FALSE(form.IsLoaded());
+}
+
+TEST_F(ConnectProb, Enter_in_a_field_checks_nothing) {
+  Open();
+  for (const forms::Control* field : {static_cast<forms::Control*>(&form.cmbDialups),
+                                      static_cast<forms::Control*>(&form.txtEmunrateError)}) {
+    TabTo(*field);
+    desktop.PressKey(form, forms::kEnterKey);
+  }
+
+  EXPECT_FALSE(desktop.Ended);
+  EXPECT_TRUE(form.cmdCheck.Enabled());
+  EXPECT_TRUE(Lines().empty());
 }
 
 } // namespace
