@@ -59,7 +59,8 @@ void MailPanel::DesignTile(std::size_t tile) {
   frsCon_lblMailsBG[tile].Move(kFirstTileLeft, 0, Px(kTileWidth), Px(kTileHeight));
   frsCon_lblMailBG2[tile].Transparent = true;
   frsCon_lblMailBG2[tile].BackColour = forms::kWhite;
-  frsCon_lblMailBG2[tile].Move(0, 0, Px(kTileWidth), Px(kTileHeight));
+  // Inside the tile's edge, where the mouse finds the tile itself.
+  frsCon_lblMailBG2[tile].Move(Px(kEdge), Px(kEdge), Px(kTileWidth - 2 * kEdge), Px(kTileHeight - 2 * kEdge));
   frsCon_imgMails[tile].Contents = forms::Picture::Artwork(kPrograms[tile].artwork);
   frsCon_imgMails[tile].Move(Px(kEdge), Px(kEdge), Px(kTileWidth - 2 * kEdge), Px(kPictureHeight));
   looks::PlainText(frsCon_lblMails[tile], kPrograms[tile].caption, looks::kSmall, looks::kForest);
