@@ -14,9 +14,16 @@ class ListBoxOnScreen : public QtFixture {
   }
   QListWidget& View() { return As<QListWidget>(list); }
   QPoint PlaceOf(int item) { return View().visualItemRect(View().item(item)).center(); }
-  void ClickItem(int item) {
-    PressMouse(*View().viewport(), PlaceOf(item));
-    ReleaseMouse(*View().viewport(), PlaceOf(item));
+  void ClickItem(int item, Qt::KeyboardModifiers modifiers = {}) {
+    PressMouse(*View().viewport(), PlaceOf(item), Qt::LeftButton, modifiers);
+    ReleaseMouse(*View().viewport(), PlaceOf(item), Qt::LeftButton, modifiers);
+  }
+  /// The rows that are drawn as chosen.
+  std::vector<int> ShownAsChosen() {
+    std::vector<int> rows;
+    for (int row = 0; row < View().count(); ++row)
+      if (View().item(row)->isSelected()) rows.push_back(row);
+    return rows;
   }
 
   ListBox list{form, u"lstNICs"};
@@ -40,6 +47,17 @@ TEST_F(ListBoxOnScreen, A_click_of_the_mouse_chooses_once_and_again_on_what_is_c
 
   EXPECT_EQ(chosen, (std::vector<int>{1, 1}));
   EXPECT_EQ(View().currentRow(), 1);
+}
+
+TEST_F(ListBoxOnScreen, Ctrl_and_a_click_leave_what_is_shown_and_what_is_chosen_the_same) {
+  ShowActive();
+
+  for (const int item : {1, 1, 0, 0}) {
+    ClickItem(item, Qt::ControlModifier);
+
+    EXPECT_EQ(list.ListIndex(), item);
+    EXPECT_EQ(ShownAsChosen(), std::vector<int>{item});
+  }
 }
 
 TEST_F(ListBoxOnScreen, A_double_click_is_told_as_one) {

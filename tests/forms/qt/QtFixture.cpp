@@ -33,8 +33,8 @@ class ApplicationOfAllTests : public testing::Environment {
 const testing::Environment* const environment = testing::AddGlobalTestEnvironment(new ApplicationOfAllTests);
 
 void SendMouse(QWidget& widget, QEvent::Type type, QPoint place, Qt::MouseButton button,
-               Qt::MouseButtons held) {
-  QMouseEvent event(type, place, widget.mapToGlobal(place), button, held, Qt::NoModifier);
+               Qt::MouseButtons held, Qt::KeyboardModifiers modifiers = {}) {
+  QMouseEvent event(type, place, widget.mapToGlobal(place), button, held, modifiers);
   QCoreApplication::sendEvent(&widget, &event);
 }
 
@@ -60,12 +60,14 @@ void QtFixture::MoveMouse(QWidget& widget, QPoint place, Qt::MouseButtons held) 
   SendMouse(widget, QEvent::MouseMove, place, Qt::NoButton, held);
 }
 
-void QtFixture::PressMouse(QWidget& widget, QPoint place, Qt::MouseButton button) {
-  SendMouse(widget, QEvent::MouseButtonPress, place, button, button);
+void QtFixture::PressMouse(QWidget& widget, QPoint place, Qt::MouseButton button,
+                           Qt::KeyboardModifiers modifiers) {
+  SendMouse(widget, QEvent::MouseButtonPress, place, button, button, modifiers);
 }
 
-void QtFixture::ReleaseMouse(QWidget& widget, QPoint place, Qt::MouseButton button) {
-  SendMouse(widget, QEvent::MouseButtonRelease, place, button, Qt::NoButton);
+void QtFixture::ReleaseMouse(QWidget& widget, QPoint place, Qt::MouseButton button,
+                             Qt::KeyboardModifiers modifiers) {
+  SendMouse(widget, QEvent::MouseButtonRelease, place, button, Qt::NoButton, modifiers);
 }
 
 void QtFixture::DoubleClickMouse(QWidget& widget, QPoint place) {

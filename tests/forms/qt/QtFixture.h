@@ -49,8 +49,10 @@ class QtFixture : public testing::Test {
   }
 
   static void MoveMouse(QWidget& widget, QPoint place, Qt::MouseButtons held = Qt::NoButton);
-  static void PressMouse(QWidget& widget, QPoint place, Qt::MouseButton button = Qt::LeftButton);
-  static void ReleaseMouse(QWidget& widget, QPoint place, Qt::MouseButton button = Qt::LeftButton);
+  static void PressMouse(QWidget& widget, QPoint place, Qt::MouseButton button = Qt::LeftButton,
+                         Qt::KeyboardModifiers modifiers = {});
+  static void ReleaseMouse(QWidget& widget, QPoint place, Qt::MouseButton button = Qt::LeftButton,
+                           Qt::KeyboardModifiers modifiers = {});
   static void DoubleClickMouse(QWidget& widget, QPoint place);
   static void Click(QWidget& widget);
   static void PressKey(QWidget& widget, int key, const QString& text = {},

@@ -92,6 +92,12 @@ void ListBoxView::focusOutEvent(QFocusEvent* event) {
   update();
 }
 
+// With Ctrl the toolkit would take the selection back, while the list box keeps its choice.
+QItemSelectionModel::SelectionFlags ListBoxView::selectionCommand(const QModelIndex& index,
+                                                                  const QEvent* event) const {
+  return index.isValid() ? QItemSelectionModel::ClearAndSelect : QListWidget::selectionCommand(index, event);
+}
+
 void ListBoxView::currentChanged(const QModelIndex& current, const QModelIndex& previous) {
   QListWidget::currentChanged(current, previous);
   if (showing_ || !TheControl() || !current.isValid()) return;

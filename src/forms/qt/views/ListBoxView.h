@@ -19,6 +19,8 @@ class ListBoxView : public QListWidget, public WidgetView {
   void focusInEvent(QFocusEvent* event) override;
   void focusOutEvent(QFocusEvent* event) override;
   void currentChanged(const QModelIndex& current, const QModelIndex& previous) override;
+  QItemSelectionModel::SelectionFlags selectionCommand(const QModelIndex& index,
+                                                       const QEvent* event) const override;
 
  private:
   ListBox& List() const { return static_cast<ListBox&>(*TheControl()); }
