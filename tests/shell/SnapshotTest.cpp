@@ -17,6 +17,14 @@ class Snapshot : public ProgramTest {
     expected << file.rdbuf();
     EXPECT_EQ(desktop.Render(form), expected.str());
   }
+  /// Of the page for the first connection: 0 the mail account, 1 the connection.
+  void OpenStep(std::size_t step) {
+    ComeHome();
+    ClickEntry(2);
+    ASSERT_TRUE(desktop.Click(page.menu.frsCon_lblCaption[step]));
+  }
+
+  provisioning::FirstConnectionPage& page = program.firstConnectionPage;
 };
 
 TEST_F(Snapshot, Of_the_splash) {
@@ -60,6 +68,39 @@ TEST_F(Snapshot, Of_the_page_for_the_first_connection) {
   ComeHome();
   ClickEntry(2);
   ExpectScreen(program.frmMenu, "connect");
+}
+
+TEST_F(Snapshot, Of_the_step_of_the_connection) {
+  OpenStep(1);
+  desktop.Type(page.connection.frsCon_txtUsername, u"dana");
+  desktop.Type(page.connection.frsCon_txtPassword, u"secret");
+  desktop.Click(page.connection.frsCon_lblModems[2]);
+  ExpectScreen(program.frmMenu, "connect_step");
+}
+
+TEST_F(Snapshot, Of_the_step_of_the_mail_account) {
+  machine.installedProducts.Codes = {"{90E00409-6000-11D3-8CFE-0050048383C9}"};
+  OpenStep(0);
+  desktop.Type(page.mail.frsCon_txtFullName, u"דנה לוי");
+  desktop.Type(page.mail.frsCon_txtEmailUN, u"dana");
+  desktop.Click(page.mail.frsCon_lblMails[1]);
+  ExpectScreen(program.frmMenu, "mail_step");
+}
+
+TEST_F(Snapshot, Of_the_dialog_for_network_cards) {
+  machine.adapters.Cards = {"First card", "Second card"};
+  OpenStep(1);
+  desktop.Type(page.connection.frsCon_txtUsername, u"dana");
+  desktop.Type(page.connection.frsCon_txtPassword, u"secret");
+  desktop.Click(page.connection.frsCon_lblModems[2]);
+  int shown = 0;
+  desktop.OnModal = [&](forms::Form& cards) {
+    ++shown;
+    desktop.ChooseItem(program.connection.frmNetworkAdapters.lstNICs, 1);
+    ExpectScreen(cards, "network_cards");
+  };
+  desktop.Click(page.connection.frsCon_cmdCreate);
+  EXPECT_EQ(shown, 1);
 }
 
 TEST_F(Snapshot, Of_the_about_box) {
