@@ -115,6 +115,33 @@ TEST_F(FirstConnection, The_pages_button_is_disabled_while_the_connection_is_mad
   EXPECT_TRUE(page.connection.frsCon_cmdCreate.Enabled());
 }
 
+TEST_F(FirstConnection, The_button_that_stayed_enabled_without_a_modem_writes_an_empty_record) {
+  machine.ras.AddEntry("097").SetDevice("vpn", "vpn").SetLogin("old", "old");
+  FillIn(2);
+  ClickEntry(1);
+  ClickEntry(2);
+
+  ASSERT_TRUE(desktop.Click(page.connection.frsCon_cmdCreate));
+
+  std::vector<std::uint8_t> emptyRecord(RasEntry::kBytes);
+  PutLittle32(emptyRecord, 0, RasEntry::kBytes);
+  const auto& entry = *machine.ras.Entry("097");
+  EXPECT_EQ(entry.properties, emptyRecord);
+  EXPECT_EQ(entry.userName, "");
+  EXPECT_EQ(entry.password, "");
+  EXPECT_EQ(desktop.Boxes, std::vector<Box>{kSuccess});
+}
+
+TEST_F(FirstConnection, The_program_may_end_while_the_box_of_success_stands) {
+  desktop.OnBox = [&] { desktop.CloseBox(program.frmMenu); };
+
+  Create(0);
+
+  EXPECT_EQ(desktop.Boxes, std::vector<Box>{kSuccess});
+  EXPECT_TRUE(desktop.Ended);
+  EXPECT_EQ(desktop.EndStatus, 0);
+}
+
 TEST_F(FirstConnection, The_card_of_the_vpn_modem_gets_its_addresses) {
   Create(2);
 

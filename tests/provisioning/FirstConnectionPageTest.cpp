@@ -54,6 +54,20 @@ TEST_F(FirstConnection, Opening_again_clears_the_choices_and_paints_nothing) {
   EXPECT_EQ(Green(modemGrounds), Rows{4});
 }
 
+TEST_F(FirstConnection, Opening_again_leaves_the_button_as_it_was_until_a_field_changes) {
+  OpenConnectionStep();
+  FillConnection();
+  desktop.Click(connection.frsCon_lblModems[2]);
+  page.Stop();
+
+  OpenPage();
+
+  EXPECT_EQ(page.SelectedModem, -1);
+  EXPECT_TRUE(connection.frsCon_cmdCreate.Enabled());
+  desktop.Type(connection.frsCon_txtPassword, u"x");
+  EXPECT_FALSE(connection.frsCon_cmdCreate.Enabled());
+}
+
 TEST_F(FirstConnection, The_menu_opens_the_mail_step_by_its_first_hot_spot_and_the_connection_by_its_second) {
   OpenPage();
   EXPECT_FALSE(connection.frsCon_Frame1.Visible());

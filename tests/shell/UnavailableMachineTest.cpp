@@ -1,6 +1,7 @@
 #include "platform/unavailable/UnavailableMachine.h"
 
 #include "capture/CaptureState.h"
+#include "foundation/Wording.h"
 #include "platform/ReplacedFamilies.h"
 #include "shell/ProgramFixture.h"
 
@@ -8,6 +9,7 @@ namespace quendra::shell {
 namespace {
 
 const Text kNoVersion = u"  Error Getting OS Information";
+const Text kLayersError = u"  RAS API Error";
 
 /// A whole program on a machine that lacks everything, save what a test puts in.
 class UnavailableMachineTest : public testing::Test {
@@ -19,6 +21,18 @@ class UnavailableMachineTest : public testing::Test {
     ASSERT_TRUE(program->frmMenu.Visible());
   }
   void ClickEntry(std::size_t entry) { ASSERT_TRUE(desktop.Click(program->frmMenu.lblCaption[entry])); }
+  void OpenConnectionStep() {
+    ClickEntry(2);
+    provisioning::FirstConnectionPage& page = program->firstConnectionPage;
+    ASSERT_TRUE(desktop.Click(page.menu.frsCon_lblCaption[1]));
+    ASSERT_TRUE(desktop.Type(page.connection.frsCon_txtUsername, u"dana"));
+    ASSERT_TRUE(desktop.Type(page.connection.frsCon_txtPassword, u"secret"));
+  }
+  /// False when the user couldn't ask for it.
+  bool Create(std::size_t modem) {
+    provisioning::ConnectionPanel& step = program->firstConnectionPage.connection;
+    return desktop.Click(step.frsCon_lblModems[modem]) && desktop.Click(step.frsCon_cmdCreate);
+  }
   std::vector<Text> BoxTitles() const {
     std::vector<Text> titles;
     for (const auto& box : desktop.Boxes) titles.push_back(box.title);
@@ -48,6 +62,46 @@ TEST_F(UnavailableMachineTest, Pages_that_ask_nothing_of_the_machine_open_and_cl
   desktop.CloseBox(program->frmMenu);
   EXPECT_EQ(BoxTitles(), std::vector<Text>{kNoVersion});
   EXPECT_EQ(desktop.EndStatus, 0);
+}
+
+TEST_F(UnavailableMachineTest, The_link_opens_the_dialog_after_the_boxes_of_failure) {
+  ComeHome(machine.Operations());
+  ClickEntry(2);
+
+  ASSERT_TRUE(desktop.Click(program->firstConnectionPage.menu.frsCon_lblConnectProb));
+
+  EXPECT_EQ(BoxTitles(), (std::vector<Text>{kNoVersion, kLayersError, foundation::kTitle}));
+  EXPECT_EQ(desktop.Boxes.back().text, u"נכשל!");
+  const provisioning::frmConnectProb& dialog = program->connection.frmConnectProb;
+  EXPECT_TRUE(dialog.Visible());
+  EXPECT_EQ(dialog.cmbDialups.ListCount(), 0);
+  EXPECT_FALSE(desktop.Ended);
+}
+
+TEST_F(UnavailableMachineTest, A_connection_for_each_modem_ends_in_the_box_of_failure) {
+  ComeHome(machine.Operations());
+  OpenConnectionStep();
+  for (const std::size_t modem : {0, 1, 3, 4}) {
+    desktop.Boxes.clear();
+
+    ASSERT_TRUE(Create(modem));
+
+    EXPECT_EQ(BoxTitles(), (std::vector<Text>{kNoVersion, kLayersError, foundation::kTitle})) << modem;
+    EXPECT_EQ(desktop.Boxes.back().text, u"נכשל!") << modem;
+    EXPECT_TRUE(program->firstConnectionPage.connection.frsCon_Frame1.IsShown());
+  }
+  EXPECT_FALSE(desktop.Ended);
+}
+
+TEST_F(UnavailableMachineTest, A_connection_for_the_modem_with_a_card_ends_the_program) {
+  ComeHome(machine.Operations());
+  OpenConnectionStep();
+
+  ASSERT_TRUE(Create(2));
+
+  EXPECT_TRUE(desktop.Ended);
+  EXPECT_EQ(desktop.EndStatus, 1);
+  EXPECT_EQ(desktop.Boxes.back().text, u"Run-time error '429':\n\nActiveX component can't create object");
 }
 
 /// The pages that have sockets.

@@ -86,16 +86,18 @@ TEST_F(ModemRows, Left_by_the_mouse_lose_the_hover_and_the_chosen_one_keeps_its_
 }
 
 TEST_F(ModemRows, Show_the_chosen_one_again_when_a_field_gets_the_focus) {
-  for (forms::TextBox* field : {&connection.frsCon_txtUsername, &connection.frsCon_txtPassword}) {
+  while (desktop.Focused(window) != &page.frsCon_lblBack) desktop.PressKey(window, forms::kTabKey);
+  for (const forms::TextBox* field : {&connection.frsCon_txtUsername, &connection.frsCon_txtPassword}) {
     desktop.Click(connection.frsCon_lblModems[3]);
     desktop.MouseMove(connection.frsCon_Frame1);
-    page.frsCon_lblError[0].Visible = page.frsCon_lblError[1].Visible = true;
+    ShowAllMarks();
 
-    field->GotFocus();
+    desktop.PressKey(window, forms::kTabKey);
 
+    ASSERT_EQ(desktop.Focused(window), field);
     EXPECT_EQ(Opaque(modemGrounds), Rows{3});
     EXPECT_EQ(page.HoverModem, 3);
-    EXPECT_EQ(Marks(), (std::vector<bool>{false, false, false}));
+    EXPECT_EQ(Marks(), (std::vector<bool>{false, false, true}));
   }
 }
 

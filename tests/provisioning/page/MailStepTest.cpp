@@ -138,6 +138,25 @@ TEST_F(MailTiles, Under_the_mouse_are_painted_one_at_a_time_and_leave_the_marks_
   EXPECT_EQ(Marks(), (std::vector<bool>{true, true, true}));
 }
 
+TEST_F(MailTiles, Under_a_mouse_that_stays_are_painted_once) {
+  OpenWith(u"OE|MSO XP|");
+  desktop.MouseMove(mail.frsCon_lblMails[1]);
+  mailGrounds[1].Transparent = true;
+
+  desktop.MouseMove(mail.frsCon_lblMails[1]);
+
+  EXPECT_TRUE(Opaque(mailGrounds).empty());
+}
+
+TEST_F(MailTiles, Of_a_number_that_no_tile_has_paint_nothing) {
+  for (const std::int16_t tile : {std::int16_t{-2}, std::int16_t{5}, std::int16_t{32767}}) {
+    page.HoverMailRow(tile);
+    page.SelectMailRow(tile);
+    EXPECT_TRUE(Opaque(mailGrounds).empty());
+    EXPECT_TRUE(Green(mailGrounds).empty());
+  }
+}
+
 TEST_F(MailTiles, Lose_the_hover_between_them_too) {
   OpenWith(u"OE|MSO XP|");
   desktop.MouseMove(mail.frsCon_lblMails[1]);
@@ -160,6 +179,7 @@ TEST_F(MailTiles, Are_chosen_by_picture_and_caption_and_hide_the_mark_of_the_mai
 
       EXPECT_EQ(page.SelectedMail, static_cast<int>(tile)) << ToUtf8(part->Name());
       EXPECT_EQ(page.HoverMail, static_cast<int>(tile));
+      EXPECT_EQ(Opaque(mailGrounds), Rows{tile});
       EXPECT_EQ(Green(mailGrounds), Rows{tile});
       EXPECT_EQ(White(mailGrounds).size(), 4u);
       EXPECT_EQ(Marks(), (std::vector<bool>{true, true, false}));

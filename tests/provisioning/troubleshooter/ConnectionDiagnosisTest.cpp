@@ -51,6 +51,20 @@ TEST_F(Diagnosis, The_end_undoes_a_hook_that_is_still_known) {
   EXPECT_EQ(dun.HookedWindow, kNoWindow);
 }
 
+TEST_F(Diagnosis, A_second_check_leaves_the_red_line_of_the_first) {
+  FailWith("Home", 678);
+  ASSERT_EQ(form.lblDiagnoze.Caption(), kModemSilent);
+  machine.ras.Dial("Long").ThenError(720);
+  Pick("Long");
+
+  ClickCheck();
+  desktop.RunUntilIdle();
+
+  EXPECT_EQ(Findings().back(), u"שגיאה: 720 - כרגע לא בערכת התקלות המטופלות - פנה לתומך...");
+  EXPECT_EQ(form.lblDiagnoze.Caption(), kModemSilent);
+  EXPECT_TRUE(IsRed());
+}
+
 // 691.
 
 TEST_F(Diagnosis, A_real_refusal_makes_the_test_entry_and_finds_the_connection_still_open) {

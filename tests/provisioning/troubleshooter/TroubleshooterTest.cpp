@@ -92,6 +92,21 @@ TEST_F(Check, Hangs_up_before_a_simulated_number_too) {
   EXPECT_TRUE(machine.ras.Dials.empty());
 }
 
+TEST_F(Check, Remote_access_that_goes_between_opening_and_check_ends_in_no_dial_and_a_disabled_button) {
+  Open();
+  Pick("Home");
+  machine.ras.IsThere = false;
+
+  ClickCheck();
+  desktop.RunUntilIdle();
+
+  EXPECT_TRUE(machine.ras.Connections().empty());
+  EXPECT_EQ(dun.ActiveRasConn, platform::kNoRasConnection);
+  EXPECT_TRUE(desktop.Boxes.empty());
+  EXPECT_TRUE(Lines().empty());
+  EXPECT_FALSE(form.cmdCheck.Enabled());
+}
+
 TEST_F(Check, Without_a_picked_entry_the_index_is_outside_the_names) {
   Open();
 
@@ -124,6 +139,17 @@ TEST_F(Check, A_text_that_is_no_number_is_of_the_wrong_type) {
   }
 }
 
+TEST_F(Check, A_text_that_is_no_number_has_hung_up_before_it_fails) {
+  machine.ras.Connect("Another");
+  Open();
+  Pick("Home");
+  form.txtEmunrateError.Value = u"abc";
+
+  EXPECT_EQ(FaultNumberOf([&] { troubleshooter.cmdCheck_Click(); }), 13);
+
+  EXPECT_TRUE(machine.ras.Connections().empty());
+}
+
 TEST_F(Check, A_number_beyond_32_bits_overflows) {
   Open();
   Pick("Home");
@@ -137,6 +163,15 @@ TEST_F(Check, A_simulated_number_is_rounded_and_may_have_blanks_around_it) {
   Simulate("Home", u" 719.6 ");
 
   EXPECT_EQ(Findings(), (std::vector<Text>{u"שגיאה: 720 - כרגע לא בערכת התקלות המטופלות - פנה לתומך..."}));
+}
+
+TEST_F(Check, A_number_half_way_goes_to_the_even_one) {
+  for (const auto& [text, even] :
+       {std::pair{u"719.5", u"720"}, std::pair{u"720.5", u"720"}, std::pair{u"721.5", u"722"}}) {
+    Simulate("Home", text);
+    EXPECT_EQ(Lines().front(), u"שגיאה: " + Text(even) + u" - כרגע לא בערכת התקלות המטופלות - פנה לתומך...");
+    desktop.Click(form.Command1);
+  }
 }
 
 TEST_F(Check, After_a_simulated_number_the_button_stays_disabled_until_the_form_opens_again) {
@@ -238,6 +273,27 @@ TEST_F(Check, A_change_that_comes_while_a_diagnosis_stands_in_a_box_waits_for_it
   EXPECT_EQ(boxes, 3);
   EXPECT_EQ(Lines().back(), u"פעולה: 8193 - מנותק או לא נכשל בחיבור");
   EXPECT_EQ(Findings().size(), 4u);
+}
+
+TEST_F(Check, A_change_that_arrives_through_the_window_while_a_box_stands_is_shown_after_it) {
+  FailWith("Home", 720);
+  machine.ras.Dial("Away").ThenError(678);
+  Pick("Away");
+  std::vector<Text> lastWhileABoxStands;
+  desktop.OnBox = [&] {
+    if (lastWhileABoxStands.empty()) desktop.PostMessage(form.Window(), dun.RasDialEventMessage, 8193, 0);
+    desktop.PumpOnce();
+    lastWhileABoxStands.push_back(Lines().back());
+  };
+
+  ClickCheck(); // the window's second dial: the hook is its own predecessor
+  desktop.RunUntilIdle();
+
+  EXPECT_EQ(lastWhileABoxStands, std::vector<Text>(3, u"שגיאה: 678 - מטפל..."));
+  const Text told = u"פעולה: 8193 - מנותק או לא נכשל בחיבור";
+  const std::vector<Text> lines = Lines();
+  EXPECT_EQ(lines.back(), told);
+  EXPECT_EQ(std::count(lines.begin(), lines.end(), told), 1);
 }
 
 TEST_F(Check, A_second_error_that_comes_while_a_box_stands_is_diagnosed_after_the_first) {
