@@ -3,8 +3,8 @@
 #include "platform/linux/remote_access/DialParamsImage.h"
 #include "platform/linux/remote_access/DialParamsStore.h"
 #include "platform/linux/remote_access/RasErrorTexts.h"
-#include "platform/linux/remote_access/RecordList.h"
 #include "platform/process/SystemErrors.h"
+#include "platform/remote_access/RecordList.h"
 
 #include <unistd.h>
 

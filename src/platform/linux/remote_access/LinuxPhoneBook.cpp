@@ -5,9 +5,9 @@
 #include "platform/linux/remote_access/DialParamsStore.h"
 #include "platform/linux/remote_access/DialSettings.h"
 #include "platform/linux/remote_access/EntrySettings.h"
-#include "platform/linux/remote_access/RecordList.h"
 #include "platform/linux/remote_access/RemoteDevices.h"
 #include "platform/process/SystemErrors.h"
+#include "platform/remote_access/RecordList.h"
 #include "runtime/Text.h"
 
 namespace quendra::platform::linux_ {

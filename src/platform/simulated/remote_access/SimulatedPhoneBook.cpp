@@ -8,11 +8,6 @@ namespace {
 
 bool IsEmpty(const char* text) { return !text || *text == '\0'; }
 
-/// A buffer may be empty, to ask for the size; otherwise its first word tells the record's size.
-bool HasSizeOrNothing(const RecordList& list, std::uint32_t size) {
-  return list.buffer.empty() || list.StatedSize() == size;
-}
-
 } // namespace
 
 std::uint32_t SimulatedRemoteAccess::RasEnumEntriesA(const char* phoneBook, std::span<std::uint8_t> names,
@@ -20,7 +15,7 @@ std::uint32_t SimulatedRemoteAccess::RasEnumEntriesA(const char* phoneBook, std:
   count = 0;
   if (const auto error = Enter("RasEnumEntriesA", phoneBook)) return error;
   RecordList list{names, bytes, count};
-  if (!HasSizeOrNothing(list, RasEntryName::kBytes)) return kRasInvalidSize;
+  if (!list.States(RasEntryName::kBytes)) return kRasInvalidSize;
   return list.Fill(RasEntryName::kBytes, book_.All().size(), [this](std::size_t i, auto record) {
     PutTextAt(record, RasEntryName::kName, RasEntryName::kNameBytes, book_.All()[i].name);
   });
@@ -103,7 +98,7 @@ std::uint32_t SimulatedRemoteAccess::RasEnumDevicesA(std::span<std::uint8_t> dev
   count = 0;
   if (const auto error = Enter("RasEnumDevicesA")) return error;
   RecordList list{devices, bytes, count};
-  if (!HasSizeOrNothing(list, RasDeviceInfo::kBytes)) return kRasInvalidSize;
+  if (!list.States(RasDeviceInfo::kBytes)) return kRasInvalidSize;
   return list.Fill(RasDeviceInfo::kBytes, Devices.size(), [this](std::size_t i, auto record) {
     PutTextAt(record, RasDeviceInfo::kType, RasDeviceInfo::kTypeBytes, Devices[i].type);
     PutTextAt(record, RasDeviceInfo::kName, RasDeviceInfo::kNameBytes, Devices[i].name);

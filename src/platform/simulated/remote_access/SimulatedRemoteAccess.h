@@ -1,10 +1,10 @@
 #pragma once
 
 #include "platform/remote_access/PhoneBook.h"
+#include "platform/remote_access/RecordList.h"
 #include "platform/simulated/SimulatedCore.h"
 #include "platform/simulated/remote_access/EntryBook.h"
 #include "platform/simulated/remote_access/RasRefusals.h"
-#include "platform/simulated/remote_access/RecordList.h"
 #include "platform/simulated/remote_access/SimulatedDials.h"
 
 #include <optional>
