@@ -1,7 +1,7 @@
 #!/usr/bin/python3
-"""Types every key of the keyboard, plain and with Shift, into the user name of the first connection on a virtual display,
-once with the English and once with the Hebrew layout, and compares what arrives with what shall. Ends non-zero when a key
-differs.
+"""Types every key of the keyboard, plain and with Shift, into the boxes of the first connection whose keys are mended, on a
+virtual display, once with the English and once with the Hebrew layout, and compares what arrives with what shall. Ends
+non-zero when a key differs.
 
     layouts.py PROGRAM"""
 
@@ -18,6 +18,8 @@ from accessible import Program, wait_for
 from walk import Walk
 
 FIELD, MARK = "frsCon_txtUsername", "frsCon_lblError(0)"
+PASSWORD, MAIL_NAME = "frsCon_txtPassword", "frsCon_txtEmailUN"
+MENU, CONNECTION_STEP, MAIL_STEP = "lblCaption(2)", "frsCon_lblCaption(1)", "frsCon_lblCaption(0)"
 
 # Keys by the codes of the X server, row by row, named by what they bear on a Latin keyboard.
 ROWS = ((10, "1234567890-="), (24, "qwertyuiop[]"), (38, "asdfghjkl;'`"), (51, "\\zxcvbnm,./"), (65, " "))
@@ -40,17 +42,20 @@ def expected(layout, key, shift):
 
 
 class Typist:
-    """At the field, which is empty and without a mark between one press and the next."""
+    """At a field, which is empty between one press and the next, and the user name without a mark too."""
 
-    def __init__(self, program):
+    def __init__(self, program, name=FIELD):
         self.program = program
-        self.field = program.control(FIELD)
+        self.field = program.control(name)
+        self.is_secret = name == PASSWORD
 
     def press(self, *strokes):
         stage.run("xdotool", "key", *strokes)
 
     def typed(self):
-        return self.field.get_text(0, self.field.get_character_count())
+        """Of a password nobody learns more than its length."""
+        length = self.field.get_character_count()
+        return "*" * length if self.is_secret else self.field.get_text(0, length)
 
     def is_marked(self):
         return self.program.find(MARK) is not None
@@ -61,6 +66,7 @@ class Typist:
 
     def type_all(self, strokes, wanted):
         """Every key in a row; gives what is wrong, a sentence or nothing."""
+        wanted = "*" * len(wanted) if self.is_secret else wanted
         self.press(*strokes)
         right = soon(lambda: self.typed() == wanted)
         said = self.typed()
@@ -85,17 +91,47 @@ def stroke(key, shift):
     return f"shift+{KEYS[key]}" if shift else str(KEYS[key])
 
 
-def type_layout(program, layout):
+def set_layout(layout):
     stage.run("setxkbmap", "-layout", layout)
     time.sleep(0.5)  # until the program has heard of it
+
+
+def type_all(program, layout, field):
+    """All keys into that field, where the focus is."""
+    wrong = []
+    for shift in (False, True):
+        wanted = "".join(expected(layout, key, shift) for key in KEYS)
+        wrong += Typist(program, field).type_all([stroke(key, shift) for key in KEYS], wanted)
+    return [f"layout {layout}, {field}: {sentence}" for sentence in wrong]
+
+
+def type_refused(program, layout):
+    """Each key that the user name refuses by itself, for its mark."""
     typist = Typist(program)
     wrong = []
     for shift in (False, True):
-        results = {key: expected(layout, key, shift) for key in KEYS}
-        wrong += typist.type_all([stroke(key, shift) for key in KEYS], "".join(results.values()))
-        for key in (key for key, result in results.items() if not result):
+        for key in (key for key in KEYS if not expected(layout, key, shift)):
             wrong += typist.type_refused(stroke(key, shift), key)
     return [f"layout {layout}: {sentence}" for sentence in wrong]
+
+
+def go_to(program, walk, *controls):
+    for control in controls:
+        program.control(control)
+        time.sleep(0.5)  # a window that has just come up loses the first click
+        walk.click(control)
+
+
+def type_into_each(program, walk):
+    wrong = []
+    for step, field in ((CONNECTION_STEP, FIELD), (CONNECTION_STEP, PASSWORD), (MAIL_STEP, MAIL_NAME)):
+        go_to(program, walk, step, field)
+        for layout in PLAIN:
+            set_layout(layout)
+            wrong += type_all(program, layout, field)
+            wrong += type_refused(program, layout) if field == FIELD else []
+        go_to(program, walk, "frsCon_lblBack")
+    return wrong
 
 
 def perform(command):
@@ -104,11 +140,8 @@ def perform(command):
         child = stack.enter_context(stage.started([command]))
         program = Program(child.pid)
         walk = Walk(program, None)
-        for control in ("Label2", "lblCaption(2)", "frsCon_lblCaption(1)", FIELD):
-            program.control(control)
-            time.sleep(0.5)  # a window that has just come up loses the first click
-            walk.click(control)
-        return type_layout(program, "us") + type_layout(program, "il")
+        go_to(program, walk, "Label2", MENU)
+        return type_into_each(program, walk)
 
 
 def main():
@@ -118,7 +151,7 @@ def main():
         wrong = [str(fault)]
     for sentence in wrong:
         print(f"layouts: WRONG: {sentence}")
-    print(f"layouts: {len(KEYS)} keys, plain and with Shift, in two layouts: {'failed' if wrong else 'all as they shall be'}")
+    print(f"layouts: {len(KEYS)} keys, plain and with Shift, in two layouts and three boxes: {'failed' if wrong else 'all as they shall be'}")
     return 1 if wrong else 0
 
 

@@ -1,6 +1,8 @@
 #include "platform/PassedOnSystem.h"
 #include "provisioning/remote_access/MdlDunFixture.h"
 
+#include <array>
+
 namespace quendra::provisioning {
 namespace {
 
@@ -134,6 +136,27 @@ struct FaultySystem : MdlDunErrors {
   Faulty faulty{machine.system};
   mdlDun dunOfIt{{ras, ras}, faulty, desktop};
 };
+
+struct SystemWithTexts : MdlDunErrors {
+  /// Keeps how it was asked for a text.
+  struct Asked : platform::PassedOnSystem {
+    using PassedOnSystem::PassedOnSystem;
+    std::uint32_t FormatMessageA(std::uint32_t flags, std::uint32_t number, std::uint32_t language,
+                                 std::span<char> buffer) override {
+      calls.push_back({flags, number, language, static_cast<std::uint32_t>(buffer.size())});
+      return PassedOnSystem::FormatMessageA(flags, number, language, buffer);
+    }
+    std::vector<std::array<std::uint32_t, 4>> calls;
+  };
+  Asked asked{machine.system};
+  mdlDun dunOfIt{{ras, ras}, asked, desktop};
+};
+
+TEST_F(SystemWithTexts, A_text_of_the_system_is_asked_for_in_no_language_with_room_for_512) {
+  EXPECT_EQ(dunOfIt.ReportRasError(600, u"RasDial", kTrue16), kTrue16);
+
+  EXPECT_EQ(asked.calls, (std::vector<std::array<std::uint32_t, 4>>{{0x1000, 600, 0, 512}}));
+}
 
 TEST_F(FaultySystem, A_fault_while_the_version_is_read_is_told_in_words_of_its_own) {
   std::int32_t code = 77;

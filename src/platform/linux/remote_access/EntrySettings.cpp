@@ -101,8 +101,8 @@ ConstImage AlternatesOf(ConstImage image) {
   if (offset < RasEntry::kBytes || offset >= image.size()) return {};
   const auto rest = image.subspan(offset);
   constexpr std::array<std::uint8_t, 2> kEnd{};
-  const auto end = std::ranges::search(rest, kEnd).end();
-  return rest.first(static_cast<std::size_t>(end - rest.begin()));
+  const auto end = std::search(rest.begin(), rest.end(), kEnd.begin(), kEnd.end());
+  return rest.first(std::min(rest.size(), static_cast<std::size_t>(end - rest.begin()) + kEnd.size()));
 }
 
 /// A connection that changes its kind keeps nothing of the former.

@@ -3,6 +3,7 @@
 #include <signal.h>
 
 #include <chrono>
+#include <cstdio>
 
 namespace quendra::platform::linux_ {
 
@@ -166,6 +167,29 @@ TEST_F(ScriptedDialTest, A_manager_that_never_answers_does_not_hold_up_a_window)
   EXPECT_EQ(Dial("097"), 0U);
   EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(1));
   EXPECT_EQ(Names(), (std::vector<std::string>{"097", "tunnel"}));
+}
+
+TEST_F(ScriptedDialTest, A_dial_of_thirty_seconds_with_a_window_leaves_the_program_alive) {
+  using Clock = std::chrono::steady_clock;
+  auto lastTick = Clock::now();
+  Clock::duration longestGap{};
+  const auto ticks = loop.StartTimer(20, [&] {
+    longestGap = std::max(longestGap, Clock::now() - lastTick);
+    lastTick = Clock::now();
+  });
+  const auto begun = Clock::now();
+  BeginDial("097");
+  Play("device 40 0, device 50 0");
+  Child later({"/bin/sh", "-c", "sleep 30; " + PlayCommand("device 100 0, active 2 1")});
+  EXPECT_TRUE(loop.WaitFor(
+      [&] { return !loop.changes.empty() && loop.changes.back().first == kRasConnected; }, 60'000));
+  EXPECT_GE(Clock::now() - begun, std::chrono::seconds(30));
+  EXPECT_LT(longestGap, std::chrono::seconds(1));
+  EXPECT_EQ(loop.changes,
+            (Changes{{kRasOpenPort, 0}, {kRasPortOpened, 0}, {kRasConnectDevice, 0}, {kRasConnected, 0}}));
+  const auto spread = std::chrono::duration<double>(longestGap).count();
+  RecordProperty("longest_gap_in_seconds", std::to_string(spread));
+  std::printf("longest time between two ticks of 20 ms: %.3f s\n", spread);
 }
 
 TEST_F(ScriptedDialTest, User_name_and_password_of_a_dial_are_kept) {
