@@ -1,6 +1,6 @@
 #!/usr/bin/python3
 """Walks through the program on virtual screens of several sizes, each with a window manager and room for a panel at the
-lower edge. Leaves pictures of the splash, the home page, the three pages, the panel that traces and every dialog in
+lower edge. Leaves pictures of the splash, the home page, the pages with their steps, the panel that traces and every dialog in
 build/screens/WIDTHxHEIGHT[@SCALE] and ends non-zero when a window, its frame included, lies outside the usable screen.
 
     screens.py [WIDTHxHEIGHT[@SCALE]...]        without a size: all of them"""
@@ -15,6 +15,7 @@ import time
 from gi.repository import GLib
 
 import cast
+import connection
 import dialogs
 import stage
 import surf
@@ -28,7 +29,9 @@ SIZES = (
     *("3840x2160", "3840x2160@2"),
 )
 PANEL = 40
-SECONDS = 110
+SECONDS = 150
+SECOND_CARD = "ip link add qcard0 type veth peer name qcard1 && ip address add 10.8.0.1/24 dev qcard0 && ip link set qcard0 up"
+NO_MANAGER, FAILED = "Error Number = 711", "נכשל!"
 
 
 class CheckedWalk(Walk):
@@ -59,6 +62,28 @@ def frame_of(window):
     return left - before, top - above, left + width + after, top + height + below
 
 
+def connect_without_manager(walk):
+    """The troubleshooter and, where cards are those of a namespace, their list: both stand without remote access, too."""
+    boxes = connection.Boxes(walk)
+    walk.click("lblCaption(2)")
+    walk.click("frsCon_lblConnectProb")
+    boxes.press(NO_MANAGER, "trouble-without-manager")
+    boxes.press(FAILED, "trouble-failed")
+    walk.program.control("cmdCheck")
+    walk.picture("trouble")
+    walk.click("Command1")
+    if os.geteuid() != 0:
+        return
+    walk.click("frsCon_lblCaption(1)")
+    step = connection.ConnectionStep(walk, None)
+    step.fill()
+    walk.click(f"frsCon_lblModems({connection.BY_VPN})")
+    walk.click("frsCon_cmdCreate")
+    step.choose_card()
+    boxes.press(NO_MANAGER, "creation-without-manager")
+    boxes.press(FAILED, "creation-failed")
+
+
 def walk_through(walk):
     walk.splash()
     walk.home()
@@ -74,6 +99,7 @@ def walk_through(walk):
         trace.TraceStep(walk).take(trace.Route([], ["127.0.0.1"]))
     walk.click("surf_lblBack")
     walk.first_connection()
+    connect_without_manager(walk)
     walk.close()
     return walk.wrong
 
@@ -90,10 +116,12 @@ def show(size):
         tour.set_scene(stack, width, height, PANEL)
         surf.fill_cache()
         os.environ["QT_SCALE_FACTOR"] = str(scale)
+        os.environ["DBUS_SYSTEM_BUS_ADDRESS"] = "unix:path=/nowhere"  # nothing is asked of this machine's network manager
         command = [tour.PROGRAM]
         if os.geteuid() == 0:
             here, there = stack.enter_context(stage.linked_namespaces())
             cast.start_traffic(stack, {"here": here, "there": there})
+            stage.run(*stage.in_namespace(here, "sh", "-c", SECOND_CARD))
             command = stage.in_namespace(here, *command)
         child = stack.enter_context(stage.started(command))
         walk = CheckedWalk(Program(child.pid), folder, scale, (width, height - PANEL))
