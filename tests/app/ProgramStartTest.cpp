@@ -6,7 +6,6 @@
 
 #include <cstdlib>
 #include <fstream>
-#include <sstream>
 #include <string>
 #include <vector>
 
@@ -31,12 +30,9 @@ class StartedProgram {
 
   /// The toolkit's plugin for screens that the program has loaded, asked for ten seconds at most.
   std::string ScreenPlugin() {
-    for (int i = 0; i < 1000 && !HasEnded(); ++i, ::usleep(10'000)) {
-      std::ostringstream maps;
-      maps << std::ifstream("/proc/" + std::to_string(id_) + "/maps").rdbuf();
+    for (int i = 0; i < 1000 && !HasEnded(); ++i, ::usleep(10'000))
       for (const char* plugin : {"offscreen", "minimal", "xcb"})
-        if (maps.str().find(std::string("/libq") + plugin + ".so") != std::string::npos) return plugin;
-    }
+        if (Executes(std::string("/libq") + plugin + ".so")) return plugin;
     return ended_ ? "ended" : "none";
   }
 
@@ -52,6 +48,13 @@ class StartedProgram {
     pointers.push_back(nullptr);
     ::execv(pointers[0], pointers.data());
     ::_exit(127);
+  }
+  /// Of others the toolkit reads what they are for, and maps them for a moment, but not to be executed.
+  bool Executes(const std::string& library) const {
+    std::ifstream maps("/proc/" + std::to_string(id_) + "/maps");
+    for (std::string line; std::getline(maps, line);)
+      if (line.find(" r-xp ") != std::string::npos && line.find(library) != std::string::npos) return true;
+    return false;
   }
   bool HasEnded() {
     if (!ended_) ended_ = ::waitpid(id_, nullptr, WNOHANG) != 0;
