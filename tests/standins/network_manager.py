@@ -3,11 +3,12 @@
 
     network_manager.py LOG
 
-LOG gets the line "ready" once it can be asked, and a line for each question that changes something: never a
-secret. It dials as it is told: org.quendra.Script.Play at /script takes steps, separated by commas, each
+LOG gets the line "ready" once it can be asked, and a line for each question that changes something or tells secrets:
+never a secret. It dials as it is told: org.quendra.Script.Play at /script takes steps, separated by commas, each
 "device STATE REASON", "vpn STATE REASON" or "active STATE REASON" of the latest connection, or "forget". Other
 steps change its answers: "refuse METHOD ERROR" until "allow METHOD", and "hold METHOD", after which it does what it
-is asked and answers at "release".
+is asked, writes "held METHOD" into LOG, and answers at "release". "change NUMBER SETTING KEY TEXT" is what another
+program changes in a connection.
 """
 
 import signal
@@ -23,7 +24,7 @@ ROOT = "/org/freedesktop/NetworkManager"
 DEVICE = ROOT + "/Devices/1"
 NOT_ACTIVE = NAME + ".ConnectionNotActive"
 
-INTERFACES = """<node>
+INTERFACES = Gio.DBusNodeInfo.new_for_xml("""<node>
 <interface name="org.freedesktop.NetworkManager">
 <method name="GetDevices"><arg type="ao" direction="out"/></method>
 <method name="ActivateConnection"><arg type="o" direction="in"/><arg type="o" direction="in"/>
@@ -58,7 +59,7 @@ INTERFACES = """<node>
 <signal name="VpnStateChanged"><arg type="u"/><arg type="u"/></signal>
 </interface>
 <interface name="org.quendra.Script"><method name="Play"><arg type="s" direction="in"/></method></interface>
-</node>"""
+</node>""")
 
 
 class Refusal(Exception):
@@ -85,9 +86,9 @@ class Manager:
         self.export("/script", "org.quendra.Script")
 
     def export(self, path, name):
-        interface = Gio.DBusNodeInfo.new_for_xml(INTERFACES).lookup_interface(name)
+        # Without a function for properties, the questions for them come as any others.
         self.ids.setdefault(path, []).append(
-            self.bus.register_object(path, interface, self.on_call, self.on_get, None))
+            self.bus.register_object(path, INTERFACES.lookup_interface(name), self.on_call, None, None))
 
     def drop(self, path):
         for number in self.ids.pop(path, []):
@@ -102,13 +103,14 @@ class Manager:
                 raise Refusal(self.refusals[method])
             answer = getattr(self, "do_" + method)(path, parameters)
             if method in self.held:
+                self.tell("held " + method)
                 self.waiting.append((invocation, answer))
             else:
                 invocation.return_value(answer)
         except Refusal as refusal:
             invocation.return_dbus_error(str(refusal), "refused")
 
-    def on_get(self, _bus, _sender, path, _interface, name):
+    def value_of(self, path, name):
         active = self.active.get(path, {})
         return {
             "ActiveConnections": lambda: GLib.Variant("ao", list(self.active)),
@@ -121,6 +123,13 @@ class Manager:
             "Vpn": lambda: GLib.Variant("b", active["vpn"]),
             "State": lambda: GLib.Variant("u", active.get("state", self.device_state)),
         }[name]()
+
+    def do_Get(self, path, parameters):
+        return GLib.Variant("(v)", (self.value_of(path, parameters.unpack()[1]),))
+
+    def do_GetAll(self, path, parameters):
+        properties = INTERFACES.lookup_interface(parameters.unpack()[0]).properties
+        return GLib.Variant("(a{sv})", ({one.name: self.value_of(path, one.name) for one in properties},))
 
     # Settings.
 
@@ -154,7 +163,8 @@ class Manager:
     def do_GetSettings(self, path, _parameters):
         return GLib.Variant("(a{sa{sv}})", (self.settings[path],))
 
-    def do_GetSecrets(self, path, parameters):
+    def do_GetSecrets(self, path, _parameters):
+        self.tell("GetSecrets " + self.settings[path]["connection"]["id"].get_string())
         return GLib.Variant("(a{sa{sv}})", (self.secrets.get(path, {}),))
 
     def do_Update(self, path, parameters):
@@ -220,6 +230,8 @@ class Manager:
             waiting, self.waiting, self.held = self.waiting, [], set()
             for invocation, answer in waiting:
                 invocation.return_value(answer)
+        elif kind == "change":
+            self.settings[ROOT + "/Settings/" + words[0]][words[1]][words[2]] = GLib.Variant("s", words[3])
         elif kind == "device":
             old, self.device_state = self.device_state, numbers[0]
             self.emit(DEVICE, ".Device", "StateChanged", "(uuu)", numbers[0], old, numbers[1])

@@ -111,7 +111,8 @@ class RasTest : public testing::Test {
     return devices;
   }
   /// Entry names of the connections that stand, and their handles.
-  std::vector<std::pair<std::string, RasConnection>> Connections() {
+  std::vector<std::pair<std::string, RasConnection>> Connections() { return ConnectionsOf(dialling); }
+  static std::vector<std::pair<std::string, RasConnection>> ConnectionsOf(Dialling& dialling) {
     std::uint32_t bytes = RasConnectionRecord::kBytes, count = 0;
     Bytes records(bytes);
     PutLittle32(records, 0, bytes);

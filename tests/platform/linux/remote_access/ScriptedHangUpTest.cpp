@@ -8,7 +8,20 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-using ScriptedHangUpTest = ScriptedManagerTest;
+struct ScriptedHangUpTest : ScriptedManagerTest {
+  void ConnectTo(const char* name) {
+    BeginDial(name);
+    Play("device 100 0, active 2 1");
+    ASSERT_TRUE(Comes(kRasConnected, 0));
+  }
+};
+
+struct OtherProgram {
+  forms::headless::PolledDesktop loop{};
+  NetworkManagerBus connection{loop, loop};
+  ConnectionBook book{connection};
+  LinuxDialling dialling{book, connection, loop};
+};
 
 } // namespace
 
@@ -38,22 +51,17 @@ TEST_F(ScriptedHangUpTest, A_handle_may_be_hung_up_again_also_when_its_line_has_
 }
 
 TEST_F(ScriptedHangUpTest, A_second_client_sees_the_connection_and_ends_it) {
-  BeginDial("097");
-  Play("device 100 0, active 2 1");
-  ASSERT_TRUE(Comes(kRasConnected, 0));
-  forms::headless::PolledDesktop otherLoop;
-  NetworkManagerBus otherConnection(otherLoop, otherLoop);
-  ConnectionBook otherBook(otherConnection);
-  LinuxDialling other(otherBook, otherConnection, otherLoop);
+  ConnectTo("097");
+  OtherProgram other;
   Bytes record(RasConnectionRecord::kBytes);
   PutLittle32(record, 0, RasConnectionRecord::kBytes);
   std::uint32_t bytes = RasConnectionRecord::kBytes, count = 0;
-  ASSERT_EQ(other.RasEnumConnectionsA(record, bytes, count), 0U);
+  ASSERT_EQ(other.dialling.RasEnumConnectionsA(record, bytes, count), 0U);
   ASSERT_EQ(count, 1U);
   EXPECT_EQ(TextAt(record, RasConnectionRecord::kEntryName), "097");
   EXPECT_EQ(TextAt(record, RasConnectionRecord::kDeviceType), "pppoe");
 
-  EXPECT_EQ(other.RasHangUpA(RasConnection(Little32(record, RasConnectionRecord::kHandle))), 0U);
+  EXPECT_EQ(other.dialling.RasHangUpA(RasConnection(Little32(record, RasConnectionRecord::kHandle))), 0U);
 
   EXPECT_TRUE(Comes(kRasDisconnected, kRasUserDisconnection));
   EXPECT_EQ(Connections().size(), 0U);
@@ -81,17 +89,11 @@ TEST_F(ScriptedHangUpTest, A_line_of_another_program_that_may_not_be_hung_up_kee
   BeginDial("097");
   Play("device 100 0, active 2 1, refuse DeactivateConnection "
        "org.freedesktop.NetworkManager.PermissionDenied");
-  forms::headless::PolledDesktop otherLoop;
-  NetworkManagerBus otherConnection(otherLoop, otherLoop);
-  ConnectionBook otherBook(otherConnection);
-  LinuxDialling other(otherBook, otherConnection, otherLoop);
-  Bytes record(RasConnectionRecord::kBytes);
-  PutLittle32(record, 0, RasConnectionRecord::kBytes);
-  std::uint32_t bytes = RasConnectionRecord::kBytes, count = 0;
-  ASSERT_EQ(other.RasEnumConnectionsA(record, bytes, count), 0U);
-  const RasConnection theirs(Little32(record, RasConnectionRecord::kHandle));
-  EXPECT_EQ(other.RasHangUpA(theirs), kAccessDenied);
-  EXPECT_EQ(other.RasHangUpA(theirs), kAccessDenied);
+  OtherProgram other;
+  const auto theirs = ConnectionsOf(other.dialling);
+  ASSERT_EQ(theirs.size(), 1U);
+  EXPECT_EQ(other.dialling.RasHangUpA(theirs.front().second), kAccessDenied);
+  EXPECT_EQ(other.dialling.RasHangUpA(theirs.front().second), kAccessDenied);
 }
 
 TEST_F(ScriptedHangUpTest, A_line_whose_manager_has_gone_can_be_hung_up) {

@@ -3,6 +3,9 @@
 #include "platform/linux/remote_access/RasFixture.h"
 #include "platform/linux/system/Files.h"
 
+#include <sys/socket.h>
+#include <sys/un.h>
+
 #include <filesystem>
 
 namespace quendra::platform::linux_ {
@@ -43,13 +46,32 @@ struct ScriptedManagerTest : RasTest {
   }
   /// A process that does that once the manager is at a dial.
   std::vector<std::string> OnceItDials(const std::string& command) {
+    return Once("ActivateConnection", command);
+  }
+  /// The same once the manager has written that.
+  std::vector<std::string> Once(const std::string& written, const std::string& command) {
     return {"/bin/sh", "-c",
-            "while ! grep -q ActivateConnection " + (bus.folder / "asked") + "; do sleep 0.05; done; " +
+            "while ! grep -q '" + written + "' " + (bus.folder / "asked") + "; do sleep 0.05; done; " +
                 command};
+  }
+  /// How often the manager has written that line.
+  std::size_t CountAsked(const std::string& line) {
+    return static_cast<std::size_t>(std::ranges::count(Split(Asked(), '\n'), line));
   }
   void SpeakPpp() { std::filesystem::create_directory(kernel / "ppp"); }
   void Settle() {
     loop.WaitFor([] { return false; }, 50);
+  }
+
+  /// Ends this program's connections to the bus, as the bus does with a client that it can't bear.
+  void BreakConnections() {
+    for (int number = 3; number < 1024; ++number) {
+      sockaddr_un address{};
+      socklen_t size = sizeof address - 1;
+      if (::getpeername(number, reinterpret_cast<sockaddr*>(&address), &size) == 0 &&
+          address.sun_path == bus.folder / "bus")
+        ::shutdown(number, SHUT_RDWR);
+    }
   }
 
   PrivateBus bus;
