@@ -22,6 +22,9 @@ constexpr int kTickMilliseconds = 250;
 /// A bus lets each of its clients have so many open questions and no more; its own limit is 128.
 constexpr std::size_t kMostOpen = 64;
 
+constexpr const char* kBus = "org.freedesktop.DBus";
+constexpr std::string_view kNoOwner = "org.freedesktop.DBus.Error.NameHasNoOwner";
+
 constexpr std::array kRules{
     "type='signal',sender='org.freedesktop.DBus',member='NameOwnerChanged',"
     "arg0='org.freedesktop.NetworkManager'",
@@ -96,12 +99,32 @@ bool NetworkManagerBus::Open() {
       library_->LetsUsIn(opened, kSecond) && library_->set_method_call_timeout(opened, kSecond) >= 0;
   for (const char* rule : kRules)
     isUsable = isUsable && library_->add_match(opened, nullptr, rule, TakeSignal, this) >= 0;
-  if (!isUsable) {
+  if (!isUsable || !FindManager()) {
     bus_.reset();
     return false;
   }
   watch_ = descriptors_.WatchDescriptor(library_->get_fd(opened), [this] { HandleArrived(); });
   return true;
+}
+
+/// False when the bus doesn't tell.
+bool NetworkManagerBus::FindManager() {
+  manager_.clear();
+  BusFailure failure;
+  void* reply = nullptr;
+  const int told = library_->call_method(bus_.get(), kBus, "/org/freedesktop/DBus", kBus, "GetNameOwner",
+                                         &failure, &reply, "s", nm::kService);
+  const std::unique_ptr<void, void* (*)(void*)> message{reply, library_->message_unref};
+  const bool isNobody = failure.name && std::string_view(failure.name) == kNoOwner;
+  library_->error_free(&failure);
+  if (told < 0) return isNobody;
+  if (const auto owner = ReadValue(*library_, reply)) manager_ = owner->text;
+  return true;
+}
+
+const std::string& NetworkManagerBus::Manager() {
+  if (!IsOpen()) manager_.clear();
+  return manager_;
 }
 
 void NetworkManagerBus::Drop() {
@@ -114,6 +137,7 @@ void NetworkManagerBus::Drop() {
       pending->reply(BusAnswer());
   for (const auto& pending : lost) pending->slot.reset();
   bus_.reset();
+  manager_.clear();
   arrived_.push_back([this] {
     for (const auto& listener : listeners_) listener({.member = "NameOwnerChanged"});
   });
@@ -143,12 +167,20 @@ int NetworkManagerBus::TakeReply(void* message, void* context, BusFailure*) {
   return 0;
 }
 
+/// The bus hands on what any client sends to this one by name, whatever the rules say.
+bool NetworkManagerBus::IsBelieved(const BusSignal& signal, const char* sender) const {
+  return sender && sender == (signal.TellsOfAnotherManager() ? std::string_view(kBus) : manager_);
+}
+
 int NetworkManagerBus::TakeSignal(void* message, void* context, BusFailure*) {
   auto* bus = static_cast<NetworkManagerBus*>(context);
   const auto text = [](const char* from) { return std::string(from ? from : ""); };
   const BusSignal signal{text(bus->library_->message_get_path(message)),
                          text(bus->library_->message_get_interface(message)),
                          text(bus->library_->message_get_member(message)), bus->ValuesOf(message)};
+  if (!bus->IsBelieved(signal, bus->library_->message_get_sender(message))) return 0;
+  // Of its name, the former owner, the new one.
+  if (signal.TellsOfAnotherManager()) bus->manager_ = signal.values.size() == 3 ? signal.values[2].text : "";
   bus->arrived_.push_back([bus, signal] {
     for (const auto& listener : bus->listeners_) listener(signal);
   });

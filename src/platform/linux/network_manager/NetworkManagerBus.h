@@ -68,8 +68,12 @@ class NetworkManagerBus {
   void HandleArrived();
   /// Waits for something to come, that long at most, and hands it on.
   void Wait(std::uint64_t microseconds);
-  /// Hears of changes from now on, as long as this object lives.
+  /// Hears of changes from now on, as long as this object lives. Only NetworkManager itself is heard, and of
+  /// its coming and going the bus.
   void Listen(Listener listener);
+  /// Which NetworkManager it is: its own name on the bus, another one whenever it is started. Empty where
+  /// there is none.
+  const std::string& Manager();
 
  private:
   struct Pending;
@@ -79,6 +83,8 @@ class NetworkManagerBus {
 
   bool IsOpen();
   bool Open();
+  bool FindManager();
+  bool IsBelieved(const BusSignal& signal, const char* sender) const;
   void Drop();
   void Process();
   std::vector<BusAnswer> Await(const std::vector<BusQuestion>& questions, std::uint64_t patience);
@@ -91,6 +97,7 @@ class NetworkManagerBus {
   DescriptorWatch& descriptors_;
   std::optional<BusLibrary> library_;
   std::unique_ptr<void, void* (*)(void*)> bus_{nullptr, nullptr};
+  std::string manager_;
   std::vector<std::unique_ptr<Pending>> pending_;
   std::deque<std::function<void()>> arrived_;
   std::vector<Listener> listeners_;

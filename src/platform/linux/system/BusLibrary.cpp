@@ -31,6 +31,7 @@ bool BusLibrary::FindMessages() {
          library_.Find("sd_bus_message_enter_container", message_enter_container) &&
          library_.Find("sd_bus_message_exit_container", message_exit_container) &&
          library_.Find("sd_bus_message_get_error", message_get_error) &&
+         library_.Find("sd_bus_message_get_sender", message_get_sender) &&
          library_.Find("sd_bus_message_get_path", message_get_path) &&
          library_.Find("sd_bus_message_get_interface", message_get_interface) &&
          library_.Find("sd_bus_message_get_member", message_get_member) &&

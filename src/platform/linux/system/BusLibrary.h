@@ -50,6 +50,7 @@ struct BusLibrary {
   int (*message_enter_container)(Object* message, char type, const char* contents) = nullptr;
   int (*message_exit_container)(Object* message) = nullptr;
   const BusFailure* (*message_get_error)(Object* message) = nullptr;
+  const char* (*message_get_sender)(Object* message) = nullptr;
   const char* (*message_get_path)(Object* message) = nullptr;
   const char* (*message_get_interface)(Object* message) = nullptr;
   const char* (*message_get_member)(Object* message) = nullptr;
