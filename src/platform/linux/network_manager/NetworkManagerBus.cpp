@@ -235,13 +235,18 @@ std::vector<BusAnswer> NetworkManagerBus::Await(const std::vector<BusQuestion>& 
   std::vector<BusAnswer> answers(questions.size());
   const auto end = Time::now() + std::chrono::microseconds(patience);
   std::size_t started = 0, done = 0;
-  while (done < questions.size()) {
-    while (started < questions.size() && started - done < kMostOpen) {
+  // False where nobody is there: each further question would take as long to find that out.
+  const auto startMore = [&] {
+    while (started < questions.size() && started - done < kMostOpen && LeftUntil(end) > 0) {
       const std::size_t at = started++;
       const auto kind = Start(
           questions[at], [&, at](const BusAnswer& answer) { answers[at] = answer, ++done; }, false, patience);
-      if (kind != BusAnswer::Kind::Given) answers[at].kind = kind, ++done;
+      if (kind == BusAnswer::Kind::NobodyThere) return false;
+      if (kind == BusAnswer::Kind::Refused) answers[at].kind = kind, ++done;
     }
+    return true;
+  };
+  while (done < questions.size() && startMore()) {
     Process();
     const std::uint64_t left = LeftUntil(end);
     if (left == 0) break;

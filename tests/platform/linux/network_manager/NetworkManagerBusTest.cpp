@@ -1,6 +1,9 @@
 #include "platform/linux/network_manager/NetworkManagerBus.h"
 
 #include "platform/linux/remote_access/ScriptedManagerFixture.h"
+#include "platform/linux/system/Descriptor.h"
+
+#include <chrono>
 
 namespace quendra::platform::linux_ {
 
@@ -27,6 +30,24 @@ struct NetworkManagerBusTest : ScriptedManagerTest {
     Play("device 40 0");
     ASSERT_TRUE(Comes(kRasPortOpened, 0));
   }
+};
+
+/// A bus that takes clients and says nothing to them.
+class SilentBus {
+ public:
+  SilentBus() {
+    sockaddr_un address{};
+    address.sun_family = AF_UNIX;
+    (folder_ / "bus").copy(address.sun_path, sizeof address.sun_path - 1);
+    EXPECT_EQ(::bind(socket_.Number(), reinterpret_cast<const sockaddr*>(&address), sizeof address), 0);
+    EXPECT_EQ(::listen(socket_.Number(), 100), 0);
+    environment_.Set("DBUS_SYSTEM_BUS_ADDRESS", "unix:path=" + (folder_ / "bus"));
+  }
+
+ private:
+  TemporaryFolder folder_;
+  Environment environment_;
+  Descriptor socket_{::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0)};
 };
 
 } // namespace
@@ -61,6 +82,17 @@ TEST_F(NetworkManagerBusTest, A_manager_is_heard_on_a_new_way_to_it) {
   ASSERT_TRUE(Comes(kRasPortOpened, kRasManagerCannotStart));
   BeginDialOf("097");
   GoesOn();
+}
+
+TEST(NetworkManagerBus, A_silent_bus_holds_many_questions_up_as_long_as_one) {
+  const SilentBus silent;
+  forms::headless::PolledDesktop loop;
+  NetworkManagerBus bus(loop, loop);
+  const auto start = std::chrono::steady_clock::now();
+  const auto answers = bus.AskAll(std::vector<BusQuestion>(6, {"/", "org.quendra.Script", "Play"}));
+  EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(3));
+  ASSERT_EQ(answers.size(), 6U);
+  for (const BusAnswer& answer : answers) EXPECT_EQ(answer.kind, BusAnswer::Kind::NobodyThere);
 }
 
 } // namespace quendra::platform::linux_
