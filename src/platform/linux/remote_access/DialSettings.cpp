@@ -109,6 +109,7 @@ bool PutOtherSecrets(NetworkSettings& settings, LineKind kind, const NetworkSett
 void PutPassword(NetworkSettings& settings, LineKind kind, const NetworkSettings& secrets,
                  const std::string& password) {
   PutOtherSecrets(settings, kind, secrets);
+  if (password.empty()) return;
   if (kind == LineKind::Pppoe) {
     PutText(settings, "pppoe", "password", password);
     settings["pppoe"].erase("password-flags");

@@ -13,7 +13,8 @@ void PutDialParams(NetworkSettings& settings, LineKind kind, std::span<const std
 const char* SecretSettingOf(LineKind kind);
 /// As NetworkManager tells secrets; empty where there is none. UTF-8.
 std::string PasswordIn(const NetworkSettings& secrets, LineKind kind);
-/// Puts the password among the secrets that the connection has, to be kept by NetworkManager itself.
+/// Puts the password among the secrets that the connection has, to be kept by NetworkManager itself. An empty
+/// one leaves the others.
 void PutPassword(NetworkSettings& settings, LineKind kind, const NetworkSettings& secrets,
                  const std::string& password);
 /// Puts the secrets without the password. False where there are no others.

@@ -152,6 +152,10 @@ TEST(DialSettings, A_password_that_goes_leaves_the_other_secrets_of_its_connecti
   EXPECT_TRUE(PutOtherSecrets(line, LineKind::Pppoe, ofLine));
   EXPECT_EQ(TextIn(line, "802-1x", "password"), "kept");
   EXPECT_EQ(TextIn(line, "pppoe", "password"), "");
+
+  NetworkSettings emptied;
+  PutPassword(emptied, LineKind::Vpn, secrets, "");
+  EXPECT_EQ(emptied, tunnel);
 }
 
 TEST(DialSettings, Values_of_other_types_than_texts_are_none) {
