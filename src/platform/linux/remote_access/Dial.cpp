@@ -37,6 +37,7 @@ void Dial::AskLater(const BusQuestion& question, void (Dial::*take)(const BusAns
 
 void Dial::Start(const std::string& connectionPath) {
   change_(kRasOpenPort, 0);
+  manager_ = bus_.Manager();
   // One that is hung up or given up meanwhile lives until the answer has come, so that what it asked for
   // ends.
   bus_.AskLater(
@@ -128,8 +129,13 @@ void Dial::End(std::uint32_t error) {
   if (!isHungUp_) change_(state_, error_);
 }
 
+/// It was the way to the same NetworkManager that broke. Another one would know another line by that path.
+bool Dial::MayStandUnseen() {
+  return stage_ == Stage::Ended && error_ == kRasManagerCannotStart && bus_.Manager() == manager_;
+}
+
 std::uint32_t Dial::HangUp() {
-  if (stage_ != Stage::Ended && !activePath_.empty()) {
+  if (!activePath_.empty() && (stage_ != Stage::Ended || MayStandUnseen())) {
     if (const std::uint32_t error = EndActiveLine(bus_, activePath_)) return error;
     stage_ = Stage::Ended;
   }

@@ -24,8 +24,8 @@ class Dial : public std::enable_shared_from_this<Dial> {
   /// Asks NetworkManager for the connection at that path.
   void Start(const std::string& connectionPath);
   void Take(const BusSignal& signal);
-  /// The connection ends, if need be as soon as it is known, and nothing is told from now on. The error
-  /// number: with one, nothing has changed.
+  /// The connection ends, if need be as soon as it is known, and nothing is told from now on. So does one
+  /// that was lost sight of. The error number: with one, nothing has changed.
   std::uint32_t HangUp();
 
   Stage CurrentStage() const { return stage_; }
@@ -44,6 +44,7 @@ class Dial : public std::enable_shared_from_this<Dial> {
   void TakeFromActive(std::uint64_t state, std::uint64_t reason);
   void Reach(std::uint32_t state);
   void End(std::uint32_t error);
+  bool MayStandUnseen();
   void AskLater(const BusQuestion& question, void (Dial::*take)(const BusAnswer&));
 
   NetworkManagerBus& bus_;
@@ -56,6 +57,7 @@ class Dial : public std::enable_shared_from_this<Dial> {
   std::uint32_t state_ = 0;
   std::uint32_t error_ = 0;
   std::optional<std::uint64_t> deviceReason_; ///< of what ends it
+  std::string manager_;                       ///< the one that was asked for it
   std::string activePath_;
   std::string devicePath_;
   std::vector<BusSignal> early_; ///< what came before it was known whom it concerns

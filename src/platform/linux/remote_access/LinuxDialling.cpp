@@ -115,9 +115,10 @@ std::uint32_t LinuxDialling::RasHangUpA(RasConnection connection) {
 
 /// Also while NetworkManager hasn't told which connection the dial makes.
 bool LinuxDialling::Call::Makes(const ActiveLine& active) const {
-  if (!dial) return false;
+  // One that has ended and is active all the same was lost sight of.
+  if (!dial || HasEnded()) return false;
   const bool isAnswered = !dial->ActivePath().empty();
-  return isAnswered ? dial->ActivePath() == active.path : !HasEnded() && line.path == active.line.path;
+  return isAnswered ? dial->ActivePath() == active.path : line.path == active.line.path;
 }
 
 std::uint32_t LinuxDialling::AddActive() {

@@ -14,6 +14,11 @@ struct ScriptedHangUpTest : ScriptedManagerTest {
     Play("device 100 0, active 2 1");
     ASSERT_TRUE(Comes(kRasConnected, 0));
   }
+  static std::string ActivateCommand(const std::string& connection) {
+    return "dbus-send --system --print-reply --dest=org.freedesktop.NetworkManager "
+           "/org/freedesktop/NetworkManager org.freedesktop.NetworkManager.ActivateConnection objpath:" +
+           connection + " objpath:/ objpath:/";
+  }
 };
 
 struct OtherProgram {
@@ -125,6 +130,41 @@ TEST_F(ScriptedHangUpTest, A_line_that_is_listed_before_its_answer_has_one_handl
   EXPECT_TRUE(Comes(kRasConnected, 0));
   ASSERT_EQ(Connections().size(), 1U);
   EXPECT_EQ(Connections().front().second, handle);
+}
+
+TEST_F(ScriptedHangUpTest, A_line_that_stands_when_the_way_to_its_manager_breaks_is_listed_and_ended) {
+  ConnectTo("097");
+  BreakConnections();
+  ASSERT_TRUE(Comes(kRasDisconnected, kRasManagerCannotStart));
+  const auto standing = Connections();
+  ASSERT_EQ(standing.size(), 1U);
+  EXPECT_EQ(standing.front().first, "097");
+  EXPECT_EQ(dialling.RasHangUpA(standing.front().second), 0U);
+  EXPECT_TRUE(WasAsked("DeactivateConnection 097"));
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U) << "the former handle is let go, too";
+  EXPECT_TRUE(Connections().empty());
+}
+
+TEST_F(ScriptedHangUpTest, A_handle_ends_its_line_also_after_the_way_to_its_manager_broke) {
+  ConnectTo("097");
+  BreakConnections();
+  ASSERT_TRUE(Comes(kRasDisconnected, kRasManagerCannotStart));
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  EXPECT_TRUE(WasAsked("DeactivateConnection 097"));
+  EXPECT_TRUE(Connections().empty());
+}
+
+TEST_F(ScriptedHangUpTest, A_handle_of_a_former_manager_ends_nothing_of_the_next_one) {
+  ConnectTo("097");
+  manager->End();
+  ASSERT_TRUE(Comes(kRasDisconnected, kRasManagerCannotStart));
+  StartManager();
+  ASSERT_EQ(Put("other", EntryFor("pppoe")), 0U);
+  ASSERT_EQ(Put("097", EntryFor("pppoe")), 0U);
+  ASSERT_TRUE(RunShell(ActivateCommand("/org/freedesktop/NetworkManager/Settings/1"))) << "of the same path";
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  ASSERT_EQ(Connections().size(), 1U);
+  EXPECT_EQ(Connections().front().first, "other");
 }
 
 TEST_F(ScriptedHangUpTest, The_text_that_there_is_no_manager_needs_none) {
