@@ -11,7 +11,7 @@ namespace quendra::platform::linux_ {
 std::uint32_t ReadActiveLines(NetworkManagerBus& bus, ConnectionBook& book, std::vector<ActiveLine>& active) {
   active.clear();
   std::vector<Line> lines;
-  if (const std::uint32_t error = book.ReadLines(lines)) return error;
+  if (const std::uint32_t error = book.ReadAllLines(lines)) return error;
   const auto answer = bus.Ask({nm::kManagerPath,
                                nm::kProperties,
                                "Get",

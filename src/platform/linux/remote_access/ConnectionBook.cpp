@@ -60,13 +60,18 @@ std::uint32_t ConnectionBook::ReadUnknown() {
   return error;
 }
 
-std::uint32_t ConnectionBook::ReadLines(std::vector<Line>& lines) {
+std::uint32_t ConnectionBook::ReadAllLines(std::vector<Line>& lines) {
   lines.clear();
   if (const std::uint32_t error = Refresh()) return error;
   for (const auto& [path, known] : known_)
     if (known.kind && !known.name.empty()) lines.push_back({path, known.name, *known.kind});
   std::ranges::sort(lines, {},
                     [](const Line& line) { return std::tuple(Lowered(FromCodePage(line.name)), line.path); });
+  return kRasSuccess;
+}
+
+std::uint32_t ConnectionBook::ReadLines(std::vector<Line>& lines) {
+  if (const std::uint32_t error = ReadAllLines(lines)) return error;
   const auto repeated = std::unique(lines.begin(), lines.end(), [](const Line& left, const Line& right) {
     return SameName(left.name, right.name);
   });

@@ -28,6 +28,8 @@ class ConnectionBook {
   bool IsThere();
   /// By name. One that others have given the name of another is left out: a name stands for one entry.
   std::uint32_t ReadLines(std::vector<Line>& lines);
+  /// With those that are left out there.
+  std::uint32_t ReadAllLines(std::vector<Line>& lines);
   /// kRasCannotFindPhonebookEntry where there is none of that name; case makes no difference.
   std::uint32_t Find(std::string_view name, Line& line);
   std::uint32_t ReadSettings(const Line& line, NetworkSettings& settings);

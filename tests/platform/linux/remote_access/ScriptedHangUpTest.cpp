@@ -1,3 +1,5 @@
+#include "platform/linux/network_manager/NewConnection.h"
+#include "platform/linux/remote_access/EntrySettings.h"
 #include "platform/linux/remote_access/ScriptedManagerFixture.h"
 
 #include <signal.h>
@@ -165,6 +167,22 @@ TEST_F(ScriptedHangUpTest, A_handle_of_a_former_manager_ends_nothing_of_the_next
   EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
   ASSERT_EQ(Connections().size(), 1U);
   EXPECT_EQ(Connections().front().first, "other");
+}
+
+TEST_F(ScriptedHangUpTest, A_line_is_ended_also_where_another_entry_has_its_name) {
+  NetworkSettings second = NewConnection("097");
+  ASSERT_TRUE(PutEntryImage(second, EntryFor("pppoe")));
+  ASSERT_EQ(book.Add(second), 0U);
+  EXPECT_EQ(Names(), (std::vector<std::string>{"097", "tunnel"}));
+  for (const char* path :
+       {"/org/freedesktop/NetworkManager/Settings/1", "/org/freedesktop/NetworkManager/Settings/3"}) {
+    ASSERT_TRUE(RunShell(ActivateCommand(path)));
+    const auto standing = Connections();
+    ASSERT_EQ(standing.size(), 1U) << path;
+    EXPECT_EQ(standing.front().first, "097");
+    EXPECT_EQ(dialling.RasHangUpA(standing.front().second), 0U);
+    EXPECT_TRUE(Connections().empty()) << path;
+  }
 }
 
 TEST_F(ScriptedHangUpTest, The_text_that_there_is_no_manager_needs_none) {
