@@ -22,6 +22,9 @@ std::uint32_t ReadActiveLines(NetworkManagerBus& bus, ConnectionBook& book, std:
     for (const BusValue& path : held.items)
       questions.push_back({path.text, nm::kProperties, "GetAll", {BusValue::Text(nm::kActive)}});
   const auto answers = bus.AskAll(questions);
+  // One that nobody answers for may be any line.
+  if (std::ranges::find(answers, BusAnswer::Kind::NobodyThere, &BusAnswer::kind) != answers.end())
+    return kRasManagerCannotStart;
   for (std::size_t i = 0; i < answers.size(); ++i) {
     ValueMap properties = ValueMapOf(answers[i].First());
     const std::uint64_t state = properties["State"].number;

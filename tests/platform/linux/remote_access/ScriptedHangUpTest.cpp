@@ -185,6 +185,18 @@ TEST_F(ScriptedHangUpTest, A_line_is_ended_also_where_another_entry_has_its_name
   }
 }
 
+TEST_F(ScriptedHangUpTest, Lines_that_nobody_answers_for_are_no_missing_lines) {
+  ConnectTo("097");
+  OtherProgram other;
+  const auto before = ConnectionsOf(other.dialling);
+  ASSERT_EQ(before.size(), 1U);
+  Play("refuse GetAll org.freedesktop.DBus.Error.NoReply");
+  std::uint32_t bytes = 0, count = 0;
+  EXPECT_EQ(other.dialling.RasEnumConnectionsA({}, bytes, count), kRasManagerCannotStart);
+  Play("allow GetAll");
+  EXPECT_EQ(ConnectionsOf(other.dialling), before) << "each has kept its handle";
+}
+
 TEST_F(ScriptedHangUpTest, The_text_that_there_is_no_manager_needs_none) {
   manager->End();
   std::array<char, 512> text{};
