@@ -102,13 +102,17 @@ void LinuxDialling::Forget(RasConnection handle) {
 
 std::uint32_t LinuxDialling::RasHangUpA(RasConnection connection) {
   if (hungUp_.contains(connection)) return kRasSuccess;
+  const bool isThere = book_.IsThere();
+  // The answer may have come after the end of the line.
   bus_.HandleArrived();
   const auto found = std::ranges::find(calls_, connection, &Call::handle);
   const bool hasEnded = found != calls_.end() && found->HasEnded();
-  if (!hasEnded && !book_.IsThere()) return kRasManagerCannotStart;
+  if (!hasEnded && !isThere) return kRasManagerCannotStart;
   if (found == calls_.end()) return kErrorInvalidHandle;
   const Call call = *found;
-  const std::uint32_t error = call.dial ? call.dial->HangUp() : EndActiveLine(bus_, call.activePath);
+  std::uint32_t error = kRasSuccess;
+  // What has ended is let go also where nobody can be asked about it.
+  if (isThere) error = call.dial ? call.dial->HangUp() : EndActiveLine(bus_, call.activePath);
   if (error == kRasSuccess) Forget(connection);
   return error;
 }

@@ -156,6 +156,14 @@ TEST_F(ScriptedHangUpTest, A_handle_ends_its_line_also_after_the_way_to_its_mana
   EXPECT_TRUE(Connections().empty());
 }
 
+TEST_F(ScriptedHangUpTest, A_line_lost_sight_of_is_let_go_where_nobody_answers_any_more) {
+  ConnectTo("097");
+  BreakConnections();
+  ASSERT_TRUE(Comes(kRasDisconnected, kRasManagerCannotStart));
+  ::kill(manager->Id(), SIGSTOP);
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+}
+
 TEST_F(ScriptedHangUpTest, A_handle_of_a_former_manager_ends_nothing_of_the_next_one) {
   ConnectTo("097");
   manager->End();
@@ -195,6 +203,14 @@ TEST_F(ScriptedHangUpTest, Lines_that_nobody_answers_for_are_no_missing_lines) {
   EXPECT_EQ(other.dialling.RasEnumConnectionsA({}, bytes, count), kRasManagerCannotStart);
   Play("allow GetAll");
   EXPECT_EQ(ConnectionsOf(other.dialling), before) << "each has kept its handle";
+}
+
+TEST_F(ScriptedHangUpTest, A_line_that_ends_while_the_manager_is_asked_for_is_not_ended_again) {
+  ConnectTo("097");
+  Play("hold Get, refuse DeactivateConnection org.freedesktop.NetworkManager.PermissionDenied");
+  Child later(Once("held Get", PlayCommand("device 120 13, active 4 3, forget, release")));
+  EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
+  EXPECT_TRUE(Comes(kRasDisconnected, kRasPortDisconnected));
 }
 
 TEST_F(ScriptedHangUpTest, The_text_that_there_is_no_manager_needs_none) {
