@@ -115,6 +115,12 @@ std::string RealNetworkManager::Nmcli(const std::string& arguments) const {
   return OutputOf("timeout 20 nmcli " + arguments);
 }
 
+std::string RealNetworkManager::NmcliWith(const std::string& text, const std::string& arguments) const {
+  std::string shown = Nmcli(arguments);
+  for (int i = 0; i < 10 && shown.find(text) == std::string::npos; ++i) shown = Nmcli(arguments);
+  return shown;
+}
+
 std::string RealNetworkManager::InItsNetwork(const std::string& command) const {
   return OutputOf("nsenter -t " + std::to_string(manager_->Id()) + " -n " + command);
 }

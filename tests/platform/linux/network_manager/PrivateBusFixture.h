@@ -44,6 +44,9 @@ class RealNetworkManager {
 
   /// What nmcli prints, errors too.
   std::string Nmcli(const std::string& arguments) const;
+  /// The same, asked again a few times while `text` isn't in it: nmcli shows no secrets of a connection when
+  /// it is told of the connection's last change while it reads.
+  std::string NmcliWith(const std::string& text, const std::string& arguments) const;
   /// What a command of the shell prints in its network.
   std::string InItsNetwork(const std::string& command) const;
   std::string Log() const;

@@ -166,8 +166,9 @@ TEST_F(RealNetworkManagerTest, What_nmcli_made_appears_is_changed_without_loss_a
   manager.Nmcli("con add type pppoe con-name theirs username dan pppoe.service isp autoconnect no "
                 "802-3-ethernet.mtu 1400 ipv4.dns 10.1.1.1 ipv4.route-metric 50 ppp.lcp-echo-interval 7");
   manager.Nmcli("con modify theirs pppoe.password secret ipv4.routes '10.5.0.0/16 10.1.1.9'");
-  const auto shown = [&] { return manager.Nmcli("-s con show theirs | grep -v -e user.data -e timestamp"); };
-  const std::string before = shown();
+  const std::string show = "-s con show theirs | grep -v -e user.data -e timestamp";
+  const std::string before = manager.NmcliWith(" secret\n", show);
+  ASSERT_NE(before.find(" secret\n"), std::string::npos) << before;
   ASSERT_NE(before.find("10.1.1.9"), std::string::npos) << before;
   EXPECT_EQ(Names(), std::vector<std::string>{"theirs"});
   Bytes image = Entry("theirs");
@@ -178,11 +179,13 @@ TEST_F(RealNetworkManagerTest, What_nmcli_made_appears_is_changed_without_loss_a
   PutLittle32(image, RasEntry::kIdleDisconnectSeconds, 300);
   ASSERT_EQ(Put("theirs", image), 0U);
   EXPECT_EQ(Entry("theirs"), image);
-  EXPECT_EQ(shown(), before);
+  EXPECT_EQ(manager.NmcliWith(before, show), before);
 
   ASSERT_EQ(Save("theirs", "dana", "other"), 0U);
-  EXPECT_EQ(manager.Nmcli("-s -g pppoe.username,pppoe.password,802-3-ethernet.mtu con show theirs"),
-            "dana\nother\n1400\n");
+  const std::string changed = "dana\nother\n1400\n";
+  EXPECT_EQ(
+      manager.NmcliWith(changed, "-s -g pppoe.username,pppoe.password,802-3-ethernet.mtu con show theirs"),
+      changed);
   EXPECT_EQ(phoneBook.RasDeleteEntryA(nullptr, "theirs"), 0U);
   EXPECT_EQ(manager.Nmcli("-g name con show | grep -v lo"), "");
 }
@@ -203,12 +206,14 @@ TEST_F(RealNetworkManagerTest, Removing_a_tunnels_password_leaves_its_other_secr
   manager.Nmcli("con modify theirs vpn.data 'gateway = vpn.test, user = dan' "
                 "vpn.secrets 'password = old, other = kept'");
   ASSERT_EQ(TextAt(Saved("theirs"), kPasswordAt), "old");
-  const auto secrets = [&] { return manager.Nmcli("-s -g vpn.secrets con show theirs"); };
+  const auto secrets = [&](const std::string& expected) {
+    return manager.NmcliWith(expected, "-s -g vpn.secrets con show theirs");
+  };
   EXPECT_EQ(phoneBook.RasSetEntryDialParamsA(nullptr, DialParamsFor("theirs", "dan"), true), 0U);
   EXPECT_EQ(TextAt(Saved("theirs"), kPasswordAt), "");
-  EXPECT_EQ(secrets(), "other = kept\n");
+  EXPECT_EQ(secrets("other = kept\n"), "other = kept\n");
   EXPECT_EQ(Save("theirs", "dan", "new"), 0U);
-  EXPECT_EQ(secrets(), "other = kept, password = new\n");
+  EXPECT_EQ(secrets("other = kept, password = new\n"), "other = kept, password = new\n");
 }
 
 TEST_F(RealNetworkManagerTest, What_another_program_changes_shows_at_once) {
