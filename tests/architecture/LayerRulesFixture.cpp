@@ -29,6 +29,8 @@ const std::map<std::string, Names>& Allowed() {
   static const Names belowShell = With(subsystems, kBelowSubsystems);
   static const std::map<std::string, Names> allowed{
       {"runtime", {}},
+      // The system's headers as both backends of one system take them.
+      {"winapi", {"runtime"}},
       {"forms", {"runtime"}},
       {"platform", {"runtime"}},
       {"foundation", {"forms", "platform", "runtime"}},
@@ -39,14 +41,14 @@ const std::map<std::string, Names>& Allowed() {
       {"provisioning", With(kBelowSubsystems, {"mail", "diagnostics"})},
       {"mail", kBelowSubsystems},
       {"shell", belowShell},
-      {"app", With(With(belowShell, {"shell"}), backends)},
+      {"app", With(With(belowShell, {"shell", "winapi"}), backends)},
       {"forms/qt", {"forms", "runtime"}},
-      {"forms/win32", {"forms", "runtime"}},
+      {"forms/win32", {"forms", "runtime", "winapi"}},
       {"forms/headless", {"forms", "runtime"}},
       {"forms/headless/posix", {"forms", "forms/headless", "runtime"}},
       // What a system lacks is answered by the backend that lacks everything.
       {"platform/linux", {"platform", "platform/unavailable", "runtime"}},
-      {"platform/windows", {"platform", "platform/unavailable", "runtime"}},
+      {"platform/windows", {"platform", "platform/unavailable", "runtime", "winapi"}},
       {"platform/simulated", {"platform", "runtime"}},
       {"platform/unavailable", {"platform", "runtime"}},
   };
@@ -58,8 +60,8 @@ bool IsBackend(const std::string& folder) { return folder.find('/') != std::stri
 
 /// What only systems of one kind can be built with stands in these; all others compile for every edition.
 bool IsPortable(const std::string& folder) {
-  static const Names ofOneSystem{"forms/qt", "forms/win32", "forms/headless/posix", "platform/linux",
-                                 "platform/windows"};
+  static const Names ofOneSystem{"forms/qt",       "forms/win32",      "forms/headless/posix",
+                                 "platform/linux", "platform/windows", "winapi"};
   return !ofOneSystem.contains(folder);
 }
 
@@ -172,9 +174,10 @@ bool IsQtHeader(const std::string& header) {
 
 /// Headers of a system or toolkit that a source may name.
 bool MayNameSystemHeader(const std::string& folder, const std::string& header) {
+  if (header == "windows.h") return folder == "winapi";
   if (folder == "forms/qt") return IsQtHeader(header);
   if (folder == "forms/headless/posix" || folder == "forms/win32" || folder == "platform/linux" ||
-      folder == "platform/windows")
+      folder == "platform/windows" || folder == "winapi")
     return !IsQtHeader(header);
   return false;
 }

@@ -1,0 +1,55 @@
+#pragma once
+
+#include "forms/controls/Colour.h"
+#include "forms/view/Area.h"
+#include "forms/view/ControlPlacement.h"
+#include "forms/view/Direction.h"
+#include "forms/win32/drawing/Bitmap.h"
+#include "forms/win32/drawing/Surface.h"
+
+#include <optional>
+
+namespace quendra::forms::win32 {
+
+/// How a text is set in its place.
+struct TextSetting {
+  Direction direction = Direction::LeftToRight;
+  Side side = Side::Left;
+  bool wraps = false;   ///< on more than one line; else one line that is cut with an ellipsis
+  bool fromTop = false; ///< else half way down
+  bool underlined = false;
+};
+
+/// Draws on a surface, in the pixels of a window whose corner lies at `origin` of the surface's own. Nothing
+/// is drawn outside the clip, which is given in the same pixels as all places.
+class Drawing {
+ public:
+  Drawing(Surface& surface, Spot origin, Area clip);
+
+  /// The same surface for what stands in an area: its corner is the new origin, and nothing leaves it.
+  Drawing Within(Area area) const;
+
+  void Fill(Area area, Colour colour);
+  /// Round corners are smooth.
+  void RoundRect(Area area, int corner, std::optional<Colour> fill, std::optional<Colour> border,
+                 int borderWidth = 1);
+  void Line(Spot from, Spot to, Colour colour, int width);
+  void Triangle(const std::array<Spot, 3>& corners, Colour colour);
+  /// Scaled smoothly to the area.
+  void Picture(const Bitmap& bitmap, Area area);
+  void Text(TextView text, Area area, HFONT font, Colour colour, const TextSetting& setting = {});
+
+  Area Clip() const { return clip_; }
+  Surface& Target() const { return surface_; }
+  Spot Origin() const { return origin_; }
+
+ private:
+  Surface& surface_;
+  Spot origin_;
+  Area clip_;
+};
+
+/// What a text takes on one line, or on as many as it needs within `width` where that isn't 0.
+Extent MeasureText(TextView text, HFONT font, int width = 0);
+
+} // namespace quendra::forms::win32
