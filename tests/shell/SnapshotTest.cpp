@@ -11,7 +11,7 @@ class Snapshot : public ProgramTest {
  protected:
   void ExpectScreen(forms::Form& form, const std::string& name) {
     const std::string path = QUENDRA_SOURCE_DIR "/tests/shell/snapshots/" + name + ".txt";
-    std::ifstream file(path);
+    std::ifstream file(path, std::ios::binary); // what a text has of carriage returns stays
     ASSERT_TRUE(file) << path;
     std::stringstream expected;
     expected << file.rdbuf();
