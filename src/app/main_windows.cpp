@@ -16,6 +16,8 @@ void TrustNoWorkingFolder() {
 
 int WINAPI WinMain(HINSTANCE, HINSTANCE, char*, int) {
   TrustNoWorkingFolder();
+  // By its name the installer knows that the program runs. It goes with the process.
+  ::CreateMutexW(nullptr, FALSE, L"Local\\QuendraRuns");
   quendra::forms::win32::Win32Desktop desktop;
   quendra::platform::windows::WindowsMachine machine(desktop);
   quendra::app::Program program(machine.Operations(), desktop);

@@ -1,0 +1,88 @@
+; The installer of the Windows edition. Built by packaging/windows/build with the version and the folder of the program.
+; It speaks Hebrew, from right to left; /S installs without a word. The capture library is not ours to hand on: the last
+; page says where it comes from.
+
+Unicode true
+!include MUI2.nsh
+
+Name "Quendra"
+OutFile "${OUTPUT}"
+InstallDir "$PROGRAMFILES\Quendra"
+InstallDirRegKey HKLM "Software\Quendra" "Folder"
+RequestExecutionLevel admin
+SetCompressor /SOLID lzma
+XPStyle on
+BrandingText " "
+ShowInstDetails nevershow
+ShowUninstDetails nevershow
+
+VIProductVersion "${VERSION}.0.0"
+VIAddVersionKey /LANG=1037 "ProductName" "Quendra"
+VIAddVersionKey /LANG=1037 "FileDescription" "התקנת Quendra"
+VIAddVersionKey /LANG=1037 "CompanyName" "זלמר"
+VIAddVersionKey /LANG=1037 "LegalCopyright" ""
+VIAddVersionKey /LANG=1037 "FileVersion" "${VERSION}"
+
+!define MUI_ICON "${ICON}"
+!define MUI_UNICON "${ICON}"
+!define MUI_ABORTWARNING
+!define REMOVAL "Software\Microsoft\Windows\CurrentVersion\Uninstall\Quendra"
+
+!insertmacro MUI_PAGE_DIRECTORY
+!insertmacro MUI_PAGE_INSTFILES
+!define MUI_WELCOMEFINISHPAGE_BITMAP "${SIDE}"
+!define MUI_FINISHPAGE_TITLE "Quendra הותקנה"
+!define MUI_FINISHPAGE_TEXT_LARGE
+!define MUI_FINISHPAGE_TEXT "למדידת התעבורה דרושה ספריית לכידת מנות, שאינה חלק מהתקנה זו.$\r$\n\
+$\r$\nWindows XP: WinPcap 4.1.3, www.winpcap.org$\r$\nWindows 7 ואילך: Npcap, npcap.com$\r$\n\
+$\r$\nבלעדיה מוצגים התהליכים והיציאות שלהם בלבד."
+!define MUI_FINISHPAGE_RUN "$INSTDIR\quendra.exe"
+!insertmacro MUI_PAGE_FINISH
+!insertmacro MUI_UNPAGE_CONFIRM
+!insertmacro MUI_UNPAGE_INSTFILES
+!insertmacro MUI_LANGUAGE "Hebrew"
+
+Function .onInit
+  ; One who runs the program must close it first: its file can't be written over.
+  System::Call 'kernel32::OpenMutexW(i 0x100000, i 0, w "Local\QuendraRuns") p .r0'
+  ${If} $0 P<> 0
+    System::Call 'kernel32::CloseHandle(p r0)'
+    MessageBox MB_OK|MB_ICONEXCLAMATION|MB_RIGHT|MB_RTLREADING "יש לסגור את Quendra לפני ההתקנה." /SD IDOK
+    SetErrorLevel 2
+    Quit
+  ${EndIf}
+FunctionEnd
+
+Section
+  SetShellVarContext all
+  SetOutPath "$INSTDIR"
+  SetOverwrite try
+  ClearErrors
+  File "${PROGRAM}"
+  ${If} ${Errors}
+    SetErrorLevel 3
+    Abort
+  ${EndIf}
+  WriteUninstaller "$INSTDIR\remove.exe"
+  CreateShortcut "$SMPROGRAMS\Quendra.lnk" "$INSTDIR\quendra.exe"
+  WriteRegStr HKLM "Software\Quendra" "Folder" "$INSTDIR"
+  WriteRegStr HKLM "${REMOVAL}" "DisplayName" "Quendra"
+  WriteRegStr HKLM "${REMOVAL}" "DisplayVersion" "${VERSION}"
+  WriteRegStr HKLM "${REMOVAL}" "Publisher" "זלמר"
+  WriteRegStr HKLM "${REMOVAL}" "DisplayIcon" "$INSTDIR\quendra.exe"
+  WriteRegStr HKLM "${REMOVAL}" "UninstallString" '"$INSTDIR\remove.exe"'
+  WriteRegStr HKLM "${REMOVAL}" "QuietUninstallString" '"$INSTDIR\remove.exe" /S'
+  WriteRegDWORD HKLM "${REMOVAL}" "NoModify" 1
+  WriteRegDWORD HKLM "${REMOVAL}" "NoRepair" 1
+SectionEnd
+
+Section Uninstall
+  SetShellVarContext all
+  Delete "$INSTDIR\quendra.exe"
+  Delete "$INSTDIR\remove.exe"
+  ; Only when nothing of anybody else lies in it.
+  RMDir "$INSTDIR"
+  Delete "$SMPROGRAMS\Quendra.lnk"
+  DeleteRegKey HKLM "${REMOVAL}"
+  DeleteRegKey HKLM "Software\Quendra"
+SectionEnd
