@@ -1,0 +1,87 @@
+#include "platform/windows/remote_access/WindowsDialling.h"
+
+#include "platform/process/SystemErrors.h"
+#include "platform/unavailable/UnavailableDialling.h"
+#include "platform/windows/remote_access/RasRecords.h"
+
+namespace quendra::platform::windows {
+
+namespace {
+
+HRASCONN HandleOf(RasConnection connection) { return reinterpret_cast<HRASCONN>(connection.Value()); }
+
+RasConnection ConnectionOf(HRASCONN handle) {
+  return RasConnection(static_cast<std::uint32_t>(reinterpret_cast<std::uintptr_t>(handle)));
+}
+
+} // namespace
+
+std::unique_ptr<DialRelay> WindowsDialling::RelayTo(const Notifier& notifier) {
+  // A notifier of another kind is the address of a procedure, which none of the program's numbers is.
+  if (notifier.type != kRasNotifierIsWindow || notifier.window == kNoWindow) return nullptr;
+  const std::uint32_t registered = loop_.RegisterWindowMessageA(kRasDialEventName);
+  return std::make_unique<DialRelay>(
+      [this, window = notifier.window, message = registered != 0 ? registered : std::uint32_t{kRasDialEvent}](
+          std::uint32_t state, std::uint32_t error) { loop_.PostMessage(window, message, state, error); });
+}
+
+std::uint32_t WindowsDialling::RasDialA(std::span<const std::uint8_t> extensions, const char* phoneBook,
+                                        std::span<const std::uint8_t> params, const Notifier& notifier,
+                                        RasConnection& connection) {
+  const auto call = ras_.Calls().Dial;
+  if (!call) return kRasManagerCannotStart;
+  if (const std::uint32_t error = ErrorOfRecord(params)) return error;
+  if (!extensions.empty() && ErrorOfRecord(extensions) != kRasSuccess) return kRasInvalidSize;
+  auto relay = RelayTo(notifier);
+  if (relay && !relay->Window()) return kRasManagerCannotStart;
+  RecordCopy extended(extensions);
+  RecordCopy image(params);
+  HRASCONN handle = nullptr;
+  const std::uint32_t error = call(extensions.empty() ? nullptr : extended.As<RASDIALEXTENSIONS>(), phoneBook,
+                                   image.As<RASDIALPARAMSA>(), relay ? kRasNotifierIsWindow : 0,
+                                   relay ? relay->Window() : nullptr, &handle);
+  if (handle) Keep(ConnectionOf(handle), std::move(relay), error, connection);
+  return error;
+}
+
+void WindowsDialling::Keep(RasConnection made, std::unique_ptr<DialRelay> relay, std::uint32_t error,
+                           RasConnection& connection) {
+  hungUp_.erase(made); // a number that the system gives again
+  if (!relay && error != kRasSuccess) {
+    // A failed dial leaves its handle, and with it the line, to whoever dialled. Here nobody hears of it.
+    RasHangUpA(made);
+    return;
+  }
+  connection = made;
+  if (relay) relays_[made] = std::move(relay);
+}
+
+std::uint32_t WindowsDialling::RasHangUpA(RasConnection connection) {
+  const auto call = ras_.Calls().HangUp;
+  if (!call) return unavailable::UnavailableDialling().RasHangUpA(connection);
+  const std::uint32_t error = call(HandleOf(connection));
+  if (error == kRasSuccess) {
+    relays_.erase(connection);
+    hungUp_.insert(connection);
+  }
+  const bool wasHungUp = error == kErrorInvalidHandle && hungUp_.contains(connection);
+  return wasHungUp ? std::uint32_t{kRasSuccess} : error;
+}
+
+std::uint32_t WindowsDialling::RasEnumConnectionsA(std::span<std::uint8_t> connections, std::uint32_t& bytes,
+                                                   std::uint32_t& count) {
+  const auto call = ras_.Calls().EnumConnections;
+  if (!call) return unavailable::UnavailableDialling().RasEnumConnectionsA(connections, bytes, count);
+  count = 0;
+  // The size is the question here: there is none to take in its place.
+  if (connections.empty()) return kRasInvalidSize;
+  return FillList<RASCONNA>(connections, bytes, count, RasConnectionRecord::kBytes, call);
+}
+
+std::uint32_t WindowsDialling::RasGetErrorStringA(std::uint32_t error, std::span<char> text) {
+  const auto call = ras_.Calls().GetErrorString;
+  if (!call) return unavailable::UnavailableDialling().RasGetErrorStringA(error, text);
+  return call(error, text.data(), static_cast<DWORD>(text.size()));
+}
+
+} // namespace quendra::platform::windows
