@@ -1,6 +1,6 @@
 #pragma once
 
-#include "forms/headless/HeadlessDesktop.h"
+#include "platform/windows/WindowsLoopFixture.h"
 #include "platform/windows/remote_access/WindowsDialling.h"
 #include "platform/windows/remote_access/WindowsPhoneBook.h"
 
@@ -19,10 +19,9 @@ class StandInRemoteAccess {
   ~StandInRemoteAccess();
 
   void Script(const std::string& dials);
-  /// Handles messages of the system and of the desktop until the condition holds; false after ten seconds.
-  bool Until(const std::function<bool()>& condition);
+  bool Until(const std::function<bool()>& condition) { return Desktop.WaitFor(condition, 10'000); }
 
-  forms::headless::HeadlessDesktop Desktop;
+  WindowsLoop Desktop;
   RasCalls Calls{&StandInRasLibrary};
   WindowsPhoneBook Book{Calls};
   WindowsDialling Dials{Calls, Desktop};

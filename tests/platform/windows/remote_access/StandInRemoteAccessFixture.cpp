@@ -6,9 +6,6 @@ namespace quendra::platform::windows {
 
 namespace {
 
-constexpr DWORD kPatience = 10'000;
-constexpr DWORD kRound = 10;
-
 std::string NewFile() {
   char folder[MAX_PATH] = {};
   char file[MAX_PATH] = {};
@@ -17,16 +14,13 @@ std::string NewFile() {
   return file;
 }
 
-void HandleMessages() {
-  for (MSG message; ::PeekMessageW(&message, nullptr, 0, 0, PM_REMOVE);) ::DispatchMessageW(&message);
-}
-
 } // namespace
 
 winapi::SystemLibrary StandInRasLibrary() {
   wchar_t program[MAX_PATH] = {};
   const Text path = winapi::TextOf(program, ::GetModuleFileNameW(nullptr, program, MAX_PATH));
-  auto library = winapi::SystemLibrary::At(path.substr(0, path.rfind(u'\\')) + u"\\standins\\rasapi32.dll");
+  auto library =
+      winapi::SystemLibrary::At(path.substr(0, path.rfind(u'\\')) + u"\\standins\\standin_rasapi32.dll");
   if (!library.IsThere()) throw std::runtime_error("the stand-in library isn't there");
   return library;
 }
@@ -43,16 +37,6 @@ StandInRemoteAccess::~StandInRemoteAccess() {
 
 void StandInRemoteAccess::Script(const std::string& dials) {
   ::SetEnvironmentVariableA("QUENDRA_DIALS", dials.c_str());
-}
-
-bool StandInRemoteAccess::Until(const std::function<bool()>& condition) {
-  for (const DWORD begin = ::GetTickCount(); ::GetTickCount() - begin < kPatience;) {
-    HandleMessages();
-    Desktop.PumpOnce();
-    if (condition()) return true;
-    ::MsgWaitForMultipleObjects(0, nullptr, FALSE, kRound, QS_ALLINPUT);
-  }
-  return false;
 }
 
 } // namespace quendra::platform::windows
