@@ -60,10 +60,9 @@ std::uint32_t WindowsDialling::RasHangUpA(RasConnection connection) {
   const auto call = ras_.Calls().HangUp;
   if (!call) return unavailable::UnavailableDialling().RasHangUpA(connection);
   const std::uint32_t error = call(HandleOf(connection));
-  if (error == kRasSuccess) {
-    relays_.erase(connection);
-    hungUp_.insert(connection);
-  }
+  const bool hasEnded = error == kRasSuccess || error == kErrorInvalidHandle;
+  if (hasEnded) relays_.erase(connection);
+  if (error == kRasSuccess) hungUp_.insert(connection);
   const bool wasHungUp = error == kErrorInvalidHandle && hungUp_.contains(connection);
   return wasHungUp ? std::uint32_t{kRasSuccess} : error;
 }
