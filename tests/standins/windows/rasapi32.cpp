@@ -46,8 +46,8 @@ RasDials& Dials() {
   return dials;
 }
 
-/// A named book is another's, and there is none.
-bool IsOwnBook(const char* name) { return !name || *name == '\0'; }
+/// A named book is another's, and there is none: not even one without letters.
+bool IsOwnBook(const char* name) { return !name; }
 
 DWORD Written(bool succeeded) { return succeeded ? DWORD{kRasSuccess} : DWORD{kAccessDenied}; }
 

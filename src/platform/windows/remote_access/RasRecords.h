@@ -12,6 +12,11 @@
 /// far as its NUL.
 namespace quendra::platform::windows {
 
+/// The system has a name for every phone book but the user's own.
+inline const char* BookNamed(const char* phoneBook) {
+  return phoneBook && *phoneBook != '\0' ? phoneBook : nullptr;
+}
+
 /// 0 for a record that is as long as it says.
 inline std::uint32_t ErrorOfRecord(std::span<const std::uint8_t> record) {
   const bool isWhole = record.size() >= 4 && Little32(record, 0) <= record.size();

@@ -37,9 +37,10 @@ std::uint32_t WindowsDialling::RasDialA(std::span<const std::uint8_t> extensions
   RecordCopy extended(extensions);
   RecordCopy image(params);
   HRASCONN handle = nullptr;
-  const std::uint32_t error = call(extensions.empty() ? nullptr : extended.As<RASDIALEXTENSIONS>(), phoneBook,
-                                   image.As<RASDIALPARAMSA>(), relay ? kRasNotifierIsWindow : 0,
-                                   relay ? relay->Window() : nullptr, &handle);
+  const std::uint32_t error =
+      call(extensions.empty() ? nullptr : extended.As<RASDIALEXTENSIONS>(), BookNamed(phoneBook),
+           image.As<RASDIALPARAMSA>(), relay ? kRasNotifierIsWindow : 0, relay ? relay->Window() : nullptr,
+           &handle);
   if (handle) Keep(ConnectionOf(handle), std::move(relay), error, connection);
   return error;
 }

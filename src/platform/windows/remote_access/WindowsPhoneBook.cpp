@@ -23,14 +23,14 @@ std::uint32_t WindowsPhoneBook::RasEnumEntriesA(const char* phoneBook, std::span
   if (!call) return unavailable::UnavailablePhoneBook().RasEnumEntriesA(phoneBook, names, bytes, count);
   return FillList<RASENTRYNAMEA>(names, bytes, count, RasEntryName::kBytes,
                                  [&](auto* first, DWORD* room, DWORD* records) {
-                                   return call(nullptr, phoneBook, first, room, records);
+                                   return call(nullptr, BookNamed(phoneBook), first, room, records);
                                  });
 }
 
 std::uint32_t WindowsPhoneBook::RasDeleteEntryA(const char* phoneBook, const char* entryName) {
   const auto call = ras_.Calls().DeleteEntry;
   if (!call) return unavailable::UnavailablePhoneBook().RasDeleteEntryA(phoneBook, entryName);
-  return call(phoneBook, entryName);
+  return call(BookNamed(phoneBook), entryName);
 }
 
 std::uint32_t WindowsPhoneBook::RasGetEntryPropertiesA(const char* phoneBook, const char* entryName,
@@ -41,7 +41,7 @@ std::uint32_t WindowsPhoneBook::RasGetEntryPropertiesA(const char* phoneBook, co
   const bool holdsSize = entry.size() >= 4;
   DWORD room = holdsSize ? static_cast<DWORD>(std::min<std::size_t>(bytes, entry.size())) : 0;
   const std::uint32_t result =
-      call(phoneBook, entryName ? entryName : "",
+      call(BookNamed(phoneBook), entryName ? entryName : "",
            holdsSize ? reinterpret_cast<RASENTRYA*>(entry.data()) : nullptr, &room, nullptr, nullptr);
   bytes = room;
   return result;
@@ -55,7 +55,8 @@ std::uint32_t WindowsPhoneBook::RasSetEntryPropertiesA(const char* phoneBook, co
   if (const std::uint32_t error = ErrorOfRecord(entry)) return error;
   RecordCopy image(entry);
   DropOffsetBeyond(image.Bytes());
-  return call(phoneBook, entryName, image.As<RASENTRYA>(), static_cast<DWORD>(entry.size()), nullptr, 0);
+  return call(BookNamed(phoneBook), entryName, image.As<RASENTRYA>(), static_cast<DWORD>(entry.size()),
+              nullptr, 0);
 }
 
 std::uint32_t WindowsPhoneBook::RasGetEntryDialParamsA(const char* phoneBook, std::span<std::uint8_t> params,
@@ -67,7 +68,7 @@ std::uint32_t WindowsPhoneBook::RasGetEntryDialParamsA(const char* phoneBook, st
   if (const std::uint32_t error = ErrorOfRecord(params)) return error;
   RecordCopy image(params);
   BOOL isSaved = FALSE;
-  const std::uint32_t result = call(phoneBook, image.As<RASDIALPARAMSA>(), &isSaved);
+  const std::uint32_t result = call(BookNamed(phoneBook), image.As<RASDIALPARAMSA>(), &isSaved);
   if (result != kRasSuccess) return result;
   std::ranges::copy(image.Bytes(), params.begin());
   hasPassword = isSaved != FALSE;
@@ -82,7 +83,7 @@ std::uint32_t WindowsPhoneBook::RasSetEntryDialParamsA(const char* phoneBook,
     return unavailable::UnavailablePhoneBook().RasSetEntryDialParamsA(phoneBook, params, removePassword);
   if (const std::uint32_t error = ErrorOfRecord(params)) return error;
   RecordCopy image(params);
-  return call(phoneBook, image.As<RASDIALPARAMSA>(), removePassword ? TRUE : FALSE);
+  return call(BookNamed(phoneBook), image.As<RASDIALPARAMSA>(), removePassword ? TRUE : FALSE);
 }
 
 std::uint32_t WindowsPhoneBook::RasEnumDevicesA(std::span<std::uint8_t> devices, std::uint32_t& bytes,

@@ -199,6 +199,24 @@ TEST_F(WindowsDiallingTest, Texts_that_fill_their_fields_are_not_read_beyond_the
   EXPECT_EQ(ras.Dials.RasDialA({}, nullptr, params, {}, connection), kRasCannotFindPhonebookEntry);
 }
 
+TEST_F(WindowsDiallingTest, A_named_phone_book_is_the_systems_to_find) {
+  std::uint32_t bytes = 0;
+  std::uint32_t count = 0;
+
+  constexpr std::uint32_t kCannotOpen = 621;
+  EXPECT_EQ(ras.Book.RasEnumEntriesA("C:\\missing.pbk", {}, bytes, count), kCannotOpen);
+  EXPECT_EQ(ras.Book.RasDeleteEntryA("C:\\missing.pbk", "Home"), kCannotOpen);
+}
+
+TEST_F(WindowsDiallingTest, A_dial_that_is_hung_up_elsewhere_is_no_handle_any_more) {
+  Make("Other");
+  Told told;
+  const RasConnection connection = Dial("Other", Listener(told));
+  ASSERT_EQ(ras.Calls.Calls().HangUp(reinterpret_cast<HRASCONN>(connection.Value())), DWORD{kRasSuccess});
+
+  EXPECT_EQ(ras.Dials.RasHangUpA(connection), kErrorInvalidHandle);
+}
+
 // A system without remote access.
 
 struct WithoutRemoteAccess : testing::Test {
