@@ -1,3 +1,4 @@
+#include "forms/view/Keyboard.h"
 #include "provisioning/FirstConnectionPageFixture.h"
 
 namespace quendra::provisioning {

@@ -10,6 +10,8 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
+using Changes = DialLoop::Changes;
+
 struct ScriptedHangUpTest : ScriptedManagerTest {
   void ConnectTo(const char* name) {
     BeginDial(name);
