@@ -4,6 +4,8 @@
 #include "platform/Machine.h"
 #include "platform/net/Sockets.h"
 
+#include <gtest/gtest.h>
+
 #include <cstdint>
 #include <functional>
 #include <memory>
@@ -30,6 +32,8 @@ class Backend {
   virtual ~Backend() = default;
 
   virtual Machine Operations() = 0;
+  /// Why a test, "Suite.Name", can't be passed on this machine through no fault of ours; empty for most.
+  virtual std::string WhyNot(const std::string& /*test*/) const { return {}; }
 
   // The process that asks.
   virtual std::uint32_t OwnId() const = 0;
@@ -68,7 +72,26 @@ class Backend {
   virtual void Settle() = 0;
 };
 
+struct Kind {
+  const char* name;
+  std::unique_ptr<Backend> (*make)();
+};
+
 std::unique_ptr<Backend> MakeSimulatedBackend();
-std::unique_ptr<Backend> MakeLinuxBackend();
+/// The machine of the system that the tests are built for, under that system's name.
+Kind KindOfThisSystem();
+
+/// A test that runs over each backend.
+struct BackendTest : testing::TestWithParam<Kind> {
+  void SetUp() override;
+
+  std::unique_ptr<Backend> backend = GetParam().make();
+  Machine machine = backend->Operations();
+};
+
+/// For suites that derive from BackendTest.
+inline const auto kEveryBackend =
+    testing::Values(Kind{"Simulated", MakeSimulatedBackend}, KindOfThisSystem());
+inline std::string NameOfBackend(const testing::TestParamInfo<Kind>& tested) { return tested.param.name; }
 
 } // namespace quendra::platform

@@ -18,16 +18,8 @@
 
 namespace quendra::platform {
 
-struct Kind {
-  const char* name;
-  std::unique_ptr<Backend> (*make)();
-};
-
 /// What every machine must answer alike, real or simulated.
-struct BehaviourTest : testing::TestWithParam<Kind> {
-  std::unique_ptr<Backend> backend = GetParam().make();
-  Machine machine = backend->Operations();
-
+struct BehaviourTest : BackendTest {
   std::vector<Processes::Entry> Snapshot() {
     std::vector<Processes::Entry> entries;
     const Handle snapshot = machine.processes.CreateToolhelp32Snapshot(Processes::kSnapProcess, 0);
@@ -59,11 +51,6 @@ struct BehaviourTest : testing::TestWithParam<Kind> {
     return {};
   }
 };
-
-/// For suites that derive from BehaviourTest.
-inline const auto kEveryBackend =
-    testing::Values(Kind{"Simulated", MakeSimulatedBackend}, Kind{"Linux", MakeLinuxBackend});
-inline std::string NameOfBackend(const testing::TestParamInfo<Kind>& tested) { return tested.param.name; }
 
 inline constexpr std::uint32_t kLoopbackInMemory = 0x0100007F;
 

@@ -11,11 +11,6 @@
 namespace quendra::platform {
 namespace {
 
-struct SocketBackend {
-  const char* name;
-  std::unique_ptr<Backend> (*make)();
-};
-
 struct Told {
   std::int32_t event;
   std::int32_t error;
@@ -27,7 +22,7 @@ void PrintTo(const Told& told, std::ostream* out) {
 }
 
 /// One socket, a window that writes down what is told of it, and the far end of its connection.
-class SocketsBehaviour : public testing::TestWithParam<SocketBackend> {
+class SocketsBehaviour : public BackendTest {
  protected:
   static constexpr std::uint32_t kMessage = 32769;
 
@@ -80,8 +75,6 @@ class SocketsBehaviour : public testing::TestWithParam<SocketBackend> {
                     : text.substr(0, static_cast<std::size_t>(read));
   }
 
-  std::unique_ptr<Backend> backend = GetParam().make();
-  Machine machine = backend->Operations();
   Sockets& sockets = machine.sockets;
   SocketHandle socket = kNoSocket;
   std::unique_ptr<FarEnd> far;
@@ -165,10 +158,7 @@ TEST_P(SocketsBehaviour, A_connection_that_was_reset_keeps_both_addresses_and_re
   EXPECT_EQ(Read(10), "error 10054");
 }
 
-INSTANTIATE_TEST_SUITE_P(, SocketsBehaviour,
-                         testing::Values(SocketBackend{"Simulated", MakeSimulatedBackend},
-                                         SocketBackend{"Linux", MakeLinuxBackend}),
-                         [](const auto& kind) { return std::string(kind.param.name); });
+INSTANTIATE_TEST_SUITE_P(, SocketsBehaviour, kEveryBackend, NameOfBackend);
 
 } // namespace
 } // namespace quendra::platform
