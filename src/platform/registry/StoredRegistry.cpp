@@ -1,5 +1,6 @@
 #include "platform/registry/StoredRegistry.h"
 
+#include "platform/registry/RegistryPath.h"
 #include "runtime/Text.h"
 
 #include <algorithm>
@@ -8,40 +9,13 @@ namespace quendra::platform {
 
 namespace {
 
-/// What the system takes.
-constexpr std::size_t kLongestKeyName = 255;
-constexpr std::size_t kLongestValueName = 16383;
-constexpr std::size_t kDeepestPath = 512;
-
-bool IsRoot(RegistryKey key) { return key >= kClassesRoot && key <= kDynData; }
-
 /// Roots whose own keys are the system's hives: a program makes none there.
 bool HoldsHives(RegistryKey key) { return key == kLocalMachine || key == kUsers; }
-
-/// The names of a path; an error number for a path with an empty name in it, as before a leading backslash
-/// and behind a trailing one, and for names and depths that the system refuses.
-std::uint32_t NamesOf(const std::string& path, std::vector<std::string>& names) {
-  std::string_view rest = CutAtNul(std::string_view(path));
-  if (rest.empty()) return kRegistrySuccess;
-  while (true) {
-    const std::size_t end = std::min(rest.find('\\'), rest.size());
-    if (end == 0) return kBadKeyPath;
-    if (end > kLongestKeyName || names.size() == kDeepestPath) return kRegistryInvalidParameter;
-    names.emplace_back(rest.substr(0, end));
-    if (end == rest.size()) return kRegistrySuccess;
-    rest.remove_prefix(end + 1);
-  }
-}
-
-std::uint32_t ValueName(const std::string& given, std::string& name) {
-  name = CutAtNul(std::string_view(given));
-  return name.size() > kLongestValueName ? kRegistryInvalidParameter : kRegistrySuccess;
-}
 
 } // namespace
 
 std::optional<StoredRegistry::OpenKey> StoredRegistry::Opened(RegistryKey key) const {
-  if (IsRoot(key)) return OpenKey{key.Value(), kKeyAllAccess};
+  if (IsRegistryRoot(key)) return OpenKey{key.Value(), kKeyAllAccess};
   const auto found = open_.find(key);
   if (found == open_.end()) return {};
   return found->second;
@@ -60,7 +34,7 @@ std::uint32_t StoredRegistry::Use(RegistryKey key, std::uint32_t access, KeyNumb
 std::uint32_t StoredRegistry::FindPath(RegistryKey parent, const std::string& path, KeyNumber& number) {
   std::vector<std::string> names;
   std::uint32_t error = Use(parent, 0, number);
-  if (error == kRegistrySuccess) error = NamesOf(path, names);
+  if (error == kRegistrySuccess) error = NamesOfRegistryPath(path, names);
   for (const auto& name : names) {
     if (error != kRegistrySuccess) break;
     error = store_.Find(KeyNumber(number), name, number);
@@ -81,7 +55,7 @@ std::uint32_t StoredRegistry::RegCreateKeyA(RegistryKey parent, const std::strin
   KeyNumber number = 0;
   std::vector<std::string> names;
   std::uint32_t error = Use(parent, 0, number);
-  if (error == kRegistrySuccess) error = NamesOf(path, names);
+  if (error == kRegistrySuccess) error = NamesOfRegistryPath(path, names);
   if (error == kRegistrySuccess && HoldsHives(parent) && !names.empty()) {
     error = store_.Find(KeyNumber(number), names.front(), number);
     names.erase(names.begin());
@@ -105,7 +79,7 @@ std::uint32_t StoredRegistry::RegSetValueExA(RegistryKey key, const std::string&
   KeyNumber number = 0;
   std::string valueName;
   std::uint32_t error = Use(key, kSetValue, number);
-  if (error == kRegistrySuccess) error = ValueName(name, valueName);
+  if (error == kRegistrySuccess) error = NameOfRegistryValue(name, valueName);
   if (error != kRegistrySuccess) return error;
   return store_.Write(number, valueName, {type, {data.begin(), data.end()}});
 }
@@ -116,7 +90,7 @@ std::uint32_t StoredRegistry::RegQueryValueExA(RegistryKey key, const std::strin
   std::string valueName;
   RegistryValue value;
   std::uint32_t error = Use(key, kQueryValue, number);
-  if (error == kRegistrySuccess) error = ValueName(name, valueName);
+  if (error == kRegistrySuccess) error = NameOfRegistryValue(name, valueName);
   if (error == kRegistrySuccess) error = store_.Read(number, valueName, value);
   if (error != kRegistrySuccess) return error;
   type = value.type;
@@ -128,7 +102,7 @@ std::uint32_t StoredRegistry::RegQueryValueExA(RegistryKey key, const std::strin
 }
 
 std::uint32_t StoredRegistry::RegCloseKey(RegistryKey key) {
-  if (IsRoot(key)) return kRegistrySuccess;
+  if (IsRegistryRoot(key)) return kRegistrySuccess;
   return open_.erase(key) > 0 ? kRegistrySuccess : kInvalidRegistryKey;
 }
 
@@ -138,7 +112,7 @@ std::uint32_t StoredRegistry::RegDeleteKeyA(RegistryKey parent, const std::strin
   if (error != kRegistrySuccess) return error;
   // A root by an empty path, a hive by its name: the system keeps both.
   const std::string_view name = CutAtNul(std::string_view(path));
-  if (name.empty() && IsRoot(parent)) return kRegistryAccessDenied;
+  if (name.empty() && IsRegistryRoot(parent)) return kRegistryAccessDenied;
   if (HoldsHives(parent) && name.find('\\') == std::string_view::npos) return kRegistryAccessDenied;
   return store_.Remove(number);
 }
@@ -147,7 +121,7 @@ std::uint32_t StoredRegistry::RegDeleteValueA(RegistryKey key, const std::string
   KeyNumber number = 0;
   std::string valueName;
   std::uint32_t error = Use(key, kSetValue, number);
-  if (error == kRegistrySuccess) error = ValueName(name, valueName);
+  if (error == kRegistrySuccess) error = NameOfRegistryValue(name, valueName);
   return error == kRegistrySuccess ? store_.Erase(number, valueName) : error;
 }
 
