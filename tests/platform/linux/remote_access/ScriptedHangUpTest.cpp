@@ -48,7 +48,7 @@ TEST_F(ScriptedHangUpTest, A_line_that_is_hung_up_at_once_ends_as_soon_as_it_is_
   ASSERT_EQ(Dial("097"), 0U);
   EXPECT_EQ(dialling.RasHangUpA(handle), 0U);
   EXPECT_TRUE(WasAsked("DeactivateConnection 097"));
-  EXPECT_EQ(loop.changes, (Changes{{kRasOpenPort, 0}}));
+  EXPECT_EQ(loop.changes, (DialLoop::Changes{{kRasOpenPort, 0}}));
 }
 
 TEST_F(ScriptedHangUpTest, A_handle_may_be_hung_up_again_also_when_its_line_has_ended) {
