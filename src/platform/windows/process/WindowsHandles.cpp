@@ -55,6 +55,10 @@ std::uint32_t WindowsHandles::NtQuerySystemInformation(std::uint32_t information
       query ? static_cast<std::uint32_t>(query(informationClass, buffer.data(), LengthOf(buffer), &returned))
             : kStatusNotImplemented;
   returnedLength = returned;
+  // Some systems tell the length alone.
+  const bool lacksCount = status == kStatusInfoLengthMismatch && informationClass == kHandleTable &&
+                          returned > kCountBytes && buffer.size() >= kCountBytes && Little32(buffer, 0) == 0;
+  if (lacksCount) PutLittle32(buffer, 0, static_cast<std::uint32_t>((returned - kCountBytes) / kRecordBytes));
   return status;
 }
 

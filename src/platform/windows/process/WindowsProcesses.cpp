@@ -1,5 +1,7 @@
 #include "platform/windows/process/WindowsProcesses.h"
 
+#include "platform/windows/process/PathInCodePage.h"
+
 #include <psapi.h>
 #include <tlhelp32.h>
 
@@ -86,7 +88,7 @@ std::uint32_t WindowsProcesses::GetModuleFileNameExA(Handle process, ModuleHandl
                                found.data(), static_cast<DWORD>(found.size()));
   if (!lastError_.Succeeded(length > 0)) return 0;
   const std::string name =
-      ToCodePage(winapi::TextOf(found.data(), std::min(std::size_t{length}, found.size())));
+      PathInCodePage(winapi::TextOf(found.data(), std::min(std::size_t{length}, found.size())));
   const std::size_t written = std::min({name.size(), path.size(), std::size_t{size}});
   std::copy_n(name.begin(), written, path.begin());
   return static_cast<std::uint32_t>(written);

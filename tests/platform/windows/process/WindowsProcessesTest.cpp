@@ -1,0 +1,70 @@
+#include "platform/windows/process/WindowsProcesses.h"
+
+#include "platform/windows/process/PathInCodePage.h"
+
+#include <gtest/gtest.h>
+
+namespace quendra::platform::windows {
+namespace {
+
+struct WindowsProcessesTest : testing::Test {
+  LastError lastError;
+  WindowsProcesses processes{lastError};
+};
+
+TEST_F(WindowsProcessesTest, An_error_stays_until_the_next_question_whatever_the_system_is_asked_meanwhile) {
+  ASSERT_EQ(processes.OpenProcess(1040, false, 0x7FFFFFFC), kNoHandle);
+  ASSERT_EQ(processes.GetLastError(), kInvalidParameter);
+
+  ::SetLastError(0);
+  EXPECT_EQ(processes.GetCurrentProcess(), kOwnProcess);
+
+  EXPECT_EQ(processes.GetLastError(), kInvalidParameter);
+  const Handle own = processes.OpenProcess(1040, false, ::GetCurrentProcessId());
+  EXPECT_EQ(processes.GetLastError(), kNoError);
+  processes.CloseHandle(own);
+}
+
+TEST_F(WindowsProcessesTest, More_modules_than_there_is_room_for_fill_the_room) {
+  std::array<ModuleHandle, 1> one{};
+  EXPECT_TRUE(processes.EnumProcessModules(kOwnProcess, one));
+  EXPECT_NE(one[0], ModuleHandle());
+}
+
+struct PathInCodePageTest : testing::Test {
+  ~PathInCodePageTest() override {
+    ::DeleteFileW(winapi::Wide(path));
+    ::RemoveDirectoryW(L"C:\\QuendraTest");
+  }
+
+  void Make(const Text& file) {
+    path = file;
+    ::CreateDirectoryW(L"C:\\QuendraTest", nullptr);
+    ::CloseHandle(::CreateFileW(winapi::Wide(path), GENERIC_WRITE, 0, nullptr, CREATE_ALWAYS, 0, nullptr));
+  }
+  bool LeadsBack(const std::string& told) {
+    const Text found = FromCodePage(told);
+    return ::GetFileAttributesW(winapi::Wide(found)) != INVALID_FILE_ATTRIBUTES;
+  }
+
+  Text path;
+};
+
+TEST_F(PathInCodePageTest, A_path_that_the_page_can_hold_is_as_it_is) {
+  Make(u"C:\\QuendraTest\\שלום עולם.exe");
+  EXPECT_EQ(PathInCodePage(path), "C:\\QuendraTest\\\xF9\xEC\xE5\xED \xF2\xE5\xEC\xED.exe");
+}
+
+TEST_F(PathInCodePageTest, Another_still_leads_to_its_file) {
+  Make(u"C:\\QuendraTest\\\u65E5\u672C.exe");
+  const std::string told = PathInCodePage(path);
+  EXPECT_EQ(told.find('?'), std::string::npos) << told;
+  EXPECT_TRUE(LeadsBack(told)) << told;
+}
+
+TEST_F(PathInCodePageTest, A_file_that_is_not_there_has_question_marks) {
+  EXPECT_EQ(PathInCodePage(u"C:\\QuendraTest\\\u65E5\u672C.exe"), "C:\\QuendraTest\\??.exe");
+}
+
+} // namespace
+} // namespace quendra::platform::windows
