@@ -89,16 +89,23 @@ std::vector<ProcessorTimes> WindowsPerformanceData::Processors() {
   return last_ = std::move(now);
 }
 
+std::uint32_t WindowsPerformanceData::AskKernel(std::vector<std::uint8_t>& block) {
+  const auto processors = Processors();
+  if (processors.empty()) return kErrorFileNotFound;
+  block = ProcessorBlock(processors, FileTimeNow());
+  return 0;
+}
+
 std::uint32_t WindowsPerformanceData::Query(const std::string& valueName, std::span<std::uint8_t> buffer) {
   const Text name = FromCodePage(CutAtNul(std::string_view(valueName)));
+  const bool ofProcessors = AsksForProcessors(name);
   std::vector<std::uint8_t> block;
-  std::uint32_t error = AskRegistry(name, kRegistryRoom, block);
-  if (AsksForProcessors(name) && !HoldsProcessors(block)) {
-    const auto processors = Processors();
-    if (processors.empty()) return error == 0 ? std::uint32_t{kErrorFileNotFound} : error;
-    block = ProcessorBlock(processors, FileTimeNow());
-    error = 0;
+  std::uint32_t error = 0;
+  if (!ofProcessors || registryHasProcessors_.value_or(true)) {
+    error = AskRegistry(name, kRegistryRoom, block);
+    if (ofProcessors && !registryHasProcessors_) registryHasProcessors_ = HoldsProcessors(block);
   }
+  if (ofProcessors && !*registryHasProcessors_) error = AskKernel(block);
   if (error != 0) return error;
   if (buffer.size() < block.size()) return kErrorMoreData;
   std::ranges::copy(block, buffer.begin());
