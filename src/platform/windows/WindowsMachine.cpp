@@ -1,14 +1,12 @@
 #include "platform/windows/WindowsMachine.h"
 
-#include "platform/unavailable/UnavailableAdapters.h"
 #include "platform/unavailable/UnavailableCaptureControls.h"
 #include "platform/unavailable/UnavailableCaptureLibrary.h"
-#include "platform/unavailable/UnavailableDialling.h"
 #include "platform/unavailable/UnavailableHostNames.h"
 #include "platform/unavailable/UnavailableIcmp.h"
 #include "platform/unavailable/UnavailableIpHelper.h"
-#include "platform/unavailable/UnavailablePhoneBook.h"
 #include "platform/unavailable/UnavailableSockets.h"
+#include "platform/windows/adapters/WindowsAdapters.h"
 #include "platform/windows/files/WindowsFiles.h"
 #include "platform/windows/internet/WindowsUrlCache.h"
 #include "platform/windows/keyboard/WindowsKeyboardLayout.h"
@@ -19,6 +17,8 @@
 #include "platform/windows/process/WindowsTokens.h"
 #include "platform/windows/process/WindowsVersionInfo.h"
 #include "platform/windows/registry/WindowsRegistry.h"
+#include "platform/windows/remote_access/WindowsDialling.h"
+#include "platform/windows/remote_access/WindowsPhoneBook.h"
 #include "platform/windows/system/WindowsPerformanceData.h"
 #include "platform/windows/system/WindowsShellStart.h"
 #include "platform/windows/system/WindowsSystem.h"
@@ -26,14 +26,15 @@
 namespace quendra::platform::windows {
 
 struct WindowsMachine::Parts {
-  explicit Parts(EventLoop& /*loop*/) {}
+  explicit Parts(EventLoop& loop) : dialling(ras, loop) {}
 
   LastError lastError;
+  RasCalls ras;
 
-  unavailable::UnavailableAdapters adapters;
+  WindowsAdapters adapters;
   unavailable::UnavailableCaptureControls captureControls;
   unavailable::UnavailableCaptureLibrary captureLibrary;
-  unavailable::UnavailableDialling dialling;
+  WindowsDialling dialling;
   WindowsFiles files;
   WindowsHandles handles{lastError};
   unavailable::UnavailableHostNames hostNames;
@@ -43,7 +44,7 @@ struct WindowsMachine::Parts {
   unavailable::UnavailableIpHelper ipHelper;
   WindowsKeyboardLayout keyboardLayout;
   WindowsPerformanceData performanceData;
-  unavailable::UnavailablePhoneBook phoneBook;
+  WindowsPhoneBook phoneBook{ras};
   WindowsProcesses processes{lastError};
   WindowsRegistry registry;
   WindowsShellStart shellStart;
