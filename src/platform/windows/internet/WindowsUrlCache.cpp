@@ -18,11 +18,12 @@ class WindowsUrlCache::Walk {
 
   std::optional<CachedUrl> Next() {
     // The size of an entry is told by a call that finds too little room.
-    while (!Fetch())
-      if (::GetLastError() != ERROR_INSUFFICIENT_BUFFER || size_ <= buffer_.size() * sizeof(Unit))
-        return {};
-      else
-        buffer_.resize((size_ + sizeof(Unit) - 1) / sizeof(Unit));
+    while (!Fetch()) {
+      const bool wantsMore =
+          ::GetLastError() == ERROR_INSUFFICIENT_BUFFER && size_ > buffer_.size() * sizeof(Unit);
+      if (!wantsMore) return {};
+      buffer_.resize((size_ + sizeof(Unit) - 1) / sizeof(Unit));
+    }
     const auto& entry = *reinterpret_cast<const INTERNET_CACHE_ENTRY_INFOW*>(buffer_.data());
     const Text name = entry.lpszSourceUrlName ? winapi::TextOf(entry.lpszSourceUrlName) : Text();
     return cache_.Told(name, entry.CacheEntryType);
