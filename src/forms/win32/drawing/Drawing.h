@@ -4,9 +4,11 @@
 #include "forms/view/Area.h"
 #include "forms/view/ControlPlacement.h"
 #include "forms/view/Direction.h"
+#include "forms/view/paint/Shapes.h"
 #include "forms/win32/drawing/Bitmap.h"
 #include "forms/win32/drawing/Surface.h"
 
+#include <array>
 #include <optional>
 
 namespace quendra::forms::win32 {
@@ -17,7 +19,6 @@ struct TextSetting {
   Side side = Side::Left;
   bool wraps = false;   ///< on more than one line; else one line that is cut with an ellipsis
   bool fromTop = false; ///< else half way down
-  bool underlined = false;
 };
 
 /// Draws on a surface, in the pixels of a window whose corner lies at `origin` of the surface's own. Nothing
@@ -30,9 +31,13 @@ class Drawing {
   Drawing Within(Area area) const;
 
   void Fill(Area area, Colour colour);
-  /// Round corners are smooth.
+  void Fill(const RoundBox& box, Colour colour);
+  /// A line along the edge of a box, half of it on either side.
+  void Stroke(const RoundBox& box, Colour colour, double width = 1);
+  /// A box of whole pixels with smooth round corners, its border within it.
   void RoundRect(Area area, int corner, std::optional<Colour> fill, std::optional<Colour> border,
                  int borderWidth = 1);
+  /// Upright and level lines are sharp and hold both ends; others are smooth.
   void Line(Spot from, Spot to, Colour colour, int width);
   void Triangle(const std::array<Spot, 3>& corners, Colour colour);
   /// Scaled smoothly to the area.
@@ -44,6 +49,8 @@ class Drawing {
   Spot Origin() const { return origin_; }
 
  private:
+  Raster Pixels() const;
+
   Surface& surface_;
   Spot origin_;
   Area clip_;

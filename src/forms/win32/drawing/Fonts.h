@@ -6,6 +6,7 @@
 
 #include <map>
 #include <tuple>
+#include <vector>
 
 namespace quendra::forms::win32 {
 
@@ -18,12 +19,20 @@ class Fonts {
   Fonts(const Fonts&) = delete;
   Fonts& operator=(const Fonts&) = delete;
 
+  const Text& Family() const { return family_; }
   HFONT FontOf(const Font& font, const Scale& scale);
+  /// Pixels from one line of it to the next.
   int LineHeight(HFONT font) const;
 
  private:
+  void AddOwnFamily();
+
   Text family_;
+  std::vector<HANDLE> ownFonts_;
   std::map<std::tuple<int, bool, bool>, HFONT> fonts_; ///< by height in pixels, bold, underlined
 };
+
+/// Whether a family of this very name is there and has the signs of Hebrew and Latin text.
+bool ShowsHebrewAndLatin(const Text& family);
 
 } // namespace quendra::forms::win32
