@@ -8,9 +8,21 @@
 #include "forms/win32/drawing/Fonts.h"
 #include "forms/win32/drawing/PictureStore.h"
 
+#include <cstdint>
+
 namespace quendra::forms::win32 {
 
 class MouseInput;
+
+/// How the user works in a form.
+struct FormState {
+  /// The last thing that the user took in hand was the keyboard.
+  bool usesKeys = false;
+  /// The focus moves with the form's window: it comes back to where it was.
+  bool focusComesBack = false;
+  /// Made so far; each gets a number of its own.
+  std::uintptr_t windows = 0;
+};
 
 /// What every view of a desktop needs of it.
 struct ViewContext {
@@ -23,6 +35,7 @@ struct ViewContext {
   MouseInput& mouse;
   const TimerStarter& startTimer;
   ActiveForm& active;
+  FormState& state;
 };
 
 } // namespace quendra::forms::win32

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "forms/view/Keyboard.h"
 #include "forms/view/View.h"
 #include "forms/win32/drawing/Drawing.h"
 #include "forms/win32/views/ViewContext.h"
@@ -7,6 +8,13 @@
 #include <optional>
 
 namespace quendra::forms::win32 {
+
+/// What becomes of a key that was pressed in a control.
+enum class KeyUse {
+  Free,   ///< the form's Default or Cancel may be pressed by it; else it is the window's
+  Window, ///< the window of the system's kind needs it for itself
+  Done,   ///< the view has done what the key does
+};
 
 /// What all windows that stand for a control have in common. A window's text is the accessible name of its
 /// control. What we draw ourselves is put together by the form's window, over what lies below: controls may
@@ -27,53 +35,104 @@ class WindowView : public View {
   virtual HWND Body() const { return window_; }
   ViewContext& Context() const { return context_; }
   Direction ReadingDirection() const { return direction_; }
-  /// In the pixels of the container's body.
+  /// Of the control, in the pixels of its container's body.
   Area Place() const;
+  /// Of the window, which may reach beyond the control.
+  const Area& WindowPlace() const { return windowPlace_; }
 
-  /// Draws the control without what it holds, in its own pixels. Nothing for windows that draw themselves.
+  /// Draws the control without what it holds, in the pixels of its window. Nothing for windows that draw
+  /// themselves.
   virtual void Paint(Drawing& /*drawing*/) {}
   /// Draws the control and what it holds at once.
   void Repaint();
   /// To be drawn again when the loop is idle, with whatever lies over it.
-  void Invalidate();
+  void Invalidate() const;
   /// A press by the mouse, a key or assistive technology.
   void Press();
+
+  /// With all its containers.
+  bool IsEnabled() const;
+  /// The focus is in this window, or in one of the system's inside it.
+  bool HasFocus() const;
+  /// The last thing that the user took in hand was the keyboard.
+  bool UsesKeys() const { return context_.state.usesKeys; }
+  bool IsUnderMouse() const;
+  /// By the left button, with the mouse over it.
+  bool IsHeldDown() const;
+
   /// False for windows that need mouse events for themselves, too.
   virtual bool TakesMouse() const { return true; }
+  /// A key was pressed while the focus was in this window. The form has heard of it, and Tab never comes.
+  virtual KeyUse Use(const KeyPress& /*key*/) { return KeyUse::Free; }
 
   /// The view that a window was made for; nullptr for any other window.
   static WindowView* Of(HWND window);
+  /// That of the nearest window upwards that has one.
+  static WindowView* Around(HWND window);
+
+  /// Holds a view that is at work: it is not destroyed meanwhile, only released.
+  class Work {
+   public:
+    explicit Work(WindowView& view) : view_(view) { ++view_.underWay_; }
+    ~Work() { --view_.underWay_; }
+    Work(const Work&) = delete;
+    Work& operator=(const Work&) = delete;
+
+   private:
+    WindowView& view_;
+  };
+  bool IsAtWork() const { return underWay_ > 0; }
+
+  /// The cursor that a handler set for the control; nullptr for the usual one.
+  HCURSOR cursor = nullptr;
 
  protected:
   /// Makes the window, once, in the constructor of the kind: of the class that we register ourselves where
-  /// `windowClass` is nullptr, else of one of the system's, whose procedure stays behind ours.
-  void Create(HWND parent, const wchar_t* windowClass, DWORD style, DWORD extendedStyle = 0);
-  /// A message of the own window. None lets the class's own procedure answer. Faults leave it to the
-  /// dispatcher's gate: call handlers through Context().dispatcher alone.
+  /// `windowClass` is nullptr, else of one of the system's, whose procedure stays behind ours. It is hidden
+  /// and has the style of a child that clips its siblings and what it holds, beside what is asked for.
+  void Create(HWND parent, const wchar_t* windowClass = nullptr, DWORD style = 0, DWORD extendedStyle = 0);
+  /// A message of the own window. None lets the class's own procedure answer. Handlers of the program are
+  /// called through Context().dispatcher alone.
   virtual std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam);
   /// A message with which the window of a system's kind tells its container something (WM_COMMAND, WM_NOTIFY,
   /// WM_DRAWITEM, WM_MEASUREITEM, WM_CTLCOLOR...): the container hands it back to the view. None lets the
   /// container answer.
   virtual std::optional<LRESULT> AnswerReflected(UINT message, WPARAM wParam, LPARAM lParam);
+  /// The focus came to this window from elsewhere in the program, not with the form's window.
+  virtual void FocusCame() {}
   /// The parts of the state that only this kind of control has.
   virtual void Apply(Aspect /*aspect*/) {}
   virtual void PutInPlace();
   virtual void Show();
   /// Gives the window the accessible name that the control has now, as its text. Not for fields, whose text
-  /// is their content.
+  /// is their content. Told again whenever the window is shown: handlers and descriptions are plain members.
   virtual void TellName();
+  void MoveTo(const Area& place);
   static bool Concerns(Aspect told, Aspect wanted) { return told == wanted || told == Aspect::All; }
   /// What the class's own procedure does with a message.
   LRESULT PassOn(UINT message, WPARAM wParam, LPARAM lParam);
 
  private:
   static LRESULT CALLBACK Procedure(HWND window, UINT message, WPARAM wParam, LPARAM lParam) noexcept;
+  LRESULT Handle(UINT message, WPARAM wParam, LPARAM lParam);
+  std::optional<LRESULT> AnswerCommonly(UINT message, WPARAM wParam, LPARAM lParam);
+  std::optional<LRESULT> AnswerAsOwn(UINT message);
+  std::optional<LRESULT> ShowCursorAt(WPARAM wParam, LPARAM lParam) const;
+  /// The window goes.
+  LRESULT Forget(WPARAM wParam, LPARAM lParam);
+  void ShareFont() const;
+  void Enable();
 
   ViewContext& context_;
   Control* control_;
   Direction direction_;
   HWND window_ = nullptr;
   WNDPROC before_ = nullptr;
+  Area windowPlace_{};
+  int underWay_ = 0;
 };
+
+/// Places the views of a container's controls anew: mirrored ones hang on its width.
+void PlaceChildren(const Container& container);
 
 } // namespace quendra::forms::win32
