@@ -16,7 +16,8 @@ UINT FlagsOf(const TextSetting& setting) {
   case Side::Right: flags |= DT_RIGHT; break;
   case Side::Middle: flags |= DT_CENTER; break;
   }
-  return flags | (setting.wraps ? DT_WORDBREAK : DT_SINGLELINE | DT_END_ELLIPSIS);
+  if (setting.wraps) return flags | DT_WORDBREAK;
+  return flags | DT_SINGLELINE | (setting.cuts ? DT_END_ELLIPSIS : 0U);
 }
 
 RECT RectOf(Area area) { return {area.corner.left, area.corner.top, area.Right(), area.Bottom()}; }
@@ -66,6 +67,11 @@ void Drawing::RoundRect(Area area, int corner, std::optional<Colour> fill, std::
   const RoundBox box = RoundBox::Of(area, corner, border ? borderWidth / 2.0 : 0);
   if (fill) Fill(box, *fill);
   if (border) Stroke(box, *border, borderWidth);
+}
+
+void Drawing::Rings(Area ringed, const std::vector<Ring>& rings) {
+  for (const Ring& ring : rings)
+    Stroke(RoundBox::Of(ringed, ring.corner, ring.inset), ring.colour, ring.width);
 }
 
 void Drawing::Line(Spot from, Spot to, Colour colour, int width) {

@@ -4,12 +4,14 @@
 #include "forms/view/Area.h"
 #include "forms/view/ControlPlacement.h"
 #include "forms/view/Direction.h"
+#include "forms/view/Ring.h"
 #include "forms/view/paint/Shapes.h"
 #include "forms/win32/drawing/Bitmap.h"
 #include "forms/win32/drawing/Surface.h"
 
 #include <array>
 #include <optional>
+#include <vector>
 
 namespace quendra::forms::win32 {
 
@@ -17,8 +19,9 @@ namespace quendra::forms::win32 {
 struct TextSetting {
   Direction direction = Direction::LeftToRight;
   Side side = Side::Left;
-  bool wraps = false;   ///< on more than one line; else one line that is cut with an ellipsis
+  bool wraps = false;   ///< on more than one line
   bool fromTop = false; ///< else half way down
+  bool cuts = true;     ///< one line that is too long ends in an ellipsis; else it goes on
 };
 
 /// Draws on a surface, in the pixels of a window whose corner lies at `origin` of the surface's own. Nothing
@@ -34,9 +37,12 @@ class Drawing {
   void Fill(const RoundBox& box, Colour colour);
   /// A line along the edge of a box, half of it on either side.
   void Stroke(const RoundBox& box, Colour colour, double width = 1);
-  /// A box of whole pixels with smooth round corners, its border within it.
+  /// A box of whole pixels with smooth round corners. Its border lies within it, and the corner is that of
+  /// the border's middle.
   void RoundRect(Area area, int corner, std::optional<Colour> fill, std::optional<Colour> border,
                  int borderWidth = 1);
+  /// What a control that has the focus shows round an area.
+  void Rings(Area ringed, const std::vector<Ring>& rings);
   /// Upright and level lines are sharp and hold both ends; others are smooth.
   void Line(Spot from, Spot to, Colour colour, int width);
   void Triangle(const std::array<Spot, 3>& corners, Colour colour);
