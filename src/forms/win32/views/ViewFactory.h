@@ -13,6 +13,6 @@ struct MadeView {
 };
 
 /// The view of a control by its kind; none for kinds that nobody sees, such as a list of images.
-MadeView MakeView(ViewContext& context, Control& control, WindowView& parent);
+MadeView MakeView(ViewContext& context, Control& control, HWND parent);
 
 } // namespace quendra::forms::win32

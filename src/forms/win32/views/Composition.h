@@ -1,0 +1,11 @@
+#pragma once
+
+#include "forms/win32/views/WindowView.h"
+
+namespace quendra::forms::win32 {
+
+/// Answers WM_PAINT of a window that stands for a control or a form. What of it is due is put together from
+/// the form's ground and all controls that have a part in it, those that lie below first, and shown at once.
+void PaintWindow(const WindowView& view);
+
+} // namespace quendra::forms::win32

@@ -1,0 +1,59 @@
+#include "forms/win32/views/ViewFactory.h"
+
+#include "forms/win32/views/FrameView.h"
+#include "forms/win32/views/ImageView.h"
+#include "forms/win32/views/LabelView.h"
+#include "forms/win32/views/LineView.h"
+#include "forms/win32/views/PictureBoxView.h"
+
+namespace quendra::forms::win32 {
+
+namespace {
+
+class PlainView : public WindowView {
+ public:
+  PlainView(ViewContext& context, Control& control, HWND parent) : WindowView(context, control) {
+    Create(parent);
+  }
+};
+
+/// Makes the view of the control that it visits.
+class Maker : public ControlVisitor {
+ public:
+  Maker(ViewContext& context, HWND parent) : context_(context), parent_(parent) {}
+  MadeView Made;
+
+  void Visit(ComboBox& combo) override { Make<PlainView>(combo); }
+  void Visit(Frame& frame) override { Make<FrameView>(frame); }
+  void Visit(Image& image) override { Make<ImageView>(image); }
+  void Visit(ImageList& /*images*/) override {} // lists show its pictures
+  void Visit(Label& label) override { Make<LabelView>(label); }
+  void Visit(Line& line) override { Make<LineView>(line); }
+  void Visit(ListBox& list) override { Make<PlainView>(list); }
+  void Visit(ListView& list) override { Make<PlainView>(list); }
+  void Visit(PictureBox& box) override { Make<PictureBoxView>(box); }
+  void Visit(TextBox& box) override { Make<PlainView>(box); }
+  void Visit(Timer& timer) override {
+    Made = {std::make_unique<TimerView>(timer, context_.startTimer), nullptr};
+  }
+
+ private:
+  template <typename KindView, typename Kind> void Make(Kind& control) {
+    auto view = std::make_unique<KindView>(context_, control, parent_);
+    WindowView* const window = view.get();
+    Made = {std::move(view), window};
+  }
+
+  ViewContext& context_;
+  HWND parent_;
+};
+
+} // namespace
+
+MadeView MakeView(ViewContext& context, Control& control, HWND parent) {
+  Maker maker(context, parent);
+  control.Accept(maker);
+  return std::move(maker.Made);
+}
+
+} // namespace quendra::forms::win32
