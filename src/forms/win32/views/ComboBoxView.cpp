@@ -1,0 +1,255 @@
+#include "forms/win32/views/ComboBoxView.h"
+
+#include "forms/view/ListLook.h"
+#include "forms/view/Palette.h"
+#include "forms/view/VisibleText.h"
+#include "forms/win32/views/ItemPainting.h"
+
+#include <utility>
+
+namespace quendra::forms::win32 {
+
+namespace {
+
+/// The room of the field's edge and ring.
+constexpr int kEdge = 3;
+constexpr int kArrowRoom = 18;
+constexpr int kRoomRoundLetters = 4;
+constexpr int kMostRows = 10;
+constexpr UINT kChosen = WM_APP + 0x211;
+
+DWORD StyleOf(const ComboBox& combo) {
+  const DWORD kind = combo.FreeText ? CBS_DROPDOWN | CBS_AUTOHSCROLL : CBS_DROPDOWNLIST;
+  return kind | CBS_HASSTRINGS | CBS_OWNERDRAWFIXED | CBS_NOINTEGRALHEIGHT | WS_VSCROLL | WS_CLIPCHILDREN;
+}
+
+DWORD BarSide(Direction direction) { return direction == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
+
+} // namespace
+
+ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, HWND parent)
+    : FieldView(context, combo, parent) {
+  Hold(L"COMBOBOX", StyleOf(combo), BarSide(ReadingDirection()));
+  if (combo.FreeText) TakeFreeText();
+}
+
+void ComboBoxView::TakeFreeText() {
+  COMBOBOXINFO parts{};
+  parts.cbSize = sizeof parts;
+  ::GetComboBoxInfo(Inner().Window(), &parts);
+  edit_.emplace(*this, parts.hwndItem, [this](UINT message, WPARAM wParam, LPARAM lParam) {
+    return AnswerEdit(message, wParam, lParam);
+  });
+  field_.emplace(*this, Combo(), false);
+  field_->Take(*edit_);
+}
+
+void ComboBoxView::ControlGone() {
+  if (field_) field_->Release();
+  FieldView::ControlGone();
+}
+
+HWND ComboBoxView::KeyWindow() const { return edit_ ? edit_->Window() : FieldView::KeyWindow(); }
+
+void ComboBoxView::FocusCame() {
+  Context().dispatcher.Dispatch([this] {
+    if (field_ && field_->Entry()) field_->Entry()->GotFocus();
+  });
+}
+
+int ComboBoxView::RowHeight() const {
+  return Context().fonts.LineHeight(Letters()) + Context().scale.Pixels(kRoomRoundLetters);
+}
+
+void ComboBoxView::Apply(Aspect aspect) {
+  const bool before = std::exchange(showing_, true);
+  if (Concerns(aspect, Aspect::Font)) {
+    GiveLetters();
+    Inner().Send(CB_SETITEMHEIGHT, 0, RowHeight());
+    Arrange();
+  }
+  if (Concerns(aspect, Aspect::Items)) FillItems();
+  if (Concerns(aspect, Aspect::Items) || aspect == Aspect::Selection) ShowSelection();
+  if (field_ && aspect == Aspect::Entry) field_->ShowText();
+  if (field_ && aspect == Aspect::Caret) field_->ShowCaret();
+  showing_ = before;
+}
+
+void ComboBoxView::FillItems() const {
+  // Items only grow until they are cleared, so the ones that stand here already are right.
+  int there = static_cast<int>(Inner().Send(CB_GETCOUNT));
+  if (there > Combo().ListCount() || Combo().ListCount() == 0) {
+    Inner().Send(CB_RESETCONTENT);
+    there = 0;
+  }
+  for (int i = there; i < Combo().ListCount(); ++i) {
+    const Text shown = VisibleText(Combo().List(i));
+    Inner().Send(CB_ADDSTRING, 0, reinterpret_cast<LPARAM>(winapi::Wide(shown)));
+  }
+}
+
+void ComboBoxView::ShowSelection() {
+  const bool before = std::exchange(showing_, true);
+  if (static_cast<int>(Inner().Send(CB_GETCURSEL)) != Combo().ListIndex())
+    Inner().Send(CB_SETCURSEL, static_cast<WPARAM>(Combo().ListIndex()));
+  // The system has put the item there as it stands in the list.
+  if (field_) field_->ShowText();
+  Inner().Redraw();
+  showing_ = before;
+}
+
+Area ComboBoxView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kEdge); }
+
+// The system counts the list that hangs down into the height, and takes the height of what is closed from
+// that of its letters.
+void ComboBoxView::Arrange() {
+  if (!TheControl()) return;
+  Area room = Room(WindowPlace().extent);
+  const int wanted = room.extent.height;
+  room.extent.height += kMostRows * RowHeight();
+  Inner().MoveTo(room);
+  const auto closed = [this] {
+    RECT place{};
+    ::GetWindowRect(Inner().Window(), &place);
+    return static_cast<int>(place.bottom - place.top);
+  };
+  const LRESULT letters = Inner().Send(CB_GETITEMHEIGHT, static_cast<WPARAM>(-1));
+  if (closed() != wanted) Inner().Send(CB_SETITEMHEIGHT, static_cast<WPARAM>(-1), letters + wanted - closed());
+  PlaceEdit();
+}
+
+Area ComboBoxView::TextRoom(Extent inside) const {
+  constexpr int kAside = kFieldPadding - kEdge;
+  const bool fromRight = ReadingDirection() == Direction::RightToLeft;
+  return {{fromRight ? kArrowRoom : kAside, 0}, {inside.width - kArrowRoom - kAside, inside.height}};
+}
+
+void ComboBoxView::PlaceEdit() const {
+  if (!edit_) return;
+  const Area room = TextRoom(Inner().Inside());
+  const int height = std::min(room.extent.height, Context().fonts.LineHeight(Letters()));
+  edit_->MoveTo({{room.corner.left, (room.extent.height - height) / 2}, {room.extent.width, height}});
+}
+
+std::optional<LRESULT> ComboBoxView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
+  if (!TheControl()) return FieldView::Answer(message, wParam, lParam);
+  if (message == WM_MEASUREITEM) {
+    reinterpret_cast<MEASUREITEMSTRUCT*>(lParam)->itemHeight = static_cast<UINT>(RowHeight());
+    return TRUE;
+  }
+  if (message != WM_DRAWITEM) return FieldView::Answer(message, wParam, lParam);
+  const auto& due = *reinterpret_cast<const DRAWITEMSTRUCT*>(lParam);
+  const auto item = static_cast<int>(due.itemID);
+  if (due.itemState & ODS_COMBOBOXEDIT) {
+    Inner().Redraw();
+    return TRUE;
+  }
+  if (item < 0 || item >= Combo().ListCount()) return TRUE;
+  const Colour ground = (due.itemState & ODS_SELECTED) != 0 ? RowGround(0, true) : Palette::Page;
+  PaintItem(due, {VisibleText(Combo().List(item)), Letters(), ground, ReadingDirection()});
+  return TRUE;
+}
+
+std::optional<LRESULT> ComboBoxView::AnswerInner(UINT message, WPARAM wParam, LPARAM lParam) {
+  if (!TheControl()) return std::nullopt;
+  switch (message) {
+  case WM_ERASEBKGND: return 1;
+  case WM_PAINT: PaintClosed(); return 0;
+  case kChosen: return TellChoice();
+  case WM_LBUTTONDOWN:
+  case WM_LBUTTONDBLCLK: Drop(); return 0;
+  // Turning the wheel over a closed list would switch what it stands for by accident.
+  case WM_MOUSEWHEEL:
+    if (!IsDropped()) return ::DefWindowProcW(Inner().Window(), message, wParam, lParam);
+    return std::nullopt;
+  case WM_CTLCOLOREDIT:
+  case WM_CTLCOLORSTATIC:
+  case WM_CTLCOLORLISTBOX: return Answer(message, wParam, lParam);
+  case WM_SIZE:
+    Inner().PassOn(message, wParam, lParam);
+    PlaceEdit();
+    return 0;
+  default: return FieldView::AnswerInner(message, wParam, lParam);
+  }
+}
+
+void ComboBoxView::Drop() {
+  ::SetFocus(KeyWindow());
+  if (TheControl()) Inner().Send(CB_SHOWDROPDOWN, !IsDropped());
+}
+
+std::optional<LRESULT> ComboBoxView::AnswerEdit(UINT message, WPARAM wParam, LPARAM lParam) {
+  if (message == WM_SETFOCUS || message == WM_KILLFOCUS) {
+    const LRESULT answer = edit_->PassOn(message, wParam, lParam);
+    if (message == WM_SETFOCUS)
+      FocusCameFrom(reinterpret_cast<HWND>(wParam));
+    else
+      Invalidate();
+    return answer;
+  }
+  return field_ ? field_->Answer(message, wParam, lParam) : std::nullopt;
+}
+
+KeyUse ComboBoxView::Use(const KeyPress& /*key*/) { return IsDropped() ? KeyUse::Window : KeyUse::Free; }
+
+void ComboBoxView::Notified(int code) {
+  if (showing_ || !TheControl()) return;
+  switch (code) {
+  case CBN_EDITCHANGE:
+    if (field_) field_->Edited();
+    break;
+  case CBN_DROPDOWN: chosen_ = false; break;
+  case CBN_SELENDOK: chosen_ = true; break;
+  case CBN_SELENDCANCEL: chosen_ = false; break;
+  case CBN_SELCHANGE:
+    if (!IsDropped()) Choose();
+    break;
+  case CBN_CLOSEUP:
+    if (std::exchange(chosen_, false))
+      Choose();
+    else
+      ShowSelection();
+    break;
+  default: break;
+  }
+}
+
+void ComboBoxView::Choose() {
+  if (!std::exchange(telling_, true)) ::PostMessageW(Inner().Window(), kChosen, 0, 0);
+}
+
+LRESULT ComboBoxView::TellChoice() {
+  telling_ = false;
+  const auto chosen = static_cast<int>(Inner().Send(CB_GETCURSEL));
+  Context().dispatcher.Dispatch([&] {
+    if (chosen >= 0) Combo().SelectItem(chosen);
+  });
+  if (TheControl()) ShowSelection();
+  return 0;
+}
+
+// The ground of the field goes on here, with what tells a list: its arrow and the text of the selected item.
+void ComboBoxView::PaintClosed() const {
+  const Area whole{{}, Inner().Inside()};
+  const FieldState state = State();
+  Surface surface(whole.extent);
+  Drawing drawing(surface, {}, whole);
+  drawing.Fill(whole, FaceOf(state).fill);
+  const Colour ink = state.enabled ? Palette::Ink : Palette::QuietInk;
+  const bool fromRight = ReadingDirection() == Direction::RightToLeft;
+  const Text shown = VisibleText(Combo().SelectedText());
+  if (!field_)
+    drawing.Text(shown, TextRoom(whole.extent), Letters(), ink,
+                 {DirectionOf(shown), SideOf(Alignment::Leading, ReadingDirection())});
+  constexpr int kHalf = 4;
+  const int middle = fromRight ? kArrowRoom / 2 : whole.extent.width - kArrowRoom / 2;
+  const int top = whole.extent.height / 2 - kHalf / 2;
+  drawing.Triangle({{{middle - kHalf, top}, {middle + kHalf, top}, {middle, top + kHalf}}},
+                   state.enabled ? Palette::Ink : Palette::StrongBorder);
+  PAINTSTRUCT paint{};
+  const HDC device = ::BeginPaint(Inner().Window(), &paint);
+  surface.ShowOn(device, whole);
+  ::EndPaint(Inner().Window(), &paint);
+}
+
+} // namespace quendra::forms::win32

@@ -1,0 +1,179 @@
+#include "forms/win32/views/EditField.h"
+
+#include "forms/view/VisibleText.h"
+#include "forms/view/fields/Typing.h"
+#include "forms/win32/views/EditMenu.h"
+#include "forms/win32/views/EditText.h"
+
+#include <utility>
+
+namespace quendra::forms::win32 {
+
+namespace {
+
+/// Its place in the window is brought into sight when the handlers are through: a text that grows at its end
+/// would else jump to its start and back.
+constexpr UINT kShowCaret = WM_APP + 0x210;
+
+bool IsDown(int key) { return ::GetKeyState(key) < 0; }
+
+/// Ctrl and Alt together are the key for third letters.
+int ShiftOfTyping() {
+  const bool ctrl = IsDown(VK_CONTROL);
+  const bool alt = IsDown(VK_MENU);
+  return ShiftSum(IsDown(VK_SHIFT), ctrl && !alt, alt && !ctrl);
+}
+
+/// Messages after which the caret may stand elsewhere.
+bool MayMoveCaret(UINT message) {
+  switch (message) {
+  case WM_KEYDOWN:
+  case WM_KEYUP:
+  case WM_LBUTTONDOWN:
+  case WM_LBUTTONUP:
+  case WM_LBUTTONDBLCLK:
+  case WM_UNDO: return true;
+  default: return false;
+  }
+}
+
+} // namespace
+
+void EditField::Take(const InnerWindow& edit) {
+  edit_ = &edit;
+  edit_->Send(EM_SETLIMITTEXT, 0);
+}
+
+std::optional<LRESULT> EditField::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
+  if (!entry_) return std::nullopt;
+  switch (message) {
+  case WM_CHAR: return Typed(wParam, lParam);
+  case WM_CONTEXTMENU: ShowMenu(lParam); return 0;
+  case kShowCaret: edit_->Send(EM_SCROLLCARET); return 0;
+  case WM_KEYDOWN: key_ = wParam; break;
+  case WM_MOUSEMOVE:
+    if (!(wParam & MK_LBUTTON)) return std::nullopt;
+    break;
+  default:
+    if (!MayMoveCaret(message)) return std::nullopt;
+  }
+  const LRESULT answer = edit_->PassOn(message, wParam, lParam);
+  TellSelection();
+  return answer;
+}
+
+LRESULT EditField::Typed(WPARAM unit, LPARAM lParam) {
+  const WPARAM key = std::exchange(key_, 0);
+  // With Ctrl, Enter gives a line feed.
+  const int character = key == VK_RETURN ? kEnterKey : CharacterOf(static_cast<char16_t>(unit));
+  if (character == 0) return 0;
+  const bool named = character < 0x20 && key != 0 && key != VK_PACKET;
+  const int code = named ? static_cast<int>(key) : CodeOfCharacter(static_cast<char16_t>(character));
+  if (!IsTyped(view_.TheControl()->OwnerForm(), {code, ShiftOfTyping(), false})) return 0;
+  Typing typing;
+  view_.Context().dispatcher.Dispatch([&] {
+    if (entry_) typing = Type(*entry_, character, ofManyLines_);
+  });
+  if (!entry_) return 0;
+  const bool readOnly = edit_->Has(ES_READONLY);
+  if (typing.act == Typing::Act::Insert && !readOnly)
+    edit_->Send(EM_REPLACESEL, TRUE, reinterpret_cast<LPARAM>(winapi::Wide(typing.text)));
+  if (typing.act == Typing::Act::DeleteBack && !readOnly) edit_->PassOn(WM_CHAR, kBackspaceKey, lParam);
+  if (typing.act == Typing::Act::Command) Command(character, lParam);
+  TellSelection();
+  return 0;
+}
+
+/// 0 while the other half of the character is to come.
+int EditField::CharacterOf(char16_t unit) {
+  constexpr int kFirstOutsidePlane = 0x10000;
+  if (unit >= 0xD800 && unit <= 0xDBFF) {
+    high_ = unit;
+    return 0;
+  }
+  const char16_t high = std::exchange(high_, u'\0');
+  if (unit < 0xDC00 || unit > 0xDFFF) return unit;
+  return high ? kFirstOutsidePlane + ((high - 0xD800) << 10) + (unit - 0xDC00) : 0;
+}
+
+// The class would put the other control characters into the text.
+void EditField::Command(int character, LPARAM lParam) {
+  enum : int { kSelectAll = 1, kCopy = 3, kPaste = 22, kCut = 24, kUndo = 26 };
+  if (character == kSelectAll) edit_->Send(EM_SETSEL, 0, -1);
+  if (character == kCopy || character == kPaste || character == kCut || character == kUndo)
+    edit_->PassOn(WM_CHAR, static_cast<WPARAM>(character), lParam);
+}
+
+void EditField::ShowMenu(LPARAM place) {
+  if (!edit_->HasFocus()) ::SetFocus(edit_->Window());
+  ShowEditMenu(edit_->Window(), place);
+  TellSelection();
+}
+
+void EditField::Edited() {
+  if (showing_ || !entry_) return;
+  const Text value = EditText::ValueOf(TextOfWindow(edit_->Window()), ofManyLines_);
+  const int caret = EditText(value, ofManyLines_).ValuePlace(HeldSelection().second);
+  view_.Context().dispatcher.Dispatch([&] {
+    if (entry_) entry_->Edited(value, caret);
+  });
+  if (!entry_) return;
+  // What was pasted may have signs in it that are shown in another way.
+  ShowText();
+}
+
+void EditField::TellSelection() {
+  if (showing_ || !entry_) return;
+  const EditText text(entry_->Value(), ofManyLines_);
+  const auto [from, to] = HeldSelection();
+  const int start = text.ValuePlace(from);
+  entry_->Selected(start, text.ValuePlace(to) - start);
+}
+
+std::pair<int, int> EditField::HeldSelection() const {
+  DWORD from = 0;
+  DWORD to = 0;
+  edit_->Send(EM_GETSEL, reinterpret_cast<WPARAM>(&from), reinterpret_cast<LPARAM>(&to));
+  return {static_cast<int>(from), static_cast<int>(to)};
+}
+
+void EditField::ShowText() {
+  const bool before = std::exchange(showing_, true);
+  ReadFrom(DirectionOf(entry_->Value()));
+  Hold(EditText(entry_->Value(), ofManyLines_).Held());
+  showing_ = before;
+  ShowCaret();
+}
+
+// A text that only grows keeps what stands there: it doesn't flicker, and undoing ends there.
+void EditField::Hold(const Text& text) {
+  const Text held = TextOfWindow(edit_->Window());
+  if (held == text) return;
+  if (!ofManyLines_ || held.empty() || text.compare(0, held.size(), held) != 0) {
+    ::SetWindowTextW(edit_->Window(), winapi::Wide(text));
+    return;
+  }
+  const Text tail = text.substr(held.size());
+  edit_->Send(EM_SETSEL, held.size(), static_cast<LPARAM>(held.size()));
+  edit_->Send(EM_REPLACESEL, FALSE, reinterpret_cast<LPARAM>(winapi::Wide(tail)));
+  edit_->Send(EM_EMPTYUNDOBUFFER);
+}
+
+void EditField::ShowCaret() {
+  const EditText text(entry_->Value(), ofManyLines_);
+  const int from = text.HeldPlace(entry_->SelStart());
+  const int to = text.HeldPlace(entry_->SelStart() + entry_->SelLength());
+  if (HeldSelection() == std::pair(from, to)) return;
+  const bool before = std::exchange(showing_, true);
+  edit_->Send(EM_SETSEL, static_cast<WPARAM>(from), to);
+  showing_ = before;
+  ::PostMessageW(edit_->Window(), kShowCaret, 0, 0);
+}
+
+// The caret of an empty field stands where Latin letters, which all fields here are for, begin.
+void EditField::ReadFrom(Direction direction) {
+  const bool fromRight = direction == Direction::RightToLeft;
+  if (edit_->SetStyle(GWL_EXSTYLE, WS_EX_RTLREADING | WS_EX_RIGHT, fromRight)) edit_->Redraw();
+}
+
+} // namespace quendra::forms::win32

@@ -1,0 +1,48 @@
+#pragma once
+
+#include "forms/controls/TextEntry.h"
+#include "forms/win32/views/InnerWindow.h"
+
+namespace quendra::forms::win32 {
+
+/// What keys, the focus and the mouse do in an EDIT window, whatever view it stands in.
+class EditField {
+ public:
+  EditField(WindowView& view, TextEntry& entry, bool ofManyLines)
+      : view_(view), entry_(&entry), ofManyLines_(ofManyLines) {}
+
+  /// The window, which must stay as long as this.
+  void Take(const InnerWindow& edit);
+  /// nullptr once released.
+  TextEntry* Entry() const { return entry_; }
+  /// The control goes or is let go of.
+  void Release() { entry_ = nullptr; }
+
+  /// What becomes of a message to the window. None lets its class answer.
+  std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam);
+  /// The window tells that its text has changed.
+  void Edited();
+
+  void ShowText();
+  void ShowCaret();
+
+ private:
+  LRESULT Typed(WPARAM unit, LPARAM lParam);
+  int CharacterOf(char16_t unit);
+  void Command(int character, LPARAM lParam);
+  void TellSelection();
+  void Hold(const Text& text);
+  void ReadFrom(Direction direction);
+  void ShowMenu(LPARAM place);
+  std::pair<int, int> HeldSelection() const;
+
+  WindowView& view_;
+  TextEntry* entry_;
+  bool ofManyLines_;
+  const InnerWindow* edit_ = nullptr;
+  bool showing_ = false; ///< what changes now is what the field says, not the user
+  WPARAM key_ = 0;       ///< that went down last and has given no character yet
+  char16_t high_ = 0;    ///< the first half of a character of two units
+};
+
+} // namespace quendra::forms::win32

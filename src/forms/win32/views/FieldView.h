@@ -1,0 +1,48 @@
+#pragma once
+
+#include "forms/view/fields/FieldLook.h"
+#include "forms/win32/views/InnerWindow.h"
+
+namespace quendra::forms::win32 {
+
+/// A field that the form draws, with a window of one of the system's kinds inside its edge. The accessible
+/// name of that window is the text of one without extent before it, as assistive technology finds the names
+/// of fields by the labels before them.
+class FieldView : public WindowView {
+ public:
+  FieldView(ViewContext& context, Control& control, HWND parent);
+  void Paint(Drawing& drawing) override;
+  bool TakesMouse() const override { return false; }
+  /// The window of the system's kind.
+  const InnerWindow& Inner() const { return *inner_; }
+
+ protected:
+  /// Makes the window of the system's kind, in the constructor of the view's kind.
+  void Hold(const wchar_t* windowClass, DWORD style, DWORD extendedStyle = 0);
+  std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;
+  /// A message to the window of the system's kind.
+  virtual std::optional<LRESULT> AnswerInner(UINT message, WPARAM wParam, LPARAM lParam);
+  /// The window of the system's kind tells of something.
+  virtual void Notified(int /*code*/) {}
+  void TellName() override;
+  /// The window of the system's that has the keys.
+  virtual HWND KeyWindow() const { return inner_->Window(); }
+  /// The focus has come to a window of the system's inside the field.
+  void FocusCameFrom(HWND before);
+  /// Where the window of the system's kind stands in a field of this extent.
+  virtual Area Room(Extent field) const = 0;
+  virtual bool IsReadOnly() const { return false; }
+  virtual HFONT Letters() const;
+  void GiveLetters();
+  /// Puts the window of the system's kind in its place.
+  virtual void Arrange();
+  FieldState State() const;
+
+ private:
+  LRESULT ColourText(HDC device) const;
+
+  std::optional<InnerWindow> name_;
+  std::optional<InnerWindow> inner_;
+};
+
+} // namespace quendra::forms::win32

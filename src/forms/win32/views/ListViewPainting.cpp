@@ -1,0 +1,83 @@
+#include "forms/view/Palette.h"
+#include "forms/win32/views/ListViewView.h"
+
+#include <algorithm>
+
+// How a list's windows are drawn: a row or the headers at once, put together before they are shown.
+
+namespace quendra::forms::win32 {
+
+namespace {
+
+/// A paint of the system's, from its begin to its end, in the places of the screen: the system would show
+/// what goes into a mirrored window as in a mirror.
+class PlainPainting {
+ public:
+  explicit PlainPainting(HWND window) : window_(window), device_(::BeginPaint(window, &paint_)) {
+    ::SetLayout(device_, 0);
+  }
+  ~PlainPainting() { ::EndPaint(window_, &paint_); }
+  PlainPainting(const PlainPainting&) = delete;
+  PlainPainting& operator=(const PlainPainting&) = delete;
+
+  const RECT& Due() const { return paint_.rcPaint; }
+  void Show(const Surface& surface, int top) const {
+    ::SetViewportOrgEx(device_, 0, top, nullptr);
+    surface.ShowOn(device_, {{}, surface.Size()});
+  }
+
+ private:
+  HWND window_;
+  PAINTSTRUCT paint_{};
+  HDC device_;
+};
+
+} // namespace
+
+void ListViewView::PaintRows() {
+  const PlainPainting painting(Inner().Window());
+  const int height = painter_.RowHeight();
+  const int header = painter_.HeaderHeight();
+  const Area place{{}, {Inner().Inside().width, height}};
+  if (!canvas_ || canvas_->Size() != place.extent) canvas_.emplace(place.extent);
+  const auto cells =
+      columns_->CellsOf(static_cast<int>(List().Columns().size()), height, ReadingDirection());
+  const int topRow = TopRow();
+  const int from = std::max(0, static_cast<int>(painting.Due().top) - header) / height;
+  for (int line = from; header + line * height < painting.Due().bottom; ++line) {
+    Drawing drawing(*canvas_, {}, place);
+    painter_.PaintRow(drawing, topRow + line, place, cells);
+    PaintRing(drawing, line * height);
+    painting.Show(*canvas_, header + line * height);
+  }
+}
+
+/// The part of the ring round all rows that lies `top` pixels below the first.
+void ListViewView::PaintRing(Drawing& drawing, int top) const {
+  const auto ring = RingOfList(HasFocus(), UsesKeys());
+  if (!ring) return;
+  const Extent inside = Inner().Inside();
+  const Area rows{{0, -top}, {inside.width, inside.height - painter_.HeaderHeight()}};
+  drawing.Stroke(RoundBox::Of(rows, ring->corner, ring->inset), ring->colour, ring->width);
+}
+
+void ListViewView::PaintHeaders() {
+  const PlainPainting painting(header_->Window());
+  const Extent inside = header_->Inside();
+  const Area whole{{}, inside};
+  Surface surface(inside);
+  Drawing drawing(surface, {}, whole);
+  const int count = static_cast<int>(List().Columns().size());
+  painter_.PaintHeader(drawing, count, whole);
+  // The header's window is moved with what is scrolled, so its places are those of a list that isn't.
+  int place = 0;
+  for (int column = 0; column < count; ++column) {
+    const int width = columns_->WidthOf(column);
+    const int left = ReadingDirection() == Direction::RightToLeft ? inside.width - place - width : place;
+    if (width > 0) painter_.PaintHeader(drawing, column, {{left, 0}, {width, inside.height}});
+    place += width;
+  }
+  painting.Show(surface, 0);
+}
+
+} // namespace quendra::forms::win32

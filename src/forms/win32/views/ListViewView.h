@@ -1,0 +1,68 @@
+#pragma once
+
+#include "forms/win32/views/FieldView.h"
+#include "forms/win32/views/ListColumns.h"
+#include "forms/win32/views/ListPainter.h"
+
+namespace quendra::forms::win32 {
+
+/// A table. The system's window holds no data: it has the bars, the keys and the columns, and tells assistive
+/// technology. Rows and headers are drawn here, each put together before it is shown.
+class ListViewView : public FieldView, public ListViewObserver {
+ public:
+  ListViewView(ViewContext& context, ListView& list, HWND parent);
+  void Paint(Drawing& drawing) override;
+  void Release() override;
+  void ControlGone() override;
+
+  void RowAdded(int index) override;
+  void RowRemoved(int index) override;
+  void RowChanged(int index, int cell) override;
+  void RowsMoved() override;
+  void RowsCleared() override;
+  void ColumnsChanged() override;
+
+  /// Where a row, from 0 on, stands in the system's window.
+  Area PlaceOfRow(int row) const;
+  HWND Header() const { return header_->Window(); }
+
+ protected:
+  std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;
+  std::optional<LRESULT> AnswerInner(UINT message, WPARAM wParam, LPARAM lParam) override;
+  Area Room(Extent field) const override;
+  void PutInPlace() override;
+  void Apply(Aspect aspect) override;
+
+ private:
+  ListView& List() const { return static_cast<ListView&>(*TheControl()); }
+  /// Changes the system's window without taking what it tells of for the user's choice.
+  template <typename Change> void Quietly(Change change);
+  std::optional<LRESULT> AnswerHeader(UINT message, WPARAM wParam, LPARAM lParam);
+  std::optional<LRESULT> Told(const NMHDR& notice);
+  std::optional<LRESULT> ToldByHeader(const NMHDR& notice);
+  void TellText(NMHDR& notice) const;
+  int Search(const NMHDR& notice) const;
+  LRESULT TakeMouse(UINT message, WPARAM wParam, LPARAM lParam);
+  void Choose(int row);
+  void SetCount();
+  void SetRowHeight();
+  /// The last row in sight is never cut: what a row more would need stays free.
+  void FitRows();
+  void ShowSelection();
+  void RedrawFrom(int row) const;
+  void RedrawRow(int row) const;
+  int TopRow() const;
+  void PaintRows();
+  void PaintHeaders();
+  void PaintRing(Drawing& drawing, int top) const;
+
+  ListPainter painter_;
+  std::optional<ListColumns> columns_;
+  std::optional<InnerWindow> header_;
+  std::optional<Surface> canvas_; ///< of one row
+  bool quiet_ = false;
+  bool fittingRows_ = false;
+  int shown_ = -1; ///< the row that is drawn as selected
+};
+
+} // namespace quendra::forms::win32
