@@ -1,21 +1,19 @@
 #include "forms/win32/views/ViewFactory.h"
 
+#include "forms/win32/views/ComboBoxView.h"
 #include "forms/win32/views/FrameView.h"
 #include "forms/win32/views/ImageView.h"
 #include "forms/win32/views/LabelView.h"
 #include "forms/win32/views/LineView.h"
+#include "forms/win32/views/ListBoxView.h"
+#include "forms/win32/views/ListViewView.h"
 #include "forms/win32/views/PictureBoxView.h"
+#include "forms/win32/views/TextAreaView.h"
+#include "forms/win32/views/TextLineView.h"
 
 namespace quendra::forms::win32 {
 
 namespace {
-
-class PlainView : public WindowView {
- public:
-  PlainView(ViewContext& context, Control& control, HWND parent) : WindowView(context, control) {
-    Create(parent);
-  }
-};
 
 /// Makes the view of the control that it visits.
 class Maker : public ControlVisitor {
@@ -23,16 +21,21 @@ class Maker : public ControlVisitor {
   Maker(ViewContext& context, HWND parent) : context_(context), parent_(parent) {}
   MadeView Made;
 
-  void Visit(ComboBox& combo) override { Make<PlainView>(combo); }
+  void Visit(ComboBox& combo) override { Make<ComboBoxView>(combo); }
   void Visit(Frame& frame) override { Make<FrameView>(frame); }
   void Visit(Image& image) override { Make<ImageView>(image); }
   void Visit(ImageList& /*images*/) override {} // lists show its pictures
   void Visit(Label& label) override { Make<LabelView>(label); }
   void Visit(Line& line) override { Make<LineView>(line); }
-  void Visit(ListBox& list) override { Make<PlainView>(list); }
-  void Visit(ListView& list) override { Make<PlainView>(list); }
+  void Visit(ListBox& list) override { Make<ListBoxView>(list); }
+  void Visit(ListView& list) override { Make<ListViewView>(list); }
   void Visit(PictureBox& box) override { Make<PictureBoxView>(box); }
-  void Visit(TextBox& box) override { Make<PlainView>(box); }
+  void Visit(TextBox& box) override {
+    if (box.MultiLine)
+      Make<TextAreaView>(box);
+    else
+      Make<TextLineView>(box);
+  }
   void Visit(Timer& timer) override {
     Made = {std::make_unique<TimerView>(timer, context_.startTimer), nullptr};
   }
