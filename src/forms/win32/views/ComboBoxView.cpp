@@ -40,7 +40,10 @@ void ComboBoxView::TakeFreeText() {
   edit_.emplace(*this, parts.hwndItem, [this](UINT message, WPARAM wParam, LPARAM lParam) {
     return AnswerEdit(message, wParam, lParam);
   });
-  field_.emplace(*this, Combo(), false);
+  field_.emplace(*this, Combo(), false, [this](Direction direction) {
+    const bool fromRight = direction == Direction::RightToLeft;
+    if (edit_->SetStyle(GWL_EXSTYLE, WS_EX_RTLREADING | WS_EX_RIGHT, fromRight)) edit_->Redraw();
+  });
   field_->Take(*edit_);
 }
 

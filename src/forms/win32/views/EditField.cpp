@@ -139,7 +139,8 @@ std::pair<int, int> EditField::HeldSelection() const {
 
 void EditField::ShowText() {
   const bool before = std::exchange(showing_, true);
-  ReadFrom(DirectionOf(entry_->Value()));
+  // The caret of an empty field stands where Latin letters, which all fields here are for, begin.
+  readFrom_(DirectionOf(entry_->Value()));
   Hold(EditText(entry_->Value(), ofManyLines_).Held());
   showing_ = before;
   ShowCaret();
@@ -168,12 +169,6 @@ void EditField::ShowCaret() {
   edit_->Send(EM_SETSEL, static_cast<WPARAM>(from), to);
   showing_ = before;
   ::PostMessageW(edit_->Window(), kShowCaret, 0, 0);
-}
-
-// The caret of an empty field stands where Latin letters, which all fields here are for, begin.
-void EditField::ReadFrom(Direction direction) {
-  const bool fromRight = direction == Direction::RightToLeft;
-  if (edit_->SetStyle(GWL_EXSTYLE, WS_EX_RTLREADING | WS_EX_RIGHT, fromRight)) edit_->Redraw();
 }
 
 } // namespace quendra::forms::win32

@@ -8,10 +8,11 @@ namespace quendra::forms::win32 {
 /// What keys, the focus and the mouse do in an EDIT window, whatever view it stands in.
 class EditField {
  public:
-  EditField(WindowView& view, TextEntry& entry, bool ofManyLines)
-      : view_(view), entry_(&entry), ofManyLines_(ofManyLines) {}
+  /// `readFrom` has the window read in a direction.
+  EditField(WindowView& view, TextEntry& entry, bool ofManyLines, std::function<void(Direction)> readFrom)
+      : view_(view), entry_(&entry), ofManyLines_(ofManyLines), readFrom_(std::move(readFrom)) {}
 
-  /// The window, which must stay as long as this.
+  /// The window, which must stay until another one is taken.
   void Take(const InnerWindow& edit);
   /// nullptr once released.
   TextEntry* Entry() const { return entry_; }
@@ -32,13 +33,13 @@ class EditField {
   void Command(int character, LPARAM lParam);
   void TellSelection();
   void Hold(const Text& text);
-  void ReadFrom(Direction direction);
   void ShowMenu(LPARAM place);
   std::pair<int, int> HeldSelection() const;
 
   WindowView& view_;
   TextEntry* entry_;
   bool ofManyLines_;
+  std::function<void(Direction)> readFrom_;
   const InnerWindow* edit_ = nullptr;
   bool showing_ = false; ///< what changes now is what the field says, not the user
   WPARAM key_ = 0;       ///< that went down last and has given no character yet

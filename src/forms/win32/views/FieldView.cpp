@@ -3,6 +3,8 @@
 #include "forms/view/Accessible.h"
 #include "forms/view/Palette.h"
 
+#include <utility>
+
 namespace quendra::forms::win32 {
 
 FieldView::FieldView(ViewContext& context, Control& control, HWND parent) : WindowView(context, control) {
@@ -11,10 +13,15 @@ FieldView::FieldView(ViewContext& context, Control& control, HWND parent) : Wind
 
 void FieldView::Hold(const wchar_t* windowClass, DWORD style, DWORD extendedStyle) {
   const auto leave = [](UINT, WPARAM, LPARAM) -> std::optional<LRESULT> { return std::nullopt; };
-  name_.emplace(*this, L"STATIC", 0, 0, leave);
-  inner_.emplace(*this, windowClass, style, extendedStyle, [this](UINT message, WPARAM wParam, LPARAM lParam) {
-    return AnswerInner(message, wParam, lParam);
-  });
+  if (!name_) name_ = std::make_unique<InnerWindow>(*this, L"STATIC", 0, 0, leave);
+  auto made = std::make_unique<InnerWindow>(*this, windowClass, style, extendedStyle,
+                                            [this](UINT message, WPARAM wParam, LPARAM lParam) {
+                                              return AnswerInner(message, wParam, lParam);
+                                            });
+  const HWND before = inner_ ? inner_->Window() : nullptr;
+  if (before && inner_->HasFocus()) ::SetFocus(made->Window());
+  inner_ = std::move(made);
+  if (before) ::DestroyWindow(before);
 }
 
 FieldState FieldView::State() const { return {IsEnabled(), IsReadOnly(), HasFocus(), UsesKeys()}; }

@@ -3,6 +3,8 @@
 #include "forms/view/fields/FieldLook.h"
 #include "forms/win32/views/InnerWindow.h"
 
+#include <memory>
+
 namespace quendra::forms::win32 {
 
 /// A field that the form draws, with a window of one of the system's kinds inside its edge. The accessible
@@ -17,7 +19,8 @@ class FieldView : public WindowView {
   const InnerWindow& Inner() const { return *inner_; }
 
  protected:
-  /// Makes the window of the system's kind, in the constructor of the view's kind.
+  /// Makes the window of the system's kind, in the constructor of the view's kind and whenever another one is
+  /// to take its place.
   void Hold(const wchar_t* windowClass, DWORD style, DWORD extendedStyle = 0);
   std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;
   /// A message to the window of the system's kind.
@@ -41,8 +44,8 @@ class FieldView : public WindowView {
  private:
   LRESULT ColourText(HDC device) const;
 
-  std::optional<InnerWindow> name_;
-  std::optional<InnerWindow> inner_;
+  std::unique_ptr<InnerWindow> name_;
+  std::unique_ptr<InnerWindow> inner_;
 };
 
 } // namespace quendra::forms::win32

@@ -1,10 +1,45 @@
 #include "forms/win32/views/TextFieldView.h"
 
+#include "forms/view/VisibleText.h"
+
 namespace quendra::forms::win32 {
 
+namespace {
+constexpr UINT kTurn = WM_APP + 0x212;
+}
+
+TextFieldView::TextFieldView(ViewContext& context, TextBox& box, HWND parent)
+    : FieldView(context, box, parent),
+      edit_(*this, box, box.MultiLine, [this](Direction direction) { ReadFrom(direction); }),
+      reading_(DirectionOf(box.Value())), held_(reading_) {}
+
 void TextFieldView::HoldEdit(DWORD style, DWORD extendedStyle) {
-  Hold(L"EDIT", style, extendedStyle);
+  style_ = style;
+  extendedStyle_ = extendedStyle;
+  held_ = reading_;
+  const DWORD side = held_ == Direction::RightToLeft ? WS_EX_RTLREADING | WS_EX_RIGHT : 0;
+  Hold(L"EDIT", style, extendedStyle | side);
   edit_.Take(Inner());
+}
+
+// Not all systems let an EDIT window turn once it is made, and it can't be replaced while it tells of the text
+// that turned.
+void TextFieldView::ReadFrom(Direction direction) {
+  if (direction != reading_) ::PostMessageW(Window(), kTurn, 0, 0);
+  reading_ = direction;
+}
+
+void TextFieldView::Turn() {
+  if (!TheControl() || reading_ == held_) return;
+  HoldEdit(style_, extendedStyle_);
+  ::EnableWindow(Inner().Window(), IsEnabled());
+  Apply(Aspect::All);
+}
+
+std::optional<LRESULT> TextFieldView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
+  if (message != kTurn) return FieldView::Answer(message, wParam, lParam);
+  Turn();
+  return 0;
 }
 
 void TextFieldView::ControlGone() {

@@ -10,13 +10,13 @@ namespace quendra::forms::win32 {
 /// What text boxes of one line and of many have in common.
 class TextFieldView : public FieldView {
  public:
-  TextFieldView(ViewContext& context, TextBox& box, HWND parent)
-      : FieldView(context, box, parent), edit_(*this, box, box.MultiLine) {}
+  TextFieldView(ViewContext& context, TextBox& box, HWND parent);
   void ControlGone() override;
 
  protected:
   /// Makes the window, in the constructor of the kind.
   void HoldEdit(DWORD style, DWORD extendedStyle = 0);
+  std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;
   std::optional<LRESULT> AnswerInner(UINT message, WPARAM wParam, LPARAM lParam) override;
   void Notified(int code) override;
   void FocusCame() override;
@@ -26,7 +26,14 @@ class TextFieldView : public FieldView {
   const TextBox& Box() const { return static_cast<const TextBox&>(*TheControl()); }
 
  private:
+  void ReadFrom(Direction direction);
+  void Turn();
+
   EditField edit_;
+  Direction reading_; ///< of the text
+  Direction held_;    ///< of the window
+  DWORD style_ = 0;
+  DWORD extendedStyle_ = 0;
   mutable FixedFont fixed_;
 };
 
