@@ -123,7 +123,7 @@ TEST_F(Window, What_stands_in_front_is_the_last_child_and_what_was_brought_there
   EXPECT_EQ(::GetTopWindow(WindowOf(form).Body()), ViewOf(first).Window());
 }
 
-TEST_F(Window, A_round_region_cuts_the_corners) {
+TEST_F(Window, A_round_region_cuts_the_corners_and_nothing_else) {
   form.Border = BorderStyle::None;
   desktop.Load(form);
 
@@ -133,8 +133,10 @@ TEST_F(Window, A_round_region_cuts_the_corners) {
   ::GetWindowRgn(WindowOf(form).Top(), region);
   EXPECT_FALSE(::PtInRegion(region, 0, 0));
   EXPECT_TRUE(::PtInRegion(region, 5, 1));
-  EXPECT_TRUE(::PtInRegion(region, 200, 150));
-  EXPECT_FALSE(::PtInRegion(region, 200, 300));
+  EXPECT_TRUE(::PtInRegion(region, 0, 150));
+  EXPECT_TRUE(::PtInRegion(region, 399, 150));
+  EXPECT_TRUE(::PtInRegion(region, 200, 299));
+  EXPECT_FALSE(::PtInRegion(region, 399, 299));
   ::DeleteObject(region);
 }
 

@@ -129,8 +129,9 @@ void FormWindow::CutOut(bool redraw) {
   HRGN region = nullptr;
   if (shape_) {
     const RoundRect cut = shape_->In(scale_);
-    region =
-        ::CreateRoundRectRgn(cut.left, cut.top, cut.right, cut.bottom, cut.ellipseWidth, cut.ellipseHeight);
+    // The system leaves out one more row and column than it does with other shapes.
+    region = ::CreateRoundRectRgn(cut.left, cut.top, cut.right + 1, cut.bottom + 1, cut.ellipseWidth,
+                                  cut.ellipseHeight);
   }
   // The window owns it from now on, unless it doesn't take it.
   if (!::SetWindowRgn(Top(), region, redraw) && region) ::DeleteObject(region);

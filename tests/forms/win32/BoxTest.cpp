@@ -1,0 +1,171 @@
+#include "forms/win32/Win32Fixture.h"
+
+#include "forms/win32/boxes/BoxViews.h"
+
+namespace quendra::forms::win32 {
+
+/// How message boxes lie on the screen, whatever their text, and what keys do in them.
+class Boxes : public Win32Fixture {
+ protected:
+  struct Seen {
+    Area box{};
+    Area button{};
+    bool buttonHasFocus = false;
+    bool isScrolled = false;
+    Text text{}; ///< of the field that scrolls it
+  };
+
+  /// Shows a box, looks at it and answers it by its first button.
+  Seen Show(const Text& text, int flags = kInformation | kHebrewBox) {
+    Seen seen;
+    const auto looks = desktop.StartTimer(1, [&] {
+      if (FormWindow* box = BoxAnswers::Standing()) Look(*box, seen);
+    });
+    SeenBox answered;
+    desktop.Post([&] { desktop.Post([&] { user.AnswerBox(answered); }); });
+    desktop.MessageBox(text, flags, u"title");
+    return seen;
+  }
+  bool IsOnScreen(const Seen& seen) {
+    const Area screen = UsableScreenRound(nullptr);
+    return CommonPart(seen.box, screen) == seen.box && CommonPart(seen.button, seen.box) == seen.button &&
+           seen.button.extent.height > 0;
+  }
+  /// Presses a key in the next box.
+  void PressInBox(WORD key) {
+    desktop.Post([=, this] {
+      // Once the box stands.
+      INPUT inputs[2]{};
+      inputs[0].type = inputs[1].type = INPUT_KEYBOARD;
+      inputs[0].ki.wVk = inputs[1].ki.wVk = key;
+      inputs[1].ki.dwFlags = KEYEVENTF_KEYUP;
+      if (!BoxAnswers::Standing()) return PressInBox(key);
+      ::SendInput(2, inputs, sizeof(INPUT));
+    });
+  }
+
+ private:
+  static Area OnScreen(HWND window) {
+    RECT place{};
+    ::GetWindowRect(window, &place);
+    return {{static_cast<int>(place.left), static_cast<int>(place.top)},
+            {static_cast<int>(place.right - place.left), static_cast<int>(place.bottom - place.top)}};
+  }
+  static void Look(FormWindow& box, Seen& seen) {
+    seen.box = box.OnScreen();
+    for (const Control* control : box.TheForm()->Children()) {
+      const auto& view = dynamic_cast<const WindowView&>(*control->View());
+      if (const auto* field = dynamic_cast<const TextBox*>(control); field && field->Visible()) {
+        seen.isScrolled = true;
+        seen.text = field->Value();
+      }
+      if (!dynamic_cast<const CommandButton*>(control)) continue;
+      seen.button = OnScreen(view.Window());
+      seen.buttonHasFocus = view.HasFocus();
+    }
+  }
+};
+
+TEST_F(Boxes, Show_a_short_text_whole) {
+  const Seen seen = Show(u"נתוני IP:\r\n1: 10.0.0.5\r\n2: 10.0.0.138\r\n3: 127.0.0.1");
+
+  EXPECT_FALSE(seen.isScrolled);
+  EXPECT_TRUE(IsOnScreen(seen));
+}
+
+TEST_F(Boxes, Keep_their_button_on_the_screen_under_4096_line_ends) {
+  const Seen seen = Show(Text(4096, u'\n'));
+
+  EXPECT_TRUE(IsOnScreen(seen));
+  EXPECT_TRUE(seen.isScrolled);
+}
+
+TEST_F(Boxes, Keep_their_button_on_the_screen_under_one_long_line_without_blanks) {
+  const Seen seen = Show(Text(4096, u'W'));
+
+  EXPECT_TRUE(IsOnScreen(seen));
+  EXPECT_TRUE(seen.isScrolled);
+}
+
+TEST_F(Boxes, Keep_their_button_on_the_screen_under_one_long_line_with_blanks) {
+  Text words;
+  while (words.size() < 4000) words += u"מילה ";
+
+  EXPECT_TRUE(IsOnScreen(Show(words)));
+}
+
+TEST_F(Boxes, Hold_the_whole_text_in_the_field_that_scrolls_it) {
+  Text lines;
+  for (int line = 0; line < 200; ++line) lines += DecimalText(line) + u"\r\n";
+
+  const Seen seen = Show(lines + u"end", kExclamation);
+
+  EXPECT_EQ(seen.text, lines + u"end");
+}
+
+TEST_F(Boxes, Give_the_focus_to_their_button_and_not_to_the_text) {
+  EXPECT_TRUE(Show(u"text").buttonHasFocus);
+  EXPECT_TRUE(Show(Text(500, u'\n')).buttonHasFocus);
+}
+
+TEST_F(Boxes, Are_answered_by_Enter) {
+  PressInBox(VK_RETURN);
+
+  EXPECT_EQ(desktop.MessageBox(u"text", kYesNo | kHebrewBox, u"title"), 6);
+}
+
+TEST_F(Boxes, Are_answered_by_Escape_where_they_have_one_button) {
+  PressInBox(VK_ESCAPE);
+
+  EXPECT_EQ(desktop.MessageBox(u"text", kInformation, u"title"), 1);
+}
+
+TEST_F(Boxes, That_ask_stand_until_one_of_their_buttons_is_pressed) {
+  bool stoodOn = false;
+  SeenBox seen;
+  PressInBox(VK_ESCAPE);
+  const auto later = desktop.StartTimer(100, [&] {
+    FormWindow* const box = BoxAnswers::Standing();
+    if (!box || std::exchange(stoodOn, true)) return;
+    ::SendMessageW(box->Top(), WM_SYSCOMMAND, SC_CLOSE, 0);
+    user.AnswerBox(seen, 7);
+  });
+
+  EXPECT_EQ(desktop.MessageBox(u"text", kYesNo | kHebrewBox, u"title"), 7);
+  EXPECT_TRUE(stoodOn);
+}
+
+TEST_F(Boxes, Keep_the_user_from_the_form_below_and_give_it_back) {
+  bool blocked = false;
+  SeenBox seen;
+  desktop.Show(form);
+  desktop.Post([&] {
+    blocked = !::IsWindowEnabled(WindowOf(form).Top());
+    user.AnswerBox(seen);
+  });
+
+  desktop.MessageBox(u"text", 0, u"title");
+
+  EXPECT_TRUE(blocked);
+  EXPECT_TRUE(::IsWindowEnabled(WindowOf(form).Top()));
+}
+
+using Lines = std::vector<BoxLine>;
+
+TEST(BoxLines, Read_as_their_marks_of_direction_say_and_are_drawn_without_them) {
+  BoxContent content = BoxContentOf(u"שלום\r\nC:\\a\r\n1: 10.0.0.5", kHebrewBox, u"");
+
+  EXPECT_EQ(LinesOf(content), (Lines{{u"שלום", Direction::RightToLeft},
+                                     {u"C:\\a", Direction::LeftToRight},
+                                     {u"1: 10.0.0.5", Direction::RightToLeft}}));
+}
+
+TEST(BoxLines, Of_a_box_without_marks_read_as_their_letters_do) {
+  BoxContent content = BoxContentOf(u"text\n\nשלום", 0, u"");
+
+  EXPECT_EQ(LinesOf(content), (Lines{{u"text", Direction::LeftToRight},
+                                     {u"", Direction::LeftToRight},
+                                     {u"שלום", Direction::RightToLeft}}));
+}
+
+} // namespace quendra::forms::win32
