@@ -117,8 +117,7 @@ void ComboBoxView::Arrange() {
     return static_cast<int>(place.bottom - place.top);
   };
   const LRESULT letters = Inner().Send(CB_GETITEMHEIGHT, static_cast<WPARAM>(-1));
-  if (closed() != wanted)
-    Inner().Send(CB_SETITEMHEIGHT, static_cast<WPARAM>(-1), letters + wanted - closed());
+  if (closed() != wanted) Inner().Send(CB_SETITEMHEIGHT, static_cast<WPARAM>(-1), letters + wanted - closed());
   PlaceEdit();
 }
 

@@ -28,9 +28,10 @@ ListViewView::ListViewView(ViewContext& context, ListView& list, HWND parent)
        Mirrored(ReadingDirection()));
   columns_.emplace(Inner());
   Inner().Send(LVM_SETEXTENDEDLISTVIEWSTYLE, LVS_EX_FULLROWSELECT, LVS_EX_FULLROWSELECT);
-  header_.emplace(
-      *this, reinterpret_cast<HWND>(Inner().Send(LVM_GETHEADER)),
-      [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerHeader(message, wParam, lParam); });
+  header_.emplace(*this, reinterpret_cast<HWND>(Inner().Send(LVM_GETHEADER)),
+                  [this](UINT message, WPARAM wParam, LPARAM lParam) {
+                    return AnswerHeader(message, wParam, lParam);
+                  });
   list.Observe(this);
 }
 
