@@ -132,9 +132,20 @@ class Inflater {
     if (symbol < 0 || static_cast<std::size_t>(symbol) >= std::size(kDistances)) return false;
     const std::size_t distance = Told(kDistances[symbol]);
     if (distance > written_) return false;
-    const std::size_t end = written_ + std::min(length, out_.size() - written_);
-    for (; written_ < end; ++written_) out_[written_] = out_[written_ - distance];
+    Copy(distance, std::min(length, out_.size() - written_));
     return true;
+  }
+
+  void Copy(std::size_t distance, std::size_t length) {
+    std::uint8_t* to = out_.data() + written_;
+    const std::uint8_t* from = to - distance;
+    if (distance >= length)
+      std::copy_n(from, length, to);
+    else if (distance == 1)
+      std::fill_n(to, length, *from);
+    else
+      for (std::size_t i = 0; i < length; ++i) to[i] = from[i];
+    written_ += length;
   }
 
   std::size_t Told(Range range) { return range.least + (range.bits ? bits_.Take(range.bits) : 0U); }

@@ -45,11 +45,7 @@ class PngFile {
     if (!Inflate(packed_, rows) || !Unfilter(*header_, rows)) return std::nullopt;
     Picture::Pixels pixels{header_->width, header_->height, {}};
     pixels.argb.resize(static_cast<std::size_t>(pixels.width) * static_cast<std::size_t>(pixels.height));
-    const std::size_t stride = header_->BytesOfRow() + 1;
-    auto pixel = pixels.argb.begin();
-    for (std::size_t row = 0; row < rows.size(); row += stride)
-      for (int x = 0; x < header_->width; ++x)
-        *pixel++ = PixelAt(rows.data() + row + 1 + static_cast<std::size_t>(x) * header_->Channels());
+    Convert(rows, pixels.argb);
     return pixels;
   }
 
@@ -89,15 +85,34 @@ class PngFile {
     }
   }
 
-  std::uint32_t PixelAt(const std::uint8_t* part) const {
+  void Convert(std::span<const std::uint8_t> rows, std::span<std::uint32_t> argb) const {
+    using Part = const std::uint8_t*;
     switch (header_->kind) {
-    case PngKind::Grey: return Seen(Opaque(part[0], part[0], part[0]));
-    case PngKind::Colour: return Seen(Opaque(part[0], part[1], part[2]));
-    case PngKind::Palette: return palette_[part[0]];
-    case PngKind::GreyAlpha: return WithAlpha(Opaque(part[0], part[0], part[0]), part[1]);
-    case PngKind::ColourAlpha: return WithAlpha(Opaque(part[0], part[1], part[2]), part[3]);
+    case PngKind::Grey:
+      return ConvertBy(rows, argb, [&](Part part) { return Seen(Opaque(part[0], part[0], part[0])); });
+    case PngKind::Colour:
+      return ConvertBy(rows, argb, [&](Part part) { return Seen(Opaque(part[0], part[1], part[2])); });
+    case PngKind::Palette: return ConvertBy(rows, argb, [&](Part part) { return palette_[part[0]]; });
+    case PngKind::GreyAlpha:
+      return ConvertBy(rows, argb,
+                       [](Part part) { return WithAlpha(Opaque(part[0], part[0], part[0]), part[1]); });
+    case PngKind::ColourAlpha:
+      return ConvertBy(rows, argb,
+                       [](Part part) { return WithAlpha(Opaque(part[0], part[1], part[2]), part[3]); });
     }
-    return 0;
+  }
+
+  /// `convert` takes the first byte of a pixel.
+  template <typename Conversion>
+  void ConvertBy(std::span<const std::uint8_t> rows, std::span<std::uint32_t> argb,
+                 const Conversion& convert) const {
+    const std::size_t channels = header_->Channels();
+    const std::uint8_t* part = rows.data();
+    auto pixel = argb.begin();
+    while (pixel != argb.end()) {
+      ++part; // its filter
+      for (int x = 0; x < header_->width; ++x, part += channels) *pixel++ = convert(part);
+    }
   }
 
   std::uint32_t Seen(std::uint32_t argb) const { return argb == seenThrough_ ? 0 : argb; }
