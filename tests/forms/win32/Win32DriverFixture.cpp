@@ -1,7 +1,7 @@
 #include "forms/win32/Win32Driver.h"
 
 #include "forms/win32/boxes/BoxViews.h"
-#include "forms/win32/views/WindowClass.h"
+#include "forms/win32/windows/WindowClass.h"
 
 #include <algorithm>
 

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "forms/view/BoxContent.h"
-#include "forms/win32/views/FormWindow.h"
+#include "forms/win32/windows/FormWindow.h"
 
 namespace quendra::forms::win32 {
 

@@ -1,7 +1,7 @@
 #include "forms/win32/input/KeyInput.h"
 
 #include "forms/win32/input/MouseInput.h"
-#include "forms/win32/views/FormWindow.h"
+#include "forms/win32/windows/FormWindow.h"
 
 namespace quendra::forms::win32 {
 

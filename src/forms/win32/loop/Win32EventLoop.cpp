@@ -1,6 +1,6 @@
 #include "forms/win32/loop/Win32EventLoop.h"
 
-#include "forms/win32/views/WindowClass.h"
+#include "forms/win32/windows/WindowClass.h"
 
 namespace quendra::forms::win32 {
 

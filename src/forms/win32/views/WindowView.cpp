@@ -3,8 +3,8 @@
 #include "forms/view/Accessible.h"
 #include "forms/view/FocusOrder.h"
 #include "forms/win32/input/MouseInput.h"
-#include "forms/win32/views/Composition.h"
-#include "forms/win32/views/WindowClass.h"
+#include "forms/win32/windows/Composition.h"
+#include "forms/win32/windows/WindowClass.h"
 
 namespace quendra::forms::win32 {
 

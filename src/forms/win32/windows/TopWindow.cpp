@@ -1,6 +1,6 @@
-#include "forms/win32/views/TopWindow.h"
+#include "forms/win32/windows/TopWindow.h"
 
-#include "forms/win32/views/WindowClass.h"
+#include "forms/win32/windows/WindowClass.h"
 
 #include "runtime/Fault.h"
 

@@ -1,4 +1,4 @@
-#include "forms/win32/views/FormWindow.h"
+#include "forms/win32/windows/FormWindow.h"
 
 #include "forms/view/VisibleText.h"
 

@@ -1,4 +1,4 @@
-#include "forms/win32/views/Composition.h"
+#include "forms/win32/windows/Composition.h"
 
 #include "forms/Form.h"
 

@@ -3,10 +3,10 @@
 #include "forms/view/FocusOrder.h"
 #include "forms/view/FormPlacement.h"
 #include "forms/view/RoundRect.h"
-#include "forms/win32/views/FormScroll.h"
-#include "forms/win32/views/ModalBlock.h"
-#include "forms/win32/views/TopWindow.h"
 #include "forms/win32/views/ViewFactory.h"
+#include "forms/win32/windows/FormScroll.h"
+#include "forms/win32/windows/ModalBlock.h"
+#include "forms/win32/windows/TopWindow.h"
 
 #include <functional>
 #include <optional>

@@ -1,4 +1,4 @@
-#include "forms/win32/views/ModalBlock.h"
+#include "forms/win32/windows/ModalBlock.h"
 
 #include <new>
 #include <utility>

@@ -1,4 +1,4 @@
-#include "forms/win32/views/FormScroll.h"
+#include "forms/win32/windows/FormScroll.h"
 
 #include <algorithm>
 

@@ -1,4 +1,4 @@
-#include "forms/win32/views/WindowClass.h"
+#include "forms/win32/windows/WindowClass.h"
 
 namespace quendra::forms::win32 {
 
