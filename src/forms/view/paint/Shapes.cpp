@@ -104,7 +104,9 @@ void StrokeLine(Raster& raster, Point from, Point to, double width, Colour colou
 }
 
 void FillTriangle(Raster& raster, const std::array<Point, 3>& corners, Colour colour) {
-  const auto& [a, b, c] = corners;
+  const Point a = corners[0];
+  const Point b = corners[1];
+  const Point c = corners[2];
   const double sense = LeftOf(a, b, c) > 0 ? -1 : 1;
   const auto [left, right] = std::minmax({a.x, b.x, c.x});
   const auto [top, bottom] = std::minmax({a.y, b.y, c.y});
