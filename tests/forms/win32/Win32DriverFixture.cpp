@@ -50,7 +50,10 @@ INPUT KeyInputOf(WORD key, WORD character, bool up) {
   return input;
 }
 
-bool IsNamed(int keyCode) { return keyCode <= kSpaceKey || (keyCode >= kPageUpKey && keyCode <= kDownKey); }
+bool IsNamed(int keyCode) {
+  return keyCode <= kSpaceKey || (keyCode >= kPageUpKey && keyCode <= kDownKey) || keyCode == kInsertKey ||
+         keyCode == kDeleteKey;
+}
 
 /// A key with those held down that the shift state tells.
 std::vector<INPUT> InputsOf(int keyCode, int shift) {
