@@ -1,0 +1,343 @@
+#include "forms/view/Palette.h"
+#include "forms/win32/views/ViewFixture.h"
+
+namespace quendra::forms::win32 {
+
+namespace {
+
+/// A text on the clipboard of the bed.
+void PutOnClipboard(const Text& text) {
+  const HGLOBAL memory = ::GlobalAlloc(GMEM_MOVEABLE, (text.size() + 1) * sizeof(char16_t));
+  std::copy_n(text.c_str(), text.size() + 1, static_cast<char16_t*>(::GlobalLock(memory)));
+  ::GlobalUnlock(memory);
+  ::OpenClipboard(nullptr);
+  ::EmptyClipboard();
+  ::SetClipboardData(CF_UNICODETEXT, memory);
+  ::CloseClipboard();
+}
+
+Text OnClipboard() {
+  ::OpenClipboard(nullptr);
+  const HANDLE memory = ::GetClipboardData(CF_UNICODETEXT);
+  const Text text = memory ? Text(static_cast<const char16_t*>(::GlobalLock(memory))) : Text();
+  if (memory) ::GlobalUnlock(memory);
+  ::CloseClipboard();
+  return text;
+}
+
+} // namespace
+
+/// Fields for text as the system's windows show them.
+class FieldWindows : public ViewFixture {
+ protected:
+  FieldWindows() {
+    form.design = [this] {
+      label.Caption = u"כתובת מעקב:";
+      label.Move(0, 0, 1500, 300);
+      line.Move(150, 300, 3000, 450);
+      lines.Move(150, 900, 5000, 1500);
+      combo.Move(150, 2700, 3000, 450);
+    };
+    lines.MultiLine = true;
+    lines.VerticalScrollBar = true;
+    lines.Monospaced = true;
+    combo.FreeText = true;
+    combo.AddItem(u"www.one.test");
+    combo.AddItem(u"www.two.test");
+  }
+  static Text Shown(const Control& control) { return TextOfWindow(Inner(control)); }
+  static DWORD Style(const Control& control, int index = GWL_STYLE) {
+    return static_cast<DWORD>(::GetWindowLongW(Inner(control), index));
+  }
+  HWND Edit() {
+    COMBOBOXINFO parts{};
+    parts.cbSize = sizeof parts;
+    ::GetComboBoxInfo(Inner(combo), &parts);
+    return parts.hwndItem;
+  }
+
+  Label label{form, u"Label2"};
+  TextBox line{form, u"line"};
+  TextBox lines{form, u"lines"};
+  ComboBox combo{form, u"combo"};
+};
+
+TEST_F(FieldWindows, Copy_is_a_command_that_the_handler_hears_of_by_its_control_character) {
+  std::vector<int> pressed;
+  line.KeyPress = [&](int& keyCode) { pressed.push_back(keyCode); };
+  line.Value = u"text";
+  Show();
+  line.SelLength = 4;
+
+  Key('C', kCtrl);
+
+  EXPECT_EQ(pressed, std::vector<int>{3});
+  EXPECT_EQ(OnClipboard(), u"text");
+  EXPECT_EQ(line.Value(), u"text");
+}
+
+TEST_F(FieldWindows, A_refused_control_character_pastes_nothing) {
+  PutOnClipboard(u"pasted");
+  line.KeyPress = [](int& keyCode) { keyCode = 0; };
+  Show();
+
+  Key('V', kCtrl);
+  EXPECT_EQ(line.Value(), u"");
+
+  line.KeyPress = nullptr;
+  Key('V', kCtrl);
+  EXPECT_EQ(line.Value(), u"pasted");
+}
+
+TEST_F(FieldWindows, Harmful_signs_that_are_pasted_are_shown_and_kept_as_visible_ones) {
+  PutOnClipboard(u"a\u202Eb");
+  Show();
+
+  Key('V', kCtrl);
+
+  EXPECT_EQ(line.Value(), u"a\uFFFDb");
+  EXPECT_EQ(Shown(line), u"a\uFFFDb");
+  EXPECT_EQ(line.SelStart(), 3);
+}
+
+TEST_F(FieldWindows, Everything_is_selected_by_one_key) {
+  line.Value = u"text";
+  Show();
+
+  Key('A', kCtrl);
+
+  EXPECT_EQ(line.SelStart(), 0);
+  EXPECT_EQ(line.SelLength(), 4);
+}
+
+TEST_F(FieldWindows, A_masked_field_keeps_its_text_to_itself_until_it_is_shown) {
+  line.Masked = true;
+  line.Value = u"secret";
+  PutOnClipboard(u"before");
+  Show();
+  line.SelLength = 6;
+
+  Key('C', kCtrl);
+  Key(kEndKey);
+  Key('9');
+
+  EXPECT_EQ(line.Value(), u"secret9");
+  EXPECT_EQ(OnClipboard(), u"before");
+  EXPECT_TRUE(Style(line) & ES_PASSWORD);
+  line.Masked = false;
+  EXPECT_FALSE(Style(line) & ES_PASSWORD);
+}
+
+TEST_F(FieldWindows, Delete_and_the_arrows_are_no_key_presses) {
+  int pressed = 0;
+  line.KeyPress = [&](int&) { ++pressed; };
+  line.Value = u"ab";
+  Show();
+
+  Key(kRightKey);
+  EXPECT_EQ(line.SelStart(), 1);
+  Key(kDeleteKey);
+
+  EXPECT_EQ(line.Value(), u"a");
+  EXPECT_EQ(pressed, 0);
+}
+
+TEST_F(FieldWindows, A_field_that_can_only_be_read_takes_no_text_back_from_its_handler) {
+  int pressed = 0;
+  line.ReadOnly = true;
+  line.Value = u"fixed";
+  line.KeyPress = [&](int&) { ++pressed; };
+  Show();
+
+  Key('A');
+
+  EXPECT_EQ(pressed, 1);
+  EXPECT_EQ(Shown(line), u"fixed");
+  EXPECT_EQ(line.Value(), u"fixed");
+}
+
+TEST_F(FieldWindows, A_character_of_two_units_is_one_key_press) {
+  std::vector<int> pressed;
+  line.KeyPress = [&](int& keyCode) { pressed.push_back(keyCode); };
+  Show();
+
+  for (const WPARAM unit : {0xD83DU, 0xDE00U}) ::SendMessageW(Inner(line), WM_CHAR, unit, 0);
+
+  EXPECT_EQ(pressed, std::vector<int>{0x1F600});
+  EXPECT_EQ(line.Value(), u"\U0001F600");
+}
+
+TEST_F(FieldWindows, A_field_turns_to_the_direction_of_its_first_letter_and_keeps_caret_and_focus) {
+  Show();
+  EXPECT_FALSE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
+
+  line.Value = u"שלום, abc";
+  line.SelStart = 3;
+  Settle();
+
+  EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
+  EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RIGHT);
+  EXPECT_EQ(::GetFocus(), Inner(line));
+  Key('X');
+  EXPECT_EQ(line.Value(), u"שלוXם, abc");
+
+  line.Value = u"10.0.0.1 שלום";
+  Settle();
+  EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
+  line.Value = u"www.one.test";
+  Settle();
+  EXPECT_FALSE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
+}
+
+TEST_F(FieldWindows, A_field_that_turns_tells_of_the_focus_no_second_time) {
+  int came = 0;
+  line.GotFocus = [&] { ++came; };
+  Show();
+
+  line.Value = u"שלום";
+  Settle();
+
+  EXPECT_EQ(came, 1);
+}
+
+TEST_F(FieldWindows, A_report_follows_its_end_when_its_handler_says_so) {
+  lines.Change = [this] { lines.SelStart = static_cast<int>(lines.Value().size()); };
+  Show();
+  for (int hop = 0; hop < 100; ++hop) lines.Value = lines.Value() + u"Hop #\t1\t<10 ms\t10.0.0.1\r\n";
+  Settle();
+
+  SCROLLINFO bar{sizeof bar, SIF_ALL, 0, 0, 0, 0, 0};
+  ::GetScrollInfo(Inner(lines), SB_VERT, &bar);
+  EXPECT_GT(bar.nPos, 50);
+  EXPECT_EQ(bar.nPos, bar.nMax - static_cast<int>(bar.nPage) + 1);
+  EXPECT_EQ(Shown(lines), lines.Value());
+}
+
+TEST_F(FieldWindows, A_report_has_letters_of_one_width_and_a_scroll_bar_inside_its_edge) {
+  lines.Value = u"Trace\r\n";
+  Show();
+
+  const HDC device = ::GetDC(Inner(lines));
+  const HGDIOBJ before =
+      ::SelectObject(device, reinterpret_cast<HFONT>(::SendMessageW(Inner(lines), WM_GETFONT, 0, 0)));
+  int narrow = 0;
+  int wide = 0;
+  ::GetCharWidth32W(device, L'i', L'i', &narrow);
+  ::GetCharWidth32W(device, L'W', L'W', &wide);
+  ::SelectObject(device, before);
+  ::ReleaseDC(Inner(lines), device);
+
+  EXPECT_EQ(narrow, wide);
+  EXPECT_TRUE(Style(lines) & WS_VSCROLL);
+  EXPECT_TRUE(Style(lines, GWL_EXSTYLE) & WS_EX_LEFTSCROLLBAR);
+  lines.VerticalScrollBar = false;
+  EXPECT_FALSE(Style(lines) & WS_VSCROLL);
+}
+
+TEST_F(FieldWindows, A_field_is_named_by_a_label_right_before_the_systems_window) {
+  Show();
+
+  const HWND before = ::GetWindow(Inner(line), GW_HWNDPREV);
+
+  EXPECT_EQ(TextOfWindow(before), u"כתובת מעקב:");
+  EXPECT_TRUE(::SendMessageW(before, WM_GETDLGCODE, 0, 0) & DLGC_STATIC);
+  EXPECT_EQ(TextOfWindow(As<FieldView>(line).Window()), u"כתובת מעקב:");
+}
+
+TEST_F(FieldWindows, A_field_has_the_border_of_its_state) {
+  Show();
+  const HWND window = As<FieldView>(lines).Window();
+  const HWND first = As<FieldView>(line).Window();
+
+  EXPECT_EQ(PixelOf(window, 100, 0), Palette::StrongBorder);
+  EXPECT_EQ(PixelOf(first, 100, 0), Palette::Focus);
+  EXPECT_EQ(PixelOf(window, 100, 1), Palette::Page);
+  lines.ReadOnly = true;
+  EXPECT_EQ(PixelOf(window, 100, 1), Palette::QuietPage);
+  EXPECT_EQ(PixelOf(window, 150, 50), Palette::QuietPage);
+  lines.Enabled = false;
+  EXPECT_EQ(PixelOf(window, 100, 0), Palette::Border);
+}
+
+TEST_F(FieldWindows, A_combo_box_has_the_ring_of_all_fields_for_those_who_use_the_keys) {
+  for (const bool freeText : {true, false}) {
+    combo.FreeText = freeText;
+    Show();
+    const HWND window = As<FieldView>(combo).Window();
+    EXPECT_EQ(PixelOf(window, 100, 1), Palette::Page);
+
+    Key(kTabKey);
+    Key(kTabKey);
+
+    EXPECT_EQ(PixelOf(window, 100, 1), Palette::Focus) << freeText;
+    desktop.Unload(form);
+  }
+}
+
+TEST_F(FieldWindows, An_item_that_is_chosen_by_the_arrows_stands_in_the_field) {
+  std::vector<int> chosen;
+  combo.Click = [&] { chosen.push_back(combo.ListIndex()); };
+  Show();
+  Key(kTabKey);
+  Key(kTabKey);
+
+  Key(kDownKey);
+  Settle();
+
+  EXPECT_EQ(chosen, std::vector<int>{0});
+  EXPECT_EQ(combo.Value(), u"www.one.test");
+  EXPECT_EQ(TextOfWindow(Edit()), u"www.one.test");
+}
+
+TEST_F(FieldWindows, A_list_that_hangs_down_tells_of_the_choice_when_it_is_made_and_of_none_that_was_given_up) {
+  std::vector<int> chosen;
+  combo.FreeText = false;
+  combo.Click = [&] { chosen.push_back(combo.ListIndex()); };
+  Show();
+  const HWND window = Inner(combo);
+  Click(window, {10, 10});
+  EXPECT_TRUE(::SendMessageW(window, CB_GETDROPPEDSTATE, 0, 0));
+
+  Key(kDownKey);
+  Key(kDownKey);
+  Settle();
+  EXPECT_TRUE(chosen.empty());
+  Key(kEnterKey);
+  Settle();
+  EXPECT_EQ(chosen, std::vector<int>{1});
+
+  Click(window, {10, 10});
+  Key(kUpKey);
+  Key(kEscapeKey);
+  Settle();
+  EXPECT_EQ(chosen, std::vector<int>{1});
+  EXPECT_EQ(::SendMessageW(window, CB_GETCURSEL, 0, 0), 1);
+}
+
+TEST_F(FieldWindows, The_wheel_over_a_closed_list_changes_nothing) {
+  combo.FreeText = false;
+  Show();
+  combo.SelectItem(0);
+
+  ::SendMessageW(Inner(combo), WM_MOUSEWHEEL, MAKEWPARAM(0, static_cast<WORD>(-WHEEL_DELTA)), 0);
+  Settle();
+
+  EXPECT_EQ(combo.ListIndex(), 0);
+}
+
+TEST_F(FieldWindows, A_combo_box_fills_the_height_that_it_was_given) {
+  for (const bool freeText : {true, false}) {
+    combo.FreeText = freeText;
+    Show();
+    RECT field{};
+    RECT inner{};
+    ::GetWindowRect(As<FieldView>(combo).Window(), &field);
+    ::GetWindowRect(Inner(combo), &inner);
+
+    EXPECT_EQ(field.bottom - field.top, 30);
+    EXPECT_EQ(inner.top - field.top, field.bottom - inner.bottom) << freeText;
+    desktop.Unload(form);
+  }
+}
+
+} // namespace quendra::forms::win32

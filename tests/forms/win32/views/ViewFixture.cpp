@@ -1,0 +1,36 @@
+#include "forms/win32/views/ViewFixture.h"
+
+namespace quendra::forms::win32 {
+
+void ViewFixture::Show() {
+  desktop.Show(form);
+  ASSERT_TRUE(user.WaitUntil([this] { return ::GetForegroundWindow() == Win32Driver::WindowOf(form)->Top(); }));
+  Settle();
+}
+
+void ViewFixture::Settle() {
+  bool through = false;
+  user.Loop().Post([&] { through = true; });
+  ASSERT_TRUE(user.WaitUntil([&] { return through; }));
+}
+
+void ViewFixture::Press(HWND window, Spot place, UINT message, WPARAM keys) {
+  ::SendMessageW(window, message, keys, MAKELPARAM(place.left, place.top));
+}
+
+void ViewFixture::Click(HWND window, Spot place) {
+  Press(window, place);
+  Press(window, place, WM_LBUTTONUP, 0);
+}
+
+Colour ViewFixture::PixelOf(HWND window, int x, int y) {
+  ::RedrawWindow(window, nullptr, nullptr, RDW_INVALIDATE | RDW_UPDATENOW | RDW_ALLCHILDREN);
+  RECT place{};
+  ::GetWindowRect(window, &place);
+  const HDC screen = ::GetDC(nullptr);
+  const Colour pixel = ::GetPixel(screen, place.left + x, place.top + y);
+  ::ReleaseDC(nullptr, screen);
+  return pixel;
+}
+
+} // namespace quendra::forms::win32
