@@ -249,14 +249,14 @@ TEST_F(FieldWindows, A_field_has_the_border_of_its_state) {
   const HWND window = As<FieldView>(lines).Window();
   const HWND first = As<FieldView>(line).Window();
 
-  EXPECT_EQ(PixelOf(window, 100, 0), Palette::StrongBorder);
-  EXPECT_EQ(PixelOf(first, 100, 0), Palette::Focus);
-  EXPECT_EQ(PixelOf(window, 100, 1), Palette::Page);
+  EXPECT_EQ(PixelIn(window, 100, 0), Palette::StrongBorder);
+  EXPECT_EQ(PixelIn(first, 100, 0), Palette::Focus);
+  EXPECT_EQ(PixelIn(window, 100, 1), Palette::Page);
   lines.ReadOnly = true;
-  EXPECT_EQ(PixelOf(window, 100, 1), Palette::QuietPage);
-  EXPECT_EQ(PixelOf(window, 150, 50), Palette::QuietPage);
+  EXPECT_EQ(PixelIn(window, 100, 1), Palette::QuietPage);
+  EXPECT_EQ(PixelIn(window, 150, 50), Palette::QuietPage);
   lines.Enabled = false;
-  EXPECT_EQ(PixelOf(window, 100, 0), Palette::Border);
+  EXPECT_EQ(PixelIn(window, 100, 0), Palette::Border);
 }
 
 TEST_F(FieldWindows, A_combo_box_has_the_ring_of_all_fields_for_those_who_use_the_keys) {
@@ -264,12 +264,12 @@ TEST_F(FieldWindows, A_combo_box_has_the_ring_of_all_fields_for_those_who_use_th
     combo.FreeText = freeText;
     Show();
     const HWND window = As<FieldView>(combo).Window();
-    EXPECT_EQ(PixelOf(window, 100, 1), Palette::Page);
+    EXPECT_EQ(PixelIn(window, 100, 1), Palette::Page);
 
     Key(kTabKey);
     Key(kTabKey);
 
-    EXPECT_EQ(PixelOf(window, 100, 1), Palette::Focus) << freeText;
+    EXPECT_EQ(PixelIn(window, 100, 1), Palette::Focus) << freeText;
     desktop.Unload(form);
   }
 }

@@ -84,8 +84,8 @@ TEST_F(ListBoxWindow, The_chosen_item_has_the_ground_of_the_house) {
   Show();
   list.SelectItem(1);
 
-  EXPECT_EQ(PixelOf(Inner(list), 20, PlaceOf(0).top), Palette::Page);
-  EXPECT_EQ(PixelOf(Inner(list), 20, PlaceOf(1).top), Palette::Selection);
+  EXPECT_EQ(PixelIn(Inner(list), 20, PlaceOf(0).top), Palette::Page);
+  EXPECT_EQ(PixelIn(Inner(list), 20, PlaceOf(1).top), Palette::Selection);
 }
 
 TEST_F(ListBoxWindow, An_item_with_harmful_characters_shows_them_as_signs) {

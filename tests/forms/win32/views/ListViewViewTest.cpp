@@ -254,7 +254,7 @@ TEST_F(TableWindow, Rows_have_their_grounds_in_turns_and_the_selected_one_its_ow
   list.Select(&list.Row(2));
 
   for (const int row : {0, 1, 2})
-    EXPECT_EQ(PixelOf(Inner(list), 5, MiddleOf(row).top), RowGround(row, row == 1)) << row;
+    EXPECT_EQ(PixelIn(Inner(list), 5, MiddleOf(row).top), RowGround(row, row == 1)) << row;
 }
 
 TEST_F(TableWindow, A_leading_cell_stands_at_the_right_edge_of_a_mirrored_form_and_is_no_mirror_image) {
@@ -269,8 +269,8 @@ TEST_F(TableWindow, A_leading_cell_stands_at_the_right_edge_of_a_mirrored_form_a
 
   const auto isRed = [](Colour pixel) { return (pixel & 0xFF) > 150 && pixel >> 16 < 100; };
   const auto isBlue = [](Colour pixel) { return (pixel & 0xFF) < 100 && pixel >> 16 > 150; };
-  EXPECT_TRUE(isRed(PixelOf(Inner(list), right - 8 - 17, middle)));
-  EXPECT_TRUE(isBlue(PixelOf(Inner(list), right - 8 - 3, middle)));
+  EXPECT_TRUE(isRed(PixelIn(Inner(list), right - 8 - 17, middle)));
+  EXPECT_TRUE(isBlue(PixelIn(Inner(list), right - 8 - 3, middle)));
 }
 
 TEST_F(TableWindow, A_changed_cell_is_due_and_nothing_else) {

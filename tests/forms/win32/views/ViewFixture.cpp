@@ -3,8 +3,7 @@
 namespace quendra::forms::win32 {
 
 void ViewFixture::Show() {
-  desktop.Show(form);
-  ASSERT_TRUE(user.WaitUntil([this] { return ::GetForegroundWindow() == Win32Driver::WindowOf(form)->Top(); }));
+  ShowActive();
   Settle();
 }
 
@@ -23,7 +22,7 @@ void ViewFixture::Click(HWND window, Spot place) {
   Press(window, place, WM_LBUTTONUP, 0);
 }
 
-Colour ViewFixture::PixelOf(HWND window, int x, int y) {
+Colour ViewFixture::PixelIn(HWND window, int x, int y) {
   ::RedrawWindow(window, nullptr, nullptr, RDW_INVALIDATE | RDW_UPDATENOW | RDW_ALLCHILDREN);
   RECT place{};
   ::GetWindowRect(window, &place);
