@@ -3,6 +3,7 @@
 #include "forms/view/ListLook.h"
 #include "forms/view/Palette.h"
 #include "forms/view/VisibleText.h"
+#include "forms/win32/input/MouseInput.h"
 #include "forms/win32/views/ItemPainting.h"
 
 #include <utility>
@@ -116,8 +117,11 @@ void ComboBoxView::Arrange() {
     ::GetWindowRect(Inner().Window(), &place);
     return static_cast<int>(place.bottom - place.top);
   };
-  const LRESULT letters = Inner().Send(CB_GETITEMHEIGHT, static_cast<WPARAM>(-1));
-  if (closed() != wanted) Inner().Send(CB_SETITEMHEIGHT, static_cast<WPARAM>(-1), letters + wanted - closed());
+  // What it puts round the letters is not the same before and after they are told.
+  for (int tries = 0; tries < 2 && closed() != wanted; ++tries) {
+    const LRESULT letters = Inner().Send(CB_GETITEMHEIGHT, static_cast<WPARAM>(-1));
+    Inner().Send(CB_SETITEMHEIGHT, static_cast<WPARAM>(-1), letters + wanted - closed());
+  }
   PlaceEdit();
 }
 
@@ -177,6 +181,8 @@ std::optional<LRESULT> ComboBoxView::AnswerInner(UINT message, WPARAM wParam, LP
 }
 
 void ComboBoxView::Drop() {
+  // A click is what chooses an item, not what opens the list.
+  Context().mouse.ReleaseCapture();
   ::SetFocus(KeyWindow());
   if (TheControl()) Inner().Send(CB_SHOWDROPDOWN, !IsDropped());
 }
@@ -190,6 +196,7 @@ std::optional<LRESULT> ComboBoxView::AnswerEdit(UINT message, WPARAM wParam, LPA
       Invalidate();
     return answer;
   }
+  if (message == WM_LBUTTONDOWN) Context().mouse.ReleaseCapture();
   return field_ ? field_->Answer(message, wParam, lParam) : std::nullopt;
 }
 

@@ -18,7 +18,8 @@ constexpr int kRoomRoundLetters = 4;
 DWORD BarSide(Direction direction) { return direction == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
 } // namespace
 
-ListBoxView::ListBoxView(ViewContext& context, ListBox& list, HWND parent) : FieldView(context, list, parent) {
+ListBoxView::ListBoxView(ViewContext& context, ListBox& list, HWND parent)
+    : FieldView(context, list, parent) {
   Hold(L"LISTBOX", LBS_NOTIFY | LBS_HASSTRINGS | LBS_OWNERDRAWFIXED | LBS_NOINTEGRALHEIGHT | WS_VSCROLL,
        BarSide(ReadingDirection()));
 }

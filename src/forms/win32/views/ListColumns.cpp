@@ -11,7 +11,8 @@ namespace quendra::forms::win32 {
 
 void ListColumns::SetUp(const ListView& list, const Scale& scale) {
   sizedByHand_ = false;
-  while (window_.Send(LVM_DELETECOLUMN, 0)) {}
+  while (window_.Send(LVM_DELETECOLUMN, 0)) {
+  }
   int number = 0;
   for (const ColumnHeader& column : list.Columns()) {
     // Drawn by us; this is what assistive technology reads.

@@ -31,9 +31,7 @@ HFONT ListPainter::Letters(bool bold) const {
   return context_.fonts.FontOf(font, context_.scale);
 }
 
-int ListPainter::RowHeight() const {
-  return Look().RowHeight(context_.fonts.LineHeight(Letters(false)));
-}
+int ListPainter::RowHeight() const { return Look().RowHeight(context_.fonts.LineHeight(Letters(false))); }
 
 int ListPainter::HeaderHeight() const {
   return Look().HeaderHeight(context_.fonts.LineHeight(Letters(false)));

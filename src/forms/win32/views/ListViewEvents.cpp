@@ -98,7 +98,12 @@ std::optional<LRESULT> ListViewView::AnswerInner(UINT message, WPARAM wParam, LP
   if (!TheControl() || !header_) return std::nullopt;
   switch (message) {
   case WM_ERASEBKGND: return 1;
-  case WM_PAINT: PaintRows(); return 0;
+  case WM_PAINT:
+    TellRows();
+    PaintRows();
+    return 0;
+  case kTellRows: TellRows(); return 0;
+  case WM_KEYDOWN: TellRows(); return std::nullopt;
   case WM_NOTIFY: return ToldByHeader(*reinterpret_cast<const NMHDR*>(lParam));
   case WM_SIZE: {
     const LRESULT answer = Inner().PassOn(message, wParam, lParam);

@@ -40,8 +40,7 @@ void ListViewView::PaintRows() {
   const int header = painter_.HeaderHeight();
   const Area place{{}, {Inner().Inside().width, height}};
   if (!canvas_ || canvas_->Size() != place.extent) canvas_.emplace(place.extent);
-  const auto cells =
-      columns_->CellsOf(static_cast<int>(List().Columns().size()), height, ReadingDirection());
+  const auto cells = columns_->CellsOf(static_cast<int>(List().Columns().size()), height, ReadingDirection());
   const int topRow = TopRow();
   const int from = std::max(0, static_cast<int>(painting.Due().top) - header) / height;
   for (int line = from; header + line * height < painting.Due().bottom; ++line) {

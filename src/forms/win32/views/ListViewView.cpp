@@ -28,10 +28,9 @@ ListViewView::ListViewView(ViewContext& context, ListView& list, HWND parent)
        Mirrored(ReadingDirection()));
   columns_.emplace(Inner());
   Inner().Send(LVM_SETEXTENDEDLISTVIEWSTYLE, LVS_EX_FULLROWSELECT, LVS_EX_FULLROWSELECT);
-  header_.emplace(*this, reinterpret_cast<HWND>(Inner().Send(LVM_GETHEADER)),
-                  [this](UINT message, WPARAM wParam, LPARAM lParam) {
-                    return AnswerHeader(message, wParam, lParam);
-                  });
+  header_.emplace(
+      *this, reinterpret_cast<HWND>(Inner().Send(LVM_GETHEADER)),
+      [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerHeader(message, wParam, lParam); });
   list.Observe(this);
 }
 
@@ -62,7 +61,7 @@ void ListViewView::Apply(Aspect aspect) {
   if (aspect == Aspect::All) ColumnsChanged();
   if (aspect == Aspect::Geometry) columns_->Fit(List(), Context().scale);
   if (aspect == Aspect::Font) FitRows();
-  if (Concerns(aspect, Aspect::Selection)) ShowSelection();
+  if (aspect == Aspect::Selection) ShowSelection();
 }
 
 // The letters are given for the heights that the system makes of them; ours come after.
@@ -81,29 +80,25 @@ void ListViewView::SetRowHeight() {
   Inner().Send(WM_WINDOWPOSCHANGED, 0, reinterpret_cast<LPARAM>(&same));
 }
 
-void ListViewView::SetCount() {
+void ListViewView::RowsDue(int from) {
+  RedrawFrom(from);
+  if (!std::exchange(rowsDue_, true)) ::PostMessageW(Inner().Window(), kTellRows, 0, 0);
+}
+
+void ListViewView::TellRows() {
+  if (!TheControl() || !std::exchange(rowsDue_, false)) return;
   Quietly([this] {
     Inner().Send(LVM_SETITEMCOUNT, static_cast<WPARAM>(List().Count()),
                  LVSICF_NOINVALIDATEALL | LVSICF_NOSCROLL);
   });
-}
-
-void ListViewView::RowAdded(int index) {
-  SetCount();
-  RedrawFrom(index - 1);
-}
-
-void ListViewView::RowRemoved(int index) {
-  SetCount();
-  RedrawFrom(index - 1);
   ShowSelection();
 }
 
-void ListViewView::RowsCleared() {
-  SetCount();
-  shown_ = -1;
-  Inner().Redraw();
-}
+void ListViewView::RowAdded(int index) { RowsDue(index - 1); }
+
+void ListViewView::RowRemoved(int index) { RowsDue(index - 1); }
+
+void ListViewView::RowsCleared() { RowsDue(0); }
 
 // Texts are asked for when they are drawn, so a change costs no more than the cell's place on the screen.
 void ListViewView::RowChanged(int index, int cell) {
@@ -122,21 +117,22 @@ void ListViewView::RowChanged(int index, int cell) {
 }
 
 void ListViewView::RowsMoved() {
-  ShowSelection();
-  Inner().Redraw();
+  RowsDue(0);
   header_->Redraw();
 }
 
 void ListViewView::ColumnsChanged() {
   Quietly([this] { columns_->SetUp(List(), Context().scale); });
-  SetCount();
+  rowsDue_ = true;
+  TellRows();
   FitRows();
-  ShowSelection();
   Inner().Redraw();
   header_->Redraw();
 }
 
 void ListViewView::ShowSelection() {
+  if (rowsDue_) return;
+  const int top = TopRow();
   const ListRow* selected = List().SelectedItem();
   const int row = selected ? List().IndexOf(*selected) - 1 : -1;
   Quietly([&] {
@@ -147,10 +143,12 @@ void ListViewView::ShowSelection() {
     if (held >= 0 && held != row)
       Inner().Send(LVM_SETITEMSTATE, static_cast<WPARAM>(held), reinterpret_cast<LPARAM>(&state));
     state.state = kBoth;
-    // The view doesn't go after it: rows change places every second, and it would jump under the reader's
-    // eyes.
     if (row >= 0 && held != row)
       Inner().Send(LVM_SETITEMSTATE, static_cast<WPARAM>(row), reinterpret_cast<LPARAM>(&state));
+    // The view doesn't go after it: rows change places every second, and it would jump under the reader's
+    // eyes. Not all systems leave it in its place.
+    if (const int beside = top - TopRow(); held != row && beside != 0)
+      Inner().Send(LVM_SCROLL, 0, beside * painter_.RowHeight());
   });
   const int before = std::exchange(shown_, row);
   RedrawRow(before);

@@ -34,6 +34,8 @@ class ListViewView : public FieldView, public ListViewObserver {
   void Apply(Aspect aspect) override;
 
  private:
+  static constexpr UINT kTellRows = WM_APP + 0x213;
+
   ListView& List() const { return static_cast<ListView&>(*TheControl()); }
   /// Changes the system's window without taking what it tells of for the user's choice.
   template <typename Change> void Quietly(Change change);
@@ -44,7 +46,10 @@ class ListViewView : public FieldView, public ListViewObserver {
   int Search(const NMHDR& notice) const;
   LRESULT TakeMouse(UINT message, WPARAM wParam, LPARAM lParam);
   void Choose(int row);
-  void SetCount();
+  /// The system's window hears of rows once for all changes of a handler: it counts and measures anew each
+  /// time, which takes milliseconds.
+  void RowsDue(int from);
+  void TellRows();
   void SetRowHeight();
   /// The last row in sight is never cut: what a row more would need stays free.
   void FitRows();
@@ -62,6 +67,7 @@ class ListViewView : public FieldView, public ListViewObserver {
   std::optional<Surface> canvas_; ///< of one row
   bool quiet_ = false;
   bool fittingRows_ = false;
+  bool rowsDue_ = false;
   int shown_ = -1; ///< the row that is drawn as selected
 };
 

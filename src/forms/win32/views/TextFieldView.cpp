@@ -22,8 +22,8 @@ void TextFieldView::HoldEdit(DWORD style, DWORD extendedStyle) {
   edit_.Take(Inner());
 }
 
-// Not all systems let an EDIT window turn once it is made, and it can't be replaced while it tells of the text
-// that turned.
+// Not all systems let an EDIT window turn once it is made, and it can't be replaced while it tells of the
+// text that turned.
 void TextFieldView::ReadFrom(Direction direction) {
   if (direction != reading_) ::PostMessageW(Window(), kTurn, 0, 0);
   reading_ = direction;

@@ -1,5 +1,5 @@
-#include "forms/view/ListLook.h"
 #include "forms/win32/views/ListViewView.h"
+#include "forms/view/ListLook.h"
 #include "forms/win32/views/ViewFixture.h"
 
 #include <commctrl.h>
@@ -21,6 +21,7 @@ class TableWindow : public ViewFixture {
   }
   ListViewView& View() { return As<ListViewView>(list); }
   LRESULT Ask(UINT message, WPARAM wParam = 0, LPARAM lParam = 0) {
+    Settle();
     return ::SendMessageW(Inner(list), message, wParam, lParam);
   }
   int Count() { return static_cast<int>(Ask(LVM_GETITEMCOUNT)); }
@@ -35,7 +36,10 @@ class TableWindow : public ViewFixture {
     Ask(LVM_GETITEMTEXTW, static_cast<WPARAM>(row), reinterpret_cast<LPARAM>(&item));
     return winapi::TextOf(text);
   }
-  Extent Inside() { return View().Inner().Inside(); }
+  Extent Inside() {
+    Settle();
+    return View().Inner().Inside();
+  }
   int RowHeight() { return View().PlaceOfRow(0).extent.height; }
   int HeaderHeight() {
     RECT header{};

@@ -24,11 +24,10 @@ void ViewFixture::Click(HWND window, Spot place) {
 
 Colour ViewFixture::PixelIn(HWND window, int x, int y) {
   ::RedrawWindow(window, nullptr, nullptr, RDW_INVALIDATE | RDW_UPDATENOW | RDW_ALLCHILDREN);
-  RECT place{};
-  ::GetWindowRect(window, &place);
-  const HDC screen = ::GetDC(nullptr);
-  const Colour pixel = ::GetPixel(screen, place.left + x, place.top + y);
-  ::ReleaseDC(nullptr, screen);
+  const HDC device = ::GetWindowDC(window);
+  ::SetLayout(device, 0);
+  const Colour pixel = ::GetPixel(device, x, y);
+  ::ReleaseDC(window, device);
   return pixel;
 }
 
