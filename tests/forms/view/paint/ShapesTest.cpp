@@ -14,7 +14,9 @@ class Shapes : public testing::Test {
  protected:
   /// How much of 1 is covered.
   double At(int x, int y) const {
-    return (255.0 - static_cast<double>(pixels[static_cast<std::size_t>(y * 40 + x)] & 0xFF)) / 255;
+    return (255.0 - static_cast<double>(
+                        pixels[static_cast<std::size_t>(y) * 40 + static_cast<std::size_t>(x)] & 0xFF)) /
+           255;
   }
   double Covered() const {
     double sum = 0;
