@@ -118,9 +118,10 @@ void ComboBoxView::Arrange() {
     return static_cast<int>(place.bottom - place.top);
   };
   // What it puts round the letters is not the same before and after they are told.
+  LRESULT letters = Inner().Send(CB_GETITEMHEIGHT, static_cast<WPARAM>(-1));
   for (int tries = 0; tries < 2 && closed() != wanted; ++tries) {
-    const LRESULT letters = Inner().Send(CB_GETITEMHEIGHT, static_cast<WPARAM>(-1));
-    Inner().Send(CB_SETITEMHEIGHT, static_cast<WPARAM>(-1), letters + wanted - closed());
+    letters += wanted - closed();
+    Inner().Send(CB_SETITEMHEIGHT, static_cast<WPARAM>(-1), letters);
   }
   PlaceEdit();
 }
