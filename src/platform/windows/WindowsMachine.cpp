@@ -1,16 +1,15 @@
 #include "platform/windows/WindowsMachine.h"
 
-#include "platform/unavailable/UnavailableCaptureControls.h"
-#include "platform/unavailable/UnavailableCaptureLibrary.h"
-#include "platform/unavailable/UnavailableHostNames.h"
-#include "platform/unavailable/UnavailableIcmp.h"
-#include "platform/unavailable/UnavailableIpHelper.h"
-#include "platform/unavailable/UnavailableSockets.h"
 #include "platform/windows/adapters/WindowsAdapters.h"
+#include "platform/windows/capture/WindowsCapture.h"
 #include "platform/windows/files/WindowsFiles.h"
+#include "platform/windows/icmp/WindowsIcmp.h"
 #include "platform/windows/internet/WindowsUrlCache.h"
 #include "platform/windows/keyboard/WindowsKeyboardLayout.h"
 #include "platform/windows/mail/WindowsInstalledProducts.h"
+#include "platform/windows/net/WindowsHostNames.h"
+#include "platform/windows/net/WindowsIpHelper.h"
+#include "platform/windows/net/WindowsSockets.h"
 #include "platform/windows/process/WindowsHandles.h"
 #include "platform/windows/process/WindowsIcons.h"
 #include "platform/windows/process/WindowsProcesses.h"
@@ -26,29 +25,31 @@
 namespace quendra::platform::windows {
 
 struct WindowsMachine::Parts {
-  explicit Parts(EventLoop& loop) : dialling(ras, loop) {}
+  explicit Parts(EventLoop& loop)
+      : capture(loop, ipHelperLibrary), dialling(ras, loop), sockets(loop, socketLibrary) {}
 
   LastError lastError;
+  const IpHelperLibrary ipHelperLibrary;
   RasCalls ras;
+  const SocketLibrary socketLibrary;
 
   WindowsAdapters adapters;
-  unavailable::UnavailableCaptureControls captureControls;
-  unavailable::UnavailableCaptureLibrary captureLibrary;
+  WindowsCapture capture;
   WindowsDialling dialling;
   WindowsFiles files;
   WindowsHandles handles{lastError};
-  unavailable::UnavailableHostNames hostNames;
-  unavailable::UnavailableIcmp icmp;
+  WindowsHostNames hostNames{socketLibrary};
+  WindowsIcmp icmp;
   WindowsIcons icons;
   WindowsInstalledProducts installedProducts;
-  unavailable::UnavailableIpHelper ipHelper;
+  WindowsIpHelper ipHelper{ipHelperLibrary};
   WindowsKeyboardLayout keyboardLayout;
   WindowsPerformanceData performanceData;
   WindowsPhoneBook phoneBook{ras};
   WindowsProcesses processes{lastError};
   WindowsRegistry registry;
   WindowsShellStart shellStart;
-  unavailable::UnavailableSockets sockets;
+  WindowsSockets sockets;
   WindowsSystem system;
   WindowsTokens tokens{lastError};
   WindowsUrlCache urlCache;
@@ -61,11 +62,11 @@ WindowsMachine::~WindowsMachine() = default;
 
 Machine WindowsMachine::Operations() {
   Parts& own = *parts_;
-  return {own.adapters,        own.captureControls,   own.captureLibrary, own.dialling,
-          own.files,           own.handles,           own.hostNames,      own.icmp,
-          own.icons,           own.installedProducts, own.ipHelper,       own.keyboardLayout,
-          own.performanceData, own.phoneBook,         own.processes,      own.registry,
-          own.shellStart,      own.sockets,           own.system,         own.tokens,
+  return {own.adapters,        own.capture,           own.capture,   own.dialling,
+          own.files,           own.handles,           own.hostNames, own.icmp,
+          own.icons,           own.installedProducts, own.ipHelper,  own.keyboardLayout,
+          own.performanceData, own.phoneBook,         own.processes, own.registry,
+          own.shellStart,      own.sockets,           own.system,    own.tokens,
           own.urlCache,        own.versionInfo};
 }
 

@@ -3,6 +3,7 @@
 #include "platform/windows/WindowsLoopFixture.h"
 #include "platform/windows/WindowsMachine.h"
 #include "platform/windows/WineDeviations.h"
+#include "platform/windows/net/NetworkEndsFixture.h"
 #include "winapi/SystemLibrary.h"
 
 #include <wininet.h>
@@ -20,11 +21,6 @@ namespace {
 
 void Check(bool succeeded, const char* what) {
   if (!succeeded) throw std::runtime_error(what);
-}
-
-bool IsWine() {
-  static const bool is = winapi::SystemLibrary(L"ntdll.dll").Find<void()>("wine_get_version") != nullptr;
-  return is;
 }
 
 Text OwnFile() {
@@ -151,12 +147,7 @@ class WindowsBackend : public Backend {
   }
 
   Machine Operations() override { return machine_.Operations(); }
-  std::string WhyNot(const std::string& test) const override {
-    if (std::ranges::any_of(kToCome, [&](std::string_view start) { return test.starts_with(start); }))
-      return "the backend lacks this family";
-    const auto found = std::ranges::find(kWineDeviations, test, &WineDeviation::test);
-    return IsWine() && found != kWineDeviations.end() ? std::string(found->why) : std::string();
-  }
+  std::string WhyNot(const std::string& test) const override { return WineDeviationIn(test); }
 
   std::uint32_t OwnId() const override { return ::GetCurrentProcessId(); }
   std::uint32_t OwnParent() const override {
@@ -200,11 +191,10 @@ class WindowsBackend : public Backend {
     return ToCodePage(PaddedLeft(HexText(language), 8, u'0'));
   }
 
-  // The network: no family of it is here yet.
-  std::uint16_t Listen() override { return 0; }
-  std::uint16_t Connect(std::uint16_t) override { return 0; }
-  SocketAddress Outside() override { return {}; }
-  std::unique_ptr<FarEnd> TakeConnection() override { return nullptr; }
+  std::uint16_t Listen() override { return network_.Listen(); }
+  std::uint16_t Connect(std::uint16_t port) override { return network_.Connect(port); }
+  SocketAddress Outside() override { return network_.Outside(); }
+  std::unique_ptr<FarEnd> TakeConnection() override { return network_.TakeConnection(); }
 
   forms::headless::HeadlessDesktop& Desktop() override { return loop_; }
   bool Until(const std::function<bool()>& condition) override { return loop_.WaitFor(condition, 10'000); }
@@ -215,6 +205,7 @@ class WindowsBackend : public Backend {
  private:
   FreshUser user_;
   Browser browser_;
+  NetworkEnds network_;
   WindowsLoop loop_;
   WindowsMachine machine_{loop_};
   std::vector<std::unique_ptr<Waiting>> started_;

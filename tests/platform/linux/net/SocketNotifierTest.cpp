@@ -1,11 +1,13 @@
 #include "platform/linux/net/SocketNotifier.h"
 #include "platform/linux/LinuxFixture.h"
-#include "platform/linux/net/LinuxSocketsFixture.h"
+#include "platform/net/RealSocketsFixture.h"
 
+#include <arpa/inet.h>
 #include <linux/filter.h>
 #include <linux/seccomp.h>
 #include <sys/prctl.h>
 #include <sys/resource.h>
+#include <sys/socket.h>
 #include <sys/syscall.h>
 #include <unistd.h>
 
@@ -17,9 +19,10 @@ namespace quendra::platform::linux_ {
 namespace {
 
 /// A connection to a peer that is no socket of the library.
-class SocketNotifierTest : public LinuxSocketsTest {
+class SocketNotifierTest : public RealSocketsTest {
  protected:
   void SetUp() override {
+    RealSocketsTest::SetUp();
     const Descriptor listener(::socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0));
     ASSERT_EQ(::listen(listener.Number(), 1), 0);
     sockaddr_in address{};
@@ -133,7 +136,7 @@ bool RefuseToWatch(unsigned error) {
          ::prctl(PR_SET_SECCOMP, SECCOMP_MODE_FILTER, &filter, 0, 0) == 0;
 }
 
-class UnwatchedSockets : public LinuxSocketsTest {
+class UnwatchedSockets : public RealSocketsTest {
  protected:
   std::string SelectionOf(SocketHandle socket) {
     const bool failed = sockets.WSAAsyncSelect(socket, Window(), kMessage, kAllEvents) == kSocketError;

@@ -1,21 +1,21 @@
-#include "platform/linux/net/LinuxSocketsFixture.h"
+#include "platform/net/RealSocketsFixture.h"
 #include "runtime/ByteFields.h"
 
 #include <array>
 
-namespace quendra::platform::linux_ {
+namespace quendra::platform {
 
-TEST_F(LinuxSocketsTest, A_name_is_found_and_its_addresses_stand_in_the_buffer) {
+TEST_F(RealSocketsTest, A_name_is_found_and_its_addresses_stand_in_the_buffer) {
   std::array<std::uint8_t, 1024> buffer{};
   const LookUpHandle lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
   ASSERT_NE(lookUp, kNoLookUp);
   ASSERT_TRUE(Until([&] { return !names.empty(); }));
   EXPECT_EQ(names, (std::vector<Seen>{{SocketHandle(lookUp.Value()), 0, 0}}));
   EXPECT_GE(Little32(buffer, 0), 1u);
-  EXPECT_EQ(Big32(buffer, 4), INADDR_LOOPBACK);
+  EXPECT_EQ(Big32(buffer, 4), kLoopbackNumber);
 }
 
-TEST_F(LinuxSocketsTest, A_name_that_no_host_can_have_is_not_found) {
+TEST_F(RealSocketsTest, A_name_that_no_host_can_have_is_not_found) {
   std::array<std::uint8_t, 1024> buffer{};
   for (const std::string& name : {std::string(300, 'x'), std::string(70'000, 'y')}) {
     names.clear();
@@ -25,7 +25,7 @@ TEST_F(LinuxSocketsTest, A_name_that_no_host_can_have_is_not_found) {
   }
 }
 
-TEST_F(LinuxSocketsTest, A_look_up_that_is_cancelled_tells_nothing_and_can_not_be_cancelled_twice) {
+TEST_F(RealSocketsTest, A_look_up_that_is_cancelled_tells_nothing_and_can_not_be_cancelled_twice) {
   std::array<std::uint8_t, 1024> buffer{};
   const LookUpHandle lookUp = sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer);
   EXPECT_EQ(sockets.WSACancelAsyncRequest(lookUp), 0);
@@ -36,19 +36,17 @@ TEST_F(LinuxSocketsTest, A_look_up_that_is_cancelled_tells_nothing_and_can_not_b
   EXPECT_EQ(buffer[0], 0);
 }
 
-TEST_F(LinuxSocketsTest, The_sockets_may_go_while_look_ups_run) {
+TEST_F(RealSocketsTest, The_sockets_may_go_while_look_ups_run) {
   std::array<std::uint8_t, 64> buffer{};
-  forms::headless::PolledDesktop desktop;
-  const ProcFolder folder;
-  LinuxHostNames hostNames(folder);
   for (int round = 0; round < 20; ++round) {
-    LinuxSockets gone(desktop, desktop, hostNames);
-    gone.WSAStartup(257);
+    const auto gone = MakeRealSockets();
+    gone->Operations().WSAStartup(257);
     for (int i = 0; i < 5; ++i)
-      gone.WSAAsyncGetHostByName(WindowHandle(1), kNameMessage, "localhost", buffer);
+      gone->Operations().WSAAsyncGetHostByName(WindowHandle(1), kNameMessage, "localhost", buffer);
+    gone->WaitFor([] { return true; }, 0);
   }
-  desktop.WaitFor([] { return false; }, 50);
-  EXPECT_FALSE(desktop.Ended);
+  Settle();
+  EXPECT_TRUE(names.empty());
 }
 
-} // namespace quendra::platform::linux_
+} // namespace quendra::platform

@@ -1,15 +1,15 @@
-#include "platform/linux/net/LinuxSocketsFixture.h"
+#include "platform/net/RealSocketsFixture.h"
 
 #include <array>
 #include <cstring>
 
-namespace quendra::platform::linux_ {
+namespace quendra::platform {
 
 namespace {
 
 // The library.
 
-TEST_F(LinuxSocketsTest, Without_a_start_every_call_fails_with_10093) {
+TEST_F(RealSocketsTest, Without_a_start_every_call_fails_with_10093) {
   EXPECT_EQ(sockets.WSACleanup(), 0);
   EXPECT_EQ(NewSocket(), kNoSocket);
   EXPECT_EQ(LastError(), 10093);
@@ -21,7 +21,7 @@ TEST_F(LinuxSocketsTest, Without_a_start_every_call_fails_with_10093) {
   EXPECT_EQ(sockets.WSAAsyncGetHostByName(Window(), kNameMessage, "localhost", buffer), kNoLookUp);
 }
 
-TEST_F(LinuxSocketsTest, A_handle_that_is_no_socket_fails_with_10038) {
+TEST_F(RealSocketsTest, A_handle_that_is_no_socket_fails_with_10038) {
   EXPECT_EQ(sockets.closesocket(SocketHandle(4711)), kSocketError);
   EXPECT_EQ(LastError(), 10038);
   const SocketHandle socket = NewSocket();
@@ -29,23 +29,24 @@ TEST_F(LinuxSocketsTest, A_handle_that_is_no_socket_fails_with_10038) {
   EXPECT_EQ(sockets.closesocket(socket), kSocketError);
 }
 
-TEST_F(LinuxSocketsTest, A_closed_sockets_number_is_not_given_again) {
+TEST_F(RealSocketsTest, A_closed_sockets_number_is_not_given_again) {
   const SocketHandle socket = NewSocket();
   sockets.closesocket(socket);
   EXPECT_NE(NewSocket(), socket);
 }
 
-TEST_F(LinuxSocketsTest, The_last_cleanup_closes_all_sockets) {
+TEST_F(RealSocketsTest, The_last_cleanup_closes_all_sockets) {
   sockets.WSAStartup(257);
   const SocketHandle socket = NewSocket();
   sockets.WSACleanup();
-  EXPECT_EQ(sockets.listen(socket, 1), 0);
+  EXPECT_EQ(sockets.bind(socket, At(0)), 0);
   sockets.WSACleanup();
   sockets.WSAStartup(257);
-  EXPECT_EQ(sockets.listen(socket, 1), kSocketError);
+  EXPECT_EQ(sockets.bind(socket, At(0)), kSocketError);
+  EXPECT_EQ(LastError(), 10038);
 }
 
-TEST_F(LinuxSocketsTest, Options_have_their_values_and_unknown_ones_fail_with_10042) {
+TEST_F(RealSocketsTest, Options_have_their_values_and_unknown_ones_fail_with_10042) {
   const SocketHandle socket = NewSocket();
   std::int32_t value = 0;
   EXPECT_EQ(sockets.getsockopt(socket, 0xFFFF, 0x1001, value), 0);
@@ -61,7 +62,7 @@ TEST_F(LinuxSocketsTest, Options_have_their_values_and_unknown_ones_fail_with_10
 
 // Connecting.
 
-TEST_F(LinuxSocketsTest, A_connection_is_told_as_10035_then_FD_CONNECT_then_FD_WRITE) {
+TEST_F(RealSocketsTest, A_connection_is_told_as_10035_then_FD_CONNECT_then_FD_WRITE) {
   const SocketHandle listener = Listen();
   const SocketHandle socket = NewSocket();
   Select(socket);
@@ -73,7 +74,7 @@ TEST_F(LinuxSocketsTest, A_connection_is_told_as_10035_then_FD_CONNECT_then_FD_W
   EXPECT_EQ(seen, (std::vector<Seen>{{socket, kFdConnect, 0}, {socket, kFdWrite, 0}}));
 }
 
-TEST_F(LinuxSocketsTest, A_refused_connection_is_told_as_FD_CONNECT_with_10061) {
+TEST_F(RealSocketsTest, A_refused_connection_is_told_as_FD_CONNECT_with_10061) {
   const SocketHandle listener = Listen();
   const std::uint16_t port = PortOf(listener);
   sockets.closesocket(listener);
@@ -86,7 +87,7 @@ TEST_F(LinuxSocketsTest, A_refused_connection_is_told_as_FD_CONNECT_with_10061) 
   EXPECT_EQ(seen.size(), 1u);
 }
 
-TEST_F(LinuxSocketsTest, Neither_address_0_nor_port_0_can_be_connected_to) {
+TEST_F(RealSocketsTest, Neither_address_0_nor_port_0_can_be_connected_to) {
   const SocketHandle socket = NewSocket();
   EXPECT_EQ(sockets.connect(socket, {{}, 80}), kSocketError);
   EXPECT_EQ(LastError(), kAddressNotAvailable);
@@ -94,7 +95,7 @@ TEST_F(LinuxSocketsTest, Neither_address_0_nor_port_0_can_be_connected_to) {
   EXPECT_EQ(LastError(), kAddressNotAvailable);
 }
 
-TEST_F(LinuxSocketsTest, Only_the_events_of_the_mask_are_announced) {
+TEST_F(RealSocketsTest, Only_the_events_of_the_mask_are_announced) {
   const SocketHandle listener = Listen();
   const SocketHandle socket = NewSocket();
   Select(socket, kFdConnect);
@@ -104,7 +105,7 @@ TEST_F(LinuxSocketsTest, Only_the_events_of_the_mask_are_announced) {
   EXPECT_EQ(Count(socket, kFdWrite), 0);
 }
 
-TEST_F(LinuxSocketsTest, Mask_0_ends_the_announcements) {
+TEST_F(RealSocketsTest, Mask_0_ends_the_announcements) {
   Pair();
   Select(near, 0);
   Send(far, "x");
@@ -114,7 +115,7 @@ TEST_F(LinuxSocketsTest, Mask_0_ends_the_announcements) {
 
 // Reading.
 
-TEST_F(LinuxSocketsTest, FD_READ_comes_once_until_a_read_and_again_while_data_remains) {
+TEST_F(RealSocketsTest, FD_READ_comes_once_until_a_read_and_again_while_data_remains) {
   Pair();
   Send(far, "abcdef");
   ASSERT_TRUE(Saw(near, kFdRead));
@@ -128,7 +129,7 @@ TEST_F(LinuxSocketsTest, FD_READ_comes_once_until_a_read_and_again_while_data_re
   EXPECT_EQ(Count(near, kFdRead), 2);
 }
 
-TEST_F(LinuxSocketsTest, A_peek_leaves_the_data_and_announces_it_again) {
+TEST_F(RealSocketsTest, A_peek_leaves_the_data_and_announces_it_again) {
   Pair();
   Send(far, "abc");
   ASSERT_TRUE(Saw(near, kFdRead));
@@ -137,12 +138,12 @@ TEST_F(LinuxSocketsTest, A_peek_leaves_the_data_and_announces_it_again) {
   EXPECT_EQ(Read(near, 10), "abc");
 }
 
-TEST_F(LinuxSocketsTest, A_read_with_nothing_waiting_fails_with_10035) {
+TEST_F(RealSocketsTest, A_read_with_nothing_waiting_fails_with_10035) {
   Pair();
   EXPECT_EQ(Read(near, 10), "error 10035");
 }
 
-TEST_F(LinuxSocketsTest, FIONREAD_tells_the_bytes_of_a_stream) {
+TEST_F(RealSocketsTest, FIONREAD_tells_the_bytes_of_a_stream) {
   Pair();
   Send(far, "abc");
   ASSERT_TRUE(Saw(near, kFdRead));
@@ -153,7 +154,7 @@ TEST_F(LinuxSocketsTest, FIONREAD_tells_the_bytes_of_a_stream) {
   EXPECT_EQ(LastError(), kInvalidArgument);
 }
 
-TEST_F(LinuxSocketsTest, FD_CLOSE_comes_once_and_behind_the_last_data) {
+TEST_F(RealSocketsTest, FD_CLOSE_comes_once_and_behind_the_last_data) {
   Pair();
   Send(far, "abcdef");
   sockets.closesocket(far);
@@ -170,7 +171,7 @@ TEST_F(LinuxSocketsTest, FD_CLOSE_comes_once_and_behind_the_last_data) {
   EXPECT_EQ(Count(near, kFdClose), 1);
 }
 
-TEST_F(LinuxSocketsTest, A_reset_is_told_as_FD_CLOSE_with_10054_behind_the_last_data) {
+TEST_F(RealSocketsTest, A_reset_is_told_as_FD_CLOSE_with_10054_behind_the_last_data) {
   Pair();
   Send(near, "unread, so that the close is a reset");
   ASSERT_TRUE(Saw(far, kFdRead));
@@ -184,7 +185,7 @@ TEST_F(LinuxSocketsTest, A_reset_is_told_as_FD_CLOSE_with_10054_behind_the_last_
 
 // Writing.
 
-TEST_F(LinuxSocketsTest, FD_WRITE_comes_after_a_refused_send_when_there_is_room_again) {
+TEST_F(RealSocketsTest, FD_WRITE_comes_after_a_refused_send_when_there_is_room_again) {
   Pair();
   const std::string block(1'000'000, 'x');
   while (Send(near, block) > 0) {
@@ -202,7 +203,7 @@ TEST_F(LinuxSocketsTest, FD_WRITE_comes_after_a_refused_send_when_there_is_room_
   EXPECT_EQ(Count(near, kFdWrite), 1);
 }
 
-TEST_F(LinuxSocketsTest, A_send_to_a_connection_that_was_reset_fails_without_a_signal) {
+TEST_F(RealSocketsTest, A_send_to_a_connection_that_was_reset_fails_without_a_signal) {
   Pair();
   Send(near, "unread");
   ASSERT_TRUE(Saw(far, kFdRead));
@@ -214,7 +215,7 @@ TEST_F(LinuxSocketsTest, A_send_to_a_connection_that_was_reset_fails_without_a_s
 
 // Accepting.
 
-TEST_F(LinuxSocketsTest, FD_ACCEPT_comes_once_until_accept_and_again_while_connections_wait) {
+TEST_F(RealSocketsTest, FD_ACCEPT_comes_once_until_accept_and_again_while_connections_wait) {
   const SocketHandle listener = Listen();
   for (int i = 0; i < 2; ++i) {
     const SocketHandle socket = NewSocket();
@@ -233,7 +234,7 @@ TEST_F(LinuxSocketsTest, FD_ACCEPT_comes_once_until_accept_and_again_while_conne
   EXPECT_EQ(LastError(), kWouldBlock);
 }
 
-TEST_F(LinuxSocketsTest, An_accepted_socket_has_its_listeners_selection) {
+TEST_F(RealSocketsTest, An_accepted_socket_has_its_listeners_selection) {
   const SocketHandle listener = Listen();
   const SocketHandle socket = NewSocket();
   Select(socket);
@@ -246,7 +247,7 @@ TEST_F(LinuxSocketsTest, An_accepted_socket_has_its_listeners_selection) {
   EXPECT_EQ(Read(accepted, 10), "early");
 }
 
-TEST_F(LinuxSocketsTest, Both_ends_know_each_others_address) {
+TEST_F(RealSocketsTest, Both_ends_know_each_others_address) {
   Pair();
   SocketAddress local;
   SocketAddress peer;
@@ -257,7 +258,7 @@ TEST_F(LinuxSocketsTest, Both_ends_know_each_others_address) {
   EXPECT_EQ(LastError(), 10057);
 }
 
-TEST_F(LinuxSocketsTest, A_port_in_use_is_refused_with_10048) {
+TEST_F(RealSocketsTest, A_port_in_use_is_refused_with_10048) {
   const SocketHandle listener = Listen();
   EXPECT_EQ(sockets.bind(NewSocket(), At(PortOf(listener))), kSocketError);
   EXPECT_EQ(LastError(), 10048);
@@ -265,7 +266,7 @@ TEST_F(LinuxSocketsTest, A_port_in_use_is_refused_with_10048) {
 
 // Datagrams.
 
-TEST_F(LinuxSocketsTest, A_datagram_is_announced_measured_and_read_with_its_sender) {
+TEST_F(RealSocketsTest, A_datagram_is_announced_measured_and_read_with_its_sender) {
   const SocketHandle receiver = NewSocket(2);
   const SocketHandle sender = NewSocket(2);
   sockets.bind(receiver, At(0));
@@ -290,7 +291,7 @@ TEST_F(LinuxSocketsTest, A_datagram_is_announced_measured_and_read_with_its_send
   EXPECT_EQ(LastError(), kWouldBlock);
 }
 
-TEST_F(LinuxSocketsTest, A_datagram_to_a_port_where_nobody_listens_does_not_stop_the_socket) {
+TEST_F(RealSocketsTest, A_datagram_to_a_port_where_nobody_listens_does_not_stop_the_socket) {
   const SocketHandle other = NewSocket(2);
   sockets.bind(other, At(0));
   const std::uint16_t closed = PortOf(other);
@@ -307,7 +308,7 @@ TEST_F(LinuxSocketsTest, A_datagram_to_a_port_where_nobody_listens_does_not_stop
 
 // Closing.
 
-TEST_F(LinuxSocketsTest, A_closed_socket_announces_nothing_more) {
+TEST_F(RealSocketsTest, A_closed_socket_announces_nothing_more) {
   Pair();
   Send(far, "x");
   sockets.closesocket(near);
@@ -318,4 +319,4 @@ TEST_F(LinuxSocketsTest, A_closed_socket_announces_nothing_more) {
 
 } // namespace
 
-} // namespace quendra::platform::linux_
+} // namespace quendra::platform
