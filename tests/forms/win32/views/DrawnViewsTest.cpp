@@ -16,7 +16,7 @@ struct DrawnForm : Form {
   std::function<void()> design;
 };
 
-constexpr std::uint32_t kPaper = 0xFFFFFF;
+constexpr std::uint32_t kDrawnPaper = 0xFFFFFF;
 constexpr int kWidth = 220;
 constexpr int kHeight = 80;
 
@@ -53,7 +53,7 @@ class Sheet {
   template <typename Place> int Edge(int row, const Place& place) {
     for (int i = 0; i < kWidth; ++i)
       for (int y = row < 0 ? 0 : row; y < (row < 0 ? kHeight : row + 1); ++y)
-        if (At(place(i), y) != kPaper) return place(i);
+        if (At(place(i), y) != kDrawnPaper) return place(i);
     return -1;
   }
 
@@ -97,7 +97,7 @@ TEST_F(DrawnViewsTest, A_label_is_seen_through_until_it_gets_a_ground_of_its_own
   label.Transparent = false;
 
   EXPECT_EQ(Sheet(label).At(99, 19), 0x010203U);
-  EXPECT_EQ(Sheet(label).At(100, 19), kPaper);
+  EXPECT_EQ(Sheet(label).At(100, 19), kDrawnPaper);
 }
 
 TEST_F(DrawnViewsTest, A_label_that_is_not_enabled_is_quiet_in_its_container_too) {
@@ -125,7 +125,7 @@ TEST_F(DrawnViewsTest, A_button_has_a_face_with_round_corners_and_its_caption_in
 
   EXPECT_EQ(sheet.At(50, 0), Rgb24(Palette::StrongBorder));
   EXPECT_EQ(sheet.At(99, 15), Rgb24(Palette::StrongBorder));
-  EXPECT_EQ(sheet.At(0, 0), kPaper);
+  EXPECT_EQ(sheet.At(0, 0), kDrawnPaper);
   int first = 10;
   int last = 90;
   const auto isEmpty = [&](int x) {
@@ -161,9 +161,9 @@ TEST_F(DrawnViewsTest, The_border_of_a_frame_runs_through_its_title_which_stands
 
   Sheet sheet(frame);
 
-  EXPECT_NE(sheet.At(50, middle), kPaper);
-  EXPECT_EQ(sheet.At(50, middle - 2), kPaper);
-  EXPECT_EQ(sheet.At(50, middle + 2), kPaper);
+  EXPECT_NE(sheet.At(50, middle), kDrawnPaper);
+  EXPECT_EQ(sheet.At(50, middle - 2), kDrawnPaper);
+  EXPECT_EQ(sheet.At(50, middle + 2), kDrawnPaper);
   EXPECT_EQ(sheet.At(100, 59), Rgb24(Palette::Border));
   EXPECT_EQ(sheet.At(0, 40), Rgb24(Palette::Border));
   EXPECT_NEAR(sheet.Last(middle - 2), 180, 8);
@@ -182,7 +182,7 @@ TEST_F(DrawnViewsTest, A_frame_without_a_border_is_a_plain_page) {
 
   EXPECT_EQ(sheet.At(100, 0), 0x090807U);
   EXPECT_EQ(sheet.At(199, 30), 0x090807U);
-  EXPECT_EQ(sheet.At(0, 0), kPaper);
+  EXPECT_EQ(sheet.At(0, 0), kDrawnPaper);
 }
 
 TEST_F(DrawnViewsTest, A_level_line_is_sharp_and_lets_the_mouse_through) {
@@ -195,8 +195,8 @@ TEST_F(DrawnViewsTest, A_level_line_is_sharp_and_lets_the_mouse_through) {
 
   EXPECT_EQ(sheet.At(1, 1), 0xFF0000U);
   EXPECT_EQ(sheet.At(101, 1), 0xFF0000U);
-  EXPECT_EQ(sheet.At(50, 0), kPaper);
-  EXPECT_EQ(sheet.At(50, 2), kPaper);
+  EXPECT_EQ(sheet.At(50, 0), kDrawnPaper);
+  EXPECT_EQ(sheet.At(50, 2), kDrawnPaper);
   EXPECT_EQ(::SendMessageW(ViewOf(line).Window(), WM_NCHITTEST, 0, 0), HTTRANSPARENT);
 }
 
@@ -207,10 +207,10 @@ TEST_F(DrawnViewsTest, A_slanting_line_of_a_mirrored_form_is_mirrored) {
 
   Sheet sheet(line);
 
-  EXPECT_NE(sheet.At(49, 2), kPaper);
-  EXPECT_NE(sheet.At(2, 49), kPaper);
-  EXPECT_EQ(sheet.At(2, 2), kPaper);
-  EXPECT_EQ(sheet.At(49, 49), kPaper);
+  EXPECT_NE(sheet.At(49, 2), kDrawnPaper);
+  EXPECT_NE(sheet.At(2, 49), kDrawnPaper);
+  EXPECT_EQ(sheet.At(2, 2), kDrawnPaper);
+  EXPECT_EQ(sheet.At(49, 49), kDrawnPaper);
 }
 
 TEST_F(DrawnViewsTest, An_image_covers_its_place) {
@@ -223,7 +223,7 @@ TEST_F(DrawnViewsTest, An_image_covers_its_place) {
 
   EXPECT_EQ(sheet.At(0, 0), 0x102030U);
   EXPECT_EQ(sheet.At(59, 39), 0x102030U);
-  EXPECT_EQ(sheet.At(60, 39), kPaper);
+  EXPECT_EQ(sheet.At(60, 39), kDrawnPaper);
 }
 
 TEST_F(DrawnViewsTest, A_picture_box_shows_ground_picture_and_drawings_within_its_border) {
