@@ -24,6 +24,15 @@ TEST_F(Window, A_form_takes_its_size_in_twips) {
   EXPECT_EQ(InsideOf(WindowOf(form).Body()), (Extent{400, 300}));
 }
 
+TEST_F(Window, A_window_has_the_name_of_its_control_as_a_property) {
+  Label label(form, u"lblOne(1)");
+
+  desktop.Load(form);
+
+  EXPECT_TRUE(::GetPropW(ViewOf(label).Window(), L"quendra:lblOne(1)"));
+  EXPECT_TRUE(::GetPropW(WindowOf(form).Body(), L"quendra:frmTest"));
+}
+
 TEST_F(Window, A_form_comes_up_in_the_middle_of_the_screen_with_its_frame) {
   desktop.Show(form);
 

@@ -13,6 +13,9 @@ namespace {
 /// The property of a window under which it keeps its view.
 constexpr const wchar_t* kView = L"QuendraView";
 
+/// A window has a property of this name with the control's own behind it, by which other programs find it.
+Text MarkOf(const Control& control) { return u"quendra:" + control.Name(); }
+
 /// The window that tells its container something by this message; nullptr for any other message.
 HWND SenderOf(HWND container, UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
@@ -46,12 +49,14 @@ void HandFocusOn(const Form& form, HWND window) {
 } // namespace
 
 WindowView::WindowView(ViewContext& context, Control& control)
-    : context_(context), control_(&control), direction_(DirectionOf(control.OwnerForm())) {}
+    : context_(context), control_(&control), direction_(DirectionOf(control.OwnerForm())),
+      mark_(MarkOf(control)) {}
 
 WindowView::~WindowView() {
   context_.mouse.Forget(*this);
   if (!window_) return;
   ::RemovePropW(window_, kView);
+  ::RemovePropW(window_, winapi::Wide(mark_));
   if (before_ != ::DefWindowProcW)
     ::SetWindowLongPtrW(window_, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(before_));
   ::DestroyWindow(window_);
@@ -68,6 +73,7 @@ void WindowView::Create(HWND parent, const wchar_t* windowClass, DWORD style, DW
   if (!window_) throw Fault(Fault::kOutOfMemory);
   before_ = ::DefWindowProcW;
   ::SetPropW(window_, kView, this);
+  ::SetPropW(window_, winapi::Wide(mark_), window_);
   if (!own)
     before_ = reinterpret_cast<WNDPROC>(
         ::SetWindowLongPtrW(window_, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(Procedure)));

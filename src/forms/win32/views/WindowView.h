@@ -17,8 +17,8 @@ enum class KeyUse {
 };
 
 /// What all windows that stand for a control have in common. A window's text is the accessible name of its
-/// control. What we draw ourselves is put together by the form's window, over what lies below: controls may
-/// be transparent. Windows of the system's kinds draw themselves.
+/// control, and a property tells the control's own name. What we draw ourselves is put together by the form's
+/// window, over what lies below: controls may be transparent. Windows of the system's kinds draw themselves.
 class WindowView : public View {
  public:
   WindowView(ViewContext& context, Control& control);
@@ -126,6 +126,7 @@ class WindowView : public View {
   ViewContext& context_;
   Control* control_;
   Direction direction_;
+  Text mark_; ///< the property that tells the control's name
   HWND window_ = nullptr;
   WNDPROC before_ = nullptr;
   Area windowPlace_{};
