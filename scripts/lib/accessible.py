@@ -1,30 +1,15 @@
 """The running program as a screen reader sees it: controls by the name they have in the code, their places on the
 screen, and the rows of the process table. Needs DISPLAY and DBUS_SESSION_BUS_ADDRESS before the first question."""
 
-import re
-import time
+import subprocess
 
 import gi
 
 gi.require_version("Atspi", "2.0")
-from gi.repository import Atspi, GLib  # noqa: E402
+from gi.repository import Atspi  # noqa: E402
 
-TABLE = "main_ListView1"
-SHOWN_COLUMNS = 7
-APPLICATION, NAME, CLASS, PORTS, UPLOAD, DOWNLOAD, TOTAL = range(7)
-
-
-def wait_for(what, question, seconds=15):
-    """Asks until the answer is true; a program that is busy or gone meanwhile counts as no answer."""
-    end = time.monotonic() + seconds
-    while time.monotonic() < end:
-        try:
-            if answer := question():
-                return answer
-        except GLib.Error:
-            pass
-        time.sleep(0.1)
-    raise RuntimeError(f"waited {seconds} s in vain for {what}")
+import seen  # noqa: E402
+from seen import SHOWN_COLUMNS, TABLE  # noqa: E402
 
 
 def children(node):
@@ -40,7 +25,43 @@ def below(node, depth=12):
             yield from below(child, depth - 1)
 
 
-class Program:
+class Control:
+    """A control as assistive technology is told of it: its description is its name in the code."""
+
+    def __init__(self, node):
+        self.node = node
+
+    @property
+    def code(self):
+        return self.node.get_description()
+
+    @property
+    def name(self):
+        return self.node.get_name()
+
+    def text(self):
+        return Atspi.Text.get_text(self.node.get_text_iface(), 0, -1)
+
+    def length(self):
+        return Atspi.Text.get_character_count(self.node.get_text_iface())
+
+    def chosen(self):
+        """The chosen item of a list that hangs down, without the marks that keep Latin letters in their order."""
+        return self.name.strip(seen.DIRECTION_MARKS)
+
+    @property
+    def is_secret(self):
+        return self.node.get_role() == Atspi.Role.PASSWORD_TEXT
+
+    @property
+    def is_enabled(self):
+        return self.node.get_state_set().contains(Atspi.StateType.ENABLED)
+
+    def centre(self):
+        return centre_of(self.node)
+
+
+class Program(seen.Program):
     """The program with a process id, once it has said that it can be read."""
 
     def __init__(self, process):
@@ -55,44 +76,51 @@ class Program:
                 return child
         return None
 
-    def find(self, name):
-        """The showing control whose name in the code, its accessible description, is `name`; None when there is none."""
+    def controls(self):
         node = self.node()
-        for control in below(node) if node else ():
-            if control.get_description() == name and control.get_state_set().contains(Atspi.StateType.SHOWING):
+        return map(Control, below(node)) if node else ()
+
+    def find(self, name):
+        """The showing control with a name in the code; None when there is none."""
+        for control in self.controls():
+            if control.code == name and control.node.get_state_set().contains(Atspi.StateType.SHOWING):
                 return control
         return None
 
     def focused(self):
         """The control with the focus; None when none of the program's own has it."""
-        node = self.node()
-        for control in below(node) if node else ():
-            if control.get_description() and control.get_state_set().contains(Atspi.StateType.FOCUSED):
+        for control in self.controls():
+            if control.code and control.node.get_state_set().contains(Atspi.StateType.FOCUSED):
                 return control
         return None
 
-    def control(self, name, seconds=15):
-        return wait_for(name, lambda: self.find(name), seconds)
-
     def windows(self):
+        """The newest last."""
         node = self.node()
-        return [child for child in children(node)] if node else []
+        return list(map(Control, children(node))) if node else []
 
     def texts(self, window):
-        return [control.get_name() for control in below(window) if control.get_name()]
+        return [control.get_name() for control in below(window.node) if control.get_name()]
+
+    def button(self, window):
+        """The first one in a window."""
+        return next(Control(node) for node in below(window.node) if node.get_role() == Atspi.Role.PUSH_BUTTON)
 
     def table(self, name=TABLE):
-        return Table(self.control(name))
+        return Table(self.control(name).node)
+
+    def frames(self):
+        """The windows as the display knows them."""
+        command = ["xdotool", "search", "--onlyvisible", "--pid", str(self.process)]
+        return subprocess.run(command, capture_output=True, text=True).stdout.split()
+
+    def owns(self, process):
+        return process == self.process
 
 
-def centre_of(control):
-    box = control.get_extents(Atspi.CoordType.SCREEN)
+def centre_of(node):
+    box = node.get_extents(Atspi.CoordType.SCREEN)
     return box.x + box.width // 2, box.y + box.height // 2
-
-
-def text_of(field):
-    """What stands in a field."""
-    return Atspi.Text.get_text(field.get_text_iface(), 0, -1)
 
 
 class Table:
@@ -138,8 +166,3 @@ class Table:
         """What a cell without text shows: the name of its icon."""
         cell = self.table.get_accessible_at(row, column)
         return cell.get_description() if cell else ""
-
-
-def number(text):
-    """A rate as the table shows it; an empty cell is none."""
-    return float(text) if re.fullmatch(r"\d+(\.\d+)?", text) else 0.0

@@ -3,7 +3,7 @@
 import time
 import urllib.parse
 
-from accessible import NAME, wait_for
+from seen import NAME, wait_for
 
 TRIES = 8
 BUTTONS = (

@@ -2,9 +2,8 @@
 
 import os
 
-from accessible import DOWNLOAD, NAME, PORTS, UPLOAD, number
 from cast import LEAST
-
+from seen import DOWNLOAD, NAME, PORTS, UPLOAD, number
 
 def missing_rates(rows, ports):
     """What is wrong with the rows of the processes that the tour itself started, as sentences."""

@@ -16,7 +16,7 @@ def click(place):
 
 def places_of(command, names, last):
     """Where the controls of these names lie, each clicked to reach the next one; `last` is what must come up in the end."""
-    from accessible import Program, centre_of
+    from accessible import Program
 
     places = []
     with stage.started(command, env=dict(os.environ, QT_LINUX_ACCESSIBILITY_ALWAYS_ON="1")) as child:
@@ -24,7 +24,7 @@ def places_of(command, names, last):
         for name in names:
             control = program.control(name)
             time.sleep(0.5)
-            places.append(centre_of(control))
+            places.append(control.centre())
             click(places[-1])
         program.control(last)
     return places

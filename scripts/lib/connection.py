@@ -5,8 +5,7 @@ import time
 from pathlib import Path
 
 import stage
-from accessible import below, text_of, wait_for
-from gi.repository import Atspi
+from seen import wait_for
 
 MODEMS = ("Samsung AHT E300", "Alcatel 510", "Alcatel Speed Touch Home", "ECI B-FoCUS +270/312", "Aztech E600")
 BY_VPN = 2
@@ -42,8 +41,7 @@ class Boxes:
         box = wait_for(f"the box {text!r}", lambda: self.find(text), 30)
         time.sleep(0.3)
         self.walk.picture(picture)
-        button = next(control for control in below(box) if control.get_role() == Atspi.Role.PUSH_BUTTON)
-        self.walk.point_at(button)
+        self.walk.point_at(self.program.button(box))
         self.walk.xdotool("click", 1)
         wait_for(f"the box {text!r} to close", lambda: not self.find(text))
 
@@ -57,7 +55,7 @@ class Typist:
 
     def has_focus(self, field):
         focused = self.program.focused()
-        return focused and focused.get_description() == field
+        return focused and focused.code == field
 
     def type_into(self, field, keys, arrives):
         """In place of what the field holds."""
@@ -71,9 +69,7 @@ class Typist:
     def holds(self, field, text):
         """A field for secrets tells no more than how long its text is."""
         control = self.program.control(field)
-        if control.get_role() == Atspi.Role.PASSWORD_TEXT:
-            return Atspi.Text.get_character_count(control.get_text_iface()) == len(text)
-        return text_of(control) == text
+        return control.length() == len(text) if control.is_secret else control.text() == text
 
 
 class ConnectionStep:
@@ -115,7 +111,7 @@ class ConnectionStep:
         if modem == BY_VPN:
             self.choose_card()
         self.boxes.press(CREATED, f"created-{modem}")
-        mail_name = wait_for("the mail step", lambda: text_of(self.program.control("frsCon_txtEmailUN")))
+        mail_name = wait_for("the mail step", lambda: self.program.control("frsCon_txtEmailUN").text())
         wrong = [] if mail_name == NAME else [f"the mail step has the name {mail_name!r}"]
         return wrong + self.lacks(modem)
 
@@ -201,11 +197,10 @@ class TroubleStep:
         raise RuntimeError(f"the troubleshooter has no connection {name}, but {self.chosen()!r}")
 
     def chosen(self):
-        """Without the marks that keep Latin letters in their order."""
-        return self.program.control("cmbDialups").get_name().strip("\u2066\u2067\u2068\u2069")
+        return self.program.control("cmbDialups").chosen()
 
     def status(self):
-        return text_of(self.program.control("txtStatus"))
+        return self.program.control("txtStatus").text()
 
     def check(self, name, number, end, seconds):
         """Gives what the status says once `end` stands in it. The form stays."""
@@ -234,7 +229,7 @@ class TroubleStep:
 
     def can_check(self):
         """Whether the button can be pressed, as it can be again once a diagnosis has come to its end."""
-        return self.program.control("cmdCheck").get_state_set().contains(Atspi.StateType.ENABLED)
+        return self.program.control("cmdCheck").is_enabled
 
     def dial(self, name):
         """A real dial, which no line answers; gives the status and what is wrong."""

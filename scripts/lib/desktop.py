@@ -6,7 +6,7 @@ import subprocess
 import sys
 
 import stage
-from accessible import wait_for
+from seen import wait_for
 
 FILE_MANAGER = f"{os.path.dirname(os.path.abspath(__file__))}/../../tests/standins/file_manager.py"
 SOFTWARE_CENTRE = "gnome-software"

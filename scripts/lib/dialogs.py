@@ -3,7 +3,7 @@
 import re
 import time
 
-from accessible import text_of, wait_for
+from seen import wait_for
 
 PORTS = {80: "Label3", 25: "Label4", 110: "Label6"}
 # Each with the line of /proc/meminfo that it follows; None where the figure is of another origin.
@@ -40,7 +40,7 @@ class PortsStep(DialogStep):
 
     def answers(self):
         """By port; empty while one is missing."""
-        answers = {port: self.program.control(label).get_name() for port, label in PORTS.items()}
+        answers = {port: self.program.control(label).name for port, label in PORTS.items()}
         return answers if all(answers.values()) else {}
 
     def take(self, servers_are_there):
@@ -65,7 +65,7 @@ class MemoryStep(DialogStep):
     def take(self):
         """Gives the figures by field, and what is wrong with them."""
         self.open("main_cmdMemInfo")
-        figures = {field: wait_for(field, lambda: text_of(self.program.control(field))) for field in MEMORY}
+        figures = {field: wait_for(field, lambda: self.program.control(field).text()) for field in MEMORY}
         self.walk.picture("memory")
         self.walk.xdotool("key", "Escape")
         self.await_end()

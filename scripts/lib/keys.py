@@ -2,7 +2,7 @@
 
 import time
 
-from accessible import wait_for
+from seen import wait_for
 
 MOST_STOPS = 30
 
@@ -19,7 +19,7 @@ class KeysStep:
         self.walk.xdotool("key", "Tab")
         time.sleep(0.1)
         control = wait_for("a control with the focus", self.program.focused)
-        return control.get_description(), control.get_name()
+        return control.code, control.name
 
     def take(self, wanted):
         """Gives the stops in their order, and what is wrong with them."""

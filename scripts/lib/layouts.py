@@ -14,7 +14,8 @@ from gi.repository import GLib
 
 import stage
 import tour
-from accessible import Program, wait_for
+from accessible import Program
+from seen import wait_for
 from walk import Walk
 
 FIELD, MARK = "frsCon_txtUsername", "frsCon_lblError(0)"
@@ -54,8 +55,7 @@ class Typist:
 
     def typed(self):
         """Of a password nobody learns more than its length."""
-        length = self.field.get_character_count()
-        return "*" * length if self.is_secret else self.field.get_text(0, length)
+        return "*" * self.field.length() if self.is_secret else self.field.text()
 
     def is_marked(self):
         return self.program.find(MARK) is not None

@@ -10,8 +10,7 @@ import sys
 import time
 
 import stage
-from accessible import below, wait_for
-from gi.repository import Atspi
+from seen import wait_for
 
 SERVER = f"{os.path.dirname(os.path.abspath(__file__))}/../../tests/standins/support_server.py"
 PORT = "80"
@@ -49,7 +48,7 @@ def silence(spaces, program):
     quiet = []
     for space in spaces:
         listed = subprocess.run(["ip", "netns", "pids", space], capture_output=True, text=True).stdout
-        quiet += [int(process) for process in listed.split() if int(process) != program]
+        quiet += [int(process) for process in listed.split() if not program.owns(int(process))]
     quiet = [process for process in quiet if "support_server" not in command_line(process)]
     signal_all(quiet, signal.SIGSTOP)
     try:
@@ -92,8 +91,7 @@ class ReportStep:
         return wait_for(f"the box that says {what}", find)
 
     def close(self, window, what):
-        button = next(control for control in below(window) if control.get_role() == Atspi.Role.PUSH_BUTTON)
-        self.walk.point_at(button)
+        self.walk.point_at(self.program.button(window))
         self.walk.xdotool("click", 1)
         wait_for("the box to close", lambda: not any(what in text for w in self.program.windows() for text in self.program.texts(w)))
 

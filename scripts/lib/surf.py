@@ -6,7 +6,7 @@ import sys
 import time
 
 import stage
-from accessible import wait_for
+from seen import wait_for
 
 GREETER = f"{os.path.dirname(os.path.abspath(__file__))}/../../tests/standins/mail_greeter.py"
 LIST = "surf_ListView1"

@@ -65,7 +65,7 @@ def send_report(walk, support):
     if not support.folder:
         say(f"no report is sent: {support.reason}")
         return []
-    with report.silence(support.spaces, walk.program.process):
+    with report.silence(support.spaces, walk.program):
         number, body, wrong = report.ReportStep(walk, support.folder).take()
     say(f"report {number}, as the support server received it, {len(body)} bytes:")
     print(report.as_lines(body))
@@ -80,7 +80,7 @@ def go_round(walk, *wanted):
 
 
 def act_on_process(walk, scene):
-    with report.silence(scene.spaces, walk.program.process):
+    with report.silence(scene.spaces, walk.program):
         lines, wrong = actions.ActionsStep(walk, scene.desktop, scene.victim).take()
     print("\n".join(lines))
     return wrong
@@ -171,7 +171,7 @@ def walk_through(walk, scene):
     walk.picture("monitor")
     print(as_text(program.table().captions(), rows, limit=40))
     for label in ("main_lblUpload", "main_lblDownload"):
-        print(f"{label}: {program.control(label).get_name()}")
+        print(f"{label}: {program.control(label).name}")
     walk.column()
     walk.about()
     print("\n".join(walk.addresses()))

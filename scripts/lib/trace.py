@@ -7,8 +7,7 @@ import subprocess
 import time
 
 import stage
-from accessible import below, text_of, wait_for
-from gi.repository import Atspi
+from seen import wait_for
 
 ROUTERS = 4
 
@@ -75,7 +74,7 @@ class TraceStep:
         return None
 
     def report(self):
-        return text_of(self.program.control("frmSurf_txtPingResult"))
+        return self.program.control("frmSurf_txtPingResult").text()
 
     def take(self, route):
         """Gives the report and what is wrong with it."""
@@ -86,8 +85,7 @@ class TraceStep:
         box = wait_for("the question at the end of the trace", self.question, 60)
         time.sleep(0.3)
         self.walk.picture("trace-question")
-        button = next(control for control in below(box) if control.get_role() == Atspi.Role.PUSH_BUTTON)
-        self.walk.point_at(button)
+        self.walk.point_at(self.program.button(box))
         self.walk.xdotool("click", 1)
         wait_for("the question to close", lambda: not self.question())
         self.walk.picture("trace")

@@ -4,7 +4,7 @@ import subprocess
 import time
 
 import stage
-from accessible import NAME, centre_of, wait_for
+from seen import NAME, wait_for
 
 
 class Walk:
@@ -25,10 +25,10 @@ class Walk:
         stage.run("import", "-window", "root", f"{self.folder}/{self.pictures:02}-{name}.png")
 
     def windows(self):
-        return self.xdotool("search", "--onlyvisible", "--pid", self.program.process).split()
+        return self.program.frames()
 
     def point_at(self, control):
-        self.xdotool("mousemove", *(self.scale * place for place in centre_of(control)))
+        self.xdotool("mousemove", *(self.scale * place for place in control.centre()))
 
     def click(self, name):
         self.point_at(self.program.control(name))
