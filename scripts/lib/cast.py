@@ -47,11 +47,11 @@ def executable(directory, name, role):
     return f"{directory}/{name}"
 
 
-def start_traffic(stack, spaces):
+def start_traffic(stack, spaces, players=(*SERVERS, *CLIENTS)):
     """Gives each local process's name with the port that it serves or speaks from."""
     ports = {}
     directory = stack.enter_context(stage.private_directory())
-    for side, name, role, address, port, rate in SERVERS + CLIENTS:
+    for side, name, role, address, port, rate in players:
         script = [executable(directory, name, role), "-S", TRAFFIC]
         script += [name, str(SECONDS), role, address, str(port)]
         child = stack.enter_context(

@@ -2,6 +2,7 @@
 library, the profile file by its code page."""
 
 import configparser
+import dataclasses
 import os
 import sqlite3
 
@@ -28,7 +29,7 @@ def as_value(kind, data):
     raise ValueError(f"a value of type {kind} with the bytes {data.hex()}")
 
 
-def accounts():
+def accounts_in_database():
     """The mail accounts in the registry: name and value of each entry, by the account's name."""
     with sqlite3.connect(f"file:{data_folder()}/registry.sqlite?mode=ro", uri=True) as registry:
         key = CURRENT_USER
@@ -49,11 +50,31 @@ def accounts():
         }
 
 
-def profile():
+@dataclasses.dataclass
+class Left:
+    """What the program has left: accounts by their names, each with its values by name, and the profile file's bytes."""
+
+    accounts: dict
+    profile: bytes | None
+    mode: str = ""
+
+    def sections(self):
+        return profile(self.profile) if self.profile is not None else {}
+
+
+def left():
+    """By the Linux edition."""
+    path = profile_path()
+    if not os.path.exists(path):
+        return Left(accounts_in_database(), None)
+    with open(path, "rb") as file:
+        return Left(accounts_in_database(), file.read(), f", mode {os.stat(path).st_mode & 0o777:o}")
+
+
+def profile(content):
     """The profile file's keys and values by section, as a reader of such files takes them. A file whose lines don't all
     end as they should, or whose bytes are no text, is an error."""
-    with open(profile_path(), "rb") as file:
-        text = file.read().decode(CODE_PAGE)
+    text = content.decode(CODE_PAGE)
     if not text.endswith("\r\n") or "\n" in text.replace("\r\n", ""):
         raise ValueError("the profile file has a line that doesn't end in CR and LF")
     reader = configparser.ConfigParser(delimiters=("=",), interpolation=None, strict=True)
@@ -62,37 +83,40 @@ def profile():
     return {section: dict(reader[section]) for section in reader.sections()}
 
 
-def lines():
+def account_lines(accounts):
+    return [f"{account}: {name} = {value}" for account, values in accounts.items() for name, value in values.items()]
+
+
+def lines(found=None):
     """What stands in both, a line an entry. Of the profile file the section with the account, and how much else there is."""
-    said = []
-    for account, values in accounts().items():
-        said += [f"registry: {account}: {name} = {value}" for name, value in values.items()]
-    if os.path.exists(profile_path()):
-        sections = profile()
-        mode = os.stat(profile_path()).st_mode & 0o777
+    found = found or left()
+    said = [f"registry: {line}" for line in account_lines(found.accounts)]
+    if sections := found.sections():
         said.append(
-            f"profile: {os.path.getsize(profile_path())} bytes, mode {mode:o}, {len(sections)} sections, "
+            f"profile: {len(found.profile)} bytes{found.mode}, {len(sections)} sections, "
             f"{sum(map(len, sections.values()))} entries"
         )
         said += [f"profile: [Account1] {name} = {value}" for name, value in sections["Account1"].items()]
     return said
 
 
-def wrong_with(user_name, full_name, domain):
+def wrong_with(user_name, full_name, domain, found=None):
     """What is wrong with the account that both should hold, a sentence each."""
-    wrong = []
-    account = accounts().get(domain[:1].upper() + domain[1:], {})
+    found = found or left()
+    account = found.accounts.get(domain[:1].upper() + domain[1:], {})
     expected = {
         "POP3 User Name": user_name,
         "SMTP Display Name": full_name,
         "SMTP Email Address": f"{user_name}@{domain}",
     }
-    for name, value in expected.items():
-        if account.get(name) != value:
-            wrong.append(f"the registry's {name!r} is {account.get(name)!r} and should be {value!r}")
-    section = profile()["Account1"] if os.path.exists(profile_path()) else {}
+    wrong = differences("registry", account, expected)
     expected = {"POP3UserName": user_name, "DisplayName": full_name, "EmailAddress": f"{user_name} @{domain}"}
-    for name, value in expected.items():
-        if section.get(name) != value:
-            wrong.append(f"the profile file's {name!r} is {section.get(name)!r} and should be {value!r}")
-    return wrong
+    return wrong + differences("profile file", found.sections().get("Account1", {}), expected)
+
+
+def differences(place, values, expected):
+    return [
+        f"the {place}'s {name!r} is {values.get(name)!r} and should be {value!r}"
+        for name, value in expected.items()
+        if values.get(name) != value
+    ]

@@ -1,6 +1,7 @@
 """A network manager of the tour's own: in a network namespace with two cards of its own and on a bus of its own, so that
 this machine's network and its manager, where it has one, stay as they are."""
 
+import configparser
 import contextlib
 import os
 import shutil
@@ -9,6 +10,7 @@ import time
 
 import stage
 
+ENTRY_DATA = "quendra.entry."
 CARDS = {"eth0": "192.168.7.2/24", "eth1": "192.168.8.2/24"}
 BUS = """<!DOCTYPE busconfig PUBLIC "-//freedesktop//DTD D-Bus Bus Configuration 1.0//EN"
  "http://www.freedesktop.org/standards/dbus/1.0/busconfig.dtd">
@@ -62,8 +64,9 @@ class NetworkManager:
 
     cards = tuple(CARDS)
 
-    def __init__(self, space):
+    def __init__(self, space, directory):
         self.space = space
+        self.directory = directory
 
     def nmcli(self, *words):
         return stage.run("nmcli", *words)
@@ -78,15 +81,46 @@ class NetworkManager:
         pairs = (line.rsplit(":", 1) for line in lines if line.endswith((":pppoe", ":vpn")))
         return {name.replace("\\:", ":"): kind for name, kind in pairs}
 
-    def told(self, name):
-        """What a connection holds, its secrets too, in one line."""
-        fields = ("pppoe.username", "pppoe.password", "vpn.data", "vpn.secrets", "user.data")
-        lines = self.nmcli("--show-secrets", "-t", "connection", "show", name)
-        found = {line for line in lines.splitlines() if line.split(":")[0] in fields and not line.endswith(":")}
-        return ", ".join(sorted(found))
+    def fields(self, name):
+        """What a connection holds, its secrets too: by the manager's own tool, and what it keeps of an entry beside that, by
+        the manager's file."""
+        words = "pppoe.username", "pppoe.password", "pppoe.service", "vpn.data", "vpn.secrets", "connection.type"
+        lines = self.nmcli("--show-secrets", "-t", "connection", "show", name).splitlines()
+        told = dict(line.split(":", 1) for line in lines if line.split(":")[0] in words)
+        return self.user_data(name) | (vpn_fields(told) if told["connection.type"] == "vpn" else pppoe_fields(told))
+
+    def user_data(self, name):
+        reader = configparser.ConfigParser(delimiters=("=",), interpolation=None)
+        reader.read(f"{self.directory}/connections/{name}.nmconnection")
+        own = reader["user"] if reader.has_section("user") else {}
+        kept = {key.removeprefix(ENTRY_DATA): value for key, value in own.items() if key.startswith(ENTRY_DATA)}
+        return {key: value for key, value in kept.items() if key != "version"}
 
     def addresses(self, card):
         return stage.run("ip", "-n", self.space, "-4", "-o", "address", "show", "dev", card)
+
+
+def pppoe_fields(told):
+    return {
+        "type": "pppoe",
+        "number": told.get("pppoe.service", ""),
+        "user": told.get("pppoe.username", ""),
+        "password": told.get("pppoe.password", ""),
+    }
+
+
+def vpn_fields(told):
+    """Of values that are lists themselves: name = value, name = value."""
+    data, secrets = (
+        dict(pair.split(" = ", 1) for pair in told.get(words, "").split(", ") if " = " in pair)
+        for words in ("vpn.data", "vpn.secrets")
+    )
+    return {
+        "type": "vpn",
+        "number": data.get("gateway", ""),
+        "user": data.get("user", ""),
+        "password": secrets.get("password", ""),
+    }
 
 
 def write(path, text):
@@ -145,6 +179,6 @@ def start(stack):
     script = START.format(directory=directory)
     command = stage.in_namespace(own, "unshare", "-m", "bash", "-c", script)
     stack.enter_context(stage.started(command, stdout=log, stderr=log))
-    manager = NetworkManager(own)
+    manager = NetworkManager(own, directory)
     await_cards(manager)
     return manager

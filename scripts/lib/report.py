@@ -28,10 +28,10 @@ class Support:
     reason: str = ""
 
 
-def start_server(stack, spaces, seconds):
-    """On loopback, in the first of the network namespaces when there are any."""
+def start_server(stack, spaces, seconds, log=os.devnull):
+    """On loopback, in the first of the network namespaces when there are any. The log gets the heads of all requests."""
     folder = stack.enter_context(stage.private_directory())
-    command = [sys.executable, SERVER, PORT, "--reports", folder, "--seconds", str(seconds)]
+    command = [sys.executable, SERVER, PORT, "--reports", folder, "--seconds", str(seconds), "--log", log]
     if spaces:
         command = stage.in_namespace(spaces[0], *command)
     server = stack.enter_context(

@@ -75,7 +75,7 @@ def connect_without_manager(walk):
     if os.geteuid() != 0:
         return
     walk.click("frsCon_lblCaption(1)")
-    step = connection.ConnectionStep(walk, None)
+    step = connection.ConnectionStep(walk, None, None)
     step.fill()
     walk.click(f"frsCon_lblModems({connection.BY_VPN})")
     walk.click("frsCon_cmdCreate")

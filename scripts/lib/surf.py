@@ -18,11 +18,13 @@ NETWORK_CHECKS, CHECKS = 4, 8
 CACHE_CHECK, CACHED = 4, 7
 
 
-def start_mail_servers(stack, spaces, seconds):
-    """On loopback, in the first of the network namespaces when there are any. Gives why some are missing, a sentence each."""
+def start_mail_servers(stack, spaces, seconds, logs=None):
+    """On loopback, in the first of the network namespaces when there are any. Gives why some are missing, a sentence each.
+    What visitors say goes to files in the folder of logs."""
     missing = []
     for protocol, port in (("pop3", "110"), ("smtp", "25")):
-        command = [sys.executable, GREETER, protocol, "--seconds", str(seconds)]
+        log = f"{logs}/{protocol}.log" if logs else os.devnull
+        command = [sys.executable, GREETER, protocol, "--seconds", str(seconds), "--log", log]
         if spaces:
             command = stage.in_namespace(spaces[0], *command)
         greeter = stack.enter_context(
@@ -45,12 +47,18 @@ def fill_cache():
             entry.write(bytes(1000))
 
 
+def as_lines(rows):
+    """A line a row: caption, icon and details."""
+    return [f"{caption}: {icon or '-'}: {details}" for details, caption, icon in rows]
+
+
 class SurfStep:
     """Opens the page, waits for the end of its list and says what each row says."""
 
-    def __init__(self, walk):
+    def __init__(self, walk, cached=lambda: len(os.listdir(cache()))):
         self.walk = walk
         self.program = walk.program
+        self.cached = cached
 
     def rows(self):
         """Details, caption and icon of each row."""
@@ -72,8 +80,7 @@ class SurfStep:
         rows = self.rows()
         return rows, self.wrong(rows, servers_are_there)
 
-    @staticmethod
-    def wrong(rows, servers_are_there):
+    def wrong(self, rows, servers_are_there):
         wrong = []
         if len(rows) != CHECKS + 2:
             wrong.append(f"the surf page has {len(rows)} rows")
@@ -83,6 +90,6 @@ class SurfStep:
         for details, caption, icon in rows[:NETWORK_CHECKS] if servers_are_there else ():
             if icon != TICK:
                 wrong.append(f"the check {caption!r} has no tick: {details!r}")
-        if rows[CACHE_CHECK][0] != f"{CACHED}/{CACHED}" or os.listdir(cache()):
-            wrong.append(f"the cache had {CACHED} entries, has {len(os.listdir(cache()))}, and its row says {rows[CACHE_CHECK]}")
+        if rows[CACHE_CHECK][0] != f"{CACHED}/{CACHED}" or self.cached():
+            wrong.append(f"the cache had {CACHED} entries, has {self.cached()}, and its row says {rows[CACHE_CHECK]}")
         return wrong

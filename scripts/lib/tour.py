@@ -3,7 +3,7 @@
 servers exchange data over a link of its own: sends a report to a stand-in support server, has a file shown and a process
 ended, opens every dialog, runs the checks of the page for surf problems and traces a route, makes the first connection
 for each modem and the mail account for each mail program, and looks for what is wrong with a connection. Leaves
-screenshots in build/screens, prints what the table, the report, each row and each dialog say and what other tools find
+screenshots in build/screens and what servers and files say in build/linux-tour, prints what the table, the report, each row and each dialog say and what other tools find
 afterwards, and ends non-zero when something isn't as it should be.
 
 The link, the traffic, the route and the network manager need root. Without it the program runs on this machine as it is, the table has no
@@ -25,6 +25,7 @@ import cast
 import connection
 import desktop
 import dialogs
+import keep
 import keys
 import mail
 import network_manager
@@ -60,7 +61,7 @@ def watch_table(program, ports):
     return rows, wrong + missing_processes(rows, ("Xvfb", "explorer.exe", os.path.basename(PROGRAM)))
 
 
-def send_report(walk, support):
+def send_report(walk, support, keeper):
     """Gives what is wrong with the report. Without a support server the button isn't pressed."""
     if not support.folder:
         say(f"no report is sent: {support.reason}")
@@ -69,6 +70,7 @@ def send_report(walk, support):
         number, body, wrong = report.ReportStep(walk, support.folder).take()
     say(f"report {number}, as the support server received it, {len(body)} bytes:")
     print(report.as_lines(body))
+    keeper.report(support.folder)
     return wrong
 
 
@@ -86,29 +88,26 @@ def act_on_process(walk, scene):
     return wrong
 
 
-def check_ports(walk, servers_are_there):
-    answers, wrong = dialogs.PortsStep(walk).take(servers_are_there)
-    for port, answer in answers.items():
-        print(f"port {port}: {answer}")
+def check_ports(walk, scene):
+    answers, wrong = dialogs.PortsStep(walk).take(scene.servers_are_there)
+    scene.keeper.tell("ports.txt", [f"{port}: {answer}" for port, answer in answers.items()])
     return wrong
 
 
-def read_memory(walk):
+def read_memory(walk, scene):
     figures, wrong = dialogs.MemoryStep(walk).take()
-    for field, figure in figures.items():
-        print(f"{field}: {figure}")
+    scene.keeper.tell("memory.txt", [f"{field}: {figure}" for field, figure in figures.items()])
     return wrong
 
 
 def check_surfing(walk, scene):
     """The page for surf problems; gives what is wrong with it."""
     rows, wrong = surf.SurfStep(walk).take(scene.servers_are_there)
-    for details, caption, icon in rows:
-        print(f"surf: {icon or '-':9} {caption} {details}".rstrip())
+    scene.keeper.tell("surf.txt", surf.as_lines(rows))
     wrong += go_round(walk, surf.LIST, "frmSurf_cmdAdvanced", "surf_lblBack")
     if scene.route:
         said, lacks = trace.TraceStep(walk).take(scene.route)
-        print(said)
+        scene.keeper.tell("trace.txt", said)
         wrong += lacks
     walk.click("surf_lblBack")
     return wrong
@@ -120,8 +119,8 @@ def connect(walk, scene):
         walk.first_connection()
         return []
     scene.manager.add_entry("Office")
-    wrong = connection.ConnectionStep(walk, scene.manager).take()
-    wrong += look_for_trouble(walk, scene.manager)
+    wrong = connection.ConnectionStep(walk, scene.manager, scene.keeper).take()
+    wrong += look_for_trouble(walk, scene)
     walk.click("frsCon_lblCaption(0)")
     wrong += connection.MailStep(walk).take([0])
     print("\n".join(mail.lines()))
@@ -130,12 +129,12 @@ def connect(walk, scene):
     return wrong
 
 
-def look_for_trouble(walk, manager):
+def look_for_trouble(walk, scene):
     step = connection.TroubleStep(walk)
-    said, wrong = step.simulate(connection.ENTRY, manager)
-    print(f"trouble: {said}")
+    said, wrong = step.simulate(connection.ENTRY, scene.manager)
+    scene.keeper.tell("trouble-691.txt", said)
     said, lacks = step.dial(connection.ENTRY)
-    print(f"trouble: {said}")
+    scene.keeper.tell("trouble-dial.txt", said)
     return wrong + lacks
 
 
@@ -146,9 +145,11 @@ def make_mail_accounts(walk, scene):
     walk.click("frsCon_lblCaption(0)")
     step = connection.MailStep(walk)
     wrong = step.take([0, 1, 2, 4])
-    print("\n".join(mail.lines()))
+    found = mail.left()
+    print("\n".join(mail.lines(found)))
+    scene.keeper.mail(found)
     print(f"the desktop {scene.desktop.wait_for_request('opener')}")
-    return wrong + mail.wrong_with(connection.NAME, step.FULL_NAME, MAIL_DOMAIN)
+    return wrong + mail.wrong_with(connection.NAME, step.FULL_NAME, MAIL_DOMAIN, found)
 
 
 def tour(child, pictures, take, scene):
@@ -174,11 +175,11 @@ def walk_through(walk, scene):
         print(f"{label}: {program.control(label).name}")
     walk.column()
     walk.about()
-    print("\n".join(walk.addresses()))
-    wrong += send_report(walk, scene.support)
+    scene.keeper.tell("addresses.txt", walk.addresses())
+    wrong += send_report(walk, scene.support, scene.keeper)
     wrong += act_on_process(walk, scene)
-    wrong += check_ports(walk, scene.servers_are_there)
-    wrong += read_memory(walk)
+    wrong += check_ports(walk, scene)
+    wrong += read_memory(walk, scene)
     wrong += go_round(walk, "main_ListView1", *actions.BUTTONS, "main_cmbAdapters")
     wrong += check_surfing(walk, scene)
     wrong += connect(walk, scene)
@@ -219,6 +220,7 @@ class Scene:
 
     desktop: desktop.Desktop
     victim: cast.Victim
+    keeper: keep.Keeper = dataclasses.field(default_factory=lambda: keep.Keeper("linux"))
     spaces: list = dataclasses.field(default_factory=list)
     ports: dict = dataclasses.field(default_factory=dict)
     route: trace.Route | None = None
@@ -253,8 +255,8 @@ def add_network_manager(stack, scene):
 
 def add_servers(stack, scene):
     """The stand-ins that the report and the checks speak to."""
-    scene.support = report.start_server(stack, scene.spaces, cast.SECONDS)
-    missing = surf.start_mail_servers(stack, scene.spaces, cast.SECONDS)
+    scene.support = report.start_server(stack, scene.spaces, cast.SECONDS, f"{scene.keeper.folder}/requests.log")
+    missing = surf.start_mail_servers(stack, scene.spaces, cast.SECONDS, scene.keeper.folder)
     for reason in missing:
         say(f"a mail server is missing: {reason}")
     scene.servers_are_there = bool(scene.support.folder) and not missing

@@ -1,11 +1,11 @@
 #!/usr/bin/env python3
 """A stand-in for a mail server: greets whoever connects, as POP3 and SMTP servers do, and takes no mail.
 
-    mail_greeter.py PROTOCOL [PORT] [--seconds N]
+    mail_greeter.py PROTOCOL [PORT] [--seconds N] [--log FILE]
 
 PROTOCOL is pop3 or smtp. Listens on loopback only. Prints its port once it can be reached and ends after N seconds or on
 SIGTERM. A client that sends a whole line is answered that nothing can be done for it; what it sends without a line end
-is left alone."""
+is left alone. The log has a line for each visit, with the bytes that were sent."""
 
 import argparse
 import signal
@@ -32,19 +32,25 @@ class Visit(socketserver.StreamRequestHandler):
     def handle(self):
         if threading.active_count() > MOST_CONNECTIONS:
             return
-        _, greeting, refusal, farewell = self.server.protocol
+        said = []
         try:
-            self.wfile.write(greeting)
-            for _ in range(LINES_ANSWERED):
-                line = self.rfile.readline(LONGEST_LINE)
-                if not line.endswith(b"\n"):
-                    return
-                if line.strip().upper() == b"QUIT":
-                    self.wfile.write(farewell)
-                    return
-                self.wfile.write(refusal)
+            self.talk(said)
         except OSError:
             pass  # a peer that is silent or gone concerns nobody else
+        self.server.note(b"".join(said))
+
+    def talk(self, said):
+        _, greeting, refusal, farewell = self.server.protocol
+        self.wfile.write(greeting)
+        for _ in range(LINES_ANSWERED):
+            line = self.rfile.readline(LONGEST_LINE)
+            said.append(line)
+            if not line.endswith(b"\n"):
+                return
+            if line.strip().upper() == b"QUIT":
+                self.wfile.write(farewell)
+                return
+            self.wfile.write(refusal)
 
 
 class Server(socketserver.ThreadingTCPServer):
@@ -52,6 +58,14 @@ class Server(socketserver.ThreadingTCPServer):
     daemon_threads = True
     block_on_close = False
     request_queue_size = 64
+    log = None
+    lock = threading.Lock()
+
+    def note(self, said):
+        if not self.log:
+            return
+        with self.lock, open(self.log, "a") as log:
+            log.write(f"{said!r}\n")
 
     def handle_error(self, request, client_address):
         print(f"mail greeter: {sys.exc_info()[1]}", file=sys.stderr, flush=True)
@@ -62,6 +76,7 @@ def main():
     parser.add_argument("protocol", choices=PROTOCOLS)
     parser.add_argument("port", nargs="?", type=int)
     parser.add_argument("--seconds", type=float, default=3600)
+    parser.add_argument("--log", help="file for what visitors say")
     arguments = parser.parse_args()
     for end in (signal.SIGTERM, signal.SIGINT, signal.SIGALRM):
         signal.signal(end, lambda *_: sys.exit(0))
@@ -73,6 +88,7 @@ def main():
     except OSError as fault:
         sys.exit(f"mail greeter: can't listen on {ADDRESS}:{port}: {fault.strerror}")
     server.protocol = protocol
+    server.log = arguments.log
     print(server.server_address[1], flush=True)
     server.serve_forever()
 

@@ -1,11 +1,11 @@
 #!/usr/bin/env python3
 """A stand-in for the support server: hands out report numbers and keeps the reports that are posted under them.
 
-    support_server.py [PORT] --reports FOLDER [--seconds N] [--first NUMBER] [--megabytes N] [--keep N]
+    support_server.py [PORT] --reports FOLDER [--seconds N] [--first NUMBER] [--megabytes N] [--keep N] [--log FILE]
 
 Listens on loopback only. Prints its port once it can be reached and ends after N seconds or on SIGTERM. Each report
 becomes two files in FOLDER, counted up from 00001: .head with the request's head and .body with its body, both byte
-for byte as they came. Of all reports the newest N stay."""
+for byte as they came. Of all reports the newest N stay. The log has the head of every request, whatever it asks for."""
 
 import argparse
 import os
@@ -83,7 +83,8 @@ def reply(status, content, kind="text/plain"):
 class Desk:
     """What the server knows: the numbers it has given and the reports it has taken. Used by many threads."""
 
-    def __init__(self, folder, first_number, megabytes, kept):
+    def __init__(self, folder, first_number, megabytes, kept, log=None):
+        self.log = log
         self.folder = folder
         self.kept = kept
         self.number = first_number - 1
@@ -108,6 +109,12 @@ class Desk:
             os.rename(f"{name}.{ending}.part", f"{name}.{ending}")
             if os.path.exists(f"{outdated}.{ending}"):
                 os.remove(f"{outdated}.{ending}")
+
+    def note(self, head):
+        if not self.log:
+            return
+        with self.lock, open(self.log, "ab") as log:
+            log.write(head + b"\n\n")
 
     def answer(self, method, path, head, body):
         if (method, path) == ("GET", "/getid.asp"):
@@ -136,6 +143,7 @@ class Exchange(socketserver.BaseRequestHandler):
             return reply("503 Service Unavailable", b"too many connections")
         try:
             head, body = read_request(self.request)
+            self.server.desk.note(head)
             return self.server.desk.answer(*method_and_path(head), head, body)
         except BadRequest as fault:
             return reply("400 Bad Request", str(fault).encode())
@@ -167,6 +175,7 @@ def main():
     parser.add_argument("--first", type=int, default=1001, help="the first report number")
     parser.add_argument("--megabytes", type=int, default=4, help="size of the load download")
     parser.add_argument("--keep", type=int, default=1000, help="how many reports stay")
+    parser.add_argument("--log", help="file for the heads of all requests")
     arguments = parser.parse_args()
     for end in (signal.SIGTERM, signal.SIGINT, signal.SIGALRM):
         signal.signal(end, lambda *_: sys.exit(0))
@@ -176,7 +185,7 @@ def main():
         server = Server((ADDRESS, arguments.port), Exchange)
     except OSError as fault:
         sys.exit(f"support server: can't listen on {ADDRESS}:{arguments.port}: {fault.strerror}")
-    server.desk = Desk(arguments.reports, arguments.first, arguments.megabytes, arguments.keep)
+    server.desk = Desk(arguments.reports, arguments.first, arguments.megabytes, arguments.keep, arguments.log)
     print(server.server_address[1], flush=True)
     server.serve_forever()
 

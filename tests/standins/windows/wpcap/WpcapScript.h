@@ -15,6 +15,8 @@ struct WpcapScript {
     int linkType = 1;
     bool canBeOpened = true;
     bool fails = false; ///< each dispatch does
+    std::string file{}; ///< what stands in it is delivered, too, as it grows (RecordedFrames.h)
+    long taken = 0;     ///< bytes of the file
     unsigned dropped = 0;
     std::deque<std::vector<std::uint8_t>> waiting{};
     // What became of it.

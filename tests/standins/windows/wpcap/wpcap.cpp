@@ -1,7 +1,7 @@
 // A wpcap.dll for tests: its devices and frames are those of a script, which the test has of it by
-// StandInScript. One thread.
+// StandInScript, or recorded where the environment says so. One thread.
 
-#include "standins/windows/wpcap/WpcapScript.h"
+#include "standins/windows/wpcap/RecordedFrames.h"
 
 #include "platform/windows/capture/WpcapTypes.h"
 
@@ -23,7 +23,7 @@ using namespace quendra::platform::windows;
 using quendra::standins::WpcapScript;
 
 WpcapScript& Script() {
-  static WpcapScript script;
+  static WpcapScript script{.devices = quendra::standins::RecordedDevices()};
   return script;
 }
 
@@ -108,6 +108,7 @@ EXPORTED int pcap_stats(PcapHandle* handle, PcapStatistics* statistics) {
 EXPORTED int pcap_dispatch(PcapHandle* handle, int most, PcapCallback* callback, unsigned char* user) {
   WpcapScript::Device& device = *handle->device;
   if (device.fails) return -1;
+  quendra::standins::TakeRecordedFrames(device, most);
   int count = 0;
   for (; count < most && !device.waiting.empty(); ++count) {
     const auto frame = std::move(device.waiting.front());
