@@ -55,7 +55,7 @@ def masked(name, content):
 def once(content):
     """Tries of a report told as one."""
     requests = content.split(b"\n\n")
-    kept = [request for at, request in enumerate(requests) if request not in requests[max(0, at - 2) : at] or not is_try(request)]
+    kept = [request for at, request in enumerate(requests) if not is_try(request) or request not in requests[:at]]
     return b"\n\n".join(kept)
 
 

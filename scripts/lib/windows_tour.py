@@ -33,9 +33,10 @@ import wine_machine
 import wine_program
 from checks import missing_rates
 from read_table import as_text
-from seen import NAME, Busy, wait_for
+from seen import APPLICATION, NAME, Busy, wait_for
 from walk import Walk
 
+EDITOR = "notepad.exe"  # a program of Wine's own with an icon
 SCREENS = f"{bed.ROOT}/build/windows-screens"
 SECONDS = 400
 SERVERS = [
@@ -46,6 +47,8 @@ SERVERS = [
 CLIENTS = {"download": ("get", 80), "backup": ("put", 8873, 100_000), "chat": ("talk", 6667)}
 # The least rates in kilobytes a second, half of what is sent.
 LEAST = {"download": (0.1, 140), "backup": (45, 0.1), "chat": (0.3, 0.3)}
+# What the resources of some programs say that they are; those of others say nothing.
+KNOWN = {"quendra.exe": "Quendra", EDITOR: "", "explorer.exe": "Wine", "services.exe": ""}
 MAIL_TILES = [0, 1, 2, 4]
 NO_PORT = "633"
 SPECIAL = r"Z:\tmp"
@@ -76,7 +79,11 @@ class WineActions(actions.ActionsStep):
 
     def started(self, word):
         """The command line of the program that was started with the word in it, once it runs."""
-        return wait_for(f"a program started with {word!r}", lambda: [p for p in wine_machine.processes(self.bed) if word in p])[0]
+        found = wait_for(f"a program started with {word!r}", lambda: self.running_with(word))
+        return found[0]
+
+    def running_with(self, word):
+        return [line for line in wine_machine.processes(self.bed) if word in line]
 
     def shown(self, program, picture):
         """Its window, which goes after its picture."""
@@ -148,8 +155,11 @@ class Tour:
         alive = len(wine_machine.processes(self.scene.bed))
         if abs(len(rows) - alive) > 3:
             wrong.append(f"{len(rows)} rows for {alive} processes")
-        names = [row[NAME] for row in rows]
-        return wrong + [f"no row for {name}" for name in ("quendra.exe", "explorer.exe", "services.exe") if name not in names]
+        named = {row[NAME]: row[APPLICATION] for row in rows}
+        for name, application in KNOWN.items():
+            if named.get(name) != application:
+                wrong.append(f"the application of {name} is {named.get(name)!r}")
+        return wrong
 
     def look_round(self):
         self.walk.column()
@@ -260,8 +270,10 @@ class Tour:
 
     def end(self):
         self.walk.close()
-        bed_is_left = lambda: not any("quendra.exe" in line for line in wine_machine.processes(self.scene.bed))  # noqa: E731
-        wait_for("the end of the program", bed_is_left, 10)
+        wait_for("the end of the program", self.has_ended, 10)
+
+    def has_ended(self):
+        return not any("quendra.exe" in line for line in wine_machine.processes(self.scene.bed))
 
 
 def start_clients(stack, opened):
@@ -288,6 +300,13 @@ def start_victim(stack, opened):
     process = start_talker(stack, opened, name, "wait", SECONDS)
     process.stdout.readline()
     return cast.Victim(f"{name}.exe", f"/tmp/{name}.exe", process)
+
+
+def start_editor(stack, opened):
+    """Its window is out of the way."""
+    stack.enter_context(stage.started(opened.wine(EDITOR)))
+    window = wait_for("a window of the editor", lambda: wine_machine.windows_of(EDITOR))[0]
+    stage.run("xdotool", "windowminimize", window)
 
 
 def add_network(stack, scene):
@@ -322,6 +341,7 @@ def perform():
         add_network(stack, scene)
         scene.ports = start_clients(stack, opened)
         scene.victim = start_victim(stack, opened)
+        start_editor(stack, opened)
         stack.enter_context(stage.started(wine_machine.command(opened)))
         reader = stack.enter_context(wine_program.reader(opened))
         return Tour(Walk(wine_program.Program(opened, reader), SCREENS), scene).take()
@@ -346,7 +366,8 @@ def main():
     signal.alarm(0)
     for sentence in wrong:
         say(f"WRONG: {sentence}")
-    say(f"screenshots are in {os.path.relpath(SCREENS)}, what servers and files say in {os.path.relpath(keep.folder('windows'))}")
+    say(f"screenshots are in {os.path.relpath(SCREENS)}")
+    say(f"what servers received and files became is in {os.path.relpath(keep.folder('windows'))}")
     say("failed" if wrong else "all as it should be")
     return 1 if wrong else 0
 

@@ -15,7 +15,8 @@ STANDINS = f"{ROOT}/build/windows/standins"
 PROGRAM = f"{ROOT}/build/windows/quendra.exe"
 FRAMES = f"{ROOT}/build/windows-frames"
 BOOK, DIALS = "/tmp/phone-book.ini", "/tmp/dials"
-# A line without a port to dial by, as where the kernel of the other edition has none, and one whose other side doesn't know the user.
+# A line without a port to dial by, as where the kernel of the other edition has none, and one whose other side doesn't
+# know the user.
 NO_PORT, REFUSED = b"*: 0 1 2 633\n", b"*: 0 1 2 3 4 5 691\n"
 OVERRIDES = "WINEDLLOVERRIDES=rasapi32=n;mscoree=;mshtml=;winemenubuilder.exe="
 # Products of three families that have a mail program, as the machine's list of installed products names them.
