@@ -67,7 +67,7 @@ class ActionsStep:
             wrong.append("the row of an ended process stays")
         if len(self.program.windows()) != before:
             wrong.append(f"a box says {self.program.texts(self.program.windows()[-1])}")
-        return status, wrong
+        return f"by signal {-status}", wrong
 
     def add_or_remove_programs(self):
         self.walk.click("main_cmdAddRemove")
@@ -78,11 +78,11 @@ class ActionsStep:
         self.select()
         self.walk.picture("selected")
         request, wrong = self.show_file()
-        status, lacks = self.end()
+        way, lacks = self.end()
         self.walk.picture("ended")
         lines = [
             f"file manager: {request}",
-            f"{self.victim.name}: ended by the button, by signal {-status}",
+            f"{self.victim.name}: ended by the button, {way}",
             f"software centre: {self.add_or_remove_programs()}",
         ]
         return lines, wrong + lacks

@@ -1,6 +1,5 @@
 """A user's hands and eyes: real clicks and keys on a program's window, and a picture after each step."""
 
-import subprocess
 import time
 
 import stage

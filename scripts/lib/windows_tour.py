@@ -51,7 +51,7 @@ LEAST = {"download": (0.1, 140), "backup": (45, 0.1), "chat": (0.3, 0.3)}
 KNOWN = {"quendra.exe": "Quendra", EDITOR: "", "explorer.exe": "Wine", "services.exe": ""}
 MAIL_TILES = [0, 1, 2, 4]
 NO_PORT = "633"
-SPECIAL = r"Z:\tmp"
+FOLDER = r"Z:\tmp"  # of the programs that are started, as Windows sees it
 
 
 def say(text):
@@ -96,7 +96,7 @@ class WineActions(actions.ActionsStep):
         self.press("main_lblJumpToPath")
         request = self.started("/select")
         self.shown("explorer.exe", "shown-file")
-        return request, [] if request.endswith(f"{SPECIAL}\\{self.victim.name}") else [f"the file is shown by {request!r}"]
+        return request, [] if request.endswith(f"{FOLDER}\\{self.victim.name}") else [f"the file is shown by {request!r}"]
 
     def end(self):
         self.press("main_lblEndProcess")
@@ -104,8 +104,8 @@ class WineActions(actions.ActionsStep):
         try:
             wait_for("the row to go", lambda: self.place() is None, 3)
         except RuntimeError:
-            return 0, ["the row of an ended process stays"]
-        return 0, []
+            return "its row stays", ["the row of an ended process stays"]
+        return "at once", []
 
     def add_or_remove_programs(self):
         self.walk.click("main_cmdAddRemove")

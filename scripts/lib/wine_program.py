@@ -3,7 +3,6 @@ what is spoken as its text. A reader in the bed asks them; see tests/standins/wi
 
 import contextlib
 import json
-import os
 import subprocess
 
 import seen
@@ -192,8 +191,3 @@ class Table:
     def description(self, row, column):
         text = self.told["rows"][row][column]
         return text if text in ICONS else ""
-
-
-def is_there():
-    """Whether what the tour needs of the build is there."""
-    return os.path.exists(READER)

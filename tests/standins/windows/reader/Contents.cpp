@@ -15,6 +15,8 @@ namespace {
 constexpr LRESULT kMostRows = 5000;
 constexpr LRESULT kMostColumns = 40;
 constexpr const char* kNoAnswer = "null";
+/// Milliseconds for a whole table: a program may hang between two cells.
+constexpr DWORD kPatience = 5000;
 
 /// How many of something there are; 0 without an answer.
 int Counted(HWND window, UINT message, LRESULT most) {
@@ -97,10 +99,12 @@ std::string TableIn(HWND window) {
   const auto count = Ask(window, LVM_GETITEMCOUNT);
   const ForeignMemory memory(window);
   if (!count || !memory.IsThere()) return kNoAnswer;
+  const DWORD begin = ::GetTickCount();
   int columns = 0;
   const std::string headers = HeadersIn(window, memory, columns);
   std::vector<std::string> rows;
   for (int row = 0; row < std::min(*count, kMostRows); ++row) {
+    if (::GetTickCount() - begin > kPatience) return kNoAnswer;
     std::vector<std::string> cells;
     for (int column = 0; column < columns; ++column)
       cells.push_back(Quoted(CellIn(window, memory, row, column)));

@@ -6,8 +6,7 @@
 //   table WINDOW    headers, rows and selection of a table
 //   items WINDOW    items of a list box or a combo box
 //
-// No answer takes longer than a program that hangs is waited for, two seconds a message. It ends with its
-// input.
+// A program that hangs is waited for two seconds a message, and five for a table. It ends with its input.
 
 #include "standins/windows/reader/Contents.h"
 #include "standins/windows/reader/WindowTree.h"
