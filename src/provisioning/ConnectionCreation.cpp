@@ -7,7 +7,7 @@ namespace quendra::provisioning {
 
 namespace {
 
-constexpr const char16_t* kEntry = u"097";
+constexpr const char16_t* kOwnEntry = u"097";
 constexpr const char16_t* kTemporaryEntry = u"tmp097";
 constexpr const char16_t* kRealm = u"@097";
 constexpr TextView kOtherRealm = u"@izelmar";
@@ -56,7 +56,7 @@ bool ConnectionCreation::WriteEntry() {
   const Modem* modem = FindModem(page_.SelectedModem);
   if (modem) Describe(*modem, record, dialParams);
   if (modem && modem->viaTemporaryEntry) return WriteByWayOfAnother(record, dialParams);
-  return phoneBook_.Set(kEntry, record, dialParams);
+  return phoneBook_.Set(kOwnEntry, record, dialParams);
 }
 
 void ConnectionCreation::Describe(const Modem& modem, RasEntryRecord& record,
@@ -76,12 +76,12 @@ void ConnectionCreation::Describe(const Modem& modem, RasEntryRecord& record,
 // entry stays.
 bool ConnectionCreation::WriteByWayOfAnother(const RasEntryRecord& record, RasDialParamsRecord& dialParams) {
   if (!phoneBook_.Set(kTemporaryEntry, record, dialParams)) return false;
-  phoneBook_.Delete(kEntry, kFalse16); // there may be none
+  phoneBook_.Delete(kOwnEntry, kFalse16); // there may be none
   RasEntryRecord made;
   if (!phoneBook_.Get(kTemporaryEntry, made)) return false;
   RasDialParamsRecord madeParams = phoneBook_.DialParamsOf(kTemporaryEntry);
   made.options = kOptionsOfCopiedEntry;
-  if (!phoneBook_.Set(kEntry, made, madeParams)) return false;
+  if (!phoneBook_.Set(kOwnEntry, made, madeParams)) return false;
   phoneBook_.Delete(kTemporaryEntry, kTrue16);
   dun_.HangUpAllConnections();
   return true;

@@ -122,15 +122,15 @@ void FirstConnectionPage::OfferHand(forms::Control& control) {
 
 void FirstConnectionPage::Design() {
   const forms::Geometry page = frame.Position;
-  looks::PageHead(frsCon_lblTitle, frsCon_lblBack, row.caption, page.width);
+  steps::PageHead(frsCon_lblTitle, frsCon_lblBack, row.caption, page.width);
   menu.Design(page.width);
   const forms::Geometry panel{Px(kPanelInset), Px(kPanelTop), page.width - 2 * Px(kPanelInset),
                               page.height - Px(kPanelTop + kPanelInset)};
   mail.Design(panel);
   connection.Design(panel);
-  looks::ErrorMark(frsCon_lblError[kUsernameMark], ConnectionPanel::kUsernameTop);
-  looks::ErrorMark(frsCon_lblError[kPasswordMark], ConnectionPanel::kPasswordTop);
-  looks::ErrorMark(frsCon_lblError[kEmailUNMark], MailPanel::kEmailUNTop);
+  steps::ErrorMark(frsCon_lblError[kUsernameMark], ConnectionPanel::kUsernameTop);
+  steps::ErrorMark(frsCon_lblError[kPasswordMark], ConnectionPanel::kPasswordTop);
+  steps::ErrorMark(frsCon_lblError[kEmailUNMark], MailPanel::kEmailUNTop);
   modems_.Selected = modems_.Hovered = mails_.Selected = mails_.Hovered = kNone;
 }
 

@@ -7,13 +7,13 @@ namespace quendra::diagnostics {
 
 namespace {
 
-struct Row {
+struct ErrorRow {
   CPULoad::Error error;
   const char16_t* text;
   const char16_t* source;
 };
 
-constexpr std::array<Row, 6> kErrors{{
+constexpr std::array<ErrorRow, 6> kErrors{{
     {CPULoad::kNoVersion, u"Can't get the Windows version", u"CPULoad.Initialize"},
     // The name in the source is not quite that of the operation; people look for it as it is.
     {CPULoad::kNoMonitoring, u"Unable to start performance monitoring", u"CPULoad.CollectCPRData()"},
@@ -28,7 +28,7 @@ constexpr std::array<Row, 6> kErrors{{
 } // namespace
 
 Fault CpuLoadFault(CPULoad::Error error) {
-  const auto& row = *std::ranges::find(kErrors, error, &Row::error);
+  const auto& row = *std::ranges::find(kErrors, error, &ErrorRow::error);
   return {static_cast<int>(error), row.text, row.source};
 }
 

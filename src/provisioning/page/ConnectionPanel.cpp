@@ -30,29 +30,29 @@ constexpr std::array<Modem, ConnectionPanel::kModems> kModemTable{{
 } // namespace
 
 void ConnectionPanel::Design(const forms::Geometry& place) {
-  looks::StepFrame(frsCon_Frame1, place);
-  looks::StepTitle(Title, u"פרטי החיבור");
-  looks::StepField(UsernamePrompt, u"שם משתמש:", frsCon_txtUsername, kUsernameTop);
-  looks::StepField(PasswordPrompt, u"סיסמה:", frsCon_txtPassword, kPasswordTop);
+  steps::StepFrame(frsCon_Frame1, place);
+  steps::StepTitle(Title, u"פרטי החיבור");
+  steps::StepField(UsernamePrompt, u"שם משתמש:", frsCon_txtUsername, kUsernameTop);
+  steps::StepField(PasswordPrompt, u"סיסמה:", frsCon_txtPassword, kPasswordTop);
   frsCon_txtPassword.Masked = true;
   DesignModems();
-  looks::StepButton(frsCon_Picture5, "create_connection", frsCon_cmdCreate, u"צור חיבור", place.height);
+  steps::StepButton(frsCon_Picture5, "create_connection", frsCon_cmdCreate, u"צור חיבור", place.height);
 }
 
 void ConnectionPanel::DesignModems() {
-  looks::ChoicePrompt(ModemsPrompt, u"בחר את המודם שלך:");
+  steps::ChoicePrompt(ModemsPrompt, u"בחר את המודם שלך:");
   int top = kRowsTop;
   for (std::size_t row = 0; row < kModems; ++row) {
     forms::Label& ground = frsCon_lblModemBG[row];
     ground.MouseOnly = true;
     ground.Transparent = true;
     ground.BackColour = forms::kWhite;
-    ground.Move(Px(looks::kChoiceLeft), Px(top), Px(kRowWidth), Px(kRowHeight));
+    ground.Move(Px(steps::kChoiceLeft), Px(top), Px(kRowWidth), Px(kRowHeight));
     frsCon_imgModems[row].Contents = forms::Picture::Artwork(kModemTable[row].artwork);
-    frsCon_imgModems[row].Move(Px(looks::kChoiceLeft + 8), Px(top + 4), Px(kPictureWidth),
+    frsCon_imgModems[row].Move(Px(steps::kChoiceLeft + 8), Px(top + 4), Px(kPictureWidth),
                                Px(kPictureHeight));
-    looks::PlainText(frsCon_lblModems[row], kModemTable[row].caption, {11, true, false}, looks::kForest);
-    frsCon_lblModems[row].Move(Px(looks::kChoiceLeft + kPictureWidth + 20), Px(top + 4),
+    steps::PlainText(frsCon_lblModems[row], kModemTable[row].caption, {11, true, false}, steps::kForest);
+    frsCon_lblModems[row].Move(Px(steps::kChoiceLeft + kPictureWidth + 20), Px(top + 4),
                                Px(kRowWidth - kPictureWidth - 28), Px(kRowHeight - 8));
     top += kRowHeight + kRowGap;
   }

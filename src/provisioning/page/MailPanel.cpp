@@ -36,25 +36,25 @@ constexpr std::array<MailProgram, MailPanel::kTiles> kPrograms{{
 } // namespace
 
 void MailPanel::Design(const forms::Geometry& place) {
-  looks::StepFrame(frsCon_Frame2, place);
-  looks::StepTitle(Title, u"פרטי הדואר");
-  looks::StepField(FullNamePrompt, u"שם מלא:", frsCon_txtFullName, 66);
-  looks::StepField(EmailUNPrompt, u"שם משתמש בדואר:", frsCon_txtEmailUN, kEmailUNTop);
+  steps::StepFrame(frsCon_Frame2, place);
+  steps::StepTitle(Title, u"פרטי הדואר");
+  steps::StepField(FullNamePrompt, u"שם מלא:", frsCon_txtFullName, 66);
+  steps::StepField(EmailUNPrompt, u"שם משתמש בדואר:", frsCon_txtEmailUN, kEmailUNTop);
   DesignTiles();
-  looks::StepButton(frsCon_Picture12, "create_mail", frsCon_cmdCreateEmail, u"צור חשבון דואר", place.height);
+  steps::StepButton(frsCon_Picture12, "create_mail", frsCon_cmdCreateEmail, u"צור חשבון דואר", place.height);
 }
 
 void MailPanel::DesignTiles() {
-  looks::ChoicePrompt(MailsPrompt, u"בחר את תוכנת הדואר שלך:");
+  steps::ChoicePrompt(MailsPrompt, u"בחר את תוכנת הדואר שלך:");
   Tiles.Caption = Text();
   Tiles.Border = false;
-  Tiles.BackColour = looks::kStepGround;
-  Tiles.Move(Px(looks::kChoiceLeft), Px(56), Px(524), Px(kTileHeight));
+  Tiles.BackColour = steps::kStepGround;
+  Tiles.Move(Px(steps::kChoiceLeft), Px(56), Px(524), Px(kTileHeight));
   for (std::size_t tile = 0; tile < kTiles; ++tile) DesignTile(tile);
 }
 
 void MailPanel::DesignTile(std::size_t tile) {
-  frsCon_lblMailsBG[tile].BackColour = looks::kStepGround;
+  frsCon_lblMailsBG[tile].BackColour = steps::kStepGround;
   frsCon_lblMailsBG[tile].Visible = false;
   frsCon_lblMailsBG[tile].Move(kFirstTileLeft, 0, Px(kTileWidth), Px(kTileHeight));
   frsCon_lblMailBG2[tile].Transparent = true;
@@ -63,7 +63,7 @@ void MailPanel::DesignTile(std::size_t tile) {
   frsCon_lblMailBG2[tile].Move(Px(kEdge), Px(kEdge), Px(kTileWidth - 2 * kEdge), Px(kTileHeight - 2 * kEdge));
   frsCon_imgMails[tile].Contents = forms::Picture::Artwork(kPrograms[tile].artwork);
   frsCon_imgMails[tile].Move(Px(kEdge), Px(kEdge), Px(kTileWidth - 2 * kEdge), Px(kPictureHeight));
-  looks::PlainText(frsCon_lblMails[tile], kPrograms[tile].caption, looks::kSmall, looks::kForest);
+  steps::PlainText(frsCon_lblMails[tile], kPrograms[tile].caption, steps::kSmall, steps::kForest);
   frsCon_lblMails[tile].WordWrap = true;
   frsCon_lblMails[tile].Align = forms::Alignment::Centre;
   frsCon_lblMails[tile].Move(Px(kEdge), Px(kEdge + kPictureHeight), Px(kTileWidth - 2 * kEdge),

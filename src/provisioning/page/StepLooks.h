@@ -3,7 +3,7 @@
 #include "foundation/Looks.h"
 
 /// What the two steps of the page look like alike.
-namespace quendra::provisioning::looks {
+namespace quendra::provisioning::steps {
 
 using namespace foundation::looks;
 using foundation::Px;
@@ -63,4 +63,4 @@ inline void StepButton(forms::PictureBox& plate, const char* artwork, forms::Com
   button.Move(Px(72), Px(13), Px(kPlateWidth - 86), Px(kPlateHeight - 26));
 }
 
-} // namespace quendra::provisioning::looks
+} // namespace quendra::provisioning::steps

@@ -13,9 +13,9 @@ const std::array<std::uint32_t, 4> kRasConnectionSizes{
 namespace {
 
 using Fields = RasConnectionFields;
-using Field = RecordField<Fields>;
+using ConnectionField = RecordField<Fields>;
 
-constexpr Field kFields[] = {
+constexpr ConnectionField kConnectionFields[] = {
     {&Fields::handle, Record::kHandle},
     {&Fields::entryName, Record::kEntryName, Record::kEntryNameBytes},
     {&Fields::deviceType, Record::kDeviceType, Record::kDeviceTypeBytes},
@@ -25,7 +25,7 @@ constexpr Field kFields[] = {
     {&Fields::guid, Record::kGuid},
 };
 
-Field PlacedIn(std::uint32_t bytes, Field field) {
+ConnectionField ConnectionFieldIn(std::uint32_t bytes, ConnectionField field) {
   if (bytes == Record::kBytesOfShortNames && field.at == Record::kEntryName)
     field.width = Record::kShortEntryNameBytes;
   return field;
@@ -36,8 +36,9 @@ Field PlacedIn(std::uint32_t bytes, Field field) {
 RasConnectionFields RasConnectionOf(std::span<const std::uint8_t> record) {
   const auto bytes = static_cast<std::uint32_t>(record.size());
   RasConnectionFields connection;
-  for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes)) TakeField(connection, field, record);
+  for (const ConnectionField& listed : kConnectionFields)
+    if (const ConnectionField field = ConnectionFieldIn(bytes, listed); field.IsIn(bytes))
+      TakeField(connection, field, record);
   return connection;
 }
 

@@ -13,7 +13,7 @@ namespace {
 
 using platform::RasDialParams;
 using Params = RasDialParamsRecord;
-using Field = RecordField<Params>;
+using DialParamsField = RecordField<Params>;
 
 constexpr std::size_t kPhoneNumber = RasDialParams::kEntryName + RasDialParams::kEntryNameBytes;
 constexpr std::size_t kCallbackNumber = kPhoneNumber + RasDialParams::kPhoneNumberBytes;
@@ -21,7 +21,7 @@ constexpr std::size_t kUserName = kCallbackNumber + RasDialParams::kCallbackNumb
 constexpr std::size_t kPassword = kUserName + RasDialParams::kUserNameBytes;
 constexpr std::size_t kDomain = kPassword + RasDialParams::kPasswordBytes;
 
-constexpr Field kFields[] = {
+constexpr DialParamsField kDialParamsFields[] = {
     {&Params::size, 0},
     {&Params::entryName, RasDialParams::kEntryName, RasDialParams::kEntryNameBytes},
     {&Params::phoneNumber, kPhoneNumber, RasDialParams::kPhoneNumberBytes},
@@ -34,7 +34,7 @@ constexpr Field kFields[] = {
 };
 
 /// The oldest record has a shorter entry name, and all behind it comes so much earlier.
-Field PlacedIn(std::uint32_t bytes, Field field) {
+DialParamsField DialParamsFieldIn(std::uint32_t bytes, DialParamsField field) {
   constexpr std::size_t kShorter = RasDialParams::kEntryNameBytes - RasDialParams::kShortEntryNameBytes;
   if (bytes != RasDialParams::kBytesOfShortNames) return field;
   if (field.at == RasDialParams::kEntryName) field.width -= kShorter;
@@ -52,8 +52,9 @@ std::vector<std::uint8_t> EmptyRasDialParams(std::uint32_t bytes, const Text& en
 
 void PutRasDialParams(const RasDialParamsRecord& record, std::span<std::uint8_t> image) {
   const auto bytes = static_cast<std::uint32_t>(image.size());
-  for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes)) PutField(record, field, image);
+  for (const DialParamsField& listed : kDialParamsFields)
+    if (const DialParamsField field = DialParamsFieldIn(bytes, listed); field.IsIn(bytes))
+      PutField(record, field, image);
   PutLittle32(image, 0, bytes);
 }
 
@@ -62,8 +63,9 @@ bool TakeRasDialParams(RasDialParamsRecord& record, std::span<const std::uint8_t
   const std::uint32_t bytes = Little32(image, 0);
   if (std::ranges::find(kRasDialParamsSizes, bytes) == kRasDialParamsSizes.end()) return false;
   if (image.size() < bytes) throw Fault(Fault::kSubscript);
-  for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(bytes, listed); field.IsIn(bytes)) TakeField(record, field, image);
+  for (const DialParamsField& listed : kDialParamsFields)
+    if (const DialParamsField field = DialParamsFieldIn(bytes, listed); field.IsIn(bytes))
+      TakeField(record, field, image);
   return true;
 }
 

@@ -9,7 +9,7 @@ namespace {
 
 using platform::RasEntry;
 using Entry = RasEntryRecord;
-using Field = RecordField<Entry>;
+using EntryField = RecordField<Entry>;
 
 constexpr std::size_t kPadType = RasEntry::kDeviceName + RasEntry::kDeviceNameBytes;
 constexpr std::size_t kX25Address = kPadType + RasEntry::kPadTypeBytes;
@@ -17,7 +17,7 @@ constexpr std::size_t kX25Facilities = kX25Address + RasEntry::kX25TextBytes;
 constexpr std::size_t kX25UserData = kX25Facilities + RasEntry::kX25TextBytes;
 constexpr std::size_t kChannels = kX25UserData + RasEntry::kChannelsFromUserData;
 
-constexpr Field kFields[] = {
+constexpr EntryField kEntryFields[] = {
     {&Entry::options, RasEntry::kOptions},
     {&Entry::countryId, RasEntry::kCountryId},
     {&Entry::countryCode, RasEntry::kCountryCode},
@@ -57,7 +57,7 @@ constexpr Field kFields[] = {
 };
 
 /// The oldest record has a shorter device name, and all behind it comes so much earlier.
-Field PlacedIn(std::uint32_t recordBytes, Field field) {
+EntryField EntryFieldIn(std::uint32_t recordBytes, EntryField field) {
   constexpr std::size_t kShorter = RasEntry::kDeviceNameBytes - RasEntry::kShortDeviceNameBytes;
   if (recordBytes != RasEntry::kBytesOfShortDeviceNames) return field;
   if (field.at == RasEntry::kDeviceName) field.width -= kShorter;
@@ -81,8 +81,8 @@ std::vector<std::uint8_t> RasEntryImageOf(const RasEntryRecord& record, std::uin
   const std::string alternates = ToCodePage(record.alternateNumbers);
   auto image = RecordBlock(std::uint64_t{recordBytes} + alternates.size() + 1);
   PutLittle32(image, 0, recordBytes);
-  for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(recordBytes, listed); field.IsIn(recordBytes))
+  for (const EntryField& listed : kEntryFields)
+    if (const EntryField field = EntryFieldIn(recordBytes, listed); field.IsIn(recordBytes))
       PutField(record, field, image);
   if (alternates.empty()) return image;
   PutLittle32(image, RasEntry::kAlternateOffset, recordBytes);
@@ -93,8 +93,9 @@ std::vector<std::uint8_t> RasEntryImageOf(const RasEntryRecord& record, std::uin
 void TakeRasEntryImage(RasEntryRecord& record, std::span<const std::uint8_t> image,
                        std::uint32_t recordBytes) {
   const std::size_t held = std::min<std::size_t>(recordBytes, image.size());
-  for (const Field& listed : kFields)
-    if (const Field field = PlacedIn(recordBytes, listed); field.IsIn(held)) TakeField(record, field, image);
+  for (const EntryField& listed : kEntryFields)
+    if (const EntryField field = EntryFieldIn(recordBytes, listed); field.IsIn(held))
+      TakeField(record, field, image);
   record.alternateNumbers = AlternatesIn(image);
 }
 

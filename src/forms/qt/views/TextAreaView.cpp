@@ -16,7 +16,7 @@
 namespace quendra::forms::qt {
 
 namespace {
-constexpr int kEdge = 3;
+constexpr int kAreaEdge = 3;
 }
 
 TextAreaView::TextAreaView(ViewContext& context, TextBox& box, QWidget* parent)
@@ -26,7 +26,7 @@ TextAreaView::TextAreaView(ViewContext& context, TextBox& box, QWidget* parent)
              [this] { textCursor().deletePreviousChar(); }}) {
   // Never drawn: the room of the field's edge and ring, inside of which the scroll bar stands.
   setFrameStyle(QFrame::Box | QFrame::Plain);
-  setLineWidth(kEdge);
+  setLineWidth(kAreaEdge);
   setTabChangesFocus(true);
   setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
   setViewportMargins(2, 0, 2, 0);

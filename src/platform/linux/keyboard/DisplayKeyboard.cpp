@@ -11,7 +11,6 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr std::uint16_t kCoreKeyboard = 0x100;
-constexpr std::uint32_t kGroupNames = 0x1000;
 
 using ReplyBytes = std::vector<std::uint8_t>;
 

@@ -8,7 +8,6 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr std::size_t kHead = 32;
-constexpr std::uint32_t kGroupNames = 0x1000;
 constexpr unsigned kMostGroups = 4;
 
 template <typename Field> std::optional<Field> FieldAt(DisplayReply reply, std::size_t at) {

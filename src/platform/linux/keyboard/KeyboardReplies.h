@@ -9,6 +9,9 @@
 /// a reply isn't read.
 namespace quendra::platform::linux_ {
 
+/// The names of groups alone, as "GetNames" is asked for them and says that it tells them.
+inline constexpr std::uint32_t kGroupNames = 0x1000;
+
 using DisplayReply = std::span<const std::uint8_t>;
 
 /// An answer's size as its head tells it; nothing is read beyond the head.

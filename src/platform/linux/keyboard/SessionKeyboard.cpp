@@ -7,9 +7,9 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr const char* kService = "org.kde.keyboard";
-constexpr const char* kLayouts = "org.kde.KeyboardLayouts";
-constexpr SessionBus::Method kGetLayout{kService, "/Layouts", kLayouts, "getLayout"};
-constexpr SessionBus::Method kGetLayoutsList{kService, "/Layouts", kLayouts, "getLayoutsList"};
+constexpr const char* kLayoutsInterface = "org.kde.KeyboardLayouts";
+constexpr SessionBus::Method kGetLayout{kService, "/Layouts", kLayoutsInterface, "getLayout"};
+constexpr SessionBus::Method kGetLayoutsList{kService, "/Layouts", kLayoutsInterface, "getLayoutsList"};
 
 /// The code of the layout with that index in a list of code, shown name and full name each.
 std::optional<std::string> CodeAt(const BusLibrary& library, void* list, std::uint32_t index) {

@@ -6,7 +6,6 @@ namespace quendra::platform::linux_ {
 
 namespace {
 
-constexpr std::uint32_t kFirstProcess = 1;
 constexpr int kMostGenerations = 16;
 // How many updates a process that opened sockets stays the first place to look for more.
 constexpr std::uint32_t kBusyUpdates = 8;

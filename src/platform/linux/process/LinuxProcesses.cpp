@@ -10,7 +10,6 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr ModuleHandle kExecutableModule{1};
-constexpr std::uint32_t kFirstProcess = 1;
 
 } // namespace
 

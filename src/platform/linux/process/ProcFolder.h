@@ -11,6 +11,9 @@
 
 namespace quendra::platform::linux_ {
 
+/// The process that the system starts first and that no other has started.
+inline constexpr std::uint32_t kFirstProcess = 1;
+
 /// What /proc tells of one process in its line of figures.
 struct ProcessStat {
   std::string comm;

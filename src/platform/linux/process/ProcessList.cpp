@@ -12,7 +12,6 @@ namespace quendra::platform::linux_ {
 namespace {
 
 constexpr std::uint64_t kSeriesMilliseconds = 5000;
-constexpr std::uint32_t kFirstProcess = 1;
 // No process has it: the kernel's own limit is far below.
 constexpr std::uint32_t kNoProcess = 0xFFFFFFFF;
 
