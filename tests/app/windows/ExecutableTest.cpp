@@ -14,8 +14,6 @@ namespace {
 
 using Bytes = std::vector<std::uint8_t>;
 
-Text ProgramFile() { return FolderOfBuild() + u"\\quendra.exe"; }
-
 Bytes ReadProgram() {
   std::ifstream file(ToCodePage(ProgramFile()), std::ios::binary);
   return {std::istreambuf_iterator<char>(file), {}};

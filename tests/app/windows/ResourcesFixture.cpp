@@ -5,8 +5,29 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdlib>
+#include <new>
 #include <ostream>
 #include <vector>
+
+namespace {
+
+int objectsOnHeap = 0; // there is one thread
+
+} // namespace
+
+// These take the place of the compiler's own in this executable.
+void* operator new(std::size_t size) {
+  void* const object = std::malloc(size ? size : 1);
+  if (!object) throw std::bad_alloc();
+  ++objectsOnHeap;
+  return object;
+}
+void operator delete(void* object) noexcept {
+  objectsOnHeap -= object != nullptr;
+  std::free(object);
+}
+void operator delete(void* object, std::size_t) noexcept { operator delete(object); }
 
 namespace quendra::app::windows {
 
@@ -85,11 +106,13 @@ int KilobytesOfHeaps() {
 
 } // namespace
 
-Resources Resources::Now() { return {DrawingObjects(), HighestOfNewIcons(), Handles(), KilobytesOfHeaps()}; }
+Resources Resources::Now() {
+  return {DrawingObjects(), HighestOfNewIcons(), Handles(), objectsOnHeap, KilobytesOfHeaps()};
+}
 
 std::ostream& operator<<(std::ostream& out, const Resources& held) {
   return out << held.drawing << " drawing objects, " << held.windows << " the highest window or icon, "
-             << held.handles << " handles, " << held.kilobytes << " KB";
+             << held.handles << " handles, " << held.objects << " objects, " << held.kilobytes << " KB";
 }
 
 } // namespace quendra::app::windows

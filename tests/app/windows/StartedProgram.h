@@ -9,6 +9,8 @@ namespace quendra::app::windows {
 
 /// Where the executables of this build lie.
 Text FolderOfBuild();
+/// The program as it is shipped.
+Text ProgramFile();
 /// Looks until the condition holds; false when it doesn't within ten seconds.
 bool Until(const std::function<bool()>& condition);
 

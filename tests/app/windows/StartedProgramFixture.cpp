@@ -50,6 +50,8 @@ Text FolderOfBuild() {
   return path.substr(0, path.rfind(u'\\'));
 }
 
+Text ProgramFile() { return FolderOfBuild() + u"\\quendra.exe"; }
+
 bool Until(const std::function<bool()>& condition) {
   const DWORD start = ::GetTickCount();
   while (!condition()) {
