@@ -42,16 +42,34 @@ $\r$\nבלעדיה מוצגים התהליכים והיציאות שלהם בל�
 !insertmacro MUI_UNPAGE_INSTFILES
 !insertmacro MUI_LANGUAGE "Hebrew"
 
-Function .onInit
-  ; One who runs the program must close it first: its file can't be written over.
+; One who runs the program must close it first: its file can't be written over or taken away. Status 2 says so to whoever
+; asked for silence.
+!macro RefuseWhileItRuns
   System::Call 'kernel32::OpenMutexW(i 0x100000, i 0, w "Local\QuendraRuns") p .r0'
   ${If} $0 P<> 0
     System::Call 'kernel32::CloseHandle(p r0)'
-    MessageBox MB_OK|MB_ICONEXCLAMATION|MB_RIGHT|MB_RTLREADING "יש לסגור את Quendra לפני ההתקנה." /SD IDOK
+    MessageBox MB_OK|MB_ICONEXCLAMATION|MB_RIGHT|MB_RTLREADING "יש לסגור את Quendra ולנסות שוב." /SD IDOK
     SetErrorLevel 2
     Quit
   ${EndIf}
+!macroend
+
+Function .onInit
+  !insertmacro RefuseWhileItRuns
 FunctionEnd
+
+Function un.onInit
+  !insertmacro RefuseWhileItRuns
+FunctionEnd
+
+; Status 3: a file or an entry of the registry can't be written, as for one who may not install programs.
+!macro RefuseAfterErrors
+  ${If} ${Errors}
+    MessageBox MB_OK|MB_ICONSTOP|MB_RIGHT|MB_RTLREADING "ההתקנה נכשלה: אין אפשרות לכתוב אל $INSTDIR או אל רישום המערכת." /SD IDOK
+    SetErrorLevel 3
+    Abort
+  ${EndIf}
+!macroend
 
 Section
   SetShellVarContext all
@@ -59,10 +77,7 @@ Section
   SetOverwrite try
   ClearErrors
   File "${PROGRAM}"
-  ${If} ${Errors}
-    SetErrorLevel 3
-    Abort
-  ${EndIf}
+  !insertmacro RefuseAfterErrors
   WriteUninstaller "$INSTDIR\remove.exe"
   CreateShortcut "$SMPROGRAMS\Quendra.lnk" "$INSTDIR\quendra.exe"
   WriteRegStr HKLM "Software\Quendra" "Folder" "$INSTDIR"
@@ -74,11 +89,18 @@ Section
   WriteRegStr HKLM "${REMOVAL}" "QuietUninstallString" '"$INSTDIR\remove.exe" /S'
   WriteRegDWORD HKLM "${REMOVAL}" "NoModify" 1
   WriteRegDWORD HKLM "${REMOVAL}" "NoRepair" 1
+  !insertmacro RefuseAfterErrors
 SectionEnd
 
 Section Uninstall
   SetShellVarContext all
+  ClearErrors
   Delete "$INSTDIR\quendra.exe"
+  ${If} ${Errors}
+    MessageBox MB_OK|MB_ICONSTOP|MB_RIGHT|MB_RTLREADING "ההסרה נכשלה: אין אפשרות למחוק מ-$INSTDIR." /SD IDOK
+    SetErrorLevel 3
+    Abort
+  ${EndIf}
   Delete "$INSTDIR\remove.exe"
   ; Only when nothing of anybody else lies in it.
   RMDir "$INSTDIR"
