@@ -103,6 +103,7 @@ std::optional<LRESULT> ListViewView::AnswerInner(UINT message, WPARAM wParam, LP
     PaintRows();
     return 0;
   case kTellRows: TellRows(); return 0;
+  case WM_NCCALCSIZE: return LeaveRoomForBar(wParam, lParam);
   case WM_KEYDOWN: TellRows(); return std::nullopt;
   case WM_NOTIFY: return ToldByHeader(*reinterpret_cast<const NMHDR*>(lParam));
   case WM_SIZE: {
@@ -132,6 +133,16 @@ std::optional<LRESULT> ListViewView::AnswerInner(UINT message, WPARAM wParam, LP
 
 // The window's own way would keep the thread to itself as long as the button is held, and give up the choice
 // in places without a row.
+// Not all systems find the side of the bar where a mirrored window stands in one that isn't.
+LRESULT ListViewView::LeaveRoomForBar(WPARAM wParam, LPARAM lParam) {
+  RECT& place = *reinterpret_cast<RECT*>(lParam); // which the longer record begins with
+  const RECT before = place;
+  const LRESULT answer = Inner().PassOn(WM_NCCALCSIZE, wParam, lParam);
+  if (ReadingDirection() == Direction::RightToLeft && place.left == before.left)
+    ::OffsetRect(&place, before.right - place.right, 0);
+  return answer;
+}
+
 LRESULT ListViewView::TakeMouse(UINT message, WPARAM /*wParam*/, LPARAM lParam) {
   if (message == WM_LBUTTONUP || message == WM_RBUTTONUP) {
     if (::GetCapture() == Inner().Window()) ::ReleaseCapture();

@@ -44,6 +44,7 @@ class ListViewView : public FieldView, public ListViewObserver {
   std::optional<LRESULT> ToldByHeader(const NMHDR& notice);
   void TellText(NMHDR& notice) const;
   int Search(const NMHDR& notice) const;
+  LRESULT LeaveRoomForBar(WPARAM wParam, LPARAM lParam);
   LRESULT TakeMouse(UINT message, WPARAM wParam, LPARAM lParam);
   void Choose(int row);
   /// The system's window hears of rows once for all changes of a handler: it counts and measures anew each

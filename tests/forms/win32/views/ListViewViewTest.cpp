@@ -49,6 +49,23 @@ class TableWindow : public ViewFixture {
   /// In the pixels of the system's window, whose own places count from the right.
   Spot MiddleOf(int row) { return {20, View().PlaceOfRow(row).corner.top + RowHeight() / 2}; }
 
+  RECT OnScreen() {
+    RECT window{};
+    ::GetWindowRect(Inner(list), &window);
+    return window;
+  }
+  /// Pixels between the window's left or right edge and what rows have.
+  LONG BarBeside(bool left) {
+    const RECT window = OnScreen();
+    RECT rows{};
+    ::GetClientRect(Inner(list), &rows);
+    ::MapWindowPoints(Inner(list), nullptr, reinterpret_cast<POINT*>(&rows), 2);
+    return left ? rows.left - window.left : window.right - rows.right;
+  }
+  static bool IsGround(Colour colour) {
+    return colour == RowGround(0, false) || colour == RowGround(1, false) || colour == RowGround(0, true);
+  }
+
   ImageList icons{form, u"icons"};
   ListView list{form, u"main_ListView1"};
 };
@@ -275,6 +292,41 @@ TEST_F(TableWindow, A_leading_cell_stands_at_the_right_edge_of_a_mirrored_form_a
   const auto isBlue = [](Colour pixel) { return (pixel & 0xFF) < 100 && pixel >> 16 > 150; };
   EXPECT_TRUE(isRed(PixelIn(Inner(list), right - 8 - 17, middle)));
   EXPECT_TRUE(isBlue(PixelIn(Inner(list), right - 8 - 3, middle)));
+}
+
+TEST_F(TableWindow, The_bar_of_many_rows_stands_at_the_left_of_a_mirrored_list_and_takes_the_mouse) {
+  for (const bool fromRight : {true, false}) {
+    form.RightToLeft = fromRight;
+    for (int i = list.Count(); i < 300; ++i) AddRow(DecimalText(1000 + i));
+    Show();
+    Settle();
+
+    EXPECT_GT(BarBeside(fromRight), 0) << fromRight;
+    EXPECT_EQ(BarBeside(!fromRight), 0) << fromRight;
+    const RECT window = OnScreen();
+    const LONG bar = fromRight ? window.left + 5 : window.right - 5;
+    EXPECT_EQ(Ask(WM_NCHITTEST, 0, MAKELPARAM(bar, window.top + 100)), HTVSCROLL) << fromRight;
+    desktop.Unload(form);
+  }
+}
+
+TEST_F(TableWindow, No_part_of_a_mirrored_list_stays_undrawn_whatever_rows_and_size_it_has) {
+  Show();
+  for (const int rows : {0, 300, 3, 300, 0})
+    for (const int width : {6000, 4500, 5250}) {
+      list.Clear();
+      list.Move(0, 0, width, 4500);
+      for (int i = 0; i < rows; ++i) AddRow(DecimalText(1000 + i));
+      Settle();
+      Ask(LVM_SCROLL, 0, 100 * RowHeight());
+
+      EXPECT_EQ(BarBeside(true) > 0, rows == 300) << rows;
+      EXPECT_EQ(BarBeside(false), 0) << rows;
+      const RECT window = OnScreen();
+      for (const LONG left : {window.right - window.left - 1, BarBeside(true)})
+        for (LONG top = HeaderHeight(); top < window.bottom - window.top; top += 5 * RowHeight())
+          EXPECT_TRUE(IsGround(PixelIn(Inner(list), left, top + 1))) << rows << " " << left << " " << top;
+    }
 }
 
 TEST_F(TableWindow, A_changed_cell_is_due_and_nothing_else) {
