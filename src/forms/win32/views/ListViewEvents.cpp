@@ -99,12 +99,12 @@ std::optional<LRESULT> ListViewView::AnswerInner(UINT message, WPARAM wParam, LP
   switch (message) {
   case WM_ERASEBKGND: return 1;
   case WM_PAINT:
-    TellRows();
+    Tell();
     PaintRows();
     return 0;
-  case kTellRows: TellRows(); return 0;
+  case kTell: Tell(); return 0;
   case WM_NCCALCSIZE: return LeaveRoomForBar(wParam, lParam);
-  case WM_KEYDOWN: TellRows(); return std::nullopt;
+  case WM_KEYDOWN: Tell(); return std::nullopt;
   case WM_NOTIFY: return ToldByHeader(*reinterpret_cast<const NMHDR*>(lParam));
   case WM_SIZE: {
     const LRESULT answer = Inner().PassOn(message, wParam, lParam);

@@ -21,9 +21,15 @@ class PlainPainting {
   PlainPainting& operator=(const PlainPainting&) = delete;
 
   const RECT& Due() const { return paint_.rcPaint; }
+  /// Whether any part of a place is due.
+  bool IsDue(Area place) const {
+    const RECT line{place.corner.left, place.corner.top, place.Right(), place.Bottom()};
+    return ::RectVisible(device_, &line) != 0;
+  }
   void Show(const Surface& surface, int top) const {
     ::SetViewportOrgEx(device_, 0, top, nullptr);
     surface.ShowOn(device_, {{}, surface.Size()});
+    ::SetViewportOrgEx(device_, 0, 0, nullptr);
   }
 
  private:
@@ -44,6 +50,7 @@ void ListViewView::PaintRows() {
   const int topRow = TopRow();
   const int from = std::max(0, static_cast<int>(painting.Due().top) - header) / height;
   for (int line = from; header + line * height < painting.Due().bottom; ++line) {
+    if (!painting.IsDue({{0, header + line * height}, place.extent})) continue;
     Drawing drawing(*canvas_, {}, place);
     painter_.PaintRow(drawing, topRow + line, place, cells);
     PaintRing(drawing, line * height);

@@ -6,6 +6,52 @@
 
 namespace quendra::forms::win32 {
 
+/// Looks at a part of a window again and again, while the window's own thread draws.
+class Watcher {
+ public:
+  Watcher(HWND window, Area part)
+      : window_(window), part_(part), seen_(part.extent),
+        thread_(::CreateThread(nullptr, 0, Run, this, 0, nullptr)) {}
+  ~Watcher() { End(); }
+  Watcher(const Watcher&) = delete;
+  Watcher& operator=(const Watcher&) = delete;
+
+  void End() {
+    if (!thread_) return;
+    ::InterlockedExchange(&over_, 1);
+    ::WaitForSingleObject(thread_, INFINITE);
+    ::CloseHandle(std::exchange(thread_, nullptr));
+  }
+  int Looks() const { return looks_; }
+  /// How often it had one colour.
+  int Blanks() const { return blanks_; }
+
+ private:
+  static DWORD WINAPI Run(void* watcher) noexcept {
+    auto& self = *static_cast<Watcher*>(watcher);
+    while (!self.over_) self.Look();
+    return 0;
+  }
+  void Look() {
+    const HDC device = ::GetDC(window_);
+    ::SetLayout(device, 0);
+    const auto [width, height] = part_.extent;
+    ::BitBlt(seen_.Dc(), 0, 0, width, height, device, part_.corner.left, part_.corner.top, SRCCOPY);
+    ::ReleaseDC(window_, device);
+    const auto pixels = seen_.Pixels();
+    ++looks_;
+    if (std::equal(pixels.begin() + 1, pixels.end(), pixels.begin())) ++blanks_;
+  }
+
+  HWND window_;
+  Area part_;
+  Surface seen_;
+  LONG volatile over_ = 0;
+  int looks_ = 0;
+  int blanks_ = 0;
+  HANDLE thread_;
+};
+
 class TableWindow : public ViewFixture {
  protected:
   TableWindow() {
@@ -49,6 +95,20 @@ class TableWindow : public ViewFixture {
   /// In the pixels of the system's window, whose own places count from the right.
   Spot MiddleOf(int row) { return {20, View().PlaceOfRow(row).corner.top + RowHeight() / 2}; }
 
+  /// Handles what the view has posted to the system's window, and nothing else.
+  void TellDue() {
+    MSG message{};
+    while (::PeekMessageW(&message, Inner(list), WM_APP, 0xBFFF, PM_REMOVE)) ::DispatchMessageW(&message);
+  }
+  /// Of the columns that are 100 pixels wide, counted from the right as the system's window does.
+  bool IsDue(int row, int cell) {
+    const HRGN region = ::CreateRectRgn(0, 0, 0, 0);
+    ::GetUpdateRgn(Inner(list), region, FALSE);
+    const int middle = View().PlaceOfRow(row).corner.top + RowHeight() / 2;
+    const bool due = ::PtInRegion(region, 100 * cell + 50, middle) != 0;
+    ::DeleteObject(region);
+    return due;
+  }
   RECT OnScreen() {
     RECT window{};
     ::GetWindowRect(Inner(list), &window);
@@ -335,6 +395,7 @@ TEST_F(TableWindow, A_changed_cell_is_due_and_nothing_else) {
   ::UpdateWindow(Inner(list));
 
   list.Row(3).SetCellText(1, u".443.");
+  TellDue();
 
   RECT due{};
   EXPECT_TRUE(::GetUpdateRect(Inner(list), &due, FALSE));
@@ -350,9 +411,46 @@ TEST_F(TableWindow, A_row_of_5000_that_changes_out_of_sight_is_not_drawn) {
   ::UpdateWindow(Inner(list));
 
   list.Row(4900).SetCellText(1, u".443.");
+  TellDue();
 
   RECT due{};
   EXPECT_FALSE(::GetUpdateRect(Inner(list), &due, FALSE));
+}
+
+TEST_F(TableWindow, Hundreds_of_changes_of_a_handler_are_due_at_once_with_those_in_sight_alone) {
+  Show();
+  for (int i = 0; i < 300; ++i) AddRow(DecimalText(i));
+  Settle();
+  ::UpdateWindow(Inner(list));
+
+  for (int row = 3; row <= 300; row += 2) list.Row(row).SetCellText(1, u".443.");
+  EXPECT_FALSE(::GetUpdateRect(Inner(list), nullptr, FALSE));
+  TellDue();
+
+  EXPECT_FALSE(IsDue(0, 1));
+  EXPECT_FALSE(IsDue(1, 1));
+  EXPECT_TRUE(IsDue(2, 1));
+  EXPECT_FALSE(IsDue(2, 0));
+  EXPECT_FALSE(IsDue(3, 1));
+  EXPECT_TRUE(IsDue(4, 1));
+}
+
+TEST_F(TableWindow, No_row_turns_blank_while_all_are_drawn_anew) {
+  Show();
+  for (int i = 0; i < 300; ++i) AddRow(DecimalText(1000 + i));
+  Settle();
+  ::UpdateWindow(Inner(list));
+
+  Watcher watcher(Inner(list), View().PlaceOfRow(3));
+  for (int pass = 0; pass < 60; ++pass) {
+    for (int row = 1; row <= 300; ++row) list.Row(row).SetCellText(1, DecimalText(1000 + pass));
+    TellDue();
+    ::RedrawWindow(Inner(list), nullptr, nullptr, RDW_ERASE | RDW_INVALIDATE | RDW_UPDATENOW);
+  }
+  watcher.End();
+
+  EXPECT_GT(watcher.Looks(), 60);
+  EXPECT_EQ(watcher.Blanks(), 0);
 }
 
 TEST_F(TableWindow, Texts_are_read_without_harmful_signs_and_an_icon_alone_by_its_key) {
