@@ -9,30 +9,45 @@
 
 namespace quendra::forms::win32 {
 
+// The system lays out its header anew with each column that goes or comes, and a page sets up the same ones
+// again whenever it opens: those that are there stay.
 void ListColumns::SetUp(const ListView& list, const Scale& scale) {
   sizedByHand_ = false;
-  while (window_.Send(LVM_DELETECOLUMN, 0)) {
+  std::vector<Text> names;
+  for (const ColumnHeader& column : list.Columns()) names.push_back(AccessibleNameOf(column));
+  while (names_.size() > names.size()) {
+    names_.pop_back();
+    window_.Send(LVM_DELETECOLUMN, names_.size());
   }
-  int number = 0;
-  for (const ColumnHeader& column : list.Columns()) {
-    // Drawn by us; this is what assistive technology reads.
-    Text name = AccessibleNameOf(column);
-    LVCOLUMNW made{};
-    made.mask = LVCF_TEXT | LVCF_SUBITEM;
-    made.pszText = reinterpret_cast<wchar_t*>(name.data());
-    made.iSubItem = number;
-    window_.Send(LVM_INSERTCOLUMNW, static_cast<WPARAM>(number), reinterpret_cast<LPARAM>(&made));
-    ++number;
-  }
+  const std::vector<int> widths = Widths(list, scale);
+  for (std::size_t number = 0; number < names.size(); ++number) Put(number, names[number], widths[number]);
   Fit(list, scale);
+}
+
+std::vector<int> ListColumns::Widths(const ListView& list, const Scale& scale) const {
+  std::vector<int> told;
+  for (const ColumnHeader& column : list.Columns()) told.push_back(scale.PixelsX(column.width));
+  return ColumnWidths(told, window_.Inside().width);
+}
+
+// Drawn by us; this is what assistive technology reads.
+void ListColumns::Put(std::size_t number, const Text& name, int width) {
+  const bool isThere = number < names_.size();
+  if (isThere && names_[number] == name) return;
+  LVCOLUMNW column{};
+  column.mask = LVCF_TEXT | LVCF_SUBITEM | (isThere ? 0U : LVCF_WIDTH);
+  column.cx = width;
+  column.pszText = const_cast<wchar_t*>(winapi::Wide(name));
+  column.iSubItem = static_cast<int>(number);
+  window_.Send(isThere ? LVM_SETCOLUMNW : LVM_INSERTCOLUMNW, number, reinterpret_cast<LPARAM>(&column));
+  if (!isThere) names_.emplace_back();
+  names_[number] = name;
 }
 
 void ListColumns::Fit(const ListView& list, const Scale& scale) {
   if (sizedByHand_ || std::exchange(fitting_, true)) return;
-  std::vector<int> told;
-  for (const ColumnHeader& column : list.Columns()) told.push_back(scale.PixelsX(column.width));
   int number = 0;
-  for (const int width : ColumnWidths(told, window_.Inside().width)) {
+  for (const int width : Widths(list, scale)) {
     if (width != WidthOf(number))
       window_.Send(LVM_SETCOLUMNWIDTH, static_cast<WPARAM>(number), MAKELPARAM(width, 0));
     ++number;

@@ -108,7 +108,7 @@ std::optional<LRESULT> ListViewView::AnswerInner(UINT message, WPARAM wParam, LP
   case WM_NOTIFY: return ToldByHeader(*reinterpret_cast<const NMHDR*>(lParam));
   case WM_SIZE: {
     const LRESULT answer = Inner().PassOn(message, wParam, lParam);
-    columns_->Fit(List(), Context().scale);
+    FitColumns();
     FitRows();
     Inner().Redraw();
     return answer;
@@ -181,7 +181,10 @@ std::optional<LRESULT> ListViewView::AnswerHeader(UINT message, WPARAM wParam, L
   if (!TheControl()) return std::nullopt;
   switch (message) {
   case WM_ERASEBKGND: return 1;
-  case WM_PAINT: PaintHeaders(); return 0;
+  case WM_PAINT:
+    Tell();
+    PaintHeaders();
+    return 0;
   case HDM_LAYOUT: {
     const LRESULT answer = header_->PassOn(message, wParam, lParam);
     const auto& layout = *reinterpret_cast<const HDLAYOUT*>(lParam);

@@ -58,8 +58,11 @@ void ListViewView::Paint(Drawing& drawing) {
 
 void ListViewView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Font)) SetRowHeight();
-  if (aspect == Aspect::All) ColumnsChanged();
-  if (aspect == Aspect::Geometry) columns_->Fit(List(), Context().scale);
+  if (aspect == Aspect::All) {
+    ColumnsChanged();
+    RowsDue(0);
+  }
+  if (aspect == Aspect::Geometry) FitColumns();
   if (aspect == Aspect::Font) FitRows();
   if (aspect == Aspect::Selection) ShowSelection();
 }
@@ -92,6 +95,7 @@ void ListViewView::RowsDue(int from) {
 
 void ListViewView::Tell() {
   if (!TheControl() || !telling_) return;
+  if (std::exchange(columnsDue_, false)) TellColumns();
   if (std::exchange(rowsDue_, false)) TellRows();
   RedrawDue();
   telling_ = false;
@@ -123,12 +127,19 @@ void ListViewView::RowsMoved() {
 }
 
 void ListViewView::ColumnsChanged() {
+  columnsDue_ = true;
+  Due();
+}
+
+void ListViewView::TellColumns() {
   Quietly([this] { columns_->SetUp(List(), Context().scale); });
-  rowsDue_ = false;
-  TellRows();
   FitRows();
   Inner().Redraw();
   header_->Redraw();
+}
+
+void ListViewView::FitColumns() {
+  if (!columnsDue_) columns_->Fit(List(), Context().scale);
 }
 
 void ListViewView::ShowSelection() {

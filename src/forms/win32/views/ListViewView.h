@@ -53,6 +53,8 @@ class ListViewView : public FieldView, public ListViewObserver {
   void Due();
   void RowsDue(int from);
   void Tell();
+  void TellColumns();
+  void FitColumns();
   void TellRows();
   void RedrawDue();
   RowsInSight InSight() const;
@@ -72,6 +74,7 @@ class ListViewView : public FieldView, public ListViewObserver {
   bool quiet_ = false;
   bool fittingRows_ = false;
   DueCells due_;
+  bool columnsDue_ = false;
   bool rowsDue_ = false; ///< the system's window has not heard of all rows
   bool telling_ = false; ///< it is about to hear of what is due
   int told_ = 0;         ///< how many rows the system's window has heard of

@@ -93,6 +93,7 @@ void WindowView::Release() {
 }
 
 void WindowView::ControlGone() {
+  ForgetPlace();
   context_.mouse.Forget(*this);
   control_ = nullptr;
 }
@@ -107,7 +108,7 @@ void WindowView::Changed(Aspect aspect) {
   Apply(aspect);
   if (Concerns(aspect, Aspect::Caption)) TellName();
   if (Concerns(aspect, Aspect::Visible)) Show();
-  if (aspect != Aspect::Tag && aspect != Aspect::Visible) Invalidate();
+  if (aspect != Aspect::Tag) Invalidate();
 }
 
 void WindowView::ShareFont() const {
@@ -135,9 +136,11 @@ void WindowView::PutInPlace() { MoveTo(Place()); }
 void WindowView::MoveTo(const Area& place) {
   if (place == windowPlace_) return;
   windowPlace_ = place;
+  ForgetPlace();
   // What it showed at its old place lets other things shine through.
   ::SetWindowPos(window_, nullptr, place.corner.left, place.corner.top, place.extent.width,
                  place.extent.height, SWP_NOZORDER | SWP_NOACTIVATE | SWP_NOCOPYBITS);
+  ForgetPlace();
 }
 
 void WindowView::Show() {
@@ -146,17 +149,30 @@ void WindowView::Show() {
   ::ShowWindow(window_, control_->Visible() ? SW_SHOWNA : SW_HIDE);
 }
 
-void WindowView::Invalidate() const {
+std::optional<Area> WindowView::ForgetPlace() const {
   const WindowView* const form =
       control_ ? dynamic_cast<const WindowView*>(control_->OwnerForm().View()) : nullptr;
-  if (!form || !::IsWindowVisible(window_)) return;
-  RECT place{};
-  ::GetWindowRect(window_, &place);
-  ::MapWindowPoints(nullptr, form->Body(), reinterpret_cast<POINT*>(&place), 2);
-  ::RedrawWindow(form->Body(), &place, nullptr, RDW_INVALIDATE | RDW_ALLCHILDREN | RDW_NOERASE);
+  if (!form) return std::nullopt;
+  RECT window{};
+  ::GetWindowRect(window_, &window);
+  ::MapWindowPoints(nullptr, form->Body(), reinterpret_cast<POINT*>(&window), 2);
+  const Area place{
+      {static_cast<int>(window.left), static_cast<int>(window.top)},
+      {static_cast<int>(window.right - window.left), static_cast<int>(window.bottom - window.top)}};
+  context_.state.picture.Forget(place);
+  return place;
+}
+
+void WindowView::Invalidate() const {
+  const auto place = ForgetPlace();
+  if (!place || !::IsWindowVisible(window_)) return;
+  const RECT due{place->corner.left, place->corner.top, place->Right(), place->Bottom()};
+  const auto* form = static_cast<const WindowView*>(control_->OwnerForm().View());
+  ::RedrawWindow(form->Body(), &due, nullptr, RDW_INVALIDATE | RDW_ALLCHILDREN | RDW_NOERASE);
 }
 
 void WindowView::Repaint() {
+  ForgetPlace();
   ::RedrawWindow(window_, nullptr, nullptr, RDW_INVALIDATE | RDW_ALLCHILDREN | RDW_NOERASE | RDW_UPDATENOW);
 }
 

@@ -118,6 +118,8 @@ class WindowView : public View {
   std::optional<LRESULT> AnswerCommonly(UINT message, WPARAM wParam, LPARAM lParam);
   std::optional<LRESULT> AnswerAsOwn(UINT message);
   std::optional<LRESULT> ShowCursorAt(WPARAM wParam, LPARAM lParam) const;
+  /// What the form's picture shows where the window stands has changed. Gives that place, none without form.
+  std::optional<Area> ForgetPlace() const;
   /// The window goes.
   LRESULT Forget(WPARAM wParam, LPARAM lParam);
   void ShareFont() const;
