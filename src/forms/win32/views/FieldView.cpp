@@ -30,8 +30,7 @@ void FieldView::Paint(Drawing& drawing) {
   const FieldState state = State();
   const FieldFace face = FaceOf(state);
   drawing.RoundRect(whole, face.corner, face.fill, face.border);
-  for (const Ring& ring : RingsOf(state))
-    drawing.Stroke(RoundBox::Of(whole, ring.corner, ring.inset), ring.colour, ring.width);
+  drawing.Rings(whole, RingsOf(state));
 }
 
 std::optional<LRESULT> FieldView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
