@@ -110,6 +110,46 @@ TEST_F(FieldWindows, Everything_is_selected_by_one_key) {
   EXPECT_EQ(line.SelLength(), 4);
 }
 
+TEST_F(FieldWindows, Ctrl_and_the_backspace_delete_a_word_and_the_handler_may_refuse_it) {
+  line.Value = u"www.one.test";
+  Show();
+  line.SelStart = 12;
+
+  Key(kBackspaceKey, kCtrl);
+  EXPECT_EQ(line.Value(), u"www.one.");
+  EXPECT_EQ(line.SelStart(), 8);
+
+  std::vector<int> pressed;
+  line.KeyPress = [&](int& keyCode) {
+    pressed.push_back(keyCode);
+    keyCode = 0;
+  };
+  Key(kBackspaceKey, kCtrl);
+  EXPECT_EQ(line.Value(), u"www.one.");
+  EXPECT_EQ(pressed, std::vector<int>{kBackspaceKey});
+
+  line.KeyPress = nullptr;
+  line.SelStart = 1;
+  line.SelLength = 2;
+  Key(kBackspaceKey, kCtrl);
+  EXPECT_EQ(line.Value(), u"w.one.");
+
+  line.ReadOnly = true;
+  Key(kBackspaceKey, kCtrl);
+  EXPECT_EQ(line.Value(), u"w.one.");
+}
+
+TEST_F(FieldWindows, Ctrl_and_the_backspace_tell_nothing_of_the_words_of_a_masked_text) {
+  line.Masked = true;
+  line.Value = u"two words";
+  Show();
+  line.SelStart = 9;
+
+  Key(kBackspaceKey, kCtrl);
+
+  EXPECT_EQ(line.Value(), u"");
+}
+
 TEST_F(FieldWindows, A_masked_field_keeps_its_text_to_itself_until_it_is_shown) {
   line.Masked = true;
   line.Value = u"secret";
