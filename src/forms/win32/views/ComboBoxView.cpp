@@ -201,6 +201,12 @@ std::optional<LRESULT> ComboBoxView::AnswerEdit(UINT message, WPARAM wParam, LPA
   return field_ ? field_->Answer(message, wParam, lParam) : std::nullopt;
 }
 
+Text ComboBoxView::TipAt(HWND window, Spot /*place*/) const {
+  if (field_ || window != Inner().Window()) return {};
+  const Text shown = VisibleText(Combo().SelectedText());
+  return MeasureText(shown, Letters()).width > TextRoom(Inner().Inside()).extent.width ? shown : Text();
+}
+
 KeyUse ComboBoxView::Use(const KeyPress& /*key*/) { return IsDropped() ? KeyUse::Window : KeyUse::Free; }
 
 void ComboBoxView::Notified(int code) {

@@ -11,6 +11,7 @@ class ComboBoxView : public FieldView {
   ComboBoxView(ViewContext& context, ComboBox& combo, HWND parent);
   void ControlGone() override;
   KeyUse Use(const KeyPress& key) override;
+  Text TipAt(HWND window, Spot place) const override;
 
  protected:
   std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;

@@ -66,7 +66,9 @@ bool InnerWindow::IsTaken(UINT message, WPARAM wParam, LPARAM lParam) const {
 
 LRESULT InnerWindow::Handle(UINT message, WPARAM wParam, LPARAM lParam) {
   const WindowView::Work work(view_);
-  if (IsTaken(message, wParam, lParam)) return 0;
+  const bool taken = IsTaken(message, wParam, lParam);
+  view_.HearForTip(window_, message, lParam);
+  if (taken) return 0;
   if (const auto answer = hear_(message, wParam, lParam)) return *answer;
   return PassOn(message, wParam, lParam);
 }

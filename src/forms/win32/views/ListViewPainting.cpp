@@ -38,6 +38,13 @@ class PlainPainting {
   HDC device_;
 };
 
+LONG LeftOnScreen(HWND window) {
+  RECT inside{};
+  ::GetClientRect(window, &inside);
+  ::MapWindowPoints(window, nullptr, reinterpret_cast<POINT*>(&inside), 2);
+  return inside.left;
+}
+
 } // namespace
 
 void ListViewView::PaintRows() {
@@ -56,6 +63,24 @@ void ListViewView::PaintRows() {
     PaintRing(drawing, line * height);
     painting.Show(*canvas_, header + line * height);
   }
+}
+
+Text ListViewView::TipAt(HWND window, Spot place) const {
+  const int count = static_cast<int>(List().Columns().size());
+  const auto cells = columns_->CellsOf(count, painter_.RowHeight(), ReadingDirection());
+  const bool ofHeader = window == Header();
+  // The header's window is moved with what is scrolled.
+  if (ofHeader) place.left += static_cast<int>(LeftOnScreen(window) - LeftOnScreen(Inner().Window()));
+  const int row = TopRow() + (place.top - painter_.HeaderHeight()) / painter_.RowHeight();
+  for (int column = 0; column < count; ++column) {
+    const Area& cell = cells[static_cast<std::size_t>(column)];
+    if (place.left < cell.corner.left || place.left >= cell.Right()) continue;
+    if (ofHeader) return painter_.CutText(List().Columns()[static_cast<std::size_t>(column)], cell);
+    if (place.top < painter_.HeaderHeight() || row >= List().Count()) return {};
+    const ListRow& shown = List().Row(row + 1);
+    return column <= shown.CellCount() ? painter_.CutText(shown, column, cell) : Text();
+  }
+  return {};
 }
 
 /// The part of the ring round all rows that lies `top` pixels below the first.

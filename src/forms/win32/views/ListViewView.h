@@ -13,6 +13,7 @@ class ListViewView : public FieldView, public ListViewObserver {
  public:
   ListViewView(ViewContext& context, ListView& list, HWND parent);
   void Paint(Drawing& drawing) override;
+  Text TipAt(HWND window, Spot place) const override;
   void Release() override;
   void ControlGone() override;
 

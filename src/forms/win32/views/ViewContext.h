@@ -8,6 +8,7 @@
 #include "forms/win32/drawing/Fonts.h"
 #include "forms/win32/drawing/FormPicture.h"
 #include "forms/win32/drawing/PictureStore.h"
+#include "forms/win32/views/HoverTip.h"
 
 #include <cstdint>
 
@@ -24,6 +25,7 @@ struct FormState {
   /// Made so far; each gets a number of its own.
   std::uintptr_t windows = 0;
   FormPicture picture{};
+  HoverTip tip{};
 };
 
 /// What every view of a desktop needs of it.

@@ -224,9 +224,18 @@ LRESULT WindowView::Handle(UINT message, WPARAM wParam, LPARAM lParam) {
   return PassOn(message, wParam, lParam);
 }
 
+void WindowView::HearForTip(HWND window, UINT message, LPARAM lParam) const {
+  const bool asks = message == WM_MOUSEMOVE || message == WM_MOUSEHOVER;
+  const bool ofMouse = message >= WM_MOUSEFIRST && message <= WM_MOUSELAST;
+  if (!control_ || !(asks || ofMouse || message == WM_MOUSELEAVE)) return;
+  context_.state.tip.Hear(window, message, asks ? TipAt(window, PlainPlace(window, lParam)) : Text());
+}
+
 std::optional<LRESULT> WindowView::AnswerCommonly(UINT message, WPARAM wParam, LPARAM lParam) {
   if (message == WM_NCDESTROY) return Forget(wParam, lParam);
-  if (context_.mouse.Takes(*this, message, wParam, lParam)) return 0;
+  const bool taken = context_.mouse.Takes(*this, message, wParam, lParam);
+  HearForTip(window_, message, lParam);
+  if (taken) return 0;
   switch (message) {
   case WM_SETFOCUS:
     Invalidate();
