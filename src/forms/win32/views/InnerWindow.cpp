@@ -8,10 +8,10 @@
 namespace quendra::forms::win32 {
 
 InnerWindow::InnerWindow(WindowView& view, const wchar_t* windowClass, DWORD style, DWORD extendedStyle,
-                         Hearer hear)
-    : view_(view), window_(::CreateWindowExW(extendedStyle, windowClass, L"",
-                                             style | WS_CHILD | WS_VISIBLE | WS_CLIPSIBLINGS, 0, 0, 0, 0,
-                                             view.Window(), nullptr, ::GetModuleHandleW(nullptr), nullptr)),
+                         Hearer hear, HWND parent)
+    : view_(view), window_(::CreateWindowExW(
+                       extendedStyle, windowClass, L"", style | WS_CHILD | WS_VISIBLE | WS_CLIPSIBLINGS, 0, 0,
+                       0, 0, parent ? parent : view.Window(), nullptr, ::GetModuleHandleW(nullptr), nullptr)),
       hear_(std::move(hear)) {
   Join();
 }

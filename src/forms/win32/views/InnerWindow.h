@@ -13,8 +13,9 @@ class InnerWindow {
   /// None lets the class's own procedure answer.
   using Hearer = std::function<std::optional<LRESULT>(UINT message, WPARAM wParam, LPARAM lParam)>;
 
-  /// Makes a window that fills nothing yet.
-  InnerWindow(WindowView& view, const wchar_t* windowClass, DWORD style, DWORD extendedStyle, Hearer hear);
+  /// Makes a window that fills nothing yet, in the view's own or in another one inside it.
+  InnerWindow(WindowView& view, const wchar_t* windowClass, DWORD style, DWORD extendedStyle, Hearer hear,
+              HWND parent = nullptr);
   /// Takes one that a window of the system has made.
   InnerWindow(WindowView& view, HWND window, Hearer hear);
   ~InnerWindow();
