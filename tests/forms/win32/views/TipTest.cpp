@@ -1,5 +1,5 @@
-#include "forms/win32/views/ListViewView.h"
 #include "forms/win32/views/ViewFixture.h"
+#include "forms/win32/views/list/ListViewView.h"
 
 namespace quendra::forms::win32 {
 

@@ -1,4 +1,4 @@
-#include "forms/win32/views/ListColumns.h"
+#include "forms/win32/views/list/ListColumns.h"
 
 #include "forms/view/Accessible.h"
 #include "forms/view/ListLayout.h"

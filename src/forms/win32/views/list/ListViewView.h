@@ -1,9 +1,9 @@
 #pragma once
 
-#include "forms/win32/views/DueCells.h"
 #include "forms/win32/views/FieldView.h"
-#include "forms/win32/views/ListColumns.h"
-#include "forms/win32/views/ListPainter.h"
+#include "forms/win32/views/list/DueCells.h"
+#include "forms/win32/views/list/ListColumns.h"
+#include "forms/win32/views/list/ListPainter.h"
 
 namespace quendra::forms::win32 {
 

@@ -1,4 +1,4 @@
-#include "forms/win32/views/ListPainter.h"
+#include "forms/win32/views/list/ListPainter.h"
 
 #include "forms/view/Palette.h"
 #include "forms/view/VisibleText.h"

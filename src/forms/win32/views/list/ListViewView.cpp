@@ -1,4 +1,4 @@
-#include "forms/win32/views/ListViewView.h"
+#include "forms/win32/views/list/ListViewView.h"
 
 #include "forms/view/Accessible.h"
 #include "forms/view/Keyboard.h"

@@ -1,5 +1,5 @@
 #include "forms/view/Palette.h"
-#include "forms/win32/views/ListViewView.h"
+#include "forms/win32/views/list/ListViewView.h"
 
 #include <algorithm>
 

@@ -2,7 +2,7 @@
 #include "forms/view/Keyboard.h"
 #include "forms/view/VisibleText.h"
 #include "forms/win32/input/MouseInput.h"
-#include "forms/win32/views/ListViewView.h"
+#include "forms/win32/views/list/ListViewView.h"
 
 #include <commctrl.h>
 

@@ -1,4 +1,4 @@
-#include "forms/win32/views/DueCells.h"
+#include "forms/win32/views/list/DueCells.h"
 
 #include <gtest/gtest.h>
 
