@@ -41,9 +41,8 @@ void ComboBoxView::MakeEdit() {
   held_ = reading_;
   const DWORD side = held_ == Direction::RightToLeft ? WS_EX_RTLREADING | WS_EX_RIGHT : 0;
   auto made = std::make_unique<InnerWindow>(
-      *this, L"EDIT", ES_AUTOHSCROLL, side,
-      [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerEdit(message, wParam, lParam); },
-      Inner().Window());
+      *this, InnerWindow::Kind{L"EDIT", ES_AUTOHSCROLL, side, Inner().Window()},
+      [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerEdit(message, wParam, lParam); });
   const HWND before = edit_ ? edit_->Window() : nullptr;
   if (before && edit_->HasFocus()) ::SetFocus(made->Window());
   edit_ = std::move(made);

@@ -7,11 +7,11 @@
 
 namespace quendra::forms::win32 {
 
-InnerWindow::InnerWindow(WindowView& view, const wchar_t* windowClass, DWORD style, DWORD extendedStyle,
-                         Hearer hear, HWND parent)
-    : view_(view), window_(::CreateWindowExW(
-                       extendedStyle, windowClass, L"", style | WS_CHILD | WS_VISIBLE | WS_CLIPSIBLINGS, 0, 0,
-                       0, 0, parent ? parent : view.Window(), nullptr, ::GetModuleHandleW(nullptr), nullptr)),
+InnerWindow::InnerWindow(WindowView& view, const Kind& kind, Hearer hear)
+    : view_(view),
+      window_(::CreateWindowExW(
+          kind.extendedStyle, kind.windowClass, L"", kind.style | WS_CHILD | WS_VISIBLE | WS_CLIPSIBLINGS, 0,
+          0, 0, 0, kind.parent ? kind.parent : view.Window(), nullptr, ::GetModuleHandleW(nullptr), nullptr)),
       hear_(std::move(hear)) {
   Join();
 }
