@@ -100,6 +100,7 @@ std::optional<LRESULT> ListViewView::AnswerInner(UINT message, WPARAM wParam, LP
   case WM_ERASEBKGND: return 1;
   case WM_PAINT:
     Tell();
+    RedrawIfScrolled();
     PaintRows();
     return 0;
   case kTell: Tell(); return 0;

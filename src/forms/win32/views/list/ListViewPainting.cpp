@@ -2,6 +2,7 @@
 #include "forms/win32/views/list/ListViewView.h"
 
 #include <algorithm>
+#include <utility>
 
 // How a list's windows are drawn: a row or the headers at once, put together before they are shown.
 
@@ -46,6 +47,11 @@ LONG LeftOnScreen(HWND window) {
 }
 
 } // namespace
+
+void ListViewView::RedrawIfScrolled() {
+  const Spot now{::GetScrollPos(Inner().Window(), SB_HORZ), TopRow()};
+  if (std::exchange(scrolled_, now) != now) Inner().Redraw();
+}
 
 void ListViewView::PaintRows() {
   const PlainPainting painting(Inner().Window());

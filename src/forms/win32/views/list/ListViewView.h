@@ -64,6 +64,8 @@ class ListViewView : public FieldView, public ListViewObserver {
   void FitRows();
   void ShowSelection();
   int TopRow() const;
+  /// Not all systems move the whole of a mirrored window's inside when it scrolls.
+  void RedrawIfScrolled();
   void PaintRows();
   void PaintHeaders();
   void PaintRing(Drawing& drawing, int top) const;
@@ -78,6 +80,7 @@ class ListViewView : public FieldView, public ListViewObserver {
   bool columnsDue_ = false;
   bool rowsDue_ = false; ///< the system's window has not heard of all rows
   bool telling_ = false; ///< it is about to hear of what is due
+  Spot scrolled_{};      ///< how far the rows were that were painted last
   int told_ = 0;         ///< how many rows the system's window has heard of
   int shown_ = -1;       ///< the row that is drawn as selected
 };

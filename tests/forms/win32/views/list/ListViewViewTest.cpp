@@ -389,6 +389,30 @@ TEST_F(TableWindow, No_part_of_a_mirrored_list_stays_undrawn_whatever_rows_and_s
     }
 }
 
+TEST_F(TableWindow, A_mirrored_list_that_scrolls_leaves_nothing_of_what_was_there) {
+  Show();
+  for (int i = 0; i < 300; ++i) AddRow(DecimalText(1000 + i));
+  Settle();
+  ::UpdateWindow(Inner(list));
+  const auto onScreen = [this](int left, int line) {
+    const HDC device = ::GetDC(Inner(list));
+    ::SetLayout(device, 0);
+    const Colour pixel = ::GetPixel(device, left, HeaderHeight() + line * RowHeight() + 2);
+    ::ReleaseDC(Inner(list), device);
+    return pixel;
+  };
+  ASSERT_EQ(onScreen(0, 0), RowGround(0, true));
+
+  for (const int rows : {3, -1}) {
+    ::SendMessageW(Inner(list), LVM_SCROLL, 0, rows * RowHeight());
+    ::UpdateWindow(Inner(list));
+    const int top = static_cast<int>(::SendMessageW(Inner(list), LVM_GETTOPINDEX, 0, 0));
+    for (const int left : {0, Inside().width - 1})
+      for (int line = 0; line < 5; ++line)
+        EXPECT_EQ(onScreen(left, line), RowGround(top + line, false)) << rows << " " << left << " " << line;
+  }
+}
+
 TEST_F(TableWindow, A_changed_cell_is_due_and_nothing_else) {
   Show();
   for (int i = 0; i < 10; ++i) AddRow(DecimalText(i));
