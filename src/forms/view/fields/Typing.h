@@ -30,4 +30,8 @@ bool IsTyped(const Form& form, const KeyPress& key);
 /// in a field of many lines Enter begins the next one.
 Typing Type(TextEntry& entry, int character, bool ofManyLines);
 
+/// Where the word begins that ends at a place, with the blanks behind it: up to there Ctrl and the backspace
+/// delete. Signs side by side are a word too, and so is a line break.
+int WordStart(TextView text, int place);
+
 } // namespace quendra::forms

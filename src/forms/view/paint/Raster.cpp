@@ -59,14 +59,19 @@ void Raster::Put(const Picture::Pixels& picture, Spot corner) {
                                 static_cast<std::ptrdiff_t>(y - corner.top) * picture.width +
                                 (part.corner.left - corner.left);
     std::uint32_t* to = At(part.corner.left, y);
-    for (int x = 0; x < part.extent.width; ++x) to[x] = Over(to[x], from[x], 255);
+    for (int x = 0; x < part.extent.width; ++x) to[x] = Over(to[x], from[x]);
   }
 }
 
-std::uint32_t Raster::Over(std::uint32_t below, std::uint32_t argb, unsigned coverage) const {
-  const unsigned alpha = Times(argb >> 24, coverage);
+void Raster::Blend(int x, int y, std::uint32_t argb, unsigned coverage) {
+  std::uint32_t& below = *At(x, y);
+  below = Over(below, Times(argb >> 24, coverage) << 24 | (argb & 0xFFFFFF));
+}
+
+std::uint32_t Raster::Over(std::uint32_t below, std::uint32_t argb) const {
+  const unsigned alpha = argb >> 24;
   if (alpha == 0) return below;
-  if (alpha == 255) return argb | 0xFF000000;
+  if (alpha == 255) return argb;
   return ground_ == Ground::Opaque ? OverOpaque(below, argb, alpha) : OverSeeThrough(below, argb, alpha);
 }
 

@@ -39,10 +39,7 @@ class Raster {
 
   void Fill(Area area, Colour colour);
   /// One pixel, of which `coverage` of 255 parts get the colour. Within the clip alone.
-  void Blend(int x, int y, std::uint32_t argb, unsigned coverage = 255) {
-    std::uint32_t& below = *At(x, y);
-    below = Over(below, argb, coverage);
-  }
+  void Blend(int x, int y, std::uint32_t argb, unsigned coverage = 255);
   /// A picture as large as it is.
   void Put(const Picture::Pixels& picture, Spot corner);
 
@@ -50,7 +47,7 @@ class Raster {
   std::uint32_t* At(int x, int y) const {
     return pixels_.data() + static_cast<std::ptrdiff_t>(y + origin_.top) * width_ + (x + origin_.left);
   }
-  std::uint32_t Over(std::uint32_t below, std::uint32_t argb, unsigned coverage) const;
+  std::uint32_t Over(std::uint32_t below, std::uint32_t argb) const;
 
   std::span<std::uint32_t> pixels_;
   int width_;

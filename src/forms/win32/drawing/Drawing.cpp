@@ -27,11 +27,16 @@ int DrawOrMeasure(HDC dc, TextView text, RECT& place, UINT flags) {
                      flags);
 }
 
-/// Where the lines start that stand half way down a place.
-int TopOf(HDC dc, TextView text, Area place, UINT flags) {
-  RECT needed = RectOf({{}, place.extent});
+/// What the lines of a text need.
+int HeightOf(HDC dc, TextView text, Extent room, UINT flags) {
+  if (flags & DT_SINGLELINE) {
+    TEXTMETRICW metrics{};
+    ::GetTextMetricsW(dc, &metrics);
+    return metrics.tmHeight;
+  }
+  RECT needed = RectOf({{}, room});
   DrawOrMeasure(dc, text, needed, flags | DT_CALCRECT);
-  return place.corner.top + (place.extent.height - static_cast<int>(needed.bottom - needed.top)) / 2;
+  return static_cast<int>(needed.bottom - needed.top);
 }
 
 } // namespace
@@ -112,7 +117,7 @@ void Drawing::Text(TextView text, Area area, HFONT font, Colour colour, const Te
   ::SetTextColor(dc, colour);
   const UINT flags = FlagsOf(setting);
   RECT place = RectOf(area);
-  if (!setting.fromTop) place.top = TopOf(dc, text, area, flags);
+  if (!setting.fromTop) place.top += (area.extent.height - HeightOf(dc, text, area.extent, flags)) / 2;
   // Letters may reach beyond the place that they were given; the clip alone holds them.
   DrawOrMeasure(dc, text, place, flags | DT_NOCLIP);
   ::RestoreDC(dc, state);

@@ -54,6 +54,13 @@ bool HasSigns(HDC dc, const Text& signs) {
   return count == signs.size() && std::find(glyphs.begin(), glyphs.end(), 0xFFFF) == glyphs.end();
 }
 
+int HeightOf(HFONT font) {
+  const FontDc dc(font);
+  TEXTMETRICW metrics{};
+  ::GetTextMetricsW(dc.Dc(), &metrics);
+  return metrics.tmHeight;
+}
+
 } // namespace
 
 bool ShowsHebrewAndLatin(const Text& family) {
@@ -68,10 +75,8 @@ bool ShowsHebrewAndLatin(const Text& family) {
 }
 
 int Fonts::LineHeight(HFONT font) const {
-  const FontDc dc(font);
-  TEXTMETRICW metrics{};
-  ::GetTextMetricsW(dc.Dc(), &metrics);
-  return metrics.tmHeight;
+  const auto own = heights_.find(font);
+  return own != heights_.end() ? own->second : HeightOf(font);
 }
 
 Fonts::Fonts() {
@@ -100,7 +105,9 @@ HFONT Fonts::FontOf(const Font& font, const Scale& scale) {
   const int height =
       std::max(1, static_cast<int>(std::lround(scale.Points(font.size) * dots / kPointsToTheInch)));
   HFONT& made = fonts_[{height, font.bold, font.underline}];
-  if (!made) made = MakeFont(family_, height, font.bold, font.underline);
+  if (made) return made;
+  made = MakeFont(family_, height, font.bold, font.underline);
+  heights_[made] = HeightOf(made);
   return made;
 }
 

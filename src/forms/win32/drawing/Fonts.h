@@ -30,6 +30,7 @@ class Fonts {
   Text family_;
   std::vector<HANDLE> ownFonts_;
   std::map<std::tuple<int, bool, bool>, HFONT> fonts_; ///< by height in pixels, bold, underlined
+  std::map<HFONT, int> heights_;                       ///< of their lines, which each row of a list asks for
 };
 
 /// Whether a family of this very name is there and has the signs of Hebrew and Latin text.

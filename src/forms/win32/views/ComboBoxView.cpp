@@ -18,10 +18,11 @@ constexpr int kArrowRoom = 18;
 constexpr int kRoomRoundLetters = 4;
 constexpr int kMostRows = 10;
 constexpr UINT kChosen = WM_APP + 0x211;
+constexpr UINT kTurn = WM_APP + 0x214;
 
-DWORD StyleOf(const ComboBox& combo) {
-  const DWORD kind = combo.FreeText ? CBS_DROPDOWN | CBS_AUTOHSCROLL : CBS_DROPDOWNLIST;
-  return kind | CBS_HASSTRINGS | CBS_OWNERDRAWFIXED | CBS_NOINTEGRALHEIGHT | WS_VSCROLL | WS_CLIPCHILDREN;
+DWORD StyleOf() {
+  return CBS_DROPDOWNLIST | CBS_HASSTRINGS | CBS_OWNERDRAWFIXED | CBS_NOINTEGRALHEIGHT | WS_VSCROLL |
+         WS_CLIPCHILDREN;
 }
 
 DWORD BarSide(Direction direction) { return direction == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
@@ -29,23 +30,39 @@ DWORD BarSide(Direction direction) { return direction == Direction::RightToLeft 
 } // namespace
 
 ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, HWND parent)
-    : FieldView(context, combo, parent) {
-  Hold(L"COMBOBOX", StyleOf(combo), BarSide(ReadingDirection()));
-  if (combo.FreeText) TakeFreeText();
+    : FieldView(context, combo, parent), reading_(DirectionOf(combo.Value())), held_(reading_) {
+  Hold(L"COMBOBOX", StyleOf(), BarSide(ReadingDirection()));
+  if (!combo.FreeText) return;
+  field_.emplace(*this, combo, false, [this](Direction direction) { ReadFrom(direction); });
+  MakeEdit();
 }
 
-void ComboBoxView::TakeFreeText() {
-  COMBOBOXINFO parts{};
-  parts.cbSize = sizeof parts;
-  ::GetComboBoxInfo(Inner().Window(), &parts);
-  edit_.emplace(*this, parts.hwndItem, [this](UINT message, WPARAM wParam, LPARAM lParam) {
-    return AnswerEdit(message, wParam, lParam);
-  });
-  field_.emplace(*this, Combo(), false, [this](Direction direction) {
-    const bool fromRight = direction == Direction::RightToLeft;
-    if (edit_->SetStyle(GWL_EXSTYLE, WS_EX_RTLREADING | WS_EX_RIGHT, fromRight)) edit_->Redraw();
-  });
+void ComboBoxView::MakeEdit() {
+  held_ = reading_;
+  const DWORD side = held_ == Direction::RightToLeft ? WS_EX_RTLREADING | WS_EX_RIGHT : 0;
+  auto made = std::make_unique<InnerWindow>(
+      *this, InnerWindow::Kind{L"EDIT", ES_AUTOHSCROLL, side, Inner().Window()},
+      [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerEdit(message, wParam, lParam); });
+  const HWND before = edit_ ? edit_->Window() : nullptr;
+  if (before && edit_->HasFocus()) ::SetFocus(made->Window());
+  edit_ = std::move(made);
+  if (before) ::DestroyWindow(before);
   field_->Take(*edit_);
+}
+
+// It can't be replaced while it tells of the text that turned.
+void ComboBoxView::ReadFrom(Direction direction) {
+  if (direction != reading_) ::PostMessageW(Window(), kTurn, 0, 0);
+  reading_ = direction;
+}
+
+void ComboBoxView::Turn() {
+  if (!TheControl() || reading_ == held_) return;
+  MakeEdit();
+  ::EnableWindow(edit_->Window(), IsEnabled());
+  edit_->Send(WM_SETFONT, reinterpret_cast<WPARAM>(Letters()));
+  PlaceEdit();
+  field_->ShowText();
 }
 
 void ComboBoxView::ControlGone() {
@@ -69,6 +86,7 @@ void ComboBoxView::Apply(Aspect aspect) {
   const bool before = std::exchange(showing_, true);
   if (Concerns(aspect, Aspect::Font)) {
     GiveLetters();
+    if (edit_) edit_->Send(WM_SETFONT, reinterpret_cast<WPARAM>(Letters()));
     Inner().Send(CB_SETITEMHEIGHT, 0, RowHeight());
     Arrange();
   }
@@ -96,7 +114,6 @@ void ComboBoxView::ShowSelection() {
   const bool before = std::exchange(showing_, true);
   if (static_cast<int>(Inner().Send(CB_GETCURSEL)) != Combo().ListIndex())
     Inner().Send(CB_SETCURSEL, static_cast<WPARAM>(Combo().ListIndex()));
-  // The system has put the item there as it stands in the list.
   if (field_) field_->ShowText();
   Inner().Redraw();
   showing_ = before;
@@ -141,6 +158,10 @@ void ComboBoxView::PlaceEdit() const {
 
 std::optional<LRESULT> ComboBoxView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
   if (!TheControl()) return FieldView::Answer(message, wParam, lParam);
+  if (message == kTurn) {
+    Turn();
+    return 0;
+  }
   if (message == WM_MEASUREITEM) {
     reinterpret_cast<MEASUREITEMSTRUCT*>(lParam)->itemHeight = static_cast<UINT>(RowHeight());
     return TRUE;
@@ -164,6 +185,13 @@ std::optional<LRESULT> ComboBoxView::AnswerInner(UINT message, WPARAM wParam, LP
   case WM_ERASEBKGND: return 1;
   case WM_PAINT: PaintClosed(); return 0;
   case kChosen: return TellChoice();
+  case WM_COMMAND:
+    if (!edit_ || reinterpret_cast<HWND>(lParam) != edit_->Window()) return std::nullopt;
+    if (HIWORD(wParam) == EN_CHANGE) field_->Edited();
+    return 0;
+  case WM_ENABLE:
+    if (edit_) ::EnableWindow(edit_->Window(), wParam != 0);
+    return std::nullopt;
   case WM_LBUTTONDOWN:
   case WM_LBUTTONDBLCLK: Drop(); return 0;
   // Turning the wheel over a closed list would switch what it stands for by accident.
@@ -184,8 +212,23 @@ std::optional<LRESULT> ComboBoxView::AnswerInner(UINT message, WPARAM wParam, LP
 void ComboBoxView::Drop() {
   // A click is what chooses an item, not what opens the list.
   Context().mouse.ReleaseCapture();
-  ::SetFocus(KeyWindow());
-  if (TheControl()) Inner().Send(CB_SHOWDROPDOWN, !IsDropped());
+  const bool drops = !IsDropped();
+  // What hangs down has the keys.
+  ::SetFocus(drops ? Inner().Window() : KeyWindow());
+  if (TheControl()) Inner().Send(CB_SHOWDROPDOWN, drops);
+}
+
+/// The keys of a list that hangs down, or that are pressed for it to do so.
+bool ComboBoxView::PassesToList(UINT message, WPARAM wParam, LPARAM lParam) {
+  if (message != WM_KEYDOWN && message != WM_SYSKEYDOWN) return false;
+  const bool moves = wParam == VK_UP || wParam == VK_DOWN;
+  if (wParam == VK_F4 || (moves && message == WM_SYSKEYDOWN))
+    Drop();
+  else if (moves || wParam == VK_PRIOR || wParam == VK_NEXT)
+    Inner().Send(message, wParam, lParam);
+  else
+    return false;
+  return true;
 }
 
 std::optional<LRESULT> ComboBoxView::AnswerEdit(UINT message, WPARAM wParam, LPARAM lParam) {
@@ -198,7 +241,14 @@ std::optional<LRESULT> ComboBoxView::AnswerEdit(UINT message, WPARAM wParam, LPA
     return answer;
   }
   if (message == WM_LBUTTONDOWN) Context().mouse.ReleaseCapture();
+  if (TheControl() && PassesToList(message, wParam, lParam)) return 0;
   return field_ ? field_->Answer(message, wParam, lParam) : std::nullopt;
+}
+
+Text ComboBoxView::TipAt(HWND window, Spot /*place*/) const {
+  if (field_ || window != Inner().Window()) return {};
+  const Text shown = VisibleText(Combo().SelectedText());
+  return MeasureText(shown, Letters()).width > TextRoom(Inner().Inside()).extent.width ? shown : Text();
 }
 
 KeyUse ComboBoxView::Use(const KeyPress& /*key*/) { return IsDropped() ? KeyUse::Window : KeyUse::Free; }
@@ -206,9 +256,6 @@ KeyUse ComboBoxView::Use(const KeyPress& /*key*/) { return IsDropped() ? KeyUse:
 void ComboBoxView::Notified(int code) {
   if (showing_ || !TheControl()) return;
   switch (code) {
-  case CBN_EDITCHANGE:
-    if (field_) field_->Edited();
-    break;
   case CBN_DROPDOWN: chosen_ = false; break;
   case CBN_SELENDOK: chosen_ = true; break;
   case CBN_SELENDCANCEL: chosen_ = false; break;
@@ -220,6 +267,7 @@ void ComboBoxView::Notified(int code) {
       Choose();
     else
       ShowSelection();
+    if (edit_ && Inner().HasFocus()) ::SetFocus(edit_->Window());
     break;
   default: break;
   }

@@ -64,8 +64,7 @@ std::optional<LRESULT> EditField::Answer(UINT message, WPARAM wParam, LPARAM lPa
 
 LRESULT EditField::Typed(WPARAM unit, LPARAM lParam) {
   const WPARAM key = std::exchange(key_, 0);
-  // With Ctrl, Enter gives a line feed.
-  const int character = key == VK_RETURN ? kEnterKey : CharacterOf(static_cast<char16_t>(unit));
+  const int character = CharacterOf(key, static_cast<char16_t>(unit));
   if (character == 0) return 0;
   const bool named = character < 0x20 && key != 0 && key != VK_PACKET;
   const int code = named ? static_cast<int>(key) : CodeOfCharacter(static_cast<char16_t>(character));
@@ -78,14 +77,17 @@ LRESULT EditField::Typed(WPARAM unit, LPARAM lParam) {
   const bool readOnly = edit_->Has(ES_READONLY);
   if (typing.act == Typing::Act::Insert && !readOnly)
     edit_->Send(EM_REPLACESEL, TRUE, reinterpret_cast<LPARAM>(winapi::Wide(typing.text)));
-  if (typing.act == Typing::Act::DeleteBack && !readOnly) edit_->PassOn(WM_CHAR, kBackspaceKey, lParam);
+  if (typing.act == Typing::Act::DeleteBack && !readOnly) DeleteBack(lParam);
   if (typing.act == Typing::Act::Command) Command(character, lParam);
   TellSelection();
   return 0;
 }
 
 /// 0 while the other half of the character is to come.
-int EditField::CharacterOf(char16_t unit) {
+int EditField::CharacterOf(WPARAM key, char16_t unit) {
+  // With Ctrl they give other control characters, and not the same ones on all systems.
+  if (key == VK_RETURN) return kEnterKey;
+  if (key == VK_BACK) return kBackspaceKey;
   constexpr int kFirstOutsidePlane = 0x10000;
   if (unit >= 0xD800 && unit <= 0xDBFF) {
     high_ = unit;
@@ -102,6 +104,19 @@ void EditField::Command(int character, LPARAM lParam) {
   if (character == kSelectAll) edit_->Send(EM_SETSEL, 0, -1);
   if (character == kCopy || character == kPaste || character == kCut || character == kUndo)
     edit_->PassOn(WM_CHAR, static_cast<WPARAM>(character), lParam);
+}
+
+// Words of a masked text are nobody's business.
+void EditField::DeleteBack(LPARAM lParam) {
+  if (!IsDown(VK_CONTROL)) {
+    edit_->PassOn(WM_CHAR, kBackspaceKey, lParam);
+    return;
+  }
+  auto [from, to] = HeldSelection();
+  const bool masked = edit_->Send(EM_GETPASSWORDCHAR) != 0;
+  if (from == to) from = masked ? 0 : WordStart(TextOfWindow(edit_->Window()), to);
+  edit_->Send(EM_SETSEL, static_cast<WPARAM>(from), to);
+  edit_->Send(EM_REPLACESEL, TRUE, reinterpret_cast<LPARAM>(L""));
 }
 
 void EditField::ShowMenu(LPARAM place) {

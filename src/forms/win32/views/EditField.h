@@ -29,8 +29,9 @@ class EditField {
 
  private:
   LRESULT Typed(WPARAM unit, LPARAM lParam);
-  int CharacterOf(char16_t unit);
+  int CharacterOf(WPARAM key, char16_t unit);
   void Command(int character, LPARAM lParam);
+  void DeleteBack(LPARAM lParam);
   void TellSelection();
   void Hold(const Text& text);
   void ShowMenu(LPARAM place);

@@ -13,9 +13,9 @@ FieldView::FieldView(ViewContext& context, Control& control, HWND parent) : Wind
 
 void FieldView::Hold(const wchar_t* windowClass, DWORD style, DWORD extendedStyle) {
   const auto leave = [](UINT, WPARAM, LPARAM) -> std::optional<LRESULT> { return std::nullopt; };
-  if (!name_) name_ = std::make_unique<InnerWindow>(*this, L"STATIC", 0, 0, leave);
+  if (!name_) name_ = std::make_unique<InnerWindow>(*this, InnerWindow::Kind{L"STATIC"}, leave);
   auto made = std::make_unique<InnerWindow>(
-      *this, windowClass, style, extendedStyle,
+      *this, InnerWindow::Kind{windowClass, style, extendedStyle},
       [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerInner(message, wParam, lParam); });
   const HWND before = inner_ ? inner_->Window() : nullptr;
   if (before && inner_->HasFocus()) ::SetFocus(made->Window());
@@ -30,8 +30,7 @@ void FieldView::Paint(Drawing& drawing) {
   const FieldState state = State();
   const FieldFace face = FaceOf(state);
   drawing.RoundRect(whole, face.corner, face.fill, face.border);
-  for (const Ring& ring : RingsOf(state))
-    drawing.Stroke(RoundBox::Of(whole, ring.corner, ring.inset), ring.colour, ring.width);
+  drawing.Rings(whole, RingsOf(state));
 }
 
 std::optional<LRESULT> FieldView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {

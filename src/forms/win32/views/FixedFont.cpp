@@ -25,6 +25,8 @@ FixedFont::~FixedFont() {
 }
 
 HFONT FixedFont::As(HFONT letters) {
+  if (made_ && of_ == letters) return made_;
+  of_ = letters;
   LOGFONTW wanted{};
   if (!::GetObjectW(letters, sizeof wanted, &wanted)) return letters;
   wanted.lfPitchAndFamily = FIXED_PITCH | FF_MODERN;

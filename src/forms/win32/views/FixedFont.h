@@ -12,10 +12,11 @@ class FixedFont {
   FixedFont(const FixedFont&) = delete;
   FixedFont& operator=(const FixedFont&) = delete;
 
-  /// In the size of another font. The one given before goes with the call.
+  /// In the size of another font. It stays until another one is asked for.
   HFONT As(HFONT letters);
 
  private:
+  HFONT of_ = nullptr;
   HFONT made_ = nullptr;
 };
 

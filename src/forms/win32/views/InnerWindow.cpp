@@ -7,11 +7,11 @@
 
 namespace quendra::forms::win32 {
 
-InnerWindow::InnerWindow(WindowView& view, const wchar_t* windowClass, DWORD style, DWORD extendedStyle,
-                         Hearer hear)
-    : view_(view), window_(::CreateWindowExW(extendedStyle, windowClass, L"",
-                                             style | WS_CHILD | WS_VISIBLE | WS_CLIPSIBLINGS, 0, 0, 0, 0,
-                                             view.Window(), nullptr, ::GetModuleHandleW(nullptr), nullptr)),
+InnerWindow::InnerWindow(WindowView& view, const Kind& kind, Hearer hear)
+    : view_(view),
+      window_(::CreateWindowExW(
+          kind.extendedStyle, kind.windowClass, L"", kind.style | WS_CHILD | WS_VISIBLE | WS_CLIPSIBLINGS, 0,
+          0, 0, 0, kind.parent ? kind.parent : view.Window(), nullptr, ::GetModuleHandleW(nullptr), nullptr)),
       hear_(std::move(hear)) {
   Join();
 }
@@ -66,7 +66,9 @@ bool InnerWindow::IsTaken(UINT message, WPARAM wParam, LPARAM lParam) const {
 
 LRESULT InnerWindow::Handle(UINT message, WPARAM wParam, LPARAM lParam) {
   const WindowView::Work work(view_);
-  if (IsTaken(message, wParam, lParam)) return 0;
+  const bool taken = IsTaken(message, wParam, lParam);
+  view_.HearForTip(window_, message, lParam);
+  if (taken) return 0;
   if (const auto answer = hear_(message, wParam, lParam)) return *answer;
   return PassOn(message, wParam, lParam);
 }

@@ -13,8 +13,14 @@ class InnerWindow {
   /// None lets the class's own procedure answer.
   using Hearer = std::function<std::optional<LRESULT>(UINT message, WPARAM wParam, LPARAM lParam)>;
 
+  struct Kind {
+    const wchar_t* windowClass;
+    DWORD style = 0;
+    DWORD extendedStyle = 0;
+    HWND parent = nullptr; ///< inside the view's own, which it else is itself
+  };
   /// Makes a window that fills nothing yet.
-  InnerWindow(WindowView& view, const wchar_t* windowClass, DWORD style, DWORD extendedStyle, Hearer hear);
+  InnerWindow(WindowView& view, const Kind& kind, Hearer hear);
   /// Takes one that a window of the system has made.
   InnerWindow(WindowView& view, HWND window, Hearer hear);
   ~InnerWindow();

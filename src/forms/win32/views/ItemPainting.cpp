@@ -5,15 +5,20 @@
 
 namespace quendra::forms::win32 {
 
+namespace {
+constexpr int kPadding = 4;
+}
+
+int TextRoomOfItem(int width) { return width - 2 * kPadding; }
+
 void PaintItem(const DRAWITEMSTRUCT& due, const ItemFace& face) {
-  constexpr int kPadding = 4;
   const RECT& place = due.rcItem;
   const Area item{{},
                   {static_cast<int>(place.right - place.left), static_cast<int>(place.bottom - place.top)}};
   Surface surface(item.extent);
   Drawing drawing(surface, {}, item);
   drawing.Fill(item, face.ground);
-  const Area room{{kPadding, 0}, {item.extent.width - 2 * kPadding, item.extent.height}};
+  const Area room{{kPadding, 0}, {TextRoomOfItem(item.extent.width), item.extent.height}};
   const Direction reading = DirectionOf(face.text);
   drawing.Text(face.text, room, face.font, Palette::Ink, {reading, SideOf(Alignment::Leading, face.list)});
   POINT before{};

@@ -14,6 +14,9 @@ struct ItemFace {
 };
 
 /// Answers WM_DRAWITEM for a window whose items the program draws.
+/// Pixels for the text of an item.
+int TextRoomOfItem(int width);
+
 void PaintItem(const DRAWITEMSTRUCT& due, const ItemFace& face);
 
 } // namespace quendra::forms::win32

@@ -20,6 +20,13 @@ KeyUse LabelView::Use(const KeyPress& key) {
   return KeyUse::Done;
 }
 
+Text LabelView::TipAt(HWND /*window*/, Spot /*place*/) const {
+  const LabelText set = TextOf(TheLabel());
+  const int room = LabelPlace().extent.width - 2 * TextInset(TheLabel());
+  const bool cut = !set.wraps && MeasureText(set.text, Letters(set.underlined)).width > room;
+  return cut ? set.text : Text();
+}
+
 void LabelView::Paint(Drawing& drawing) {
   if (!TheControl()) return;
   const LabelState state = State();

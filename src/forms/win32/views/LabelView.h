@@ -11,6 +11,7 @@ class LabelView : public WindowView {
 
   void Paint(Drawing& drawing) override;
   KeyUse Use(const KeyPress& key) override;
+  Text TipAt(HWND window, Spot place) const override;
 
  protected:
   void Apply(Aspect aspect) override;

@@ -103,6 +103,13 @@ void ListBoxView::Notified(int code) {
   Context().dispatcher.Dispatch([&] { List().SelectItem(chosen); });
 }
 
+Text ListBoxView::TipAt(HWND /*window*/, Spot place) const {
+  const LRESULT found = Inner().Send(LB_ITEMFROMPOINT, 0, MAKELPARAM(place.left, place.top));
+  if (HIWORD(found) || LOWORD(found) >= List().ListCount()) return {};
+  const Text shown = VisibleText(List().List(LOWORD(found)));
+  return MeasureText(shown, Letters()).width > TextRoomOfItem(Inner().Inside().width) ? shown : Text();
+}
+
 KeyUse ListBoxView::Use(const KeyPress& key) {
   const auto item = ItemReachedBy(List(), key);
   if (!item) return KeyUse::Free;

@@ -9,6 +9,7 @@ class ListBoxView : public FieldView {
  public:
   ListBoxView(ViewContext& context, ListBox& list, HWND parent);
   KeyUse Use(const KeyPress& key) override;
+  Text TipAt(HWND window, Spot place) const override;
 
  protected:
   std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;

@@ -6,7 +6,9 @@
 #include "forms/view/ActiveForm.h"
 #include "forms/view/Scale.h"
 #include "forms/win32/drawing/Fonts.h"
+#include "forms/win32/drawing/FormPicture.h"
 #include "forms/win32/drawing/PictureStore.h"
+#include "forms/win32/views/HoverTip.h"
 
 #include <cstdint>
 
@@ -14,7 +16,7 @@ namespace quendra::forms::win32 {
 
 class MouseInput;
 
-/// How the user works in a form.
+/// How the user works in a form, and what it shows.
 struct FormState {
   /// The last thing that the user took in hand was the keyboard.
   bool usesKeys = false;
@@ -22,6 +24,8 @@ struct FormState {
   bool focusComesBack = false;
   /// Made so far; each gets a number of its own.
   std::uintptr_t windows = 0;
+  FormPicture picture{};
+  HoverTip tip{};
 };
 
 /// What every view of a desktop needs of it.

@@ -6,10 +6,10 @@
 #include "forms/win32/views/LabelView.h"
 #include "forms/win32/views/LineView.h"
 #include "forms/win32/views/ListBoxView.h"
-#include "forms/win32/views/ListViewView.h"
 #include "forms/win32/views/PictureBoxView.h"
 #include "forms/win32/views/TextAreaView.h"
 #include "forms/win32/views/TextLineView.h"
+#include "forms/win32/views/list/ListViewView.h"
 
 namespace quendra::forms::win32 {
 

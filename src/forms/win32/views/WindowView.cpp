@@ -99,6 +99,7 @@ void WindowView::Release() {
 }
 
 void WindowView::ControlGone() {
+  ForgetPlace();
   context_.mouse.Forget(*this);
   control_ = nullptr;
 }
@@ -113,7 +114,7 @@ void WindowView::Changed(Aspect aspect) {
   Apply(aspect);
   if (Concerns(aspect, Aspect::Caption)) TellName();
   if (Concerns(aspect, Aspect::Visible)) Show();
-  if (aspect != Aspect::Tag && aspect != Aspect::Visible) Invalidate();
+  if (aspect != Aspect::Tag) Invalidate();
 }
 
 void WindowView::ShareFont() const {
@@ -141,9 +142,11 @@ void WindowView::PutInPlace() { MoveTo(Place()); }
 void WindowView::MoveTo(const Area& place) {
   if (place == windowPlace_) return;
   windowPlace_ = place;
+  ForgetPlace();
   // What it showed at its old place lets other things shine through.
   ::SetWindowPos(window_, nullptr, place.corner.left, place.corner.top, place.extent.width,
                  place.extent.height, SWP_NOZORDER | SWP_NOACTIVATE | SWP_NOCOPYBITS);
+  ForgetPlace();
 }
 
 void WindowView::Show() {
@@ -152,17 +155,30 @@ void WindowView::Show() {
   ::ShowWindow(window_, control_->Visible() ? SW_SHOWNA : SW_HIDE);
 }
 
-void WindowView::Invalidate() const {
+std::optional<Area> WindowView::ForgetPlace() const {
   const WindowView* const form =
       control_ ? dynamic_cast<const WindowView*>(control_->OwnerForm().View()) : nullptr;
-  if (!form || !::IsWindowVisible(window_)) return;
-  RECT place{};
-  ::GetWindowRect(window_, &place);
-  ::MapWindowPoints(nullptr, form->Body(), reinterpret_cast<POINT*>(&place), 2);
-  ::RedrawWindow(form->Body(), &place, nullptr, RDW_INVALIDATE | RDW_ALLCHILDREN | RDW_NOERASE);
+  if (!form) return std::nullopt;
+  RECT window{};
+  ::GetWindowRect(window_, &window);
+  ::MapWindowPoints(nullptr, form->Body(), reinterpret_cast<POINT*>(&window), 2);
+  const Area place{
+      {static_cast<int>(window.left), static_cast<int>(window.top)},
+      {static_cast<int>(window.right - window.left), static_cast<int>(window.bottom - window.top)}};
+  context_.state.picture.Forget(place);
+  return place;
+}
+
+void WindowView::Invalidate() const {
+  const auto place = ForgetPlace();
+  if (!place || !::IsWindowVisible(window_)) return;
+  const RECT due{place->corner.left, place->corner.top, place->Right(), place->Bottom()};
+  const auto* form = static_cast<const WindowView*>(control_->OwnerForm().View());
+  ::RedrawWindow(form->Body(), &due, nullptr, RDW_INVALIDATE | RDW_ALLCHILDREN | RDW_NOERASE);
 }
 
 void WindowView::Repaint() {
+  ForgetPlace();
   ::RedrawWindow(window_, nullptr, nullptr, RDW_INVALIDATE | RDW_ALLCHILDREN | RDW_NOERASE | RDW_UPDATENOW);
 }
 
@@ -214,9 +230,18 @@ LRESULT WindowView::Handle(UINT message, WPARAM wParam, LPARAM lParam) {
   return PassOn(message, wParam, lParam);
 }
 
+void WindowView::HearForTip(HWND window, UINT message, LPARAM lParam) const {
+  const bool asks = message == WM_MOUSEMOVE || message == WM_MOUSEHOVER;
+  const bool ofMouse = message >= WM_MOUSEFIRST && message <= WM_MOUSELAST;
+  if (!control_ || !(asks || ofMouse || message == WM_MOUSELEAVE)) return;
+  context_.state.tip.Hear(window, message, asks ? TipAt(window, PlainPlace(window, lParam)) : Text());
+}
+
 std::optional<LRESULT> WindowView::AnswerCommonly(UINT message, WPARAM wParam, LPARAM lParam) {
   if (message == WM_NCDESTROY) return Forget(wParam, lParam);
-  if (context_.mouse.Takes(*this, message, wParam, lParam)) return 0;
+  const bool taken = context_.mouse.Takes(*this, message, wParam, lParam);
+  HearForTip(window_, message, lParam);
+  if (taken) return 0;
   switch (message) {
   case WM_SETFOCUS:
     Invalidate();

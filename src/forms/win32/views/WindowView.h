@@ -65,6 +65,11 @@ class WindowView : public View {
   /// A key was pressed while the focus was in this window. The form has heard of it, and Tab never comes.
   virtual KeyUse Use(const KeyPress& /*key*/) { return KeyUse::Free; }
 
+  /// The whole text where a window of this view cuts it, in the pixels of the window's inside; else empty.
+  virtual Text TipAt(HWND /*window*/, Spot /*place*/) const { return {}; }
+  /// A message to a window of this view, of which those of the mouse show and hide the tip.
+  void HearForTip(HWND window, UINT message, LPARAM lParam) const;
+
   /// The view that a window was made for; nullptr for any other window.
   static WindowView* Of(HWND window);
   /// That of the nearest window upwards that has one.
@@ -118,6 +123,8 @@ class WindowView : public View {
   std::optional<LRESULT> AnswerCommonly(UINT message, WPARAM wParam, LPARAM lParam);
   std::optional<LRESULT> AnswerAsOwn(UINT message);
   std::optional<LRESULT> ShowCursorAt(WPARAM wParam, LPARAM lParam) const;
+  /// What the form's picture shows where the window stands has changed. Gives that place, none without form.
+  std::optional<Area> ForgetPlace() const;
   /// The window goes.
   LRESULT Forget(WPARAM wParam, LPARAM lParam);
   void ShareFont() const;

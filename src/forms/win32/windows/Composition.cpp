@@ -54,14 +54,17 @@ void PaintWindow(const WindowView& view) {
   const Area due = painting.Due();
   auto* const form = dynamic_cast<WindowView*>(view.TheControl()->OwnerForm().View());
   if (!form || due.extent.width <= 0 || due.extent.height <= 0) return;
-  POINT corner{due.corner.left, due.corner.top};
+  POINT corner{};
   ::MapWindowPoints(view.Window(), form->Body(), &corner, 1);
-  Surface surface(due.extent);
-  Drawing drawing(surface, {-static_cast<int>(corner.x), -static_cast<int>(corner.y)},
-                  {{static_cast<int>(corner.x), static_cast<int>(corner.y)}, due.extent});
-  PutTogether(*form, drawing);
-  ::SetViewportOrgEx(painting.Device(), due.corner.left, due.corner.top, nullptr);
-  surface.ShowOn(painting.Device(), {{}, due.extent});
+  const Area part{{due.corner.left + static_cast<int>(corner.x), due.corner.top + static_cast<int>(corner.y)},
+                  due.extent};
+  RECT whole{};
+  ::GetClientRect(form->Body(), &whole);
+  FormPicture& picture = view.Context().state.picture;
+  picture.Bring(part, {static_cast<int>(whole.right), static_cast<int>(whole.bottom)},
+                [form](Drawing& drawing) { PutTogether(*form, drawing); });
+  ::SetViewportOrgEx(painting.Device(), -corner.x, -corner.y, nullptr);
+  picture.ShowOn(painting.Device(), part);
 }
 
 } // namespace quendra::forms::win32

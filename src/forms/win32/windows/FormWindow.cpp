@@ -82,6 +82,7 @@ void FormWindow::ControlGone() {
 
 void FormWindow::Hide() {
   if (block_) block_->Lift();
+  state_.tip.Hide();
   ::ShowWindow(Top(), SW_HIDE);
 }
 

@@ -115,4 +115,32 @@ TEST(FieldLookTest, A_field_that_cannot_be_changed_is_quiet) {
 }
 
 } // namespace
+TEST(WordStart, Is_that_of_the_word_before_with_the_blanks_behind_it) {
+  const Text text = u"www.one.test  שלום_1, abc";
+
+  EXPECT_EQ(WordStart(text, 25), 22);
+  EXPECT_EQ(WordStart(text, 22), 20);
+  EXPECT_EQ(WordStart(text, 20), 14);
+  EXPECT_EQ(WordStart(text, 16), 14);
+  EXPECT_EQ(WordStart(text, 14), 8);
+  EXPECT_EQ(WordStart(text, 8), 7);
+  EXPECT_EQ(WordStart(text, 3), 0);
+  EXPECT_EQ(WordStart(text, 0), 0);
+}
+
+TEST(WordStart, Goes_over_one_line_break_however_it_is_written) {
+  const Text text = u"a\r\n\nb\r\n  ";
+
+  EXPECT_EQ(WordStart(text, 9), 7);
+  EXPECT_EQ(WordStart(text, 7), 5);
+  EXPECT_EQ(WordStart(text, 4), 3);
+  EXPECT_EQ(WordStart(text, 3), 1);
+}
+
+TEST(WordStart, Of_a_place_outside_the_text_is_that_of_its_nearest_end) {
+  EXPECT_EQ(WordStart(u"ab", 9), 0);
+  EXPECT_EQ(WordStart(u"ab", -1), 0);
+  EXPECT_EQ(WordStart(u"", 0), 0);
+}
+
 } // namespace quendra::forms

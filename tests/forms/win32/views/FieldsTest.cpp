@@ -49,12 +49,7 @@ class FieldWindows : public ViewFixture {
   static DWORD Style(const Control& control, int index = GWL_STYLE) {
     return static_cast<DWORD>(::GetWindowLongW(Inner(control), index));
   }
-  HWND Edit() {
-    COMBOBOXINFO parts{};
-    parts.cbSize = sizeof parts;
-    ::GetComboBoxInfo(Inner(combo), &parts);
-    return parts.hwndItem;
-  }
+  HWND Edit() { return ::FindWindowExW(Inner(combo), nullptr, L"EDIT", nullptr); }
 
   Label label{form, u"Label2"};
   TextBox line{form, u"line"};
@@ -108,6 +103,46 @@ TEST_F(FieldWindows, Everything_is_selected_by_one_key) {
 
   EXPECT_EQ(line.SelStart(), 0);
   EXPECT_EQ(line.SelLength(), 4);
+}
+
+TEST_F(FieldWindows, Ctrl_and_the_backspace_delete_a_word_and_the_handler_may_refuse_it) {
+  line.Value = u"www.one.test";
+  Show();
+  line.SelStart = 12;
+
+  Key(kBackspaceKey, kCtrl);
+  EXPECT_EQ(line.Value(), u"www.one.");
+  EXPECT_EQ(line.SelStart(), 8);
+
+  std::vector<int> pressed;
+  line.KeyPress = [&](int& keyCode) {
+    pressed.push_back(keyCode);
+    keyCode = 0;
+  };
+  Key(kBackspaceKey, kCtrl);
+  EXPECT_EQ(line.Value(), u"www.one.");
+  EXPECT_EQ(pressed, std::vector<int>{kBackspaceKey});
+
+  line.KeyPress = nullptr;
+  line.SelStart = 1;
+  line.SelLength = 2;
+  Key(kBackspaceKey, kCtrl);
+  EXPECT_EQ(line.Value(), u"w.one.");
+
+  line.ReadOnly = true;
+  Key(kBackspaceKey, kCtrl);
+  EXPECT_EQ(line.Value(), u"w.one.");
+}
+
+TEST_F(FieldWindows, Ctrl_and_the_backspace_tell_nothing_of_the_words_of_a_masked_text) {
+  line.Masked = true;
+  line.Value = u"two words";
+  Show();
+  line.SelStart = 9;
+
+  Key(kBackspaceKey, kCtrl);
+
+  EXPECT_EQ(line.Value(), u"");
 }
 
 TEST_F(FieldWindows, A_masked_field_keeps_its_text_to_itself_until_it_is_shown) {
@@ -287,6 +322,59 @@ TEST_F(FieldWindows, An_item_that_is_chosen_by_the_arrows_stands_in_the_field) {
   EXPECT_EQ(chosen, std::vector<int>{0});
   EXPECT_EQ(combo.Value(), u"www.one.test");
   EXPECT_EQ(TextOfWindow(Edit()), u"www.one.test");
+}
+
+TEST_F(FieldWindows, A_combo_box_turns_to_the_direction_of_its_text_and_keeps_caret_and_focus) {
+  Show();
+  Key(kTabKey);
+  Key(kTabKey);
+  const auto isTurned = [this] {
+    constexpr LONG kTurned = WS_EX_RTLREADING | WS_EX_RIGHT;
+    return (::GetWindowLongW(Edit(), GWL_EXSTYLE) & kTurned) == kTurned;
+  };
+  EXPECT_FALSE(isTurned());
+
+  combo.Value = u"שלום, abc";
+  combo.SelStart = 3;
+  Settle();
+  EXPECT_TRUE(isTurned());
+  EXPECT_EQ(::GetFocus(), Edit());
+  Key('X');
+  EXPECT_EQ(combo.Value(), u"שלוXם, abc");
+
+  combo.SelectItem(0);
+  Settle();
+  EXPECT_FALSE(isTurned());
+  EXPECT_EQ(TextOfWindow(Edit()), u"www.one.test");
+  combo.Enabled = false;
+  EXPECT_FALSE(::IsWindowEnabled(Edit()));
+}
+
+TEST_F(FieldWindows, A_list_with_free_text_hangs_down_by_its_keys_and_gives_the_focus_back) {
+  std::vector<int> chosen;
+  combo.Click = [&] { chosen.push_back(combo.ListIndex()); };
+  Show();
+  Key(kTabKey);
+  Key(kTabKey);
+  constexpr int kF4Key = kF1Key + 3;
+
+  ::SendMessageW(Edit(), WM_KEYDOWN, kF4Key, 0);
+  EXPECT_TRUE(::SendMessageW(Inner(combo), CB_GETDROPPEDSTATE, 0, 0));
+  Key(kDownKey);
+  Key(kDownKey);
+  Key(kEnterKey);
+  Settle();
+
+  EXPECT_EQ(chosen, std::vector<int>{1});
+  EXPECT_EQ(combo.Value(), u"www.two.test");
+  EXPECT_EQ(::GetFocus(), Edit());
+
+  ::SendMessageW(Edit(), WM_SYSKEYDOWN, VK_DOWN, 1 << 29);
+  EXPECT_TRUE(::SendMessageW(Inner(combo), CB_GETDROPPEDSTATE, 0, 0));
+  Key(kEscapeKey);
+  Settle();
+  EXPECT_EQ(::GetFocus(), Edit());
+  EXPECT_EQ(chosen.size(), 1U);
 }
 
 TEST_F(FieldWindows,

@@ -1,4 +1,4 @@
-#include "forms/win32/views/ListPainter.h"
+#include "forms/win32/views/list/ListPainter.h"
 
 #include "forms/view/Palette.h"
 #include "forms/view/VisibleText.h"
@@ -53,13 +53,30 @@ void ListPainter::PaintCell(Drawing& drawing, const ListRow& row, int cell, Area
   const int icon = row.CellIcon(cell);
   if (cell == 0) PaintIcon(drawing, row.SmallIcon(), Look().IconPlace(place));
   if (icon) PaintIcon(drawing, icon, Look().CellIconPlace(place, !text.empty()));
-  const Area room = icon ? Look().TextAfterIcon(place) : Look().TextPlace(place, cell);
+  const Area room = TextRoom(row, cell, place);
   if (text.empty() || room.extent.width <= 0) return;
   const Text visible = VisibleText(text, LineBreaks::Show, kMostOfCell);
   const Alignment alignment = list_.Columns()[static_cast<std::size_t>(cell)].alignment;
   drawing.Within(place).Text(visible, {{room.corner.left - place.corner.left, 0}, room.extent},
                              Letters(row.CellBold(cell)), CellInk(row, cell),
                              {DirectionOf(visible), Look().SideOf(alignment)});
+}
+
+Area ListPainter::TextRoom(const ListRow& row, int cell, Area place) const {
+  return row.CellIcon(cell) ? Look().TextAfterIcon(place) : Look().TextPlace(place, cell);
+}
+
+Text ListPainter::CutText(const ListRow& row, int cell, Area place) const {
+  const Text shown = VisibleText(row.CellText(cell));
+  const int needed = MeasureText(shown, Letters(row.CellBold(cell))).width;
+  return needed > TextRoom(row, cell, place).extent.width ? shown : Text();
+}
+
+Text ListPainter::CutText(const ColumnHeader& column, Area place) const {
+  if (column.caption.empty()) return VisibleText(column.description);
+  const Text shown = VisibleText(column.caption);
+  const int needed = MeasureText(shown, Letters(false)).width;
+  return needed > Look().HeaderTextPlace(place).extent.width ? shown : Text();
 }
 
 void ListPainter::PaintIcon(Drawing& drawing, int number, Area place) {

@@ -18,12 +18,18 @@ class ListPainter {
   int RowHeight() const;
   int HeaderHeight() const;
 
+  /// The text of a cell that stands here, whole, where it is cut; else empty.
+  Text CutText(const ListRow& row, int cell, Area place) const;
+  /// What a header's icon stands for, or a caption that is cut; else empty.
+  Text CutText(const ColumnHeader& column, Area place) const;
+
   /// The row of this number, from 0 on; plain ground below the last.
   void PaintRow(Drawing& drawing, int row, Area place, const std::vector<Area>& cells);
   void PaintHeader(Drawing& drawing, int column, Area place);
 
  private:
   HFONT Letters(bool bold) const;
+  Area TextRoom(const ListRow& row, int cell, Area place) const;
   void PaintCell(Drawing& drawing, const ListRow& row, int cell, Area place);
   void PaintIcon(Drawing& drawing, int number, Area place);
   void PaintHeaderIcon(Drawing& drawing, int number, Area header);

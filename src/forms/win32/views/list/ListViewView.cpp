@@ -1,4 +1,4 @@
-#include "forms/win32/views/ListViewView.h"
+#include "forms/win32/views/list/ListViewView.h"
 
 #include "forms/view/Accessible.h"
 #include "forms/view/Keyboard.h"
@@ -58,8 +58,11 @@ void ListViewView::Paint(Drawing& drawing) {
 
 void ListViewView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Font)) SetRowHeight();
-  if (aspect == Aspect::All) ColumnsChanged();
-  if (aspect == Aspect::Geometry) columns_->Fit(List(), Context().scale);
+  if (aspect == Aspect::All) {
+    ColumnsChanged();
+    RowsDue(0);
+  }
+  if (aspect == Aspect::Geometry) FitColumns();
   if (aspect == Aspect::Font) FitRows();
   if (aspect == Aspect::Selection) ShowSelection();
 }
@@ -80,17 +83,29 @@ void ListViewView::SetRowHeight() {
   Inner().Send(WM_WINDOWPOSCHANGED, 0, reinterpret_cast<LPARAM>(&same));
 }
 
+void ListViewView::Due() {
+  if (!std::exchange(telling_, true)) ::PostMessageW(Inner().Window(), kTell, 0, 0);
+}
+
 void ListViewView::RowsDue(int from) {
-  RedrawFrom(from);
-  if (!std::exchange(rowsDue_, true)) ::PostMessageW(Inner().Window(), kTellRows, 0, 0);
+  rowsDue_ = true;
+  due_.AddFrom(from);
+  Due();
+}
+
+void ListViewView::Tell() {
+  if (!TheControl() || !telling_) return;
+  if (std::exchange(columnsDue_, false)) TellColumns();
+  if (std::exchange(rowsDue_, false)) TellRows();
+  RedrawDue();
+  telling_ = false;
 }
 
 void ListViewView::TellRows() {
-  if (!TheControl() || !std::exchange(rowsDue_, false)) return;
-  Quietly([this] {
-    Inner().Send(LVM_SETITEMCOUNT, static_cast<WPARAM>(List().Count()),
-                 LVSICF_NOINVALIDATEALL | LVSICF_NOSCROLL);
-  });
+  if (std::exchange(told_, List().Count()) != List().Count())
+    Quietly([this] {
+      Inner().Send(LVM_SETITEMCOUNT, static_cast<WPARAM>(told_), LVSICF_NOINVALIDATEALL | LVSICF_NOSCROLL);
+    });
   ShowSelection();
 }
 
@@ -102,18 +117,8 @@ void ListViewView::RowsCleared() { RowsDue(0); }
 
 // Texts are asked for when they are drawn, so a change costs no more than the cell's place on the screen.
 void ListViewView::RowChanged(int index, int cell) {
-  if (cell >= static_cast<int>(List().Columns().size())) return;
-  Area place = PlaceOfRow(index - 1);
-  const Extent inside = Inner().Inside();
-  if (place.Bottom() <= painter_.HeaderHeight() || place.corner.top >= inside.height) return;
-  RECT due{0, place.corner.top, place.Right(), place.Bottom()};
-  RECT part{};
-  // The system counts the pixels of a mirrored window from its right edge, as columns do.
-  due.left = -::GetScrollPos(Inner().Window(), SB_HORZ);
-  for (int column = 0; column < cell; ++column) due.left += columns_->WidthOf(column);
-  due.right = due.left + columns_->WidthOf(cell);
-  const RECT all{0, 0, inside.width, inside.height};
-  if (::IntersectRect(&part, &due, &all)) ::InvalidateRect(Inner().Window(), &part, FALSE);
+  due_.Add(index - 1, cell);
+  Due();
 }
 
 void ListViewView::RowsMoved() {
@@ -122,12 +127,19 @@ void ListViewView::RowsMoved() {
 }
 
 void ListViewView::ColumnsChanged() {
+  columnsDue_ = true;
+  Due();
+}
+
+void ListViewView::TellColumns() {
   Quietly([this] { columns_->SetUp(List(), Context().scale); });
-  rowsDue_ = true;
-  TellRows();
   FitRows();
   Inner().Redraw();
   header_->Redraw();
+}
+
+void ListViewView::FitColumns() {
+  if (!columnsDue_) columns_->Fit(List(), Context().scale);
 }
 
 void ListViewView::ShowSelection() {
@@ -151,8 +163,10 @@ void ListViewView::ShowSelection() {
       Inner().Send(LVM_SCROLL, 0, beside * painter_.RowHeight());
   });
   const int before = std::exchange(shown_, row);
-  RedrawRow(before);
-  RedrawRow(row);
+  if (before == row) return;
+  due_.Add(before);
+  due_.Add(row);
+  Due();
 }
 
 int ListViewView::TopRow() const { return static_cast<int>(Inner().Send(LVM_GETTOPINDEX)); }
@@ -162,17 +176,26 @@ Area ListViewView::PlaceOfRow(int row) const {
   return {{0, painter_.HeaderHeight() + (row - TopRow()) * height}, {Inner().Inside().width, height}};
 }
 
-void ListViewView::RedrawRow(int row) const {
-  if (row < 0) return;
-  const Area place = PlaceOfRow(row);
-  const RECT due{0, place.corner.top, place.Right(), place.Bottom()};
-  ::InvalidateRect(Inner().Window(), &due, FALSE);
+RowsInSight ListViewView::InSight() const {
+  RowsInSight sight;
+  sight.top = TopRow();
+  sight.first = PlaceOfRow(sight.top);
+  const int height = sight.first.extent.height;
+  sight.count = (Inner().Inside().height - sight.first.corner.top + height - 1) / height;
+  // The system counts the pixels of a mirrored window from its right edge, as columns do.
+  sight.cells = columns_->CellsOf(static_cast<int>(List().Columns().size()), height, Direction::LeftToRight);
+  return sight;
 }
 
-void ListViewView::RedrawFrom(int row) const {
-  const Extent inside = Inner().Inside();
-  const RECT due{0, PlaceOfRow(row).corner.top, inside.width, inside.height};
-  ::InvalidateRect(Inner().Window(), &due, FALSE);
+void ListViewView::RedrawDue() {
+  const HRGN region = ::CreateRectRgn(0, 0, 0, 0);
+  for (const Area& place : due_.Take(InSight())) {
+    const HRGN part = ::CreateRectRgn(place.corner.left, place.corner.top, place.Right(), place.Bottom());
+    ::CombineRgn(region, region, part, RGN_OR);
+    ::DeleteObject(part);
+  }
+  ::InvalidateRgn(Inner().Window(), region, FALSE);
+  ::DeleteObject(region);
 }
 
 Area ListViewView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kEdge); }

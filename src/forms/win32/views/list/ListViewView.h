@@ -1,8 +1,9 @@
 #pragma once
 
 #include "forms/win32/views/FieldView.h"
-#include "forms/win32/views/ListColumns.h"
-#include "forms/win32/views/ListPainter.h"
+#include "forms/win32/views/list/DueCells.h"
+#include "forms/win32/views/list/ListColumns.h"
+#include "forms/win32/views/list/ListPainter.h"
 
 namespace quendra::forms::win32 {
 
@@ -12,6 +13,7 @@ class ListViewView : public FieldView, public ListViewObserver {
  public:
   ListViewView(ViewContext& context, ListView& list, HWND parent);
   void Paint(Drawing& drawing) override;
+  Text TipAt(HWND window, Spot place) const override;
   void Release() override;
   void ControlGone() override;
 
@@ -34,7 +36,7 @@ class ListViewView : public FieldView, public ListViewObserver {
   void Apply(Aspect aspect) override;
 
  private:
-  static constexpr UINT kTellRows = WM_APP + 0x213;
+  static constexpr UINT kTell = WM_APP + 0x213;
 
   ListView& List() const { return static_cast<ListView&>(*TheControl()); }
   /// Changes the system's window without taking what it tells of for the user's choice.
@@ -44,19 +46,26 @@ class ListViewView : public FieldView, public ListViewObserver {
   std::optional<LRESULT> ToldByHeader(const NMHDR& notice);
   void TellText(NMHDR& notice) const;
   int Search(const NMHDR& notice) const;
+  LRESULT LeaveRoomForBar(WPARAM wParam, LPARAM lParam);
   LRESULT TakeMouse(UINT message, WPARAM wParam, LPARAM lParam);
   void Choose(int row);
-  /// The system's window hears of rows once for all changes of a handler: it counts and measures anew each
-  /// time, which takes milliseconds.
+  /// The system's window hears once of all that a handler changes: rows it counts and measures anew each
+  /// time, which takes milliseconds, and a call for each of hundreds of cells takes as long.
+  void Due();
   void RowsDue(int from);
+  void Tell();
+  void TellColumns();
+  void FitColumns();
   void TellRows();
+  void RedrawDue();
+  RowsInSight InSight() const;
   void SetRowHeight();
   /// The last row in sight is never cut: what a row more would need stays free.
   void FitRows();
   void ShowSelection();
-  void RedrawFrom(int row) const;
-  void RedrawRow(int row) const;
   int TopRow() const;
+  /// Not all systems move the whole of a mirrored window's inside when it scrolls.
+  void RedrawIfScrolled();
   void PaintRows();
   void PaintHeaders();
   void PaintRing(Drawing& drawing, int top) const;
@@ -67,8 +76,13 @@ class ListViewView : public FieldView, public ListViewObserver {
   std::optional<Surface> canvas_; ///< of one row
   bool quiet_ = false;
   bool fittingRows_ = false;
-  bool rowsDue_ = false;
-  int shown_ = -1; ///< the row that is drawn as selected
+  DueCells due_;
+  bool columnsDue_ = false;
+  bool rowsDue_ = false; ///< the system's window has not heard of all rows
+  bool telling_ = false; ///< it is about to hear of what is due
+  Spot scrolled_{};      ///< how far the rows were that were painted last
+  int told_ = 0;         ///< how many rows the system's window has heard of
+  int shown_ = -1;       ///< the row that is drawn as selected
 };
 
 } // namespace quendra::forms::win32

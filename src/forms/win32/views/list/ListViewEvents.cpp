@@ -2,7 +2,7 @@
 #include "forms/view/Keyboard.h"
 #include "forms/view/VisibleText.h"
 #include "forms/win32/input/MouseInput.h"
-#include "forms/win32/views/ListViewView.h"
+#include "forms/win32/views/list/ListViewView.h"
 
 #include <commctrl.h>
 
@@ -99,15 +99,17 @@ std::optional<LRESULT> ListViewView::AnswerInner(UINT message, WPARAM wParam, LP
   switch (message) {
   case WM_ERASEBKGND: return 1;
   case WM_PAINT:
-    TellRows();
+    Tell();
+    RedrawIfScrolled();
     PaintRows();
     return 0;
-  case kTellRows: TellRows(); return 0;
-  case WM_KEYDOWN: TellRows(); return std::nullopt;
+  case kTell: Tell(); return 0;
+  case WM_NCCALCSIZE: return LeaveRoomForBar(wParam, lParam);
+  case WM_KEYDOWN: Tell(); return std::nullopt;
   case WM_NOTIFY: return ToldByHeader(*reinterpret_cast<const NMHDR*>(lParam));
   case WM_SIZE: {
     const LRESULT answer = Inner().PassOn(message, wParam, lParam);
-    columns_->Fit(List(), Context().scale);
+    FitColumns();
     FitRows();
     Inner().Redraw();
     return answer;
@@ -132,6 +134,16 @@ std::optional<LRESULT> ListViewView::AnswerInner(UINT message, WPARAM wParam, LP
 
 // The window's own way would keep the thread to itself as long as the button is held, and give up the choice
 // in places without a row.
+// Not all systems find the side of the bar where a mirrored window stands in one that isn't.
+LRESULT ListViewView::LeaveRoomForBar(WPARAM wParam, LPARAM lParam) {
+  RECT& place = *reinterpret_cast<RECT*>(lParam); // which the longer record begins with
+  const RECT before = place;
+  const LRESULT answer = Inner().PassOn(WM_NCCALCSIZE, wParam, lParam);
+  if (ReadingDirection() == Direction::RightToLeft && place.left == before.left)
+    ::OffsetRect(&place, before.right - place.right, 0);
+  return answer;
+}
+
 LRESULT ListViewView::TakeMouse(UINT message, WPARAM /*wParam*/, LPARAM lParam) {
   if (message == WM_LBUTTONUP || message == WM_RBUTTONUP) {
     if (::GetCapture() == Inner().Window()) ::ReleaseCapture();
@@ -170,7 +182,10 @@ std::optional<LRESULT> ListViewView::AnswerHeader(UINT message, WPARAM wParam, L
   if (!TheControl()) return std::nullopt;
   switch (message) {
   case WM_ERASEBKGND: return 1;
-  case WM_PAINT: PaintHeaders(); return 0;
+  case WM_PAINT:
+    Tell();
+    PaintHeaders();
+    return 0;
   case HDM_LAYOUT: {
     const LRESULT answer = header_->PassOn(message, wParam, lParam);
     const auto& layout = *reinterpret_cast<const HDLAYOUT*>(lParam);

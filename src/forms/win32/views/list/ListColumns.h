@@ -25,7 +25,11 @@ class ListColumns {
   std::vector<Area> CellsOf(int count, int height, Direction direction) const;
 
  private:
+  void Put(std::size_t number, const Text& name, int width);
+  std::vector<int> Widths(const ListView& list, const Scale& scale) const;
+
   const InnerWindow& window_;
+  std::vector<Text> names_;
   bool sizedByHand_ = false;
   bool fitting_ = false;
 };

@@ -1,7 +1,8 @@
 #include "forms/view/Palette.h"
-#include "forms/win32/views/ListViewView.h"
+#include "forms/win32/views/list/ListViewView.h"
 
 #include <algorithm>
+#include <utility>
 
 // How a list's windows are drawn: a row or the headers at once, put together before they are shown.
 
@@ -21,9 +22,15 @@ class PlainPainting {
   PlainPainting& operator=(const PlainPainting&) = delete;
 
   const RECT& Due() const { return paint_.rcPaint; }
+  /// Whether any part of a place is due.
+  bool IsDue(Area place) const {
+    const RECT line{place.corner.left, place.corner.top, place.Right(), place.Bottom()};
+    return ::RectVisible(device_, &line) != 0;
+  }
   void Show(const Surface& surface, int top) const {
     ::SetViewportOrgEx(device_, 0, top, nullptr);
     surface.ShowOn(device_, {{}, surface.Size()});
+    ::SetViewportOrgEx(device_, 0, 0, nullptr);
   }
 
  private:
@@ -32,7 +39,19 @@ class PlainPainting {
   HDC device_;
 };
 
+LONG LeftOnScreen(HWND window) {
+  RECT inside{};
+  ::GetClientRect(window, &inside);
+  ::MapWindowPoints(window, nullptr, reinterpret_cast<POINT*>(&inside), 2);
+  return inside.left;
+}
+
 } // namespace
+
+void ListViewView::RedrawIfScrolled() {
+  const Spot now{::GetScrollPos(Inner().Window(), SB_HORZ), TopRow()};
+  if (std::exchange(scrolled_, now) != now) Inner().Redraw();
+}
 
 void ListViewView::PaintRows() {
   const PlainPainting painting(Inner().Window());
@@ -44,11 +63,30 @@ void ListViewView::PaintRows() {
   const int topRow = TopRow();
   const int from = std::max(0, static_cast<int>(painting.Due().top) - header) / height;
   for (int line = from; header + line * height < painting.Due().bottom; ++line) {
+    if (!painting.IsDue({{0, header + line * height}, place.extent})) continue;
     Drawing drawing(*canvas_, {}, place);
     painter_.PaintRow(drawing, topRow + line, place, cells);
     PaintRing(drawing, line * height);
     painting.Show(*canvas_, header + line * height);
   }
+}
+
+Text ListViewView::TipAt(HWND window, Spot place) const {
+  const int count = static_cast<int>(List().Columns().size());
+  const auto cells = columns_->CellsOf(count, painter_.RowHeight(), ReadingDirection());
+  const bool ofHeader = window == Header();
+  // The header's window is moved with what is scrolled.
+  if (ofHeader) place.left += static_cast<int>(LeftOnScreen(window) - LeftOnScreen(Inner().Window()));
+  const int row = TopRow() + (place.top - painter_.HeaderHeight()) / painter_.RowHeight();
+  for (int column = 0; column < count; ++column) {
+    const Area& cell = cells[static_cast<std::size_t>(column)];
+    if (place.left < cell.corner.left || place.left >= cell.Right()) continue;
+    if (ofHeader) return painter_.CutText(List().Columns()[static_cast<std::size_t>(column)], cell);
+    if (place.top < painter_.HeaderHeight() || row >= List().Count()) return {};
+    const ListRow& shown = List().Row(row + 1);
+    return column <= shown.CellCount() ? painter_.CutText(shown, column, cell) : Text();
+  }
+  return {};
 }
 
 /// The part of the ring round all rows that lies `top` pixels below the first.

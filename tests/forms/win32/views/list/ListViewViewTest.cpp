@@ -1,10 +1,56 @@
-#include "forms/win32/views/ListViewView.h"
+#include "forms/win32/views/list/ListViewView.h"
 #include "forms/view/ListLook.h"
 #include "forms/win32/views/ViewFixture.h"
 
 #include <commctrl.h>
 
 namespace quendra::forms::win32 {
+
+/// Looks at a part of a window again and again, while the window's own thread draws.
+class Watcher {
+ public:
+  Watcher(HWND window, Area part)
+      : window_(window), part_(part), seen_(part.extent),
+        thread_(::CreateThread(nullptr, 0, Run, this, 0, nullptr)) {}
+  ~Watcher() { End(); }
+  Watcher(const Watcher&) = delete;
+  Watcher& operator=(const Watcher&) = delete;
+
+  void End() {
+    if (!thread_) return;
+    ::InterlockedExchange(&over_, 1);
+    ::WaitForSingleObject(thread_, INFINITE);
+    ::CloseHandle(std::exchange(thread_, nullptr));
+  }
+  int Looks() const { return looks_; }
+  /// How often it had one colour.
+  int Blanks() const { return blanks_; }
+
+ private:
+  static DWORD WINAPI Run(void* watcher) noexcept {
+    auto& self = *static_cast<Watcher*>(watcher);
+    while (!self.over_) self.Look();
+    return 0;
+  }
+  void Look() {
+    const HDC device = ::GetDC(window_);
+    ::SetLayout(device, 0);
+    const auto [width, height] = part_.extent;
+    ::BitBlt(seen_.Dc(), 0, 0, width, height, device, part_.corner.left, part_.corner.top, SRCCOPY);
+    ::ReleaseDC(window_, device);
+    const auto pixels = seen_.Pixels();
+    ++looks_;
+    if (std::equal(pixels.begin() + 1, pixels.end(), pixels.begin())) ++blanks_;
+  }
+
+  HWND window_;
+  Area part_;
+  Surface seen_;
+  LONG volatile over_ = 0;
+  int looks_ = 0;
+  int blanks_ = 0;
+  HANDLE thread_;
+};
 
 class TableWindow : public ViewFixture {
  protected:
@@ -48,6 +94,37 @@ class TableWindow : public ViewFixture {
   }
   /// In the pixels of the system's window, whose own places count from the right.
   Spot MiddleOf(int row) { return {20, View().PlaceOfRow(row).corner.top + RowHeight() / 2}; }
+
+  /// Handles what the view has posted to the system's window, and nothing else.
+  void TellDue() {
+    MSG message{};
+    while (::PeekMessageW(&message, Inner(list), WM_APP, 0xBFFF, PM_REMOVE)) ::DispatchMessageW(&message);
+  }
+  /// Of the columns that are 100 pixels wide, counted from the right as the system's window does.
+  bool IsDue(int row, int cell) {
+    const HRGN region = ::CreateRectRgn(0, 0, 0, 0);
+    ::GetUpdateRgn(Inner(list), region, FALSE);
+    const int middle = View().PlaceOfRow(row).corner.top + RowHeight() / 2;
+    const bool due = ::PtInRegion(region, 100 * cell + 50, middle) != 0;
+    ::DeleteObject(region);
+    return due;
+  }
+  RECT OnScreen() {
+    RECT window{};
+    ::GetWindowRect(Inner(list), &window);
+    return window;
+  }
+  /// Pixels between the window's left or right edge and what rows have.
+  LONG BarBeside(bool left) {
+    const RECT window = OnScreen();
+    RECT rows{};
+    ::GetClientRect(Inner(list), &rows);
+    ::MapWindowPoints(Inner(list), nullptr, reinterpret_cast<POINT*>(&rows), 2);
+    return left ? rows.left - window.left : window.right - rows.right;
+  }
+  static bool IsGround(Colour colour) {
+    return colour == RowGround(0, false) || colour == RowGround(1, false) || colour == RowGround(0, true);
+  }
 
   ImageList icons{form, u"icons"};
   ListView list{form, u"main_ListView1"};
@@ -277,12 +354,72 @@ TEST_F(TableWindow, A_leading_cell_stands_at_the_right_edge_of_a_mirrored_form_a
   EXPECT_TRUE(isBlue(PixelIn(Inner(list), right - 8 - 3, middle)));
 }
 
+TEST_F(TableWindow, The_bar_of_many_rows_stands_at_the_left_of_a_mirrored_list_and_takes_the_mouse) {
+  for (const bool fromRight : {true, false}) {
+    form.RightToLeft = fromRight;
+    for (int i = list.Count(); i < 300; ++i) AddRow(DecimalText(1000 + i));
+    Show();
+    Settle();
+
+    EXPECT_GT(BarBeside(fromRight), 0) << fromRight;
+    EXPECT_EQ(BarBeside(!fromRight), 0) << fromRight;
+    const RECT window = OnScreen();
+    const LONG bar = fromRight ? window.left + 5 : window.right - 5;
+    EXPECT_EQ(Ask(WM_NCHITTEST, 0, MAKELPARAM(bar, window.top + 100)), HTVSCROLL) << fromRight;
+    desktop.Unload(form);
+  }
+}
+
+TEST_F(TableWindow, No_part_of_a_mirrored_list_stays_undrawn_whatever_rows_and_size_it_has) {
+  Show();
+  for (const int rows : {0, 300, 3, 300, 0})
+    for (const int width : {6000, 4500, 5250}) {
+      list.Clear();
+      list.Move(0, 0, width, 4500);
+      for (int i = 0; i < rows; ++i) AddRow(DecimalText(1000 + i));
+      Settle();
+      Ask(LVM_SCROLL, 0, 100 * RowHeight());
+
+      EXPECT_EQ(BarBeside(true) > 0, rows == 300) << rows;
+      EXPECT_EQ(BarBeside(false), 0) << rows;
+      const RECT window = OnScreen();
+      for (const LONG left : {window.right - window.left - 1, BarBeside(true)})
+        for (LONG top = HeaderHeight(); top < window.bottom - window.top; top += 5 * RowHeight())
+          EXPECT_TRUE(IsGround(PixelIn(Inner(list), left, top + 1))) << rows << " " << left << " " << top;
+    }
+}
+
+TEST_F(TableWindow, A_mirrored_list_that_scrolls_leaves_nothing_of_what_was_there) {
+  Show();
+  for (int i = 0; i < 300; ++i) AddRow(DecimalText(1000 + i));
+  Settle();
+  ::UpdateWindow(Inner(list));
+  const auto onScreen = [this](int left, int line) {
+    const HDC device = ::GetDC(Inner(list));
+    ::SetLayout(device, 0);
+    const Colour pixel = ::GetPixel(device, left, HeaderHeight() + line * RowHeight() + 2);
+    ::ReleaseDC(Inner(list), device);
+    return pixel;
+  };
+  ASSERT_EQ(onScreen(0, 0), RowGround(0, true));
+
+  for (const int rows : {3, -1}) {
+    ::SendMessageW(Inner(list), LVM_SCROLL, 0, rows * RowHeight());
+    ::UpdateWindow(Inner(list));
+    const int top = static_cast<int>(::SendMessageW(Inner(list), LVM_GETTOPINDEX, 0, 0));
+    for (const int left : {0, Inside().width - 1})
+      for (int line = 0; line < 5; ++line)
+        EXPECT_EQ(onScreen(left, line), RowGround(top + line, false)) << rows << " " << left << " " << line;
+  }
+}
+
 TEST_F(TableWindow, A_changed_cell_is_due_and_nothing_else) {
   Show();
   for (int i = 0; i < 10; ++i) AddRow(DecimalText(i));
   ::UpdateWindow(Inner(list));
 
   list.Row(3).SetCellText(1, u".443.");
+  TellDue();
 
   RECT due{};
   EXPECT_TRUE(::GetUpdateRect(Inner(list), &due, FALSE));
@@ -298,9 +435,46 @@ TEST_F(TableWindow, A_row_of_5000_that_changes_out_of_sight_is_not_drawn) {
   ::UpdateWindow(Inner(list));
 
   list.Row(4900).SetCellText(1, u".443.");
+  TellDue();
 
   RECT due{};
   EXPECT_FALSE(::GetUpdateRect(Inner(list), &due, FALSE));
+}
+
+TEST_F(TableWindow, Hundreds_of_changes_of_a_handler_are_due_at_once_with_those_in_sight_alone) {
+  Show();
+  for (int i = 0; i < 300; ++i) AddRow(DecimalText(i));
+  Settle();
+  ::UpdateWindow(Inner(list));
+
+  for (int row = 3; row <= 300; row += 2) list.Row(row).SetCellText(1, u".443.");
+  EXPECT_FALSE(::GetUpdateRect(Inner(list), nullptr, FALSE));
+  TellDue();
+
+  EXPECT_FALSE(IsDue(0, 1));
+  EXPECT_FALSE(IsDue(1, 1));
+  EXPECT_TRUE(IsDue(2, 1));
+  EXPECT_FALSE(IsDue(2, 0));
+  EXPECT_FALSE(IsDue(3, 1));
+  EXPECT_TRUE(IsDue(4, 1));
+}
+
+TEST_F(TableWindow, No_row_turns_blank_while_all_are_drawn_anew) {
+  Show();
+  for (int i = 0; i < 300; ++i) AddRow(DecimalText(1000 + i));
+  Settle();
+  ::UpdateWindow(Inner(list));
+
+  Watcher watcher(Inner(list), View().PlaceOfRow(3));
+  for (int pass = 0; pass < 60; ++pass) {
+    for (int row = 1; row <= 300; ++row) list.Row(row).SetCellText(1, DecimalText(1000 + pass));
+    TellDue();
+    ::RedrawWindow(Inner(list), nullptr, nullptr, RDW_ERASE | RDW_INVALIDATE | RDW_UPDATENOW);
+  }
+  watcher.End();
+
+  EXPECT_GT(watcher.Looks(), 60);
+  EXPECT_EQ(watcher.Blanks(), 0);
 }
 
 TEST_F(TableWindow, Texts_are_read_without_harmful_signs_and_an_icon_alone_by_its_key) {
