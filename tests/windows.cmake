@@ -20,7 +20,8 @@ endif()
 quendra_test(app/windows quendra_app quendra_forms_win32 quendra_platform_windows)
 set(as_shipped ${CMAKE_CURRENT_BINARY_DIR}/as_shipped.rc)
 file(GENERATE OUTPUT ${as_shipped} CONTENT "1 24 \"${PROJECT_SOURCE_DIR}/src/app/windows/quendra.manifest\"\n")
-set_tests_properties(app/windows/part_1 PROPERTIES TIMEOUT 1200) # thousands of passes and changes of the page
+# Thousands of passes and changes of the page, and times that are taken.
+set_tests_properties(app/windows/part_1 PROPERTIES TIMEOUT 1200 RUN_SERIAL TRUE)
 target_sources(app_windows_test PRIVATE forms/win32/Win32DriverFixture.cpp ${as_shipped})
 add_subdirectory(app/windows/programs)
 add_subdirectory(standins/windows/planted)
