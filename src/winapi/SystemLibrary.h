@@ -32,6 +32,12 @@ class SystemLibrary {
   HMODULE module_ = nullptr;
 };
 
+/// The same, put into `call`, a pointer to a function; false where there is none.
+template <typename Call> bool Find(const SystemLibrary& library, const char* name, Call*& call) {
+  call = library.Find<Call>(name);
+  return call != nullptr;
+}
+
 /// The system's folder, without a separator behind it. Empty where the system doesn't tell.
 Text SystemFolder();
 

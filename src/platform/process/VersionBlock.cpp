@@ -8,7 +8,7 @@ namespace quendra::platform {
 
 namespace {
 
-using Bytes = std::span<const std::uint8_t>;
+using Block = std::span<const std::uint8_t>;
 
 constexpr std::size_t kHeaderBytes = 6;
 constexpr std::size_t kValueLengthAt = 2;
@@ -29,7 +29,7 @@ struct Node {
 };
 
 /// Up to the NUL or to the end.
-Text CharactersAt(Bytes block, std::size_t at, std::size_t end) {
+Text CharactersAt(Block block, std::size_t at, std::size_t end) {
   Text text;
   for (; end - at >= kUnit && Little16(block, at) != 0; at += kUnit)
     text.push_back(static_cast<char16_t>(Little16(block, at)));
@@ -37,7 +37,7 @@ Text CharactersAt(Bytes block, std::size_t at, std::size_t end) {
 }
 
 /// The node at a place; nothing where none fits before `end`.
-std::optional<Node> NodeAt(Bytes block, std::size_t at, std::size_t end) {
+std::optional<Node> NodeAt(Block block, std::size_t at, std::size_t end) {
   if (at > end || end - at < kHeaderBytes) return {};
   const std::size_t length = Little16(block, at);
   if (length < kHeaderBytes || length > end - at) return {};
@@ -53,7 +53,7 @@ std::optional<Node> NodeAt(Bytes block, std::size_t at, std::size_t end) {
   return node;
 }
 
-std::optional<Node> NodeOfName(Bytes block, const Node& parent, TextView name) {
+std::optional<Node> NodeOfName(Block block, const Node& parent, TextView name) {
   std::size_t at = parent.nodes;
   for (auto node = NodeAt(block, at, parent.end); node; node = NodeAt(block, at, parent.end)) {
     if (SameIgnoringCase(node->name, name)) return node;
@@ -62,9 +62,9 @@ std::optional<Node> NodeOfName(Bytes block, const Node& parent, TextView name) {
   return {};
 }
 
-std::vector<std::uint8_t> ValueOf(Bytes block, const Node& node) {
+std::vector<std::uint8_t> ValueOf(Block block, const Node& node) {
   if (!node.isText) {
-    const Bytes value = block.subspan(node.value, node.valueEnd - node.value);
+    const Block value = block.subspan(node.value, node.valueEnd - node.value);
     return {value.begin(), value.end()};
   }
   const std::string text = ToCodePage(CharactersAt(block, node.value, node.valueEnd));
@@ -75,7 +75,7 @@ std::vector<std::uint8_t> ValueOf(Bytes block, const Node& node) {
 
 } // namespace
 
-std::optional<std::vector<std::uint8_t>> ValueOfVersionBlock(Bytes block, TextView path) {
+std::optional<std::vector<std::uint8_t>> ValueOfVersionBlock(Block block, TextView path) {
   std::optional<Node> node = NodeAt(block, 0, block.size());
   while (node && !path.empty()) {
     const std::size_t end = std::min(path.find(u'\\'), path.size());

@@ -1,18 +1,6 @@
 #include "platform/windows/capture/WpcapLibrary.h"
 
-#include <type_traits>
-
 namespace quendra::platform::windows {
-
-namespace {
-
-template <typename Function>
-bool Find(const winapi::SystemLibrary& library, const char* name, Function& function) {
-  function = library.Find<std::remove_pointer_t<Function>>(name);
-  return function != nullptr;
-}
-
-} // namespace
 
 std::vector<Text> WpcapLibrary::UsualPaths() {
   const Text folder = winapi::SystemFolder();

@@ -1,7 +1,5 @@
 #include "platform/windows/icmp/IcmpLibrary.h"
 
-#include <type_traits>
-
 namespace quendra::platform::windows {
 
 namespace {
@@ -10,11 +8,6 @@ winapi::SystemLibrary LibraryWithEchoes() {
   winapi::SystemLibrary helper(L"iphlpapi.dll");
   if (helper.Find<void()>("IcmpSendEcho")) return helper;
   return winapi::SystemLibrary(L"icmp.dll");
-}
-
-template <typename Call> bool Find(const winapi::SystemLibrary& library, const char* name, Call& call) {
-  call = library.Find<std::remove_pointer_t<Call>>(name);
-  return call != nullptr;
 }
 
 } // namespace

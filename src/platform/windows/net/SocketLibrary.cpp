@@ -1,17 +1,6 @@
 #include "platform/windows/net/SocketLibrary.h"
 
-#include <type_traits>
-
 namespace quendra::platform::windows {
-
-namespace {
-
-template <typename Call> bool Find(const winapi::SystemLibrary& library, const char* name, Call& call) {
-  call = library.Find<std::remove_pointer_t<Call>>(name);
-  return call != nullptr;
-}
-
-} // namespace
 
 SocketLibrary::SocketLibrary(const wchar_t* fileName) : library_(fileName), isThere_(FindAll()) {}
 

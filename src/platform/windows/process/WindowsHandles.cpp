@@ -7,15 +7,17 @@
 
 namespace quendra::platform::windows {
 
-namespace {
-
-constexpr std::uint32_t kStatusPending = 0x103;
-
-// As the native interface has them, under names of ours: the system's headers tell them apart by version.
+/// What the native interface says of an operation's end.
 struct StatusBlock {
   std::uint32_t status;
   std::uint32_t information;
 };
+
+namespace {
+
+constexpr std::uint32_t kStatusPending = 0x103;
+
+// Under names of ours, as is the block: the system's headers tell them apart by version.
 using QuerySystem = LONG NTAPI(ULONG informationClass, void* buffer, ULONG length, ULONG* returned);
 using QueryObject = LONG NTAPI(HANDLE handle, ULONG informationClass, void* buffer, ULONG length,
                                ULONG* returned);

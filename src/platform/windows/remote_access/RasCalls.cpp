@@ -2,15 +2,6 @@
 
 namespace quendra::platform::windows {
 
-namespace {
-
-template <typename Function>
-void Find(const winapi::SystemLibrary& library, const char* name, Function*& call) {
-  call = library.Find<Function>(name);
-}
-
-} // namespace
-
 RasCalls::RasCalls(Load load) : load_(std::move(load)) {}
 
 const RasCalls::Table& RasCalls::Calls() {
