@@ -1,5 +1,7 @@
 #include "platform/linux/capture/LinuxCaptureFixture.h"
 
+#include <unistd.h>
+
 #include <cstring>
 
 namespace quendra::platform::linux_ {
@@ -17,11 +19,14 @@ class LinuxCaptureEventsTest : public LinuxCaptureFixture {
     LinuxCaptureFixture::SetUp();
     if (!IsSkipped()) Start("qv0");
   }
-  /// A burst that arrives as one block.
+  /// A burst that the loop finds as one arrival: where the kernel's clock ended a block in the midst of it,
+  /// the next block has been handed over, too.
   void SendTcp(unsigned count) {
     std::vector<Bytes> frames;
     for (unsigned i = 0; i < count; ++i) frames.push_back(TcpFrame(1025 + i, 80));
     RawLink("qv1").SendTogether(std::move(frames));
+    constexpr useconds_t kTwoBlocks = 40'000;
+    ::usleep(kTwoBlocks);
   }
   void WaitForEvents(int count) {
     WaitUntil([&] { return events >= count; }, "events");
