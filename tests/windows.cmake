@@ -9,7 +9,7 @@ foreach(test platform_test provisioning_test)
   add_dependencies(${test} standin_rasapi32) # which it loads
 endforeach()
 target_link_libraries(foundation_test PRIVATE quendra_platform_windows ws2_32)
-target_sources(foundation_test PRIVATE platform/windows/WindowsLoopFixture.cpp)
+target_sources(foundation_test PRIVATE platform/windows/WindowsLoopFixture.cpp platform/windows/WineDeviationsTest.cpp)
 add_subdirectory(standins/windows/wpcap)
 add_dependencies(platform_test standin_wpcap) # which it loads
 quendra_test(forms/win32 quendra_forms_win32)

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "TestName.h"
 #include "foundation/WorldFixture.h"
 
 #include "runtime/Fault.h"
@@ -14,6 +15,10 @@ namespace quendra::foundation {
 /// One suite of behaviour for the simulated network and for real sockets on loopback.
 class SocketSuite : public testing::TestWithParam<MakeWorld> {
  protected:
+  void SetUp() override {
+    const std::string why = world->WhyNot(NameOfTest(*testing::UnitTest::GetInstance()->current_test_info()));
+    if (!why.empty()) GTEST_SKIP() << why;
+  }
   /// An index that is connected, and the far end of its connection.
   std::unique_ptr<FarEnd> Connected(const Variant& index = 1) {
     program->ArrayAdd(index);

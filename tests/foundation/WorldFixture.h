@@ -48,6 +48,8 @@ class World {
       : desktop_(std::move(desktop)), Desktop(*desktop_) {}
   virtual ~World() = default;
 
+  /// Why a test, "Suite.Name", can't be passed in it; empty for most.
+  virtual std::string WhyNot(const std::string& /*test*/) const { return {}; }
   virtual platform::Sockets& Sockets() = 0;
   virtual platform::HostNames& Names() = 0;
   virtual std::unique_ptr<FarServer> Listen() = 0;

@@ -28,6 +28,15 @@ int Best(const char* what, std::vector<int> figures) {
   return figures.front();
 }
 
+void ReadListOfProcesses(platform::Processes& processes) {
+  const platform::Handle snapshot = processes.CreateToolhelp32Snapshot(platform::Processes::kSnapProcess, 0);
+  platform::Processes::Entry entry;
+  for (bool more = processes.Process32First(snapshot, entry); more;
+       more = processes.Process32Next(snapshot, entry)) {
+  }
+  processes.CloseHandle(snapshot);
+}
+
 TEST(Speed, The_splash_is_painted_within_a_second_of_the_birth_of_the_process) {
   std::vector<int> figures;
   for (int i = 0; i < 5; ++i) {
@@ -63,16 +72,14 @@ TEST(Speed, A_pass_of_the_table_with_300_processes_takes_less_than_20_millisecon
   std::vector<int> passes, lists;
   for (int i = 0; i < kPasses; ++i) {
     passes.push_back(Milliseconds(pass));
-    lists.push_back(Milliseconds([&] {
-      platform::Processes& processes = machine.Operations().processes;
-      processes.CloseHandle(processes.CreateToolhelp32Snapshot(platform::Processes::kSnapProcess, 0));
-    }));
+    lists.push_back(Milliseconds([&] { ReadListOfProcesses(machine.Operations().processes); }));
   }
 
   std::cout << program.monitorPage.table.main_ListView1.Count() << " rows, the page came after " << first
             << " ms\n";
   EXPECT_GE(program.monitorPage.table.main_ListView1.Count(), static_cast<int>(kProcesses));
-  // Wine makes its list of processes by reading several files of each from the system below it.
+  // Wine makes its list of processes by reading several files of each from the system below it, and asks its
+  // server for each step through the list.
   const int ofWine = Best("the system's list of processes alone", lists);
   EXPECT_LT(Best("a pass", passes) - ofWine, 20);
 }

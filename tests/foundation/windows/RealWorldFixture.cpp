@@ -1,5 +1,6 @@
 #include "foundation/WorldFixture.h"
 #include "platform/windows/WindowsLoopFixture.h"
+#include "platform/windows/WineDeviations.h"
 #include "platform/windows/net/WindowsHostNames.h"
 #include "platform/windows/net/WindowsSockets.h"
 
@@ -149,6 +150,9 @@ class RealWorld : private Started, public World {
  public:
   RealWorld() : World(std::make_unique<platform::windows::WindowsLoop>()) {}
 
+  std::string WhyNot(const std::string& test) const override {
+    return platform::windows::WineDeviationIn(test);
+  }
   platform::Sockets& Sockets() override { return sockets_; }
   platform::HostNames& Names() override { return names_; }
   std::unique_ptr<FarServer> Listen() override { return std::make_unique<RealFarServer>(); }

@@ -1,5 +1,7 @@
 #include "platform/windows/WineDeviations.h"
 
+#include "TestName.h"
+
 #include <gtest/gtest.h>
 
 #include <set>
@@ -7,29 +9,36 @@
 namespace quendra::platform::windows {
 namespace {
 
-/// "Suite.Name" of every test in this executable, without what instances and parameters add.
+/// Every test in this executable.
 std::set<std::string> AllTests() {
   std::set<std::string> names;
   const testing::UnitTest& all = *testing::UnitTest::GetInstance();
   for (int i = 0; i < all.total_test_suite_count(); ++i) {
     const testing::TestSuite& suite = *all.GetTestSuite(i);
-    const std::string suiteName = suite.name();
-    for (int k = 0; k < suite.total_test_count(); ++k) {
-      const std::string name = suite.GetTestInfo(k)->name();
-      names.insert(suiteName.substr(suiteName.find('/') + 1) + "." + name.substr(0, name.find('/')));
-    }
+    for (int k = 0; k < suite.total_test_count(); ++k) names.insert(NameOfTest(*suite.GetTestInfo(k)));
   }
   return names;
 }
 
+bool HasSuiteOf(const std::set<std::string>& tests, std::string_view test) {
+  const std::string suite(test.substr(0, test.find('.') + 1));
+  return std::ranges::any_of(tests, [&](const std::string& each) { return each.starts_with(suite); });
+}
+
+// Runs in each executable with suites that the list names.
 TEST(WineDeviations, Name_tests_that_there_are_each_once_with_a_reason) {
   const std::set<std::string> tests = AllTests();
   std::set<std::string_view> named;
+  int here = 0;
   for (const WineDeviation& deviation : kWineDeviations) {
-    EXPECT_TRUE(tests.contains(std::string(deviation.test))) << deviation.test;
+    if (HasSuiteOf(tests, deviation.test)) {
+      EXPECT_TRUE(tests.contains(std::string(deviation.test))) << deviation.test;
+      ++here;
+    }
     EXPECT_TRUE(named.insert(deviation.test).second) << deviation.test;
     EXPECT_GT(deviation.why.size(), 20U) << deviation.test;
   }
+  EXPECT_GE(here, 3);
 }
 
 TEST(WineDeviations, Skip_no_test_that_they_do_not_name) {
