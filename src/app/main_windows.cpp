@@ -1,11 +1,11 @@
 #include "app/Program.h"
-#include "app/windows/TrustedLibraries.h"
 #include "forms/win32/Win32Desktop.h"
 #include "platform/windows/WindowsMachine.h"
+#include "winapi/TrustedLibraries.h"
 
 int WINAPI WinMain(HINSTANCE, HINSTANCE, char*, int) {
   using namespace quendra;
-  app::windows::TrustedLibraries libraries;
+  winapi::TrustedLibraries libraries;
   // By its name the installer knows that the program runs. It goes with the process.
   ::CreateMutexW(nullptr, FALSE, L"Local\\QuendraRuns");
   forms::win32::Win32Desktop desktop;

@@ -1,7 +1,7 @@
 #include "app/Program.h"
-#include "app/windows/TrustedLibraries.h"
 #include "forms/win32/Win32Desktop.h"
 #include "platform/windows/WindowsMachine.h"
+#include "winapi/TrustedLibraries.h"
 
 // The program's start, which ends with the number of milliseconds from the birth of the process until its
 // splash was painted.
@@ -38,7 +38,7 @@ bool IsOnScreen(const forms::Form& form) {
 } // namespace
 
 int WINAPI WinMain(HINSTANCE, HINSTANCE, char*, int) {
-  app::windows::TrustedLibraries libraries;
+  winapi::TrustedLibraries libraries;
   forms::win32::Win32Desktop desktop;
   platform::windows::WindowsMachine machine(desktop);
   app::Program program(machine.Operations(), desktop);

@@ -1,8 +1,8 @@
-#include "app/windows/TrustedLibraries.h"
+#include "winapi/TrustedLibraries.h"
 
 #include <commctrl.h>
 
-namespace quendra::app::windows {
+namespace quendra::winapi {
 
 namespace {
 
@@ -54,4 +54,4 @@ void TrustedLibraries::LoadTheOthers() {
   for (const wchar_t* name : kOthers) loaded_.emplace_back(name);
 }
 
-} // namespace quendra::app::windows
+} // namespace quendra::winapi

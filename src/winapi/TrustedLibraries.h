@@ -4,7 +4,7 @@
 
 #include <vector>
 
-namespace quendra::app::windows {
+namespace quendra::winapi {
 
 /// Keeps files out that lie beside the program, or in the folder that it works in, under the names of the
 /// system's libraries. We ask for each by its full path; the system's own ask for others by their mere names,
@@ -18,7 +18,7 @@ class TrustedLibraries {
   void LoadTheOthers();
 
  private:
-  std::vector<winapi::SystemLibrary> loaded_;
+  std::vector<SystemLibrary> loaded_;
 };
 
-} // namespace quendra::app::windows
+} // namespace quendra::winapi
