@@ -50,14 +50,15 @@ def of_googletest(case, folder):
 
 def results_of(whole, folder):
     """The tests that one test of CTest stands for: itself, or those that its process reported."""
-    report = folder / f"{whole.name}.xml"
-    if not report.exists():
+    name, part = os.path.split(whole.name)
+    if not part.startswith("part_"):
         return [whole]
-    name = os.path.dirname(whole.name)
-    parts = [of_googletest(case, name) for case in cases_of(report)]
+    parts = [of_googletest(case, name) for case in cases_of(folder / f"{whole.name}.xml")]
+    if not parts:
+        return [dataclasses.replace(whole, outcome="failed", output=whole.output + "\nit reported no test")]
     # A process can also end badly after its last test.
-    unexplained = whole.outcome != "passed" and not any(part.outcome == "failed" for part in parts)
-    return parts + [whole] if unexplained or not parts else parts
+    unexplained = whole.outcome != "passed" and not any(each.outcome == "failed" for each in parts)
+    return parts + [whole] if unexplained else parts
 
 
 def main():

@@ -300,20 +300,23 @@ TEST_F(RealNetworkManagerTest, One_that_stands_still_holds_a_question_up_for_sec
 }
 
 TEST_F(RealNetworkManagerTest, A_thousand_entries_are_listed_and_one_more_is_made_at_once) {
+  // Each is asked for among all before it: watched by sanitizers a fifth of them takes long enough.
+  constexpr std::uint32_t kEntries = kSanitized ? 200 : 1000;
   const double first = SecondsOf([&] { EXPECT_EQ(Put("entry", EntryFor("pppoe")), 0U); });
-  for (int i = 1; i < 1000; ++i) ASSERT_EQ(Put(("entry" + std::to_string(i)).c_str(), EntryFor("pppoe")), 0U);
+  for (std::uint32_t i = 1; i < kEntries; ++i)
+    ASSERT_EQ(Put(("entry" + std::to_string(i)).c_str(), EntryFor("pppoe")), 0U);
   const double last = SecondsOf([&] { EXPECT_EQ(Put("one more", EntryFor("pppoe")), 0U); });
 
   double listing = 60;
   for (int round = 0; round < 3; ++round) {
     FreshBook fresh;
-    listing = std::min(listing, SecondsOf([&] { EXPECT_EQ(fresh.Count(), 1001U); }));
+    listing = std::min(listing, SecondsOf([&] { EXPECT_EQ(fresh.Count(), kEntries + 1); }));
   }
-  const double again = SecondsOf([&] { EXPECT_EQ(Names().size(), 1001U); });
+  const double again = SecondsOf([&] { EXPECT_EQ(Names().size(), kEntries + 1); });
 
-  std::printf("first entry %.3f s, 1,001st %.3f s, listing 1,001: %.3f s for the first time (the best of "
+  std::printf("first entry %.3f s, one after %u %.3f s, listing all: %.3f s for the first time (the best of "
               "three), then %.3f s\n",
-              first, last, listing, again);
+              first, kEntries, last, listing, again);
   // At rest a third of this is enough; other tests run at the same time.
   constexpr double kListing = kSanitized ? 5 : 1;
   EXPECT_LT(last, first + kListing / 3);
