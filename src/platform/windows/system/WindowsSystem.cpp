@@ -58,7 +58,8 @@ void WindowsSystem::Sleep(std::uint32_t milliseconds) { ::Sleep(milliseconds); }
 
 void WindowsSystem::GetSystemInfo(SystemInfo& info) {
   SYSTEM_INFO told{};
-  ::GetSystemInfo(&told);
+  // The other call counts no more than 32 for a program of 32 bits on a system of 64.
+  ::GetNativeSystemInfo(&told);
   info.numberOfProcessors = told.dwNumberOfProcessors;
 }
 
