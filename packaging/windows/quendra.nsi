@@ -36,7 +36,8 @@ VIAddVersionKey /LANG=1037 "FileVersion" "${VERSION}"
 !define MUI_FINISHPAGE_TEXT "למדידת התעבורה דרושה ספריית לכידת מנות, שאינה חלק מהתקנה זו.$\r$\n\
 $\r$\nWindows XP: WinPcap 4.1.3, www.winpcap.org$\r$\nWindows 7 ואילך: Npcap, npcap.com$\r$\n\
 $\r$\nבלעדיה מוצגים התהליכים והיציאות שלהם בלבד."
-!define MUI_FINISHPAGE_RUN "$INSTDIR\quendra.exe"
+!define MUI_FINISHPAGE_RUN
+!define MUI_FINISHPAGE_RUN_FUNCTION StartForTheUser
 !insertmacro MUI_PAGE_FINISH
 !insertmacro MUI_UNPAGE_CONFIRM
 !insertmacro MUI_UNPAGE_INSTFILES
@@ -70,6 +71,11 @@ FunctionEnd
     Abort
   ${EndIf}
 !macroend
+
+; By the desktop, with the rights and the settings of whoever sits there, and not with the administrator's that we have.
+Function StartForTheUser
+  Exec '"$WINDIR\explorer.exe" "$INSTDIR\quendra.exe"'
+FunctionEnd
 
 Section
   SetShellVarContext all

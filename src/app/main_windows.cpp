@@ -5,6 +5,8 @@
 
 int WINAPI WinMain(HINSTANCE, HINSTANCE, char*, int) {
   using namespace quendra;
+  // A question about a drive without a disk fails; the system would hold the program up by a box of its own.
+  ::SetErrorMode(SEM_FAILCRITICALERRORS | SEM_NOOPENFILEERRORBOX);
   winapi::TrustedLibraries libraries;
   // By its name the installer knows that the program runs. It goes with the process.
   ::CreateMutexW(nullptr, FALSE, L"Local\\QuendraRuns");

@@ -29,6 +29,7 @@ class EventLoop {
                            std::uint32_t /*lParam*/) {}
   /// The number of the window messages of that name, the same for whoever asks; 0 on failure.
   virtual std::uint32_t RegisterWindowMessageA(const std::string& /*name*/) { return 0; }
+  /// Each tick runs the object that was handed over, no copy of it: it keeps what it remembers.
   [[nodiscard]] virtual std::unique_ptr<Subscription> StartTimer(int milliseconds,
                                                                  std::function<void()> tick) = 0;
   /// Handles what waits, without waiting for more.

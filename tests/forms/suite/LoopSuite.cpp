@@ -98,6 +98,13 @@ TEST_P(DesktopSuite, A_timer_ticks_until_its_subscription_goes) {
   EXPECT_EQ(ticks, before);
 }
 
+TEST_P(DesktopSuite, A_tick_keeps_what_it_remembers) {
+  int told = 0;
+  const auto timer = loop.StartTimer(1, [&told, own = 0]() mutable { told = ++own; });
+
+  EXPECT_TRUE(user->WaitUntil([&] { return told >= 3; }));
+}
+
 TEST_P(DesktopSuite, A_timer_may_end_in_its_own_tick) {
   int ticks = 0;
   std::unique_ptr<platform::EventLoop::Subscription> timer;

@@ -6,10 +6,12 @@
 
 #include <shellapi.h>
 #include <shlobj.h>
+#include <tlhelp32.h>
 
 #include <algorithm>
 #include <optional>
 #include <set>
+#include <vector>
 
 // The installer as a subscriber, or whoever looks after many machines, runs it.
 
@@ -199,6 +201,59 @@ TEST_F(InstallerTest, Is_mirrored_and_tells_on_its_last_page_where_the_capture_l
 
   EXPECT_TRUE(Tells(setup, u"npcap.com"));
   EXPECT_TRUE(Tells(setup, u"www.winpcap.org"));
+}
+
+/// All that run, with their names in small letters.
+std::vector<PROCESSENTRY32W> Processes() {
+  std::vector<PROCESSENTRY32W> found;
+  const HANDLE all = ::CreateToolhelp32Snapshot(TH32CS_SNAPPROCESS, 0);
+  PROCESSENTRY32W entry{};
+  entry.dwSize = sizeof entry;
+  for (BOOL more = ::Process32FirstW(all, &entry); more; more = ::Process32NextW(all, &entry)) {
+    ::CharLowerW(entry.szExeFile);
+    found.push_back(entry);
+  }
+  ::CloseHandle(all);
+  return found;
+}
+
+/// The names of those that a process has started and that still run.
+std::set<Text> ChildrenOf(DWORD process) {
+  std::set<Text> names;
+  for (const PROCESSENTRY32W& entry : Processes())
+    if (entry.th32ParentProcessID == process) names.insert(winapi::TextOf(entry.szExeFile));
+  return names;
+}
+
+/// Ends the program that somebody else has started; false when none runs.
+bool EndTheProgram() {
+  for (const PROCESSENTRY32W& entry : Processes()) {
+    if (winapi::TextOf(entry.szExeFile) != u"quendra.exe") continue;
+    const HANDLE program = ::OpenProcess(PROCESS_TERMINATE | SYNCHRONIZE, FALSE, entry.th32ProcessID);
+    ::TerminateProcess(program, 0);
+    const bool hasEnded = ::WaitForSingleObject(program, 10'000) == WAIT_OBJECT_0;
+    ::CloseHandle(program);
+    return hasEnded;
+  }
+  return false;
+}
+
+TEST_F(InstallerTest, Has_the_desktop_start_the_program_and_does_not_start_it_with_its_own_rights) {
+  const StartedProgram setup(Installer());
+  const auto window = [] { return ::FindWindowW(L"#32770", nullptr); };
+  ASSERT_TRUE(Until([&] { return ::IsWindowEnabled(::GetDlgItem(window(), IDOK)); }));
+  ::PostMessageW(window(), WM_COMMAND, IDOK, 0);
+  ASSERT_TRUE(Tells(setup, u"npcap.com"));
+
+  ::PostMessageW(window(), WM_COMMAND, IDOK, 0);
+
+  std::set<Text> started;
+  EXPECT_TRUE(Until([&] {
+    started.merge(ChildrenOf(setup.Id()));
+    return !setup.Runs();
+  }));
+  EXPECT_EQ(started, std::set<Text>{u"explorer.exe"});
+  EXPECT_TRUE(Until(EndTheProgram));
 }
 
 } // namespace

@@ -19,15 +19,15 @@ class LoopTimers::Running : public platform::EventLoop::Subscription {
 
 std::unique_ptr<platform::EventLoop::Subscription> LoopTimers::Start(int milliseconds, Tick tick) {
   const UINT_PTR number = ++table_->last;
-  table_->ticks[number] = std::move(tick);
+  table_->ticks[number] = std::make_shared<const Tick>(std::move(tick));
   auto running = std::make_unique<Running>(table_, number);
   ::SetTimer(table_->window, number, static_cast<UINT>(std::max(milliseconds, 1)), nullptr);
   return running;
 }
 
-LoopTimers::Tick LoopTimers::TickOf(UINT_PTR number) const {
+std::shared_ptr<const LoopTimers::Tick> LoopTimers::TickOf(UINT_PTR number) const {
   const auto found = table_->ticks.find(number);
-  return found == table_->ticks.end() ? Tick() : found->second;
+  return found == table_->ticks.end() ? nullptr : found->second;
 }
 
 } // namespace quendra::forms::win32

@@ -18,13 +18,14 @@ class LoopTimers {
   /// Subscriptions may outlive the loop.
   void Close() { table_->window = nullptr; }
   std::unique_ptr<platform::EventLoop::Subscription> Start(int milliseconds, Tick tick);
-  /// What runs at a tick of this timer; empty for one that has ended, of which a tick was on its way.
-  Tick TickOf(UINT_PTR number) const;
+  /// What runs at a tick of this timer, the same object each time, so that it keeps what it remembers;
+  /// nullptr for one that has ended, of which a tick was on its way.
+  std::shared_ptr<const Tick> TickOf(UINT_PTR number) const;
 
  private:
   struct Table {
     HWND window = nullptr;
-    std::map<UINT_PTR, Tick> ticks{};
+    std::map<UINT_PTR, std::shared_ptr<const Tick>> ticks{};
     UINT_PTR last = 0;
   };
   class Running;

@@ -68,7 +68,7 @@ void Win32EventLoop::Handle(UINT message, WPARAM wParam) {
     inForeignLoop_ = before;
     return;
   }
-  if (const LoopTimers::Tick tick = timers_.TickOf(wParam)) dispatcher_.Dispatch(tick);
+  if (const auto tick = timers_.TickOf(wParam)) dispatcher_.Dispatch(*tick);
 }
 
 void Win32EventLoop::Dispatch(const MSG& message) {

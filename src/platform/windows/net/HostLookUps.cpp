@@ -31,9 +31,15 @@ bool HostLookUps::Cancel(LookUpHandle handle) {
   const auto found = std::ranges::find_if(
       underWay_, [&](const LookUp& lookUp) { return lookUp.handle == handle && !lookUp.isCancelled; });
   if (found == underWay_.end()) return false;
-  library_.WSACancelAsyncRequest(found->request);
+  found->isStopped = library_.WSACancelAsyncRequest(found->request) == 0;
   found->isCancelled = true;
+  LetOldStoppedOnesGo();
   return true;
+}
+
+void HostLookUps::LetOldStoppedOnesGo() {
+  if (std::ranges::count_if(underWay_, &LookUp::isStopped) <= kMostStopped) return;
+  underWay_.erase(std::ranges::find_if(underWay_, &LookUp::isStopped));
 }
 
 void HostLookUps::OnEnd(HANDLE request, LPARAM result) {

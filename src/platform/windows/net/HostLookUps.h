@@ -5,6 +5,7 @@
 #include "platform/windows/net/SocketLibrary.h"
 
 #include <array>
+#include <cstddef>
 #include <list>
 #include <memory>
 
@@ -31,6 +32,12 @@ class HostLookUps {
   bool Cancel(LookUpHandle lookUp);
   void OnEnd(HANDLE request, LPARAM result);
 
+  /// How many the system may still write about: those under way, and cancelled ones.
+  std::size_t Held() const { return underWay_.size(); }
+  /// So many of those that the system has agreed to stop are held: no end of them is told, and one of the
+  /// system's threads may just be writing.
+  static constexpr std::ptrdiff_t kMostStopped = 16;
+
  private:
   using Block = std::array<char, MAXGETHOSTSTRUCT>;
   struct LookUp {
@@ -39,7 +46,10 @@ class HostLookUps {
     Asker asker;
     std::unique_ptr<Block> found;
     bool isCancelled = false;
+    bool isStopped = false; ///< no message will tell its end
   };
+
+  void LetOldStoppedOnesGo();
 
   const SocketLibrary& library_;
   EventLoop& loop_;

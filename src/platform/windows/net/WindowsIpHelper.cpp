@@ -47,6 +47,15 @@ void PutIntoProgramsPage(InterfaceRow& row) {
 
 } // namespace
 
+WindowsIpHelper::WindowsIpHelper(const IpHelperLibrary& library, bool isLater) : library_(library) {
+  if (!isLater) return;
+  std::vector<InterfaceRow> rows;
+  ReadInterfaceRows(library_, true, rows);
+  later_.emplace(rows);
+}
+
+bool WindowsIpHelper::IsVistaOrLater() { return LOBYTE(::GetVersion()) >= 6; }
+
 std::uint32_t WindowsIpHelper::ReadExtendedTable(std::vector<std::uint8_t>& table) const {
   return ReadSizedTable(table, [this](void* room, DWORD& size) {
     return library_.GetExtendedTcpTable(room, &size, TRUE, AF_INET, TCP_TABLE_OWNER_PID_ALL, 0);
@@ -90,6 +99,11 @@ std::uint32_t WindowsIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& adapt
 std::uint32_t WindowsIpHelper::GetIfTable(std::span<std::uint8_t> buffer, std::uint32_t& size, bool sorted) {
   std::vector<InterfaceRow> rows;
   if (const std::uint32_t result = ReadInterfaceRows(library_, sorted, rows); result != 0) return result;
+  if (later_) {
+    std::vector<NetworkCard> cards;
+    if (const std::uint32_t result = ReadNetworkCards(library_, cards); result != 0) return result;
+    rows = later_->AsOnXp(rows, cards);
+  }
   std::ranges::for_each(rows, PutIntoProgramsPage);
   return PutInterfaceTable(rows, buffer, size);
 }

@@ -2,13 +2,17 @@
 
 #include "platform/net/IpHelper.h"
 #include "platform/windows/net/IpHelperLibrary.h"
+#include "platform/windows/net/LaterInterfaceRows.h"
+
+#include <optional>
 
 namespace quendra::platform::windows {
 
 /// The tables of the system's IP helper library.
 class WindowsIpHelper : public IpHelper {
  public:
-  explicit WindowsIpHelper(const IpHelperLibrary& library) : library_(library) {}
+  /// `isLater`: on a system whose interface table isn't that of XP any more.
+  explicit WindowsIpHelper(const IpHelperLibrary& library, bool isLater = IsVistaOrLater());
 
   std::uint32_t AllocateAndGetTcpExTableFromStack(TcpTable& table) override;
   std::uint32_t GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) override;
@@ -19,10 +23,12 @@ class WindowsIpHelper : public IpHelper {
   std::uint32_t SetTcpEntry(std::span<const std::uint8_t, TcpTableEntry::kBytesWithoutOwner> record) override;
 
  private:
+  static bool IsVistaOrLater();
   std::uint32_t ReadExtendedTable(std::vector<std::uint8_t>& table) const;
   std::uint32_t ReadOlderTable(std::vector<std::uint8_t>& table) const;
 
   const IpHelperLibrary& library_;
+  std::optional<LaterInterfaceRows> later_; ///< none on XP
 };
 
 } // namespace quendra::platform::windows

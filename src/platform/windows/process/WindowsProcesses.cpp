@@ -18,6 +18,9 @@ namespace {
 /// Longer than any path that a module can be loaded from in a program of that time.
 constexpr std::size_t kModulePathRoom = 1024;
 
+/// In place of a module: the program itself.
+constexpr ModuleHandle kWholeProgram;
+
 using Walk = decltype(::Process32FirstW);
 
 bool Step(Walk& walk, Handle snapshot, Processes::Entry& entry) {
@@ -72,23 +75,39 @@ bool WindowsProcesses::EnumProcessModules(Handle process, std::span<ModuleHandle
   DWORD needed = 0;
   const bool known =
       enumerate(ToSystem(process), found.data(), static_cast<DWORD>(found.size() * sizeof(HMODULE)), &needed);
-  if (!lastError_.Succeeded(known)) return false;
+  if (!lastError_.Succeeded(known)) {
+    // One of 32 bits is told no more of a program of 64.
+    if (lastError_.value != kPartialCopy || !imagePath_.IsThere()) return false;
+    std::ranges::fill(modules, kWholeProgram);
+    return lastError_.Succeeded(true);
+  }
   std::ranges::transform(found, modules.begin(), [](HMODULE module) {
     return ModuleHandle(static_cast<std::uint32_t>(reinterpret_cast<std::uintptr_t>(module)));
   });
   return true;
 }
 
-std::uint32_t WindowsProcesses::GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
-                                                     std::uint32_t size) {
+Text WindowsProcesses::PathOfProgram(Handle process) {
+  Text path = imagePath_.Of(process);
+  lastError_.Succeeded(!path.empty());
+  return path;
+}
+
+Text WindowsProcesses::PathOfModule(Handle process, ModuleHandle module) {
   const auto getName = FindInPsapi<decltype(::GetModuleFileNameExW)>("GetModuleFileNameExW");
-  if (!getName) return 0;
+  if (!getName) return {};
   std::vector<wchar_t> found(kModulePathRoom);
   const DWORD length = getName(ToSystem(process), reinterpret_cast<HMODULE>(std::uintptr_t{module.Value()}),
                                found.data(), static_cast<DWORD>(found.size()));
-  if (!lastError_.Succeeded(length > 0)) return 0;
-  const std::string name =
-      PathInCodePage(winapi::TextOf(found.data(), std::min(std::size_t{length}, found.size())));
+  if (!lastError_.Succeeded(length > 0)) return {};
+  return winapi::TextOf(found.data(), std::min(std::size_t{length}, found.size()));
+}
+
+std::uint32_t WindowsProcesses::GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,
+                                                     std::uint32_t size) {
+  const Text found = module == kWholeProgram && imagePath_.IsThere() ? PathOfProgram(process)
+                                                                     : PathOfModule(process, module);
+  const std::string name = PathInCodePage(found);
   const std::size_t written = std::min({name.size(), path.size(), std::size_t{size}});
   std::copy_n(name.begin(), written, path.begin());
   return static_cast<std::uint32_t>(written);

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/windows/process/ImagePath.h"
 #include "platform/windows/process/LastError.h"
 #include "platform/windows/process/SystemHandle.h"
 #include "platform/windows/system/LazyLibrary.h"
@@ -26,9 +27,12 @@ class WindowsProcesses : public Processes {
 
  private:
   template <typename Function> Function* FindInPsapi(const char* name);
+  Text PathOfProgram(Handle process);
+  Text PathOfModule(Handle process, ModuleHandle module);
 
   LastError& lastError_;
   LazyLibrary psapi_{L"psapi.dll"};
+  ImagePath imagePath_;
 };
 
 } // namespace quendra::platform::windows

@@ -79,7 +79,7 @@ std::uint32_t WindowsPerformanceData::AskRegistry(const Text& valueName, std::si
 std::vector<ProcessorTimes> WindowsPerformanceData::Processors() {
   const auto query = ntdll_.Find<QuerySystem>("NtQuerySystemInformation");
   SYSTEM_INFO info{};
-  ::GetSystemInfo(&info);
+  ::GetNativeSystemInfo(&info);
   std::vector<KernelTimes> times(info.dwNumberOfProcessors);
   const auto length = static_cast<ULONG>(times.size() * sizeof(KernelTimes));
   if (!query || query(kProcessorPerformance, times.data(), length, nullptr) != 0) return {};

@@ -43,9 +43,9 @@ bool Start(const wchar_t* file, Text line, int windowStyle) {
   how.dwFlags = STARTF_USESHOWWINDOW;
   how.wShowWindow = static_cast<WORD>(windowStyle);
   PROCESS_INFORMATION started{};
-  // The system may write to the line.
-  if (!::CreateProcessW(file, reinterpret_cast<wchar_t*>(line.data()), nullptr, nullptr, FALSE, 0, nullptr,
-                        nullptr, &how, &started))
+  // The system may write to the line. What it asks the user about is each program's own choice, not ours.
+  if (!::CreateProcessW(file, reinterpret_cast<wchar_t*>(line.data()), nullptr, nullptr, FALSE,
+                        CREATE_DEFAULT_ERROR_MODE, nullptr, nullptr, &how, &started))
     return false;
   ::CloseHandle(started.hThread);
   ::CloseHandle(started.hProcess);

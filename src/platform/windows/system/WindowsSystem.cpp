@@ -6,6 +6,7 @@
 #include <array>
 #include <cstring>
 #include <limits>
+#include <utility>
 
 namespace quendra::platform::windows {
 
@@ -30,6 +31,13 @@ SYSTEMTIME LocalTime() {
 
 } // namespace
 
+OsVersion AsKnown(const OsVersion& told) {
+  constexpr OsVersion kXp{VER_PLATFORM_WIN32_NT, 5, 1};
+  const bool isLater = told.platformId == kXp.platformId && std::pair(told.majorVersion, told.minorVersion) >
+                                                                std::pair(kXp.majorVersion, kXp.minorVersion);
+  return isLater ? OsVersion{kXp.platformId, kXp.majorVersion, kXp.minorVersion, told.buildNumber} : told;
+}
+
 std::uint32_t WindowsSystem::GetTickCount() { return ::GetTickCount(); }
 
 bool WindowsSystem::GetVersionExA(OsVersion& version) {
@@ -37,7 +45,7 @@ bool WindowsSystem::GetVersionExA(OsVersion& version) {
   static_assert(sizeof told == 148);
   told.dwOSVersionInfoSize = sizeof told;
   if (!::GetVersionExA(&told)) return false;
-  version = {told.dwPlatformId, told.dwMajorVersion, told.dwMinorVersion, told.dwBuildNumber};
+  version = AsKnown({told.dwPlatformId, told.dwMajorVersion, told.dwMinorVersion, told.dwBuildNumber});
   return true;
 }
 
@@ -58,7 +66,8 @@ void WindowsSystem::Sleep(std::uint32_t milliseconds) { ::Sleep(milliseconds); }
 
 void WindowsSystem::GetSystemInfo(SystemInfo& info) {
   SYSTEM_INFO told{};
-  ::GetSystemInfo(&told);
+  // The other call counts no more than 32 for a program of 32 bits on a system of 64.
+  ::GetNativeSystemInfo(&told);
   info.numberOfProcessors = told.dwNumberOfProcessors;
 }
 

@@ -4,6 +4,10 @@
 
 namespace quendra::platform::windows {
 
+/// A version that the program knows: it asks for the TCP owner table of XP by that system's number alone.
+/// Later systems have that table too, and what else the program takes from XP, so they count as XP.
+OsVersion AsKnown(const OsVersion& told);
+
 /// The system's clock, version, memory and waiting.
 class WindowsSystem : public System {
  public:

@@ -93,6 +93,21 @@ TEST(LinkPollTest, A_change_is_told_once_and_what_stays_is_not_told) {
   EXPECT_EQ(changes, 1);
 }
 
+TEST(LinkPollTest, A_change_and_the_return_to_what_was_are_told_once_each) {
+  forms::headless::HeadlessDesktop desktop;
+  const std::vector<CaptureLink> before(1);
+  std::vector<CaptureLink> links = before;
+  int changes = 0;
+  const LinkPoll poll(
+      desktop, [&] { return links; }, [&] { ++changes; });
+  links.clear();
+  desktop.Advance(3 * LinkPoll::kMilliseconds);
+  EXPECT_EQ(changes, 1);
+  links = before;
+  desktop.Advance(3 * LinkPoll::kMilliseconds);
+  EXPECT_EQ(changes, 2);
+}
+
 TEST(LinkPollTest, It_may_end_in_what_it_calls) {
   forms::headless::HeadlessDesktop desktop;
   std::vector<CaptureLink> links(1);

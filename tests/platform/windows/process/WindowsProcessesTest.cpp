@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
+
 namespace quendra::platform::windows {
 namespace {
 
@@ -29,6 +31,38 @@ TEST_F(WindowsProcessesTest, More_modules_than_there_is_room_for_fill_the_room) 
   std::array<ModuleHandle, 1> one{};
   EXPECT_TRUE(processes.EnumProcessModules(kOwnProcess, one));
   EXPECT_NE(one[0], ModuleHandle());
+}
+
+TEST_F(WindowsProcessesTest, The_path_of_a_program_is_told_without_its_modules) {
+  std::array<wchar_t, MAX_PATH> own{};
+  ::GetModuleFileNameW(nullptr, own.data(), MAX_PATH);
+  std::string path(kPathRoom, ' ');
+  const std::uint32_t length = processes.GetModuleFileNameExA(kOwnProcess, ModuleHandle(), path, 500);
+  EXPECT_EQ(FromCodePage(path.substr(0, length)), winapi::TextOf(own.data()));
+  EXPECT_EQ(processes.GetLastError(), kNoError);
+}
+
+TEST_F(WindowsProcessesTest, The_path_of_no_process_is_none_for_a_reason) {
+  std::string path(kPathRoom, ' ');
+  EXPECT_EQ(processes.GetModuleFileNameExA(kNoHandle, ModuleHandle(), path, 500), 0u);
+  EXPECT_EQ(processes.GetLastError(), kErrorInvalidHandle);
+}
+
+TEST(PastRedirectionTest, A_file_of_the_systems_folder_goes_by_its_second_name) {
+  const Text folder = u"C:\\Windows\\system32";
+  EXPECT_EQ(PastRedirection(u"C:\\Windows\\System32\\svchost.exe", folder),
+            u"C:\\Windows\\Sysnative\\svchost.exe");
+  EXPECT_EQ(PastRedirection(u"c:\\windows\\SYSTEM32\\wbem\\a.exe", folder),
+            u"C:\\Windows\\Sysnative\\wbem\\a.exe");
+}
+
+TEST(PastRedirectionTest, Files_elsewhere_keep_their_names) {
+  const Text folder = u"C:\\Windows\\system32";
+  for (const Text path : {u"C:\\Windows\\explorer.exe", u"C:\\Windows\\System32x\\a.exe",
+                          u"C:\\Windows\\SysWOW64\\a.exe", u"C:\\Windows\\system32", u""}) {
+    EXPECT_EQ(PastRedirection(path, folder), path);
+    EXPECT_EQ(PastRedirection(path, u""), path);
+  }
 }
 
 struct PathInCodePageTest : testing::Test {

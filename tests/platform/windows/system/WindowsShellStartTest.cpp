@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <tlhelp32.h>
+
 #include <array>
 
 namespace quendra::platform::windows {
@@ -66,6 +68,46 @@ TEST_F(WindowsShellStartTest, A_program_of_the_working_folder_or_beside_this_one
   EXPECT_FALSE(shell.Shell("quendra-planted.exe /c exit", ShellStart::kHiddenWindow));
 
   ::DeleteFileW(winapi::Wide(beside));
+}
+
+/// A process of this name that we started, as long as it runs; nullptr for none.
+HANDLE OpenChild(const Text& name) {
+  const HANDLE all = ::CreateToolhelp32Snapshot(TH32CS_SNAPPROCESS, 0);
+  PROCESSENTRY32W entry{};
+  entry.dwSize = sizeof entry;
+  HANDLE child = nullptr;
+  for (BOOL more = ::Process32FirstW(all, &entry); more && !child; more = ::Process32NextW(all, &entry))
+    if (entry.th32ParentProcessID == ::GetCurrentProcessId() && winapi::TextOf(entry.szExeFile) == name)
+      child = ::OpenProcess(PROCESS_ALL_ACCESS, FALSE, entry.th32ProcessID);
+  ::CloseHandle(all);
+  return child;
+}
+
+/// What a thread there is told when it sets the mode to none.
+DWORD ErrorModeOf(HANDLE process) {
+  const auto call = reinterpret_cast<LPTHREAD_START_ROUTINE>(reinterpret_cast<void*>(&::SetErrorMode));
+  const HANDLE thread = ::CreateRemoteThread(process, nullptr, 0, call, nullptr, 0, nullptr);
+  DWORD mode = 0xFFFFFFFF;
+  if (::WaitForSingleObject(thread, 10'000) == WAIT_OBJECT_0) ::GetExitCodeThread(thread, &mode);
+  ::CloseHandle(thread);
+  return mode;
+}
+
+TEST_F(WindowsShellStartTest, A_started_program_has_the_systems_error_mode_and_not_ours) {
+  ASSERT_TRUE(CopyOfAProgram(L"C:\\Quendra Test\\planted.exe"));
+  const UINT before = ::SetErrorMode(SEM_FAILCRITICALERRORS | SEM_NOOPENFILEERRORBOX);
+
+  EXPECT_TRUE(
+      shell.Shell("\"C:\\Quendra Test\\planted.exe\" /k echo told> told.txt", ShellStart::kHiddenWindow));
+
+  EXPECT_TRUE(Appears(L"C:\\Quendra Test\\told.txt"));
+  const HANDLE child = OpenChild(u"planted.exe");
+  ASSERT_TRUE(child);
+  EXPECT_EQ(ErrorModeOf(child), 0U);
+  ::SetErrorMode(before);
+  ::TerminateProcess(child, 0);
+  ::WaitForSingleObject(child, 10'000);
+  ::CloseHandle(child);
 }
 
 TEST_F(WindowsShellStartTest, What_is_no_program_is_not_started) {

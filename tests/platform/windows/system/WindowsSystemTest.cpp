@@ -23,6 +23,30 @@ struct WindowsSystemTest : testing::Test {
   WindowsSystem system;
 };
 
+bool IsToldAsXp(const OsVersion& told) {
+  const OsVersion known = AsKnown(told);
+  return known.platformId == 2 && known.majorVersion == 5 && known.minorVersion == 1 &&
+         known.buildNumber == told.buildNumber;
+}
+
+TEST_F(WindowsSystemTest, A_system_later_than_XP_is_told_as_XP) {
+  for (const OsVersion later : {OsVersion{2, 5, 2, 3790}, OsVersion{2, 6, 0, 6002}, OsVersion{2, 6, 1, 7601},
+                                OsVersion{2, 6, 2, 9200}, OsVersion{2, 10, 0, 19045}})
+    EXPECT_TRUE(IsToldAsXp(later)) << later.majorVersion << "." << later.minorVersion;
+}
+
+TEST_F(WindowsSystemTest, XP_and_what_was_before_it_are_told_as_they_are) {
+  EXPECT_TRUE(IsToldAsXp({2, 5, 1, 2600}));
+  for (const OsVersion before :
+       {OsVersion{2, 5, 0, 2195}, OsVersion{2, 4, 0, 1381}, OsVersion{2, 3, 51, 1057},
+        OsVersion{1, 4, 90, 3000}, OsVersion{0, 6, 0, 1}}) {
+    const OsVersion known = AsKnown(before);
+    EXPECT_EQ(known.platformId, before.platformId);
+    EXPECT_EQ(known.majorVersion, before.majorVersion);
+    EXPECT_EQ(known.minorVersion, before.minorVersion);
+  }
+}
+
 TEST_F(WindowsSystemTest, A_message_is_the_systems_own_in_the_code_page) {
   wchar_t* told = nullptr;
   const DWORD length = ::FormatMessageW(FORMAT_MESSAGE_FROM_SYSTEM | FORMAT_MESSAGE_ALLOCATE_BUFFER, nullptr,
@@ -40,6 +64,14 @@ TEST_F(WindowsSystemTest, A_message_that_finds_no_room_for_its_NUL_is_not_told) 
   const std::size_t length = Message(System::kFromSystem, 5).size();
   EXPECT_EQ(Message(System::kFromSystem, 5, length), "");
   EXPECT_EQ(Message(System::kFromSystem, 5, length + 1).size(), length);
+}
+
+TEST_F(WindowsSystemTest, The_processors_are_those_of_the_machine_and_not_what_a_program_of_32_bits_is_told) {
+  SYSTEM_INFO machine{};
+  ::GetNativeSystemInfo(&machine);
+  SystemInfo info;
+  system.GetSystemInfo(info);
+  EXPECT_EQ(info.numberOfProcessors, machine.dwNumberOfProcessors);
 }
 
 TEST_F(WindowsSystemTest, Flags_that_would_have_the_system_take_the_buffer_for_something_else_are_refused) {
