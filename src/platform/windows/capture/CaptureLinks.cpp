@@ -32,7 +32,7 @@ bool IsUp(const InterfaceRow& row) {
   return row.Get(InterfaceRow::kAdminStatus) == kAdminUp && row.Get(InterfaceRow::kOperStatus) >= kConnected;
 }
 
-CaptureLink LinkOf(const NetworkCard& card, const std::vector<InterfaceRow>& rows, std::uint32_t routed) {
+CaptureLink LinkOf(const ListedCard& card, const std::vector<InterfaceRow>& rows, std::uint32_t routed) {
   const InterfaceRow* row = RowOf(rows, card.index);
   CaptureLink link;
   link.name = card.name;
@@ -81,10 +81,10 @@ std::uint32_t DefaultRouteIndex(const IpHelperLibrary& library) {
 
 } // namespace
 
-std::vector<CaptureLink> CaptureLinksOf(const std::vector<NetworkCard>& cards,
+std::vector<CaptureLink> CaptureLinksOf(const std::vector<ListedCard>& cards,
                                         const std::vector<InterfaceRow>& rows, std::uint32_t routed) {
   std::vector<CaptureLink> links;
-  for (const NetworkCard& card : cards)
+  for (const ListedCard& card : cards)
     if (IsShown(card.kind)) links.push_back(LinkOf(card, rows, routed));
   for (const InterfaceRow& row : rows)
     if (row.Get(InterfaceRow::kType) == kLoopbackInterface) links.push_back(LoopbackOf(row));
@@ -92,7 +92,7 @@ std::vector<CaptureLink> CaptureLinksOf(const std::vector<NetworkCard>& cards,
 }
 
 std::vector<CaptureLink> ReadCaptureLinks(const IpHelperLibrary& library) {
-  std::vector<NetworkCard> cards;
+  std::vector<ListedCard> cards;
   std::vector<InterfaceRow> rows;
   if (ReadNetworkCards(library, cards) != 0 || ReadInterfaceRows(library, true, rows) != 0) return {};
   return CaptureLinksOf(cards, rows, DefaultRouteIndex(library));

@@ -21,7 +21,7 @@ struct CaptureLink {
 
 /// From what the IP helper's tables tell; `routed` is the index of the interface of the default route, 0 for
 /// none.
-std::vector<CaptureLink> CaptureLinksOf(const std::vector<NetworkCard>& cards,
+std::vector<CaptureLink> CaptureLinksOf(const std::vector<ListedCard>& cards,
                                         const std::vector<InterfaceRow>& rows, std::uint32_t routed);
 std::vector<CaptureLink> ReadCaptureLinks(const IpHelperLibrary& library);
 

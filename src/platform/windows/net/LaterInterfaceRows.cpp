@@ -10,9 +10,9 @@ namespace {
 
 std::uint32_t IndexOf(const InterfaceRow& row) { return row.Get(InterfaceRow::kIndex); }
 
-bool IsListed(const InterfaceRow& row, std::span<const NetworkCard> cards) {
+bool IsListed(const InterfaceRow& row, std::span<const ListedCard> cards) {
   return row.Get(InterfaceRow::kType) == kLoopbackInterface ||
-         std::ranges::find(cards, IndexOf(row), &NetworkCard::index) != cards.end();
+         std::ranges::find(cards, IndexOf(row), &ListedCard::index) != cards.end();
 }
 
 /// All bits are set for a speed that finds no room.
@@ -29,7 +29,7 @@ LaterInterfaceRows::LaterInterfaceRows(std::span<const InterfaceRow> atStart) {
 }
 
 std::vector<InterfaceRow> LaterInterfaceRows::AsOnXp(std::span<const InterfaceRow> rows,
-                                                     std::span<const NetworkCard> cards) const {
+                                                     std::span<const ListedCard> cards) const {
   std::vector<InterfaceRow> listed;
   std::ranges::copy_if(rows, std::back_inserter(listed),
                        [&](const InterfaceRow& row) { return IsListed(row, cards); });

@@ -18,7 +18,7 @@ class LaterInterfaceRows {
 
   /// Those of the cards, and the loopback, by ascending index.
   std::vector<InterfaceRow> AsOnXp(std::span<const InterfaceRow> rows,
-                                   std::span<const NetworkCard> cards) const;
+                                   std::span<const ListedCard> cards) const;
 
   static constexpr std::uint32_t kUnknownSpeed = 10'000'000;
   static constexpr std::uint32_t kMostSpeed = 0x7FFFFFFF;

@@ -23,8 +23,8 @@ std::vector<Ipv4Address> AddressesIn(const IP_ADDR_STRING& first) {
   return addresses;
 }
 
-NetworkCard CardOf(const IP_ADAPTER_INFO& info) {
-  NetworkCard card;
+ListedCard CardOf(const IP_ADAPTER_INFO& info) {
+  ListedCard card;
   card.name = TextIn(info.AdapterName);
   card.description = FromAnsi(TextIn(info.Description));
   card.index = info.Index;
@@ -36,7 +36,7 @@ NetworkCard CardOf(const IP_ADAPTER_INFO& info) {
 
 } // namespace
 
-std::uint32_t ReadNetworkCards(const IpHelperLibrary& library, std::vector<NetworkCard>& cards) {
+std::uint32_t ReadNetworkCards(const IpHelperLibrary& library, std::vector<ListedCard>& cards) {
   if (!library.GetAdaptersInfo) return IpHelperLibrary::kMissing;
   std::vector<std::uint8_t> table;
   const DWORD result = ReadSizedTable(table, [&](std::uint8_t* room, DWORD& size) {

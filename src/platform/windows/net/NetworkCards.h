@@ -11,7 +11,7 @@
 namespace quendra::platform::windows {
 
 /// What the IP helper tells of an adapter; its loopback is none. An address that isn't set is 0.0.0.0.
-struct NetworkCard {
+struct ListedCard {
   std::string name; ///< such as "{4D36E972-E325-11CE-BFC1-08002BE10318}"
   Text description;
   std::uint32_t index = 0;
@@ -21,7 +21,7 @@ struct NetworkCard {
 };
 
 /// In the system's order. 0, or the reason why there is no list.
-std::uint32_t ReadNetworkCards(const IpHelperLibrary& library, std::vector<NetworkCard>& cards);
+std::uint32_t ReadNetworkCards(const IpHelperLibrary& library, std::vector<ListedCard>& cards);
 
 /// The rows of the interface table. 0, or the reason why there are none.
 std::uint32_t ReadInterfaceRows(const IpHelperLibrary& library, bool sorted, std::vector<InterfaceRow>& rows);

@@ -16,7 +16,7 @@ static_assert(sizeof(MIB_TCPROW) == TcpTableEntry::kBytesWithoutOwner);
 
 namespace {
 
-AdapterRecord RecordOf(const NetworkCard& card) {
+AdapterRecord RecordOf(const ListedCard& card) {
   AdapterRecord record;
   record.name = card.name;
   record.description = ToCodePage(card.description);
@@ -84,7 +84,7 @@ std::uint32_t WindowsIpHelper::AllocateAndGetTcpExTableFromStack(TcpTable& table
 }
 
 std::uint32_t WindowsIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& adapters, std::uint32_t& size) {
-  std::vector<NetworkCard> cards;
+  std::vector<ListedCard> cards;
   if (const std::uint32_t result = ReadNetworkCards(library_, cards); result != 0) return result;
   const std::size_t needed = cards.size() * kAdapterBytes;
   if (size < needed) {
@@ -100,7 +100,7 @@ std::uint32_t WindowsIpHelper::GetIfTable(std::span<std::uint8_t> buffer, std::u
   std::vector<InterfaceRow> rows;
   if (const std::uint32_t result = ReadInterfaceRows(library_, sorted, rows); result != 0) return result;
   if (later_) {
-    std::vector<NetworkCard> cards;
+    std::vector<ListedCard> cards;
     if (const std::uint32_t result = ReadNetworkCards(library_, cards); result != 0) return result;
     rows = later_->AsOnXp(rows, cards);
   }

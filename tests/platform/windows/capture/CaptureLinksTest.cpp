@@ -9,7 +9,7 @@ namespace quendra::platform::windows {
 
 namespace {
 
-NetworkCard Card(const std::string& name, std::uint32_t index, std::uint32_t kind) {
+ListedCard Card(const std::string& name, std::uint32_t index, std::uint32_t kind) {
   return {.name = name,
           .description = u"Card " + Text(name.begin(), name.end()),
           .index = index,

@@ -21,8 +21,8 @@ InterfaceRow LaterRow(std::uint32_t index, std::uint32_t kind = kEthernetInterfa
   return row;
 }
 
-NetworkCard CardOfIndex(std::uint32_t index) {
-  NetworkCard card;
+ListedCard CardOfIndex(std::uint32_t index) {
+  ListedCard card;
   card.index = index;
   return card;
 }
@@ -36,13 +36,13 @@ std::vector<std::uint32_t> Indexes(const std::vector<InterfaceRow>& rows) {
 TEST(LaterInterfaceRows, Cards_and_the_loopback_are_listed_by_their_indexes_and_filters_are_not) {
   const std::vector<InterfaceRow> rows{LaterRow(12), LaterRow(13), LaterRow(1, kLoopbackInterface),
                                        LaterRow(14), LaterRow(5)};
-  const std::vector<NetworkCard> cards{CardOfIndex(12), CardOfIndex(5)};
+  const std::vector<ListedCard> cards{CardOfIndex(12), CardOfIndex(5)};
   EXPECT_EQ(Indexes(Later({}).AsOnXp(rows, cards)), (std::vector<std::uint32_t>{1, 5, 12}));
 }
 
 TEST(LaterInterfaceRows, There_are_no_more_than_can_be_read) {
   std::vector<InterfaceRow> rows;
-  std::vector<NetworkCard> cards;
+  std::vector<ListedCard> cards;
   for (std::uint32_t index = 1; index <= 50; ++index) {
     rows.push_back(LaterRow(index));
     cards.push_back(CardOfIndex(index));
@@ -51,7 +51,7 @@ TEST(LaterInterfaceRows, There_are_no_more_than_can_be_read) {
 }
 
 TEST(LaterInterfaceRows, A_speed_is_one_that_can_be_reckoned_with) {
-  const std::vector<NetworkCard> cards{CardOfIndex(1)};
+  const std::vector<ListedCard> cards{CardOfIndex(1)};
   const auto speed = [&](std::uint32_t told) {
     const std::vector<InterfaceRow> rows{LaterRow(1, kEthernetInterface, told)};
     return Later({}).AsOnXp(rows, cards).at(0).Get(InterfaceRow::kSpeed);
@@ -71,7 +71,7 @@ TEST(LaterInterfaceRows, Counters_count_from_the_start_and_from_0_where_they_beg
   now.Set(InterfaceRow::kOutOctets, 20);
   InterfaceRow newcomer = LaterRow(2);
   newcomer.Set(InterfaceRow::kInOctets, 7);
-  const std::vector<NetworkCard> cards{CardOfIndex(1), CardOfIndex(2)};
+  const std::vector<ListedCard> cards{CardOfIndex(1), CardOfIndex(2)};
 
   const auto rows = Later(std::vector{start}).AsOnXp(std::vector{now, newcomer}, cards);
 
