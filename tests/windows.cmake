@@ -1,4 +1,5 @@
 # What only the Windows edition has: the suites over its backends, the program as it is shipped, and its installer.
+quendra_test(winapi quendra_winapi quendra_runtime)
 add_subdirectory(standins/windows)
 add_subdirectory(architecture/windows)
 target_link_libraries(platform_test PRIVATE quendra_platform_windows)
@@ -24,6 +25,7 @@ file(GENERATE OUTPUT ${as_shipped} CONTENT "1 24 \"${PROJECT_SOURCE_DIR}/src/app
 set_tests_properties(app/windows/part_1 PROPERTIES TIMEOUT 1200 RUN_SERIAL TRUE)
 target_sources(app_windows_test PRIVATE forms/win32/Win32DriverFixture.cpp ${as_shipped})
 add_subdirectory(app/windows/programs)
+add_dependencies(platform_test idle_program) # which it starts
 add_subdirectory(standins/windows/planted)
 add_dependencies(app_windows_test quendra_windows standin_planted standin_careless timed_start idle_program odd_program)
 # The installer runs in the bed as on a machine of a subscriber.

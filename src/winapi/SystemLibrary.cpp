@@ -1,7 +1,5 @@
 #include "winapi/SystemLibrary.h"
 
-#include <utility>
-
 namespace quendra::winapi {
 
 namespace {
@@ -26,12 +24,5 @@ SystemLibrary::SystemLibrary(const wchar_t* fileName) {
 }
 
 SystemLibrary SystemLibrary::At(const Text& path) { return SystemLibrary(LoadFrom(path)); }
-
-SystemLibrary::~SystemLibrary() {
-  if (module_) ::FreeLibrary(module_);
-}
-
-SystemLibrary::SystemLibrary(SystemLibrary&& other) noexcept
-    : module_(std::exchange(other.module_, nullptr)) {}
 
 } // namespace quendra::winapi

@@ -6,17 +6,14 @@ namespace quendra::winapi {
 
 /// A library of the system, loaded from the system's folder by its full path and from nowhere else, so that a
 /// file of its name beside the program or in the working folder is never run. It stays loaded until the
-/// object goes.
+/// program ends: libraries run threads of their own, as for a look-up of a name, and one of these may be at
+/// its last steps in the library's code when all that we asked for is over.
 class SystemLibrary {
  public:
   /// A file name, such as L"iphlpapi.dll".
   explicit SystemLibrary(const wchar_t* fileName);
   /// One that lies elsewhere than in the system's folder, by its full path.
   static SystemLibrary At(const Text& path);
-  ~SystemLibrary();
-  SystemLibrary(SystemLibrary&& other) noexcept;
-  SystemLibrary(const SystemLibrary&) = delete;
-  SystemLibrary& operator=(SystemLibrary&&) = delete;
 
   bool IsThere() const { return module_ != nullptr; }
   HMODULE Module() const { return module_; }

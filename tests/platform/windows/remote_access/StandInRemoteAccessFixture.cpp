@@ -1,5 +1,8 @@
 #include "platform/windows/remote_access/StandInRemoteAccess.h"
 
+#include <ras.h>
+
+#include <array>
 #include <stdexcept>
 
 namespace quendra::platform::windows {
@@ -12,6 +15,16 @@ std::string NewFile() {
   if (::GetTempPathA(MAX_PATH, folder) == 0 || ::GetTempFileNameA(folder, "ras", 0, file) == 0)
     throw std::runtime_error("there is no place for a phone book");
   return file;
+}
+
+/// The lines are the library's, which stays, and would be the next test's.
+void HangUpAll(const winapi::SystemLibrary& library) {
+  std::array<RASCONNA, 64> lines{};
+  lines[0].dwSize = sizeof lines[0];
+  DWORD bytes = sizeof lines;
+  DWORD count = 0;
+  library.Find<decltype(::RasEnumConnectionsA)>("RasEnumConnectionsA")(lines.data(), &bytes, &count);
+  for (DWORD i = 0; i < count; ++i) library.Find<decltype(::RasHangUpA)>("RasHangUpA")(lines[i].hrasconn);
 }
 
 } // namespace
@@ -31,6 +44,7 @@ StandInRemoteAccess::StandInRemoteAccess(const std::string& dials) : file_(NewFi
 }
 
 StandInRemoteAccess::~StandInRemoteAccess() {
+  HangUpAll(StandInRasLibrary());
   for (const char* name : {"QUENDRA_PHONE_BOOK", "QUENDRA_DIALS"}) ::SetEnvironmentVariableA(name, nullptr);
   ::DeleteFileA(file_.c_str());
 }
