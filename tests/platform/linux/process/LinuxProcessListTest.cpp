@@ -1,5 +1,6 @@
 #include "platform/linux/LinuxFixture.h"
 #include "platform/linux/process/ProcessList.h"
+#include "platform/linux/system/Files.h"
 #include "runtime/Text.h"
 
 #include <gtest/gtest.h>
