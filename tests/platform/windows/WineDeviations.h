@@ -14,11 +14,10 @@ namespace quendra::platform::windows {
 ///
 /// - The calls that count a process's drawing objects, windows and handles answer 0:
 ///   tests/app/windows/Resources counts them in the tables of the system.
-/// - Its own libraries come before others of their names, wherever those lie: for planted ones it is told not
-/// to.
+/// - Its own libraries come before others of their names, wherever those lie: for planted ones it is told
+///   not to.
 /// - A list of processes takes it as long as reading several files of each from the system below, and a
-/// request
-///   for each step: the time of a pass is that beyond the list.
+///   request for each step: the time of a pass is that beyond the list.
 /// - It has no phone book and dials nowhere: a library of ours stands in for that of the system.
 struct WineDeviation {
   std::string_view test;
