@@ -18,7 +18,10 @@ namespace quendra::platform::windows {
 ///   not to.
 /// - A list of processes takes it as long as reading several files of each from the system below, and a
 ///   request for each step: the time of a pass is that beyond the list.
-/// - It has no phone book and dials nowhere: a library of ours stands in for that of the system.
+/// - It has no phone book and dials nowhere, and no capture library: libraries of ours stand in for these.
+/// - Its management of network cards tells of cards without an address too, and sets none (the call answers
+///   65): the tour says so, and the modem behind a VPN gets its card without these addresses.
+/// - It turns no text field by Ctrl and Shift, and has no fixed pitch font of XP's.
 struct WineDeviation {
   std::string_view test;
   std::string_view why;
