@@ -1,15 +1,14 @@
 // A rasapi32.dll for tests on systems without remote access, with the record sizes of Windows XP: a phone
 // book, the devices "pppoe" and "vpn", and dials by scripts (RasDials.h). Its errors are those that the calls
-// are published with.
+// are published with. The calls themselves stand in RasWide.cpp.
 
 #include "platform/linux/remote_access/RasErrorTexts.h"
 #include "platform/process/SystemErrors.h"
 #include "platform/remote_access/RemoteAccessNumbers.h"
 #include "runtime/ByteFields.h"
 #include "standins/windows/RasDials.h"
+#include "standins/windows/RasNarrow.h"
 #include "standins/windows/RasPhoneBook.h"
-
-#include <ras.h>
 
 #include <algorithm>
 #include <array>
@@ -173,15 +172,7 @@ RasDials::Shared ConnectionBy(const std::string& entryName) {
 
 } // namespace
 
-} // namespace quendra::standins
-
-using namespace quendra;
-using namespace quendra::platform;
-using namespace quendra::standins;
-
-#define EXPORTED extern "C" __declspec(dllexport) DWORD WINAPI
-
-EXPORTED RasEnumEntriesA(LPCSTR, LPCSTR phoneBook, LPRASENTRYNAMEA first, LPDWORD bytes, LPDWORD count) {
+DWORD EnumEntries(const char* phoneBook, RASENTRYNAMEA* first, DWORD* bytes, DWORD* count) {
   if (!bytes || !count) return kInvalidParameter;
   if (!IsOwnBook(phoneBook)) return kCannotOpenPhoneBook;
   const DWORD size = first ? first->dwSize : DWORD{sizeof(RASENTRYNAMEA)};
@@ -192,14 +183,13 @@ EXPORTED RasEnumEntriesA(LPCSTR, LPCSTR phoneBook, LPRASENTRYNAMEA first, LPDWOR
   });
 }
 
-EXPORTED RasDeleteEntryA(LPCSTR phoneBook, LPCSTR entryName) {
+DWORD DeleteEntry(const char* phoneBook, const char* entryName) {
   if (!entryName) return kInvalidParameter;
   if (!IsOwnBook(phoneBook)) return kCannotOpenPhoneBook;
   return RasPhoneBook().Remove(entryName) ? kRasSuccess : kRasCannotFindPhonebookEntry;
 }
 
-EXPORTED RasGetEntryPropertiesA(LPCSTR phoneBook, LPCSTR entryName, LPRASENTRYA entry, LPDWORD bytes, LPBYTE,
-                                LPDWORD) {
+DWORD GetEntryProperties(const char* phoneBook, const char* entryName, RASENTRYA* entry, DWORD* bytes) {
   if (!bytes) return kInvalidParameter;
   if (!IsOwnBook(phoneBook)) return kCannotOpenPhoneBook;
   const RasPhoneBook book;
@@ -208,19 +198,18 @@ EXPORTED RasGetEntryPropertiesA(LPCSTR phoneBook, LPCSTR entryName, LPRASENTRYA 
   return FillEntry(entry, bytes, WholeProperties(book, entryName), book.AlternateNumbers(entryName));
 }
 
-EXPORTED RasSetEntryPropertiesA(LPCSTR phoneBook, LPCSTR entryName, LPRASENTRYA entry, DWORD bytes, LPBYTE,
-                                DWORD) {
+DWORD SetEntryProperties(const char* phoneBook, const char* entryName, const RASENTRYA* entry, DWORD bytes) {
   if (!entry || !entryName || *entryName == '\0') return kInvalidParameter;
   if (!IsOwnBook(phoneBook)) return kCannotOpenPhoneBook;
   if (!IsOneOf(kEntrySizes, entry->dwSize)) return kRasInvalidSize;
   if (bytes < entry->dwSize) return kRasBufferInvalid;
-  const auto record = BytesOf(entry, entry->dwSize);
+  const auto record = BytesOf(const_cast<RASENTRYA*>(entry), entry->dwSize);
   Image properties(record.begin(), record.end());
   properties.resize(kEntryBytes);
   return Written(RasPhoneBook().Write(entryName, properties, AlternateNumbersIn(entry, bytes)));
 }
 
-EXPORTED RasGetEntryDialParamsA(LPCSTR phoneBook, LPRASDIALPARAMSA params, LPBOOL hasPassword) {
+DWORD GetEntryDialParams(const char* phoneBook, RASDIALPARAMSA* params, BOOL* hasPassword) {
   if (const DWORD error = ErrorOfParams(params)) return error;
   if (!hasPassword) return kInvalidParameter;
   if (!IsOwnBook(phoneBook)) return kCannotOpenPhoneBook;
@@ -237,7 +226,7 @@ EXPORTED RasGetEntryDialParamsA(LPCSTR phoneBook, LPRASDIALPARAMSA params, LPBOO
   return kRasSuccess;
 }
 
-EXPORTED RasSetEntryDialParamsA(LPCSTR phoneBook, LPRASDIALPARAMSA params, BOOL removePassword) {
+DWORD SetEntryDialParams(const char* phoneBook, RASDIALPARAMSA* params, BOOL removePassword) {
   if (const DWORD error = ErrorOfParams(params)) return error;
   if (!IsOwnBook(phoneBook)) return kCannotOpenPhoneBook;
   const RasPhoneBook book;
@@ -255,7 +244,7 @@ EXPORTED RasSetEntryDialParamsA(LPCSTR phoneBook, LPRASDIALPARAMSA params, BOOL 
   return Written(book.WriteDialParams(name, saved));
 }
 
-EXPORTED RasEnumDevicesA(LPRASDEVINFOA first, LPDWORD bytes, LPDWORD count) {
+DWORD EnumDevices(RASDEVINFOA* first, DWORD* bytes, DWORD* count) {
   if (!bytes || !count) return kInvalidParameter;
   if (first && first->dwSize != RasDeviceInfo::kBytes) return kRasInvalidSize;
   return List(first, RasDeviceInfo::kBytes, bytes, count, kDevices.size(), [](std::size_t i, auto record) {
@@ -264,8 +253,8 @@ EXPORTED RasEnumDevicesA(LPRASDEVINFOA first, LPDWORD bytes, LPDWORD count) {
   });
 }
 
-EXPORTED RasDialA(LPRASDIALEXTENSIONS extensions, LPCSTR phoneBook, LPRASDIALPARAMSA params,
-                  DWORD notifierType, LPVOID notifier, LPHRASCONN connection) {
+DWORD DialBy(RASDIALEXTENSIONS* extensions, const char* phoneBook, RASDIALPARAMSA* params,
+             DialNotifier notifier, HRASCONN* connection) {
   if (!connection) return kInvalidParameter;
   if (const DWORD error = ErrorOfParams(params)) return error;
   if (extensions && extensions->dwSize != RasDialExtensions::kBytes &&
@@ -273,21 +262,21 @@ EXPORTED RasDialA(LPRASDIALEXTENSIONS extensions, LPCSTR phoneBook, LPRASDIALPAR
     return kRasInvalidSize;
   if (!IsOwnBook(phoneBook)) return kCannotOpenPhoneBook;
   // Procedures as notifiers are for others than us.
-  if (notifier && notifierType != kRasNotifierIsWindow) return kInvalidParameter;
+  if (notifier.target && notifier.type != kRasNotifierIsWindow) return kInvalidParameter;
   const std::string name = EntryNameIn(params);
   if (!RasPhoneBook().Has(name)) return kRasCannotFindPhonebookEntry;
   std::uint32_t handle = 0;
-  const DWORD error = Dials().Start(ConnectionBy(name), static_cast<HWND>(notifier), handle);
+  const DWORD error = Dials().Start(ConnectionBy(name), static_cast<HWND>(notifier.target), handle);
   *connection = reinterpret_cast<HRASCONN>(handle);
   return error;
 }
 
-EXPORTED RasHangUpA(HRASCONN connection) {
+DWORD EndConnection(HRASCONN connection) {
   const auto handle = static_cast<std::uint32_t>(reinterpret_cast<std::uintptr_t>(connection));
   return Dials().HangUp(handle) ? std::uint32_t{kRasSuccess} : std::uint32_t{kErrorInvalidHandle};
 }
 
-EXPORTED RasEnumConnectionsA(LPRASCONNA first, LPDWORD bytes, LPDWORD count) {
+DWORD EnumConnections(RASCONNA* first, DWORD* bytes, DWORD* count) {
   if (!bytes || !count) return kInvalidParameter;
   const DWORD size = first ? first->dwSize : DWORD{sizeof(RASCONNA)};
   if (!IsOneOf(kConnectionSizes, size)) return kRasInvalidSize;
@@ -299,10 +288,12 @@ EXPORTED RasEnumConnectionsA(LPRASCONNA first, LPDWORD bytes, LPDWORD count) {
   });
 }
 
-EXPORTED RasGetErrorStringA(UINT error, LPSTR text, DWORD bytes) {
+DWORD ErrorText(UINT error, char* text, DWORD bytes) {
   const std::string_view found = linux_::RasErrorText(error);
   if (found.empty() || !text) return kInvalidParameter;
   if (bytes <= found.size()) return kInsufficientBuffer;
   *std::ranges::copy(found, text).out = '\0';
   return kRasSuccess;
 }
+
+} // namespace quendra::standins

@@ -7,17 +7,17 @@ RasCalls::RasCalls(Load load) : load_(std::move(load)) {}
 const RasCalls::Table& RasCalls::Calls() {
   if (library_) return table_;
   const winapi::SystemLibrary& library = library_.emplace(load_());
-  Find(library, "RasEnumEntriesA", table_.EnumEntries);
-  Find(library, "RasDeleteEntryA", table_.DeleteEntry);
-  Find(library, "RasGetEntryPropertiesA", table_.GetEntryProperties);
-  Find(library, "RasSetEntryPropertiesA", table_.SetEntryProperties);
-  Find(library, "RasGetEntryDialParamsA", table_.GetEntryDialParams);
-  Find(library, "RasSetEntryDialParamsA", table_.SetEntryDialParams);
-  Find(library, "RasEnumDevicesA", table_.EnumDevices);
-  Find(library, "RasDialA", table_.Dial);
-  Find(library, "RasHangUpA", table_.HangUp);
-  Find(library, "RasEnumConnectionsA", table_.EnumConnections);
-  Find(library, "RasGetErrorStringA", table_.GetErrorString);
+  Find(library, "RasEnumEntriesW", table_.EnumEntries);
+  Find(library, "RasDeleteEntryW", table_.DeleteEntry);
+  Find(library, "RasGetEntryPropertiesW", table_.GetEntryProperties);
+  Find(library, "RasSetEntryPropertiesW", table_.SetEntryProperties);
+  Find(library, "RasGetEntryDialParamsW", table_.GetEntryDialParams);
+  Find(library, "RasSetEntryDialParamsW", table_.SetEntryDialParams);
+  Find(library, "RasEnumDevicesW", table_.EnumDevices);
+  Find(library, "RasDialW", table_.Dial);
+  Find(library, "RasHangUpW", table_.HangUp);
+  Find(library, "RasEnumConnectionsW", table_.EnumConnections);
+  Find(library, "RasGetErrorStringW", table_.GetErrorString);
   return table_;
 }
 

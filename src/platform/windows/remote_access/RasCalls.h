@@ -18,17 +18,17 @@ class RasCalls {
 
   /// nullptr where the system has no remote access.
   struct Table {
-    decltype(::RasEnumEntriesA)* EnumEntries = nullptr;
-    decltype(::RasDeleteEntryA)* DeleteEntry = nullptr;
-    decltype(::RasGetEntryPropertiesA)* GetEntryProperties = nullptr;
-    decltype(::RasSetEntryPropertiesA)* SetEntryProperties = nullptr;
-    decltype(::RasGetEntryDialParamsA)* GetEntryDialParams = nullptr;
-    decltype(::RasSetEntryDialParamsA)* SetEntryDialParams = nullptr;
-    decltype(::RasEnumDevicesA)* EnumDevices = nullptr;
-    decltype(::RasDialA)* Dial = nullptr;
-    decltype(::RasHangUpA)* HangUp = nullptr;
-    decltype(::RasEnumConnectionsA)* EnumConnections = nullptr;
-    decltype(::RasGetErrorStringA)* GetErrorString = nullptr;
+    decltype(::RasEnumEntriesW)* EnumEntries = nullptr;
+    decltype(::RasDeleteEntryW)* DeleteEntry = nullptr;
+    decltype(::RasGetEntryPropertiesW)* GetEntryProperties = nullptr;
+    decltype(::RasSetEntryPropertiesW)* SetEntryProperties = nullptr;
+    decltype(::RasGetEntryDialParamsW)* GetEntryDialParams = nullptr;
+    decltype(::RasSetEntryDialParamsW)* SetEntryDialParams = nullptr;
+    decltype(::RasEnumDevicesW)* EnumDevices = nullptr;
+    decltype(::RasDialW)* Dial = nullptr;
+    decltype(::RasHangUpW)* HangUp = nullptr;
+    decltype(::RasEnumConnectionsW)* EnumConnections = nullptr;
+    decltype(::RasGetErrorStringW)* GetErrorString = nullptr;
   };
   const Table& Calls();
 

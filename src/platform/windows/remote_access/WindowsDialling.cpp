@@ -30,17 +30,17 @@ std::uint32_t WindowsDialling::RasDialA(std::span<const std::uint8_t> extensions
                                         RasConnection& connection) {
   const auto call = ras_.Calls().Dial;
   if (!call) return kRasManagerCannotStart;
-  if (const std::uint32_t error = ErrorOfRecord(params)) return error;
+  if (const std::uint32_t error = ErrorOfRecord(kRasDialParams, params)) return error;
   if (!extensions.empty() && ErrorOfRecord(extensions) != kRasSuccess) return kRasInvalidSize;
   auto relay = RelayTo(notifier);
   if (relay && !relay->Window()) return kRasManagerCannotStart;
-  RecordCopy extended(extensions);
-  RecordCopy image(params);
+  std::vector<std::uint8_t> extended(extensions.begin(), extensions.end());
+  WideRecord image(kRasDialParams, params);
   HRASCONN handle = nullptr;
   const std::uint32_t error =
-      call(extensions.empty() ? nullptr : extended.As<RASDIALEXTENSIONS>(), BookNamed(phoneBook),
-           image.As<RASDIALPARAMSA>(), relay ? kRasNotifierIsWindow : 0, relay ? relay->Window() : nullptr,
-           &handle);
+      call(extensions.empty() ? nullptr : reinterpret_cast<RASDIALEXTENSIONS*>(extended.data()),
+           BookNamed(phoneBook), image.As<RASDIALPARAMSW>(), relay ? kRasNotifierIsWindow : 0,
+           relay ? relay->Window() : nullptr, &handle);
   if (handle) Keep(ConnectionOf(handle), std::move(relay), error, connection);
   return error;
 }
@@ -75,13 +75,19 @@ std::uint32_t WindowsDialling::RasEnumConnectionsA(std::span<std::uint8_t> conne
   count = 0;
   // The size is the question here: there is none to take in its place.
   if (connections.empty()) return kRasInvalidSize;
-  return FillList<RASCONNA>(connections, bytes, count, RasConnectionRecord::kBytes, call);
+  return FillList<RASCONNW>(kRasConnection, connections, bytes, count, RasConnectionRecord::kBytes, call);
 }
 
 std::uint32_t WindowsDialling::RasGetErrorStringA(std::uint32_t error, std::span<char> text) {
   const auto call = ras_.Calls().GetErrorString;
   if (!call) return unavailable::UnavailableDialling().RasGetErrorStringA(error, text);
-  return call(error, text.data(), static_cast<DWORD>(text.size()));
+  std::vector<wchar_t> told(text.size() + 1);
+  const std::uint32_t result = call(error, told.data(), static_cast<DWORD>(text.size()));
+  if (result != kRasSuccess) return result;
+  const std::string bytes = ToCodePage(winapi::TextOf(told.data()));
+  if (bytes.size() >= text.size()) return kRasBufferTooSmall;
+  *std::ranges::copy(bytes, text.begin()).out = '\0';
+  return result;
 }
 
 } // namespace quendra::platform::windows

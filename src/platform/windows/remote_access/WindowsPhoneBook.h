@@ -3,6 +3,8 @@
 #include "platform/remote_access/PhoneBook.h"
 #include "platform/windows/remote_access/RasCalls.h"
 
+#include <vector>
+
 namespace quendra::platform::windows {
 
 /// The phone book of the system's remote access, which answers itself. A machine without it answers as one
@@ -26,6 +28,11 @@ class WindowsPhoneBook : public PhoneBook {
                                 std::uint32_t& count) override;
 
  private:
+  std::uint32_t TellEntryBytes(const wchar_t* phoneBook, std::uint32_t& bytes);
+  /// An entry in the system's form, in a record of so many bytes.
+  std::uint32_t ReadEntry(const wchar_t* phoneBook, const wchar_t* entryName, std::uint32_t recordBytes,
+                          std::vector<std::uint8_t>& entry);
+
   RasCalls& ras_;
 };
 

@@ -19,12 +19,12 @@ std::string NewFile() {
 
 /// The lines are the library's, which stays, and would be the next test's.
 void HangUpAll(const winapi::SystemLibrary& library) {
-  std::array<RASCONNA, 64> lines{};
+  std::array<RASCONNW, 64> lines{};
   lines[0].dwSize = sizeof lines[0];
   DWORD bytes = sizeof lines;
   DWORD count = 0;
-  library.Find<decltype(::RasEnumConnectionsA)>("RasEnumConnectionsA")(lines.data(), &bytes, &count);
-  for (DWORD i = 0; i < count; ++i) library.Find<decltype(::RasHangUpA)>("RasHangUpA")(lines[i].hrasconn);
+  library.Find<decltype(::RasEnumConnectionsW)>("RasEnumConnectionsW")(lines.data(), &bytes, &count);
+  for (DWORD i = 0; i < count; ++i) library.Find<decltype(::RasHangUpW)>("RasHangUpW")(lines[i].hrasconn);
 }
 
 } // namespace

@@ -4,7 +4,9 @@
 
 #include <array>
 #include <optional>
+#include <string_view>
 #include <utility>
+#include <vector>
 
 namespace quendra::platform::windows {
 namespace {
@@ -209,6 +211,29 @@ TEST_F(WindowsDiallingTest, Texts_that_fill_their_fields_are_not_read_beyond_the
   RasConnection connection;
 
   EXPECT_EQ(ras.Dials.RasDialA({}, nullptr, params, {}, connection), kRasCannotFindPhonebookEntry);
+}
+
+TEST_F(WindowsDiallingTest, Names_reach_the_system_as_letters_whatever_its_code_page) {
+  Make("\xE1\xE9\xFA");
+  RASENTRYNAMEW name{};
+  name.dwSize = sizeof name;
+  DWORD bytes = sizeof name;
+  DWORD count = 0;
+
+  ASSERT_EQ(ras.Calls.Calls().EnumEntries(nullptr, nullptr, &name, &bytes, &count), DWORD{kRasSuccess});
+
+  EXPECT_EQ(winapi::TextOf(name.szEntryName), u"\u05D1\u05D9\u05EA");
+}
+
+TEST_F(WindowsDiallingTest, What_is_said_of_an_error_fits_the_room_with_its_NUL_or_is_not_said) {
+  std::array<char, 512> text{};
+  ASSERT_EQ(ras.Dials.RasGetErrorStringA(691, text), kRasSuccess);
+  const std::size_t length = std::string_view(text.data()).size();
+  std::vector<char> room(length + 1, 'x');
+
+  EXPECT_EQ(ras.Dials.RasGetErrorStringA(691, room), kRasSuccess);
+  EXPECT_STREQ(room.data(), text.data());
+  EXPECT_NE(ras.Dials.RasGetErrorStringA(691, std::span(room).first(length)), kRasSuccess);
 }
 
 TEST_F(WindowsDiallingTest, A_named_phone_book_is_the_systems_to_find) {
