@@ -91,10 +91,11 @@ std::vector<CaptureLink> CaptureLinksOf(const std::vector<ListedCard>& cards,
   return links;
 }
 
-std::vector<CaptureLink> ReadCaptureLinks(const IpHelperLibrary& library) {
+std::optional<std::vector<CaptureLink>> ReadCaptureLinks(const IpHelperLibrary& library) {
   std::vector<ListedCard> cards;
   std::vector<InterfaceRow> rows;
-  if (ReadNetworkCards(library, cards) != 0 || ReadInterfaceRows(library, true, rows) != 0) return {};
+  if (ReadNetworkCards(library, cards) != 0 || ReadInterfaceRows(library, true, rows) != 0)
+    return std::nullopt;
   return CaptureLinksOf(cards, rows, DefaultRouteIndex(library));
 }
 

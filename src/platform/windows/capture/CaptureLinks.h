@@ -23,7 +23,8 @@ struct CaptureLink {
 /// none.
 std::vector<CaptureLink> CaptureLinksOf(const std::vector<ListedCard>& cards,
                                         const std::vector<InterfaceRow>& rows, std::uint32_t routed);
-std::vector<CaptureLink> ReadCaptureLinks(const IpHelperLibrary& library);
+/// None where the system can't tell just now.
+std::optional<std::vector<CaptureLink>> ReadCaptureLinks(const IpHelperLibrary& library);
 
 /// That of one of the capture library's devices; nullptr for a device that is none of this machine's links.
 const CaptureLink* LinkOfDevice(const std::vector<CaptureLink>& links, std::string_view device);

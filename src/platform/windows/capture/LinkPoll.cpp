@@ -7,7 +7,7 @@ LinkPoll::LinkPoll(EventLoop& loop, Read read, std::function<void()> changed) {
   timer_ = loop.StartTimer(kMilliseconds, [read = std::move(read), changed = std::move(changed),
                                            last = std::move(last)]() mutable {
     auto now = read();
-    if (now == last) return;
+    if (!now || now == last) return;
     last = std::move(now);
     changed();
   });

@@ -9,10 +9,10 @@
 namespace quendra::platform::windows {
 
 /// Tells through the loop that a link has come, gone or changed, or its address. The system would tell a
-/// thread that waits; a look every second costs less.
+/// thread that waits; a look every second costs less. A look that fails tells nothing.
 class LinkPoll : public EventLoop::Subscription {
  public:
-  using Read = std::function<std::vector<CaptureLink>()>;
+  using Read = std::function<std::optional<std::vector<CaptureLink>>()>;
 
   LinkPoll(EventLoop& loop, Read read, std::function<void()> changed);
 

@@ -48,7 +48,7 @@ std::vector<LiveAdapter> WindowsCaptureAdapters::List() const {
   PcapDevice* devices = nullptr;
   if (library_.findalldevs(&devices, error) != 0) devices = nullptr;
   const std::unique_ptr<PcapDevice, decltype(library_.freealldevs)> owner(devices, library_.freealldevs);
-  const auto links = ReadCaptureLinks(ipHelper_);
+  const auto links = ReadCaptureLinks(ipHelper_).value_or(std::vector<CaptureLink>());
   std::vector<LiveAdapter> adapters;
   for (const PcapDevice* device = devices; device != nullptr; device = device->next) {
     const CaptureLink* link = LinkOfDevice(links, device->name);
@@ -59,13 +59,13 @@ std::vector<LiveAdapter> WindowsCaptureAdapters::List() const {
 }
 
 unsigned WindowsCaptureAdapters::NumberIfUp(const std::string& name) const {
-  const auto links = ReadCaptureLinks(ipHelper_);
+  const auto links = ReadCaptureLinks(ipHelper_).value_or(std::vector<CaptureLink>());
   const CaptureLink* link = LinkOfDevice(links, name);
   return link != nullptr && link->isUp ? link->index : 0;
 }
 
 Ipv4Address WindowsCaptureAdapters::AddressOf(const std::string& name) const {
-  const auto links = ReadCaptureLinks(ipHelper_);
+  const auto links = ReadCaptureLinks(ipHelper_).value_or(std::vector<CaptureLink>());
   const CaptureLink* link = LinkOfDevice(links, name);
   return link != nullptr ? link->address : Ipv4Address();
 }

@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <utility>
+
 namespace quendra::platform::windows {
 
 namespace {
@@ -106,6 +108,25 @@ TEST(LinkPollTest, A_change_and_the_return_to_what_was_are_told_once_each) {
   links = before;
   desktop.Advance(3 * LinkPoll::kMilliseconds);
   EXPECT_EQ(changes, 2);
+}
+
+TEST(LinkPollTest, A_look_that_fails_is_no_change) {
+  forms::headless::HeadlessDesktop desktop;
+  std::optional<std::vector<CaptureLink>> links(1);
+  int changes = 0;
+  const LinkPoll poll(
+      desktop, [&] { return links; }, [&] { ++changes; });
+  const auto before = std::exchange(links, std::nullopt);
+  desktop.Advance(3 * LinkPoll::kMilliseconds);
+  links = before;
+  desktop.Advance(3 * LinkPoll::kMilliseconds);
+  EXPECT_EQ(changes, 0);
+}
+
+TEST(CaptureLinks, A_table_that_the_system_cannot_give_is_not_one_without_links) {
+  IpHelperLibrary library;
+  library.GetAdaptersInfo = [](IP_ADAPTER_INFO*, ULONG*) WINAPI -> DWORD { return ERROR_INVALID_DATA; };
+  EXPECT_EQ(ReadCaptureLinks(library), std::nullopt);
 }
 
 TEST(LinkPollTest, It_may_end_in_what_it_calls) {
