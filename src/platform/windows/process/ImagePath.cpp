@@ -35,4 +35,14 @@ Text PastRedirection(const Text& path, const Text& systemFolder) {
          path.substr(systemFolder.size());
 }
 
+Text WithoutKernelsNames(const Text& path, const Text& systemFolder) {
+  constexpr TextView kWindows = u"\\SystemRoot\\";
+  constexpr TextView kDevices = u"\\??\\";
+  const bool isOnDrive = path.starts_with(kDevices) && path.find(u":\\") == kDevices.size() + 1;
+  if (isOnDrive) return path.substr(kDevices.size());
+  if (systemFolder.empty() || !SameIgnoringCase(TextView(path).substr(0, kWindows.size()), kWindows))
+    return path;
+  return systemFolder.substr(0, systemFolder.rfind(u'\\') + 1) + path.substr(kWindows.size());
+}
+
 } // namespace quendra::platform::windows

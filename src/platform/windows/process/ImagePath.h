@@ -25,4 +25,7 @@ class ImagePath {
 /// folder itself has a second name for it.
 Text PastRedirection(const Text& path, const Text& systemFolder);
 
+/// XP has the programs that it starts first under names of its kernel's, by which no file can be opened.
+Text WithoutKernelsNames(const Text& path, const Text& systemFolder);
+
 } // namespace quendra::platform::windows

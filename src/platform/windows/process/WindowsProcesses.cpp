@@ -100,7 +100,8 @@ Text WindowsProcesses::PathOfModule(Handle process, ModuleHandle module) {
   const DWORD length = getName(ToSystem(process), reinterpret_cast<HMODULE>(std::uintptr_t{module.Value()}),
                                found.data(), static_cast<DWORD>(found.size()));
   if (!lastError_.Succeeded(length > 0)) return {};
-  return winapi::TextOf(found.data(), std::min(std::size_t{length}, found.size()));
+  return WithoutKernelsNames(winapi::TextOf(found.data(), std::min(std::size_t{length}, found.size())),
+                             winapi::SystemFolder());
 }
 
 std::uint32_t WindowsProcesses::GetModuleFileNameExA(Handle process, ModuleHandle module, std::string& path,

@@ -65,6 +65,21 @@ TEST(PastRedirectionTest, Files_elsewhere_keep_their_names) {
   }
 }
 
+TEST(WithoutKernelsNamesTest, Programs_that_the_system_starts_first_lie_where_a_file_is_found) {
+  const Text folder = u"C:\\WINDOWS\\system32";
+  EXPECT_EQ(WithoutKernelsNames(u"\\SystemRoot\\System32\\smss.exe", folder),
+            u"C:\\WINDOWS\\System32\\smss.exe");
+  EXPECT_EQ(WithoutKernelsNames(u"\\??\\C:\\WINDOWS\\system32\\csrss.exe", folder),
+            u"C:\\WINDOWS\\system32\\csrss.exe");
+}
+
+TEST(WithoutKernelsNamesTest, Other_paths_stay) {
+  for (const Text path : {u"C:\\SystemRoot\\a.exe", u"\\\\server\\share\\a.exe", u"\\SystemRootx\\a.exe",
+                          u"\\??\\UNC\\server\\a.exe", u"\\??\\", u""})
+    EXPECT_EQ(WithoutKernelsNames(path, u"C:\\WINDOWS\\system32"), path);
+  EXPECT_EQ(WithoutKernelsNames(u"\\SystemRoot\\a.exe", u""), u"\\SystemRoot\\a.exe");
+}
+
 struct PathInCodePageTest : testing::Test {
   ~PathInCodePageTest() override {
     ::DeleteFileW(winapi::Wide(path));
