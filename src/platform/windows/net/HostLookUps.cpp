@@ -4,6 +4,8 @@
 #include "platform/windows/net/HostEntry.h"
 
 #include <algorithm>
+#include <iterator>
+#include <vector>
 
 namespace quendra::platform::windows {
 
@@ -35,6 +37,12 @@ bool HostLookUps::Cancel(LookUpHandle handle) {
   found->isCancelled = true;
   LetOldStoppedOnesGo();
   return true;
+}
+
+void HostLookUps::CancelAll() {
+  std::vector<LookUpHandle> all;
+  std::ranges::transform(underWay_, std::back_inserter(all), &LookUp::handle);
+  for (const LookUpHandle handle : all) Cancel(handle);
 }
 
 void HostLookUps::LetOldStoppedOnesGo() {

@@ -30,6 +30,7 @@ class HostLookUps {
   LookUpHandle Start(HWND relay, UINT relayed, const std::string& name, const Asker& asker);
   /// False when it isn't under way any more.
   bool Cancel(LookUpHandle lookUp);
+  void CancelAll();
   void OnEnd(HANDLE request, LPARAM result);
 
   /// How many the system may still write about: those under way, and cancelled ones.

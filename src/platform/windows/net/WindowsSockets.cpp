@@ -30,8 +30,12 @@ std::int32_t WindowsSockets::WSAStartup(std::uint16_t version) {
 
 std::int32_t WindowsSockets::WSACleanup() {
   if (started_ == 0) return Fail(kNotStarted);
-  // Others of this process may have the library open, so it wouldn't close the sockets itself.
-  if (--started_ == 0) CloseAll();
+  // Others of this process may have the library open, so it wouldn't close the sockets itself, nor stop
+  // look-ups whose buffers may go now.
+  if (--started_ == 0) {
+    lookUps_.CancelAll();
+    CloseAll();
+  }
   return Answer(library_.WSACleanup());
 }
 

@@ -5,6 +5,7 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <optional>
 
 namespace quendra::platform::windows {
@@ -25,6 +26,36 @@ int WSAAPI Keep(SOCKET socket, HWND window, unsigned message, long) {
   selected = Selected{socket, window, message};
   u_long isOn = 1;
   return setMode(socket, static_cast<long>(FIONBIO), &isOn);
+}
+
+/// Whom the library was asked to tell of a look-up, which never ends by itself.
+std::optional<Selected> lookedUp;
+HANDLE WSAAPI KeepLookUp(HWND window, u_int message, const char*, char*, int) {
+  lookedUp = Selected{INVALID_SOCKET, window, message};
+  return reinterpret_cast<HANDLE>(std::uintptr_t{7});
+}
+int WSAAPI RefuseToStop(HANDLE) { return SOCKET_ERROR; }
+
+TEST(WindowsLookUps, One_that_is_under_way_at_the_last_clean_up_tells_nothing_any_more) {
+  WindowsLoop loop;
+  SocketLibrary library;
+  library.WSAAsyncGetHostByName = KeepLookUp;
+  library.WSACancelAsyncRequest = RefuseToStop;
+  WindowsSockets sockets(loop, library);
+  int told = 0;
+  using Procedure = forms::WindowProcedure::element_type;
+  const WindowHandle window =
+      loop.Windows.Add(std::make_shared<Procedure>([&](auto, auto, auto, auto) { return ++told, 0; }));
+  std::array<std::uint8_t, 1024> buffer{};
+  ASSERT_EQ(sockets.WSAStartup(257), 0);
+  ASSERT_NE(sockets.WSAAsyncGetHostByName(window, 32769, "host", buffer), kNoLookUp);
+
+  EXPECT_EQ(sockets.WSACleanup(), 0);
+
+  constexpr LPARAM kFailed = MAKELPARAM(0, WSAHOST_NOT_FOUND);
+  ::PostMessageW(lookedUp->window, lookedUp->message, 7, kFailed);
+  loop.WaitFor([] { return false; }, 10);
+  EXPECT_EQ(told, 0);
 }
 
 /// A connection whose events are those that the test says.
