@@ -29,7 +29,7 @@ LaterInterfaceRows::LaterInterfaceRows(std::span<const InterfaceRow> atStart) {
 }
 
 std::vector<InterfaceRow> LaterInterfaceRows::AsOnXp(std::span<const InterfaceRow> rows,
-                                                     std::span<const ListedCard> cards) const {
+                                                     std::span<const ListedCard> cards) {
   std::vector<InterfaceRow> listed;
   std::ranges::copy_if(rows, std::back_inserter(listed),
                        [&](const InterfaceRow& row) { return IsListed(row, cards); });
@@ -42,14 +42,15 @@ std::vector<InterfaceRow> LaterInterfaceRows::AsOnXp(std::span<const InterfaceRo
   return listed;
 }
 
-void LaterInterfaceRows::CountFromStart(InterfaceRow& row) const {
+void LaterInterfaceRows::CountFromStart(InterfaceRow& row) {
   // One that came later began at 0, as did the counters of a card that was started again.
   const auto start = atStart_.find(IndexOf(row));
   if (start == atStart_.end()) return;
   for (const InterfaceRow::Field field : kCounters) {
-    const std::uint32_t before = start->second.Get(field);
     const std::uint32_t now = row.Get(field);
-    row.Set(field, now < before ? now : now - before);
+    // From here on it counts from there: it must not fall back when it passes its old start.
+    if (now < start->second.Get(field)) start->second.Set(field, 0);
+    row.Set(field, now - start->second.Get(field));
   }
 }
 

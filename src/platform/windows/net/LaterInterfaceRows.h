@@ -17,8 +17,7 @@ class LaterInterfaceRows {
   explicit LaterInterfaceRows(std::span<const InterfaceRow> atStart);
 
   /// Those of the cards, and the loopback, by ascending index.
-  std::vector<InterfaceRow> AsOnXp(std::span<const InterfaceRow> rows,
-                                   std::span<const ListedCard> cards) const;
+  std::vector<InterfaceRow> AsOnXp(std::span<const InterfaceRow> rows, std::span<const ListedCard> cards);
 
   static constexpr std::uint32_t kUnknownSpeed = 10'000'000;
   static constexpr std::uint32_t kMostSpeed = 0x7FFFFFFF;
@@ -31,7 +30,7 @@ class LaterInterfaceRows {
       InterfaceRow::kInDiscards,  InterfaceRow::kInErrors,   InterfaceRow::kInUnknownProtocols,
       InterfaceRow::kOutOctets,   InterfaceRow::kOutUnicast, InterfaceRow::kOutNonunicast,
       InterfaceRow::kOutDiscards, InterfaceRow::kOutErrors};
-  void CountFromStart(InterfaceRow& row) const;
+  void CountFromStart(InterfaceRow& row);
 
   std::map<std::uint32_t, InterfaceRow> atStart_; ///< by index
 };

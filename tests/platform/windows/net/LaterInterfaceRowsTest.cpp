@@ -81,6 +81,20 @@ TEST(LaterInterfaceRows, Counters_count_from_the_start_and_from_0_where_they_beg
   EXPECT_EQ(rows[1].Get(InterfaceRow::kInOctets), 7u);
 }
 
+TEST(LaterInterfaceRows, A_counter_that_began_anew_does_not_fall_back_when_it_passes_its_old_start) {
+  InterfaceRow start = LaterRow(1);
+  start.Set(InterfaceRow::kInOctets, 100);
+  Later later(std::vector{start});
+  const std::vector<ListedCard> cards{CardOfIndex(1)};
+  std::vector<std::uint32_t> told;
+  for (const std::uint32_t octets : {150u, 20u, 99u, 101u}) {
+    InterfaceRow now = LaterRow(1);
+    now.Set(InterfaceRow::kInOctets, octets);
+    told.push_back(later.AsOnXp(std::vector{now}, cards).at(0).Get(InterfaceRow::kInOctets));
+  }
+  EXPECT_EQ(told, (std::vector<std::uint32_t>{50, 20, 99, 101}));
+}
+
 // In place of the library's: a card, one of its filters and the loopback.
 
 constexpr DWORD kCard = 5;
