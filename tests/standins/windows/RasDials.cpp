@@ -149,6 +149,16 @@ bool RasDials::HangUp(std::uint32_t handle) {
   if (found == connections_.end()) return false;
   ::SetEvent(found->second->hungUp);
   connections_.erase(found);
+  ending_[handle] = 3;
+  return true;
+}
+
+bool RasDials::HasHandle(std::uint32_t handle) {
+  const Locked locked(lock_);
+  if (connections_.contains(handle)) return true;
+  const auto found = ending_.find(handle);
+  if (found == ending_.end()) return false;
+  if (--found->second == 0) ending_.erase(found);
   return true;
 }
 

@@ -40,6 +40,8 @@ class RasDials {
   /// A dial that returns with its outcome, or that tells a window. Either leaves a handle.
   std::uint32_t Start(const Shared& connection, HWND window, std::uint32_t& handle);
   bool HangUp(std::uint32_t handle);
+  /// Also one that was hung up, for the first questions.
+  bool HasHandle(std::uint32_t handle);
   std::map<std::uint32_t, Shared> All();
 
   struct Step {
@@ -52,6 +54,7 @@ class RasDials {
  private:
   CRITICAL_SECTION lock_;
   std::map<std::uint32_t, Shared> connections_;
+  std::map<std::uint32_t, int> ending_; ///< how many questions about it find it still there
   std::uint32_t lastHandle_ = 0x00A70000;
 };
 

@@ -22,6 +22,7 @@ DWORD EnumDevices(RASDEVINFOA* first, DWORD* bytes, DWORD* count);
 DWORD DialBy(RASDIALEXTENSIONS* extensions, const char* phoneBook, RASDIALPARAMSA* params,
              DialNotifier notifier, HRASCONN* connection);
 DWORD EndConnection(HRASCONN connection);
+DWORD ConnectStatus(HRASCONN connection);
 DWORD EnumConnections(RASCONNA* first, DWORD* bytes, DWORD* count);
 DWORD ErrorText(UINT error, char* text, DWORD bytes);
 

@@ -306,6 +306,8 @@ EXPORTED RasDialW(LPRASDIALEXTENSIONS extensions, LPCWSTR phoneBook, LPRASDIALPA
 
 EXPORTED RasHangUpW(HRASCONN connection) { return EndConnection(connection); }
 
+EXPORTED RasGetConnectStatusW(HRASCONN connection, LPRASCONNSTATUSW) { return ConnectStatus(connection); }
+
 EXPORTED RasGetErrorStringW(UINT error, LPWSTR text, DWORD characters) {
   std::vector<char> bytes(characters);
   const DWORD result = ErrorText(error, text ? bytes.data() : nullptr, characters);

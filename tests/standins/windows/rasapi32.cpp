@@ -276,6 +276,11 @@ DWORD EndConnection(HRASCONN connection) {
   return Dials().HangUp(handle) ? std::uint32_t{kRasSuccess} : std::uint32_t{kErrorInvalidHandle};
 }
 
+DWORD ConnectStatus(HRASCONN connection) {
+  const auto handle = static_cast<std::uint32_t>(reinterpret_cast<std::uintptr_t>(connection));
+  return Dials().HasHandle(handle) ? std::uint32_t{kRasSuccess} : std::uint32_t{kErrorInvalidHandle};
+}
+
 DWORD EnumConnections(RASCONNA* first, DWORD* bytes, DWORD* count) {
   if (!bytes || !count) return kInvalidParameter;
   const DWORD size = first ? first->dwSize : DWORD{sizeof(RASCONNA)};

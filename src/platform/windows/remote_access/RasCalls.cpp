@@ -16,6 +16,7 @@ const RasCalls::Table& RasCalls::Calls() {
   Find(library, "RasEnumDevicesW", table_.EnumDevices);
   Find(library, "RasDialW", table_.Dial);
   Find(library, "RasHangUpW", table_.HangUp);
+  Find(library, "RasGetConnectStatusW", table_.GetConnectStatus);
   Find(library, "RasEnumConnectionsW", table_.EnumConnections);
   Find(library, "RasGetErrorStringW", table_.GetErrorString);
   return table_;

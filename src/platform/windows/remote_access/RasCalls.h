@@ -27,6 +27,7 @@ class RasCalls {
     decltype(::RasEnumDevicesW)* EnumDevices = nullptr;
     decltype(::RasDialW)* Dial = nullptr;
     decltype(::RasHangUpW)* HangUp = nullptr;
+    decltype(::RasGetConnectStatusW)* GetConnectStatus = nullptr;
     decltype(::RasEnumConnectionsW)* EnumConnections = nullptr;
     decltype(::RasGetErrorStringW)* GetErrorString = nullptr;
   };

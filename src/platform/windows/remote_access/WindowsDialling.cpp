@@ -8,6 +8,8 @@ namespace quendra::platform::windows {
 
 namespace {
 
+constexpr std::uint32_t kMostMillisecondsToEnd = 3000; // as the system's makers advise
+
 HRASCONN HandleOf(RasConnection connection) { return reinterpret_cast<HRASCONN>(connection.Value()); }
 
 RasConnection ConnectionOf(HRASCONN handle) {
@@ -15,6 +17,19 @@ RasConnection ConnectionOf(HRASCONN handle) {
 }
 
 } // namespace
+
+WindowsDialling::~WindowsDialling() {
+  const std::uint32_t begin = ::GetTickCount();
+  for (const RasConnection connection : hungUp_)
+    while (HasHandle(connection) && ::GetTickCount() - begin < kMostMillisecondsToEnd) ::Sleep(10);
+}
+
+bool WindowsDialling::HasHandle(RasConnection connection) {
+  const auto call = ras_.Calls().GetConnectStatus;
+  RASCONNSTATUSW status{};
+  status.dwSize = sizeof status;
+  return call && call(HandleOf(connection), &status) == kRasSuccess;
+}
 
 std::unique_ptr<DialRelay> WindowsDialling::RelayTo(const Notifier& notifier) {
   // A notifier of another kind is the address of a procedure, which none of the program's numbers is.

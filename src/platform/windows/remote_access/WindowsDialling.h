@@ -16,6 +16,8 @@ namespace quendra::platform::windows {
 class WindowsDialling : public Dialling {
  public:
   WindowsDialling(RasCalls& ras, EventLoop& loop) : ras_(ras), loop_(loop) {}
+  /// Waits a while for the end of what was hung up: a line whose program goes before may stay unusable.
+  ~WindowsDialling() override;
 
   std::uint32_t RasDialA(std::span<const std::uint8_t> extensions, const char* phoneBook,
                          std::span<const std::uint8_t> params, const Notifier& notifier,
@@ -26,6 +28,7 @@ class WindowsDialling : public Dialling {
   std::uint32_t RasGetErrorStringA(std::uint32_t error, std::span<char> text) override;
 
  private:
+  bool HasHandle(RasConnection connection);
   /// nullptr for a notifier that is nobody.
   std::unique_ptr<DialRelay> RelayTo(const Notifier& notifier);
   void Keep(RasConnection made, std::unique_ptr<DialRelay> relay, std::uint32_t error,

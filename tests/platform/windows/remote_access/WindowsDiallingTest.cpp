@@ -105,6 +105,23 @@ TEST_F(WindowsDiallingTest, A_machine_that_goes_during_a_dial_is_told_no_more) {
   EXPECT_EQ(ras.Dials.RasHangUpA(connection), kRasSuccess);
 }
 
+TEST_F(WindowsDiallingTest, What_was_hung_up_has_ended_before_the_program_goes) {
+  Make("Slow");
+  Told told;
+  RasConnection connection;
+  {
+    WindowsDialling dials(ras.Calls, ras.Desktop);
+    const Dialling::Notifier notifier{kRasNotifierIsWindow, Listener(told)};
+    ASSERT_EQ(dials.RasDialA({}, nullptr, Params("Slow"), notifier, connection), kRasSuccess);
+    ASSERT_EQ(dials.RasHangUpA(connection), kRasSuccess);
+  }
+
+  RASCONNSTATUSW status{};
+  status.dwSize = sizeof status;
+  EXPECT_EQ(ras.Calls.Calls().GetConnectStatus(reinterpret_cast<HRASCONN>(connection.Value()), &status),
+            DWORD{kErrorInvalidHandle});
+}
+
 TEST_F(WindowsDiallingTest, A_dial_has_a_window_of_the_system_until_it_is_hung_up) {
   Make("Slow");
   Told told;
