@@ -46,8 +46,11 @@ $\r$\nבלעדיה מוצגים התהליכים והיציאות שלהם בל�
 ; One who runs the program must close it first: its file can't be written over or taken away. Status 2 says so to whoever
 ; asked for silence.
 !macro RefuseWhileItRuns
-  System::Call 'kernel32::OpenMutexW(i 0x100000, i 0, w "Local\QuendraRuns") p .r0'
+  System::Call 'kernel32::OpenMutexW(i 0x100000, i 0, w "Local\QuendraRuns") p .r0 ?e'
+  Pop $1
+  ; Denied: another user's, whose rights we have taken the administrator's for.
   ${If} $0 P<> 0
+  ${OrIf} $1 = 5
     System::Call 'kernel32::CloseHandle(p r0)'
     MessageBox MB_OK|MB_ICONEXCLAMATION|MB_RIGHT|MB_RTLREADING "יש לסגור את Quendra ולנסות שוב." /SD IDOK
     SetErrorLevel 2
