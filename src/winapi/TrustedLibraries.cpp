@@ -7,10 +7,12 @@ namespace quendra::winapi {
 namespace {
 
 /// Asked for by the system's own libraries, on one version or another: rights of files, COM, firewall,
-/// passwords, names of hosts, dialling, devices.
-constexpr const wchar_t* kOthers[] = {L"ntmarta.dll",  L"clbcatq.dll",  L"hnetcfg.dll",
-                                      L"secur32.dll",  L"netapi32.dll", L"rasadhlp.dll",
-                                      L"rasapi32.dll", L"setupapi.dll", L"version.dll"};
+/// passwords, names of hosts, addresses of cards, dialling, devices, settings of users, programs that are
+/// started, texts that are typed, assistive tools, counters of the processor.
+constexpr const wchar_t* kOthers[] = {
+    L"ntmarta.dll",  L"clbcatq.dll",  L"hnetcfg.dll", L"secur32.dll",  L"netapi32.dll", L"dnsapi.dll",
+    L"rasadhlp.dll", L"dhcpcsvc.dll", L"mprapi.dll",  L"rasapi32.dll", L"setupapi.dll", L"version.dll",
+    L"userenv.dll",  L"apphelp.dll",  L"msctf.dll",   L"oleacc.dll",   L"perfos.dll"};
 
 template <typename Call> Call* FindInKernel(const char* name) {
   const FARPROC call = ::GetProcAddress(::GetModuleHandleW(L"kernel32.dll"), name);

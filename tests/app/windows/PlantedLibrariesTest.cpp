@@ -15,9 +15,10 @@
 namespace quendra::app::windows {
 namespace {
 
-constexpr const char16_t* kNames[] = {u"comctl32.dll", u"iphlpapi.dll", u"msi.dll",     u"psapi.dll",
-                                      u"rasapi32.dll", u"uxtheme.dll",  u"version.dll", u"wininet.dll",
-                                      u"wpcap.dll",    u"ws2_32.dll"};
+constexpr const char16_t* kNames[] = {
+    u"apphelp.dll", u"comctl32.dll", u"dhcpcsvc.dll", u"dnsapi.dll", u"iphlpapi.dll", u"mprapi.dll",
+    u"msctf.dll",   u"msi.dll",      u"oleacc.dll",   u"psapi.dll",  u"rasapi32.dll", u"userenv.dll",
+    u"uxtheme.dll", u"version.dll",  u"wininet.dll",  u"wpcap.dll",  u"ws2_32.dll"};
 
 /// How libraries are looked for as long as it lives.
 class OrderOfLibraries {
@@ -115,6 +116,11 @@ TEST_P(PlantedLibraries, Are_not_loaded_by_the_program) {
     EXPECT_TRUE(path.starts_with(u"c:\\windows\\")) << ToUtf8(path);
   EXPECT_FALSE(run_->folders.WasLoadedBeside(GetParam()));
   EXPECT_FALSE(run_->folders.WasLoadedFromWorking(GetParam()));
+}
+
+TEST_P(PlantedLibraries, Find_those_of_the_system_loaded_in_their_place) {
+  ASSERT_EQ(ToUtf8(run_->missed), "");
+  EXPECT_FALSE(run_->program.Loaded(GetParam()).empty());
 }
 
 TEST_P(PlantedLibraries, Are_loaded_by_a_program_that_asks_for_them_by_name) {
