@@ -2,6 +2,7 @@
 
 #include "platform/net/InterfaceRow.h"
 #include "platform/windows/net/AnsiText.h"
+#include "platform/windows/net/LaterInterfaceRows.h"
 #include "platform/windows/net/NetworkCards.h"
 #include "platform/windows/net/OwnerTable.h"
 #include "platform/windows/net/SizedTable.h"
@@ -45,14 +46,17 @@ void PutIntoProgramsPage(InterfaceRow& row) {
   row.Set(InterfaceRow::kDescriptionLength, static_cast<std::uint32_t>(text.size()));
 }
 
+/// None where they can't be read.
+std::vector<InterfaceRow> RowsNow(const IpHelperLibrary& library) {
+  std::vector<InterfaceRow> rows;
+  ReadInterfaceRows(library, true, rows);
+  return rows;
+}
+
 } // namespace
 
-WindowsIpHelper::WindowsIpHelper(const IpHelperLibrary& library, bool isLater) : library_(library) {
-  if (!isLater) return;
-  std::vector<InterfaceRow> rows;
-  ReadInterfaceRows(library_, true, rows);
-  later_.emplace(rows);
-}
+WindowsIpHelper::WindowsIpHelper(const IpHelperLibrary& library, bool isLater)
+    : library_(library), isLater_(isLater), counters_(RowsNow(library)) {}
 
 bool WindowsIpHelper::IsVistaOrLater() { return LOBYTE(::GetVersion()) >= 6; }
 
@@ -99,12 +103,15 @@ std::uint32_t WindowsIpHelper::GetAdaptersInfo(std::vector<AdapterRecord>& adapt
 std::uint32_t WindowsIpHelper::GetIfTable(std::span<std::uint8_t> buffer, std::uint32_t& size, bool sorted) {
   std::vector<InterfaceRow> rows;
   if (const std::uint32_t result = ReadInterfaceRows(library_, sorted, rows); result != 0) return result;
-  if (later_) {
+  if (isLater_) {
     std::vector<ListedCard> cards;
     if (const std::uint32_t result = ReadNetworkCards(library_, cards); result != 0) return result;
-    rows = later_->AsOnXp(rows, cards);
+    rows = AsOnXp(rows, cards);
   }
-  std::ranges::for_each(rows, PutIntoProgramsPage);
+  for (InterfaceRow& row : rows) {
+    PutIntoProgramsPage(row);
+    counters_.CountFromStart(row);
+  }
   return PutInterfaceTable(rows, buffer, size);
 }
 

@@ -1,10 +1,8 @@
 #pragma once
 
 #include "platform/net/IpHelper.h"
+#include "platform/windows/net/InterfaceCounters.h"
 #include "platform/windows/net/IpHelperLibrary.h"
-#include "platform/windows/net/LaterInterfaceRows.h"
-
-#include <optional>
 
 namespace quendra::platform::windows {
 
@@ -28,7 +26,8 @@ class WindowsIpHelper : public IpHelper {
   std::uint32_t ReadOlderTable(std::vector<std::uint8_t>& table) const;
 
   const IpHelperLibrary& library_;
-  std::optional<LaterInterfaceRows> later_; ///< none on XP
+  bool isLater_;
+  InterfaceCounters counters_;
 };
 
 } // namespace quendra::platform::windows
