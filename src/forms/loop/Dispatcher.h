@@ -3,8 +3,8 @@
 #include "forms/MessageLoop.h"
 #include "runtime/Fault.h"
 
+#include <exception>
 #include <functional>
-#include <new>
 #include <utility>
 
 namespace quendra::forms {
@@ -26,12 +26,8 @@ class Dispatcher {
       std::forward<Handler>(handler)();
     } catch (const ProgramEnded& end) {
       Quit(end.status);
-    } catch (const Fault& fault) {
-      Report(fault.number, fault.description);
-    } catch (const std::bad_alloc&) {
-      Report(Fault::kOutOfMemory, Fault(Fault::kOutOfMemory).description);
-    } catch (const std::exception& error) {
-      Report(51, u"Internal error: " + FromUtf8(error.what()));
+    } catch (const std::exception&) {
+      ReportThrown();
     }
   }
 
@@ -47,7 +43,8 @@ class Dispatcher {
   }
 
  private:
-  void Report(int number, const Text& description);
+  /// Shows what was thrown, if that can be done, and leaves the loops in any case.
+  void ReportThrown() noexcept;
 
   std::function<void(const Text&)> showFault_;
   std::function<void(int)> leaveLoops_;

@@ -81,6 +81,15 @@ TEST_F(DispatcherTest, No_handler_runs_while_the_fault_is_shown_or_after_it) {
   EXPECT_EQ(ran, 0);
 }
 
+TEST_F(DispatcherTest, A_fault_that_cannot_be_shown_leaves_the_loops_all_the_same) {
+  whileTheFaultIsShown = [] { throw std::bad_alloc(); };
+
+  EXPECT_NO_THROW(dispatcher.Dispatch([] { throw Fault(Fault::kOverflow); }));
+
+  EXPECT_EQ(dispatcher.Status(), 1);
+  EXPECT_EQ(happened.back(), "left 1");
+}
+
 TEST_F(DispatcherTest, Whoever_pumps_below_an_end_goes_on_unwinding) {
   bool wentOn = false;
 
