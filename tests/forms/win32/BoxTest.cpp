@@ -150,6 +150,19 @@ TEST_F(Boxes, Keep_the_user_from_the_form_below_and_give_it_back) {
   EXPECT_TRUE(::IsWindowEnabled(WindowOf(form).Top()));
 }
 
+TEST_F(Boxes, Whose_own_handler_fails_give_the_answer_of_their_default_button) {
+  desktop.Post([&] {
+    desktop.Post([&] {
+      for (Control* control : BoxAnswers::Standing()->TheForm()->Children())
+        if (dynamic_cast<CommandButton*>(control)) control->Click = [] { throw Fault(Fault::kOutOfMemory); };
+      PressInBox(VK_RETURN);
+    });
+  });
+  const auto limit = desktop.StartTimer(3000, [&] { desktop.End(-1); });
+
+  EXPECT_EQ(desktop.MessageBox(u"text", kYesNo | kHebrewBox, u"title"), 6);
+}
+
 using Lines = std::vector<BoxLine>;
 
 TEST(BoxLines, Read_as_their_marks_of_direction_say_and_are_drawn_without_them) {

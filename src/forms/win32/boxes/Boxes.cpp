@@ -23,10 +23,11 @@ void DimCloseBox(HWND window) {
 
 } // namespace
 
-int ShowBox(const ViewContext& desktops, const FormWindow* owner, const BoxContent& content,
-            const Waiter& wait) {
-  // Buttons work also in the box that tells of the program's end.
-  Dispatcher dispatcher([](const Text&) {}, [](int) {});
+int ShowBox(const ViewContext& desktops, FormWindow* owner, const BoxContent& content, const Waiter& wait) {
+  // Buttons work also in the box that tells of the program's end. One that fails itself goes with its default
+  // answer: none of its buttons would work any more.
+  bool failed = false;
+  Dispatcher dispatcher([](const Text&) {}, [&failed](int) { failed = true; });
   ActiveForm active;
   FormState state;
   ViewContext context{desktops.desktop,    dispatcher,     desktops.scale,
@@ -38,7 +39,9 @@ int ShowBox(const ViewContext& desktops, const FormWindow* owner, const BoxConte
   if (content.cancelButton == 0) DimCloseBox(window.Top());
   box.Attach(&window);
   Sound(content.sign);
-  window.RunModal(owner, wait);
+  window.RunModal(owner, [&](const std::function<bool()>& done) {
+    wait([&] { return failed || done(); });
+  });
   window.Release();
   return box.Answer();
 }

@@ -7,7 +7,6 @@ namespace quendra::forms::win32 {
 
 /// Shows a message box over a window (nullptr for none) and waits for its answer, the number of the pressed
 /// button.
-int ShowBox(const ViewContext& desktops, const FormWindow* owner, const BoxContent& content,
-            const Waiter& wait);
+int ShowBox(const ViewContext& desktops, FormWindow* owner, const BoxContent& content, const Waiter& wait);
 
 } // namespace quendra::forms::win32
