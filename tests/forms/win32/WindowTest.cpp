@@ -164,6 +164,44 @@ TEST_F(Window, A_modal_form_keeps_the_user_from_the_others_and_gives_them_back) 
   EXPECT_TRUE(::IsWindowEnabled(WindowOf(form).Top()));
 }
 
+TEST_F(Window, The_lower_of_two_modal_forms_goes_first_and_the_user_is_kept_from_the_others_on) {
+  TestForm lower;
+  TestForm upper;
+  bool blocked = false;
+  desktop.Show(form);
+  desktop.Post([&] {
+    desktop.Post([&] {
+      desktop.Unload(lower);
+      blocked = !::IsWindowEnabled(WindowOf(form).Top()) && ::IsWindowEnabled(WindowOf(upper).Top());
+      desktop.Unload(upper);
+    });
+    desktop.Show(upper, Modality::Modal, &lower);
+  });
+
+  desktop.Show(lower, Modality::Modal, &form);
+
+  EXPECT_TRUE(blocked);
+  EXPECT_TRUE(::IsWindowEnabled(WindowOf(form).Top()));
+}
+
+TEST_F(Window, A_form_that_was_hidden_under_a_modal_one_takes_the_user_again_when_it_is_shown) {
+  TestForm lower;
+  TestForm upper;
+  desktop.Show(form);
+  desktop.Post([&] {
+    desktop.Post([&] {
+      lower.Visible = false;
+      upper.Visible = false;
+    });
+    desktop.Show(upper, Modality::Modal, &lower);
+  });
+  desktop.Show(lower, Modality::Modal, &form);
+
+  desktop.Show(lower);
+
+  EXPECT_TRUE(::IsWindowEnabled(WindowOf(lower).Top()));
+}
+
 TEST_F(Window, A_form_that_was_closed_by_its_own_click_goes_when_the_handler_has_ended) {
   TestForm other;
   Label label(form, u"label");
