@@ -157,7 +157,7 @@ void QtDesktop::Close(FormView& view) {
   Windows.Remove(view.Handle());
   view.Release();
   // Later: an event of this window may be what led here.
-  view.deleteLater();
+  view.Bury();
 }
 
 void QtDesktop::ShowView(Form& form, Modality modality, Form* owner) {

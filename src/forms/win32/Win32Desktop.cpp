@@ -170,7 +170,7 @@ void Win32Desktop::ShowView(Form& form, Modality modality, Form* owner) {
   FormWindow* window = WindowOf(form);
   if (!window) return;
   const Waiter wait = WaiterFromNow();
-  const FormWindow* over = owner ? WindowOf(*owner) : nullptr;
+  FormWindow* const over = owner ? WindowOf(*owner) : nullptr;
   if (modality == Modality::Modeless)
     window->ShowOver(over);
   else

@@ -90,6 +90,62 @@ TEST_P(DesktopSuite, The_end_behind_a_message_box_unwinds_its_caller) {
   EXPECT_FALSE(wentOn);
 }
 
+TEST_P(DesktopSuite, A_modal_form_stands_on_when_its_owner_goes) {
+  bool stood = false;
+  std::unique_ptr<platform::EventLoop::Subscription> later;
+
+  const int status = user->Run([&] {
+    desktop.Show(form);
+    loop.Post([&] {
+      desktop.Unload(form);
+      later = loop.StartTimer(50, [&] {
+        stood = user->Stands(other);
+        later.reset();
+        desktop.Unload(other);
+      });
+    });
+    desktop.Show(other, Modality::Modal, &form);
+  });
+
+  EXPECT_TRUE(stood);
+  EXPECT_EQ(status, 0);
+}
+
+TEST_P(DesktopSuite, A_form_that_was_modal_over_another_can_be_shown_when_that_one_has_gone) {
+  ShowActive(form);
+  loop.Post([&] { other.Visible = false; });
+  desktop.Show(other, Modality::Modal, &form);
+  desktop.Unload(form);
+  Pass(20);
+
+  desktop.Show(other);
+
+  EXPECT_TRUE(user->Stands(other));
+}
+
+TEST_P(DesktopSuite, A_box_stands_on_when_the_form_below_goes) {
+  SeenBox box;
+  int answer = 0;
+  std::unique_ptr<platform::EventLoop::Subscription> later;
+
+  user->Run([&] {
+    desktop.Load(other);
+    desktop.Show(form);
+    loop.Post([&] {
+      desktop.Unload(form);
+      later = loop.StartTimer(50, [&] {
+        later.reset();
+        user->AnswerBox(box, 7);
+      });
+    });
+    answer = desktop.MessageBox(u"text", kYesNo, u"title");
+    desktop.Unload(other);
+  });
+
+  EXPECT_EQ(box.count, 1);
+  EXPECT_EQ(answer, 7);
+}
+
 TEST_P(DesktopSuite, The_loop_tells_how_many_boxes_and_modal_forms_stand) {
   std::vector<int> depths;
   SeenBox box;

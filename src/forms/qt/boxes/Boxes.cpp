@@ -3,6 +3,7 @@
 #include "forms/qt/boxes/BoxIcons.h"
 #include "forms/qt/boxes/BoxText.h"
 #include "forms/qt/drawing/Conversion.h"
+#include "forms/qt/views/FormView.h"
 #include "forms/view/BoxContent.h"
 #include "forms/view/Palette.h"
 
@@ -97,6 +98,7 @@ QPushButton* PutButtons(QMessageBox& box, const BoxContent& content) {
 
 int ShowBox(QWidget* owner, const Text& text, int flags, const Text& title) {
   const BoxContent content = BoxContentOf(text, flags, title);
+  const FormView::Hold hold(dynamic_cast<FormView*>(owner));
   QMessageBox box(owner);
   box.setLayoutDirection(content.rightToLeft ? Qt::RightToLeft : Qt::LeftToRight);
   PutSign(box, content.sign);

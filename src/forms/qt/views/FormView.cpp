@@ -76,6 +76,11 @@ void FormView::Release() {
   WidgetView::Release();
 }
 
+void FormView::Bury() {
+  isBuried_ = true;
+  if (holds_ == 0) deleteLater();
+}
+
 void FormView::ControlGone() {
   Context().active.Forget(*TheControl());
   WidgetView::ControlGone();

@@ -39,6 +39,23 @@ class FormView : private FormContext, public QScrollArea, public WidgetView {
 
   Form* TheForm() const { return static_cast<Form*>(TheControl()); }
   WindowHandle Handle() const { return handle_; }
+  /// Keeps a window that something belongs to: it is not destroyed meanwhile, only released.
+  class Hold {
+   public:
+    explicit Hold(FormView* view) : view_(view) {
+      if (view_) ++view_->holds_;
+    }
+    ~Hold() {
+      if (view_ && --view_->holds_ == 0 && view_->isBuried_) view_->deleteLater();
+    }
+    Hold(const Hold&) = delete;
+    Hold& operator=(const Hold&) = delete;
+
+   private:
+    FormView* view_;
+  };
+  /// Destroys the window, not before whatever runs now has returned and nothing holds it any more.
+  void Bury();
   /// Shows the window in the middle of its owner or of the screen, once; a window that was moved stays where
   /// it is.
   void ShowOver(const QWidget* owner);
@@ -82,6 +99,8 @@ class FormView : private FormContext, public QScrollArea, public WidgetView {
   QEventLoop* modalLoop_ = nullptr;
   bool wasPlaced_ = false;
   bool hadFocus_ = false;
+  int holds_ = 0;
+  bool isBuried_ = false;
 };
 
 } // namespace quendra::forms::qt

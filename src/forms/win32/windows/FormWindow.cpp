@@ -27,6 +27,21 @@ DWORD ExtendedStyleOf(const Form& form) {
   return style;
 }
 
+/// The owner of a window for as long as this lives. The system destroys what a window owns with it.
+class Ownership {
+ public:
+  Ownership(HWND window, HWND owner) : window_(window) { Set(owner); }
+  ~Ownership() { Set(nullptr); }
+  Ownership(const Ownership&) = delete;
+  Ownership& operator=(const Ownership&) = delete;
+
+ private:
+  void Set(HWND owner) const {
+    ::SetWindowLongPtrW(window_, GWLP_HWNDPARENT, reinterpret_cast<LONG_PTR>(owner));
+  }
+  HWND window_;
+};
+
 } // namespace
 
 FormWindow::FormWindow(const ViewContext& desktops, Form& form, WindowHandle handle, ViewMaker makeView)
@@ -184,14 +199,16 @@ void FormWindow::ShowOver(const TopWindow* owner) {
   if (first) FocusFirst();
 }
 
-void FormWindow::RunModal(const TopWindow* owner, const Waiter& wait) {
+void FormWindow::RunModal(FormWindow* owner, const Waiter& wait) {
   const Work work(*this);
-  if (owner) ::SetWindowLongPtrW(Top(), GWLP_HWNDPARENT, reinterpret_cast<LONG_PTR>(owner->Top()));
+  // The owner may be closed meanwhile; its window stays until this one can do without.
+  std::optional<Work> ownersWork;
+  if (owner) ownersWork.emplace(*owner);
+  const Ownership ownership(Top(), owner ? owner->Top() : nullptr);
   ModalBlock block(Top());
   block_ = &block;
   // Who opens a form by the keyboard sees the ring at its first stop, too.
-  if (const FormWindow* over = owner ? Around(owner->Top()) : nullptr)
-    state_.usesKeys = over->state_.usesKeys;
+  if (owner) state_.usesKeys = owner->state_.usesKeys;
   ShowOver(owner);
   wait([this] { return !TheForm() || !TheForm()->Visible(); });
   block_ = nullptr;

@@ -55,7 +55,7 @@ class FormWindow : private FormContext, public TopWindow, public WindowView {
   /// it is.
   void ShowOver(const TopWindow* owner);
   /// Returns when the form is hidden or released, or the program ends.
-  void RunModal(const TopWindow* owner, const Waiter& wait);
+  void RunModal(FormWindow* owner, const Waiter& wait);
   /// Over or under other windows, or in or out of the band above all others.
   void PutAfter(InsertAfter place);
   void MoveToScreen(Spot corner);
