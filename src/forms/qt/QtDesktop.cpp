@@ -62,6 +62,7 @@ int QtDesktop::Run(std::function<void()> start) {
 
 QWidget* QtDesktop::FrontWindow() {
   if (QWidget* active = QApplication::activeWindow()) return active;
+  if (QWidget* modal = QApplication::activeModalWidget()) return modal;
   // Without a window manager no window is the active one.
   for (QWidget* window : QApplication::topLevelWidgets())
     if (window->isVisible() && dynamic_cast<FormView*>(window)) return window;

@@ -51,15 +51,8 @@ Waiter Win32Desktop::WaiterFromNow() {
   };
 }
 
-FormWindow* Win32Desktop::FrontWindow() const {
-  if (FormWindow* active = FormWindow::Around(::GetActiveWindow())) return active;
-  const auto standing = std::find_if(windows_.begin(), windows_.end(),
-                                     [](const auto& entry) { return entry.second->IsStanding(); });
-  return standing == windows_.end() ? nullptr : standing->second.get();
-}
-
 int Win32Desktop::ShowBox(const Text& text, int flags, const Text& title) {
-  return win32::ShowBox(context_, FrontWindow(), BoxContentOf(text, flags, title), WaiterFromNow());
+  return win32::ShowBox(context_, FormWindow::Front(), BoxContentOf(text, flags, title), WaiterFromNow());
 }
 
 int Win32Desktop::MessageBox(const Text& text, int flags, const Text& title) {

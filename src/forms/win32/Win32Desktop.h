@@ -95,8 +95,6 @@ class Win32Desktop : public Desktop, public platform::EventLoop {
   void Bury();
   /// The own procedure of a form's window.
   std::int32_t HandleMessage(WindowHandle window, std::uint32_t message, std::uint32_t wParam);
-  /// The window that a box stands over, nullptr for none.
-  FormWindow* FrontWindow() const;
   FormWindow* WindowOf(WindowHandle window) const;
   static FormWindow* WindowOf(const Form& form) { return static_cast<FormWindow*>(form.View()); }
 

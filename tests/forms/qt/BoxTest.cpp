@@ -56,6 +56,28 @@ class Boxes : public QtFixture {
   }
 };
 
+TEST_F(Boxes, Belong_to_the_form_that_the_user_is_not_kept_from_when_none_is_active) {
+  std::vector<std::unique_ptr<TestForm>> others;
+  TestForm modal;
+  for (int i = 0; i < 8; ++i) desktop.Show(*others.emplace_back(std::make_unique<TestForm>()));
+  const QWidget* owner = nullptr;
+  desktop.Post([&] {
+    QApplication::setActiveWindow(nullptr);
+    const auto looks = desktop.StartTimer(1, [&] {
+      auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+      if (!box) return;
+      owner = box->parentWidget();
+      box->buttons().constFirst()->click();
+    });
+    desktop.MessageBox(u"text", 0, u"title");
+    modal.Visible = false;
+  });
+
+  desktop.Show(modal, Modality::Modal);
+
+  EXPECT_EQ(owner, &WidgetOf(modal));
+}
+
 TEST_F(Boxes, Show_a_short_text_whole) {
   const Seen seen = Show(u"נתוני IP:\r\n1: 10.0.0.5\r\n2: 10.0.0.138\r\n3: 127.0.0.1");
 

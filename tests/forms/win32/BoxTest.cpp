@@ -4,6 +4,26 @@
 
 namespace quendra::forms::win32 {
 
+namespace {
+
+/// A window of the program that shows no form, and is the active one.
+class OtherWindow {
+ public:
+  OtherWindow()
+      : window_(::CreateWindowExW(0, L"STATIC", L"", WS_POPUP | WS_VISIBLE, 0, 0, 50, 50, nullptr, nullptr,
+                                  nullptr, nullptr)) {
+    ::SetForegroundWindow(window_);
+  }
+  ~OtherWindow() { ::DestroyWindow(window_); }
+  OtherWindow(const OtherWindow&) = delete;
+  OtherWindow& operator=(const OtherWindow&) = delete;
+
+ private:
+  HWND window_;
+};
+
+} // namespace
+
 /// How message boxes lie on the screen, whatever their text, and what keys do in them.
 class Boxes : public Win32Fixture {
  protected:
@@ -161,6 +181,37 @@ TEST_F(Boxes, Whose_own_handler_fails_give_the_answer_of_their_default_button) {
   const auto limit = desktop.StartTimer(3000, [&] { desktop.End(-1); });
 
   EXPECT_EQ(desktop.MessageBox(u"text", kYesNo | kHebrewBox, u"title"), 6);
+}
+
+TEST_F(Boxes, Of_a_minimised_program_come_up_in_the_middle_of_the_screen) {
+  desktop.Show(form);
+  ::ShowWindow(WindowOf(form).Top(), SW_SHOWMINIMIZED);
+
+  const Seen seen = Show(u"text");
+
+  const Area screen = UsableScreenRound(nullptr);
+  EXPECT_LE(std::abs(seen.box.corner.left + seen.box.Right() - screen.corner.left - screen.Right()), 2);
+  EXPECT_LE(std::abs(seen.box.corner.top + seen.box.Bottom() - screen.corner.top - screen.Bottom()), 2);
+}
+
+TEST_F(Boxes, Belong_to_the_form_that_the_user_is_not_kept_from_when_none_is_active) {
+  TestForm modal;
+  HWND owner = nullptr;
+  desktop.Show(form);
+  desktop.Post([&] {
+    const OtherWindow active;
+    const auto looks = desktop.StartTimer(1, [&] {
+      if (const FormWindow* box = BoxAnswers::Standing()) owner = ::GetWindow(box->Top(), GW_OWNER);
+    });
+    SeenBox seen;
+    desktop.Post([&] { desktop.Post([&] { user.AnswerBox(seen); }); });
+    desktop.MessageBox(u"text", 0, u"title");
+    modal.Visible = false;
+  });
+
+  desktop.Show(modal, Modality::Modal, &form);
+
+  EXPECT_EQ(owner, WindowOf(modal).Top());
 }
 
 using Lines = std::vector<BoxLine>;

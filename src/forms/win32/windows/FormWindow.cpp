@@ -27,6 +27,14 @@ DWORD ExtendedStyleOf(const Form& form) {
   return style;
 }
 
+/// Finds the foremost form that stands and that nothing blocks.
+BOOL CALLBACK FindOpen(HWND window, LPARAM found) noexcept {
+  if (!::IsWindowVisible(window) || !::IsWindowEnabled(window)) return TRUE;
+  FormWindow*& open = *reinterpret_cast<FormWindow**>(found);
+  open = FormWindow::Around(window);
+  return !open;
+}
+
 /// The owner of a window for as long as this lives. The system destroys what a window owns with it.
 class Ownership {
  public:
@@ -75,6 +83,13 @@ void FormWindow::AddViews(const Container& container, HWND parent, ViewMaker mak
 FormWindow* FormWindow::Around(HWND window) {
   const HWND top = window ? ::GetAncestor(window, GA_ROOT) : nullptr;
   return top ? dynamic_cast<FormWindow*>(WindowView::Of(::GetWindow(top, GW_CHILD))) : nullptr;
+}
+
+FormWindow* FormWindow::Front() {
+  if (FormWindow* active = Around(::GetActiveWindow())) return active;
+  FormWindow* front = nullptr;
+  ::EnumThreadWindows(::GetCurrentThreadId(), FindOpen, reinterpret_cast<LPARAM>(&front));
+  return front;
 }
 
 bool FormWindow::IsInUse() const {
@@ -186,9 +201,11 @@ void FormWindow::Show() {
 void FormWindow::ShowOver(const TopWindow* owner) {
   const Work work(*this);
   if (!std::exchange(wasPlaced_, true)) {
-    if (owner) MoveToScreen(owner->OnScreen().corner); // to its screen
+    const Area screen = UsableScreenRound(owner ? owner->Top() : nullptr);
+    MoveToScreen(screen.corner);
     PutInPlace();
-    CentreOver(owner ? owner->OnScreen() : UsableScreen());
+    // A minimised owner lies far off its screen.
+    CentreOver(owner && !::IsIconic(owner->Top()) ? owner->OnScreen() : screen);
   }
   // Handlers and descriptions, which count for a name, are plain members.
   if (!IsStanding())

@@ -48,6 +48,8 @@ class FormWindow : private FormContext, public TopWindow, public WindowView {
   WindowHandle Handle() const { return handle_; }
   /// The form's window that a window is or lies in; nullptr for none.
   static FormWindow* Around(HWND window);
+  /// The one that the user works in: the active one, else the foremost that no modal form or box blocks.
+  static FormWindow* Front();
   /// A handler of it is under way, or of one of its controls.
   bool IsInUse() const;
 
