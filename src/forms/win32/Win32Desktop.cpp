@@ -32,7 +32,7 @@ Win32Desktop::Win32Desktop()
       context_{*this, dispatcher_, scale_, pictures_, fonts_, mouse_, startTimer_, active_, state_},
       drawing_(scale_, fonts_),
       loop_(
-          dispatcher_, [this](const MSG& message) { return keys_.Takes(message); }, [this] { Bury(); }) {}
+          dispatcher_, [this](const MSG& message) { return keys_.Takes(message); }, [this] { TidyUp(); }) {}
 
 Win32Desktop::~Win32Desktop() = default;
 
@@ -147,6 +147,11 @@ void Win32Desktop::Close(FormWindow& window) {
   auto entry = windows_.extract(window.Handle());
   closed_.push_back(std::move(entry.mapped()));
   window.Release();
+}
+
+void Win32Desktop::TidyUp() {
+  if (FormWindow* active = FormWindow::Around(::GetActiveWindow())) active->KeepFocus();
+  Bury();
 }
 
 // Windows that go tell others, whose handlers may close more of them.

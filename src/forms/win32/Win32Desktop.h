@@ -91,6 +91,8 @@ class Win32Desktop : public Desktop, public platform::EventLoop {
   /// The end of the program counts from now on.
   Waiter WaiterFromNow();
   void Close(FormWindow& window);
+  /// After each message.
+  void TidyUp();
   /// Destroys the windows that were closed and in which no handler is under way any more.
   void Bury();
   /// The own procedure of a form's window.

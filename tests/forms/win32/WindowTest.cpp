@@ -202,6 +202,26 @@ TEST_F(Window, A_form_that_was_hidden_under_a_modal_one_takes_the_user_again_whe
   EXPECT_TRUE(::IsWindowEnabled(WindowOf(lower).Top()));
 }
 
+TEST_F(Window, A_form_that_was_minimised_gives_the_focus_back_to_the_control_that_had_it) {
+  Label first(form, u"first");
+  Label second(form, u"second");
+  first.Click = second.Click = [] {};
+  form.design = [&] {
+    first.Move(0, 0, 1500, 450);
+    second.Move(0, 600, 1500, 450);
+  };
+  ShowActive();
+  user.PressKey(form, kTabKey);
+  ASSERT_EQ(user.Focused(form), &second);
+
+  ::ShowWindow(WindowOf(form).Top(), SW_MINIMIZE);
+  desktop.PumpOnce();
+  ::ShowWindow(WindowOf(form).Top(), SW_RESTORE);
+  desktop.PumpOnce();
+
+  EXPECT_EQ(::GetFocus(), ViewOf(second).Window());
+}
+
 TEST_F(Window, A_form_that_was_closed_by_its_own_click_goes_when_the_handler_has_ended) {
   TestForm other;
   Label label(form, u"label");

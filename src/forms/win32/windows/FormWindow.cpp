@@ -267,8 +267,13 @@ void FormWindow::RestoreFocus() {
   state_.focusComesBack = before;
 }
 
+void FormWindow::KeepFocus() {
+  const HWND focused = ::GetFocus();
+  if (::IsChild(Top(), focused)) lastFocus_ = focused;
+}
+
 void FormWindow::Activated(bool active, bool minimised) {
-  if (!active && ::IsChild(Top(), ::GetFocus())) lastFocus_ = ::GetFocus();
+  if (!active) KeepFocus();
   if (active && !minimised) RestoreFocus();
   if (!TheForm()) return;
   Context().dispatcher.Dispatch([&] {

@@ -68,6 +68,9 @@ class FormWindow : private FormContext, public TopWindow, public WindowView {
   void MoveFocus(TabDirection direction);
   /// nullptr for none.
   const Control* ControlWithFocus() const;
+  /// The focus comes back to where it is now when the window is the active one again. Asked for in time: a
+  /// window that is minimised has lost it before it hears of anything.
+  void KeepFocus();
 
   /// Called in place of unloading the form when its window is to be closed.
   std::function<void()> OnClose;
@@ -100,7 +103,7 @@ class FormWindow : private FormContext, public TopWindow, public WindowView {
   std::vector<WindowView*> windows_; ///< of those that have a window
   std::optional<RoundRect> shape_;
   ModalBlock* block_ = nullptr; ///< while the form is modal
-  HWND lastFocus_ = nullptr;    ///< that it had when another window became the active one
+  HWND lastFocus_ = nullptr;    ///< that it had while it was the active one
   bool wasPlaced_ = false;
   bool hadFocus_ = false;
 };
