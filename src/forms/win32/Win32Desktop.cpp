@@ -1,6 +1,7 @@
 #include "forms/win32/Win32Desktop.h"
 
 #include "forms/win32/boxes/Boxes.h"
+#include "winapi/SystemLibrary.h"
 
 #include <algorithm>
 #include <iterator>
@@ -22,6 +23,14 @@ bool IsDense(const Scale& scale) {
   return scale.twipsPerPixelX * 2 <= kTwipsOfOrdinaryPixel;
 }
 
+/// A handler may hold the thread for a while and show its progress by Repaint. The system would take such a
+/// program for a hung one and lay a blank picture over its windows.
+void KeepWindowsInSight() {
+  const winapi::SystemLibrary user(L"user32.dll");
+  using Keep = void WINAPI();
+  if (Keep* const keep = user.Find<Keep>("DisableProcessWindowsGhosting")) keep();
+}
+
 } // namespace
 
 Win32Desktop::Win32Desktop()
@@ -32,7 +41,9 @@ Win32Desktop::Win32Desktop()
       context_{*this, dispatcher_, scale_, pictures_, fonts_, mouse_, startTimer_, active_, state_},
       drawing_(scale_, fonts_),
       loop_(
-          dispatcher_, [this](const MSG& message) { return keys_.Takes(message); }, [this] { TidyUp(); }) {}
+          dispatcher_, [this](const MSG& message) { return keys_.Takes(message); }, [this] { TidyUp(); }) {
+  KeepWindowsInSight();
+}
 
 Win32Desktop::~Win32Desktop() = default;
 
