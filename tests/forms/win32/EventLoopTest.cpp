@@ -1,32 +1,7 @@
 #include "forms/win32/Win32Fixture.h"
+#include "forms/win32/WorkerFixture.h"
 
 namespace quendra::forms::win32 {
-
-namespace {
-
-/// A thread of the system's that runs some work.
-class Worker {
- public:
-  explicit Worker(std::function<void()> work) : work_(std::move(work)) {
-    thread_ = ::CreateThread(nullptr, 0, Run, this, 0, nullptr);
-  }
-  ~Worker() {
-    ::WaitForSingleObject(thread_, INFINITE);
-    ::CloseHandle(thread_);
-  }
-  Worker(const Worker&) = delete;
-  Worker& operator=(const Worker&) = delete;
-
- private:
-  static DWORD WINAPI Run(void* worker) {
-    static_cast<Worker*>(worker)->work_();
-    return 0;
-  }
-  std::function<void()> work_;
-  HANDLE thread_;
-};
-
-} // namespace
 
 class EventLoop : public Win32Fixture {};
 
@@ -98,6 +73,32 @@ TEST_F(EventLoop, A_yield_with_nothing_to_do_looks_no_oftener_than_the_systems_t
 
   // A look each time would take seconds.
   EXPECT_LT(::GetTickCount() - start, 500U);
+}
+
+TEST_F(EventLoop, The_end_closes_a_menu_that_is_open) {
+  const HMENU menu = ::CreatePopupMenu();
+  ::AppendMenuW(menu, MF_STRING, 1, L"entry");
+  bool closedByGuard = false;
+  std::unique_ptr<Worker> guard;
+  bool open = true;
+
+  const int status = user.Run([&] {
+    desktop.Show(form);
+    const HWND window = WindowOf(form).Top();
+    guard = std::make_unique<Worker>([&, window] {
+      for (int i = 0; i < 300 && open; ++i) ::Sleep(10);
+      closedByGuard = open;
+      if (open) ::SendMessageW(window, WM_CANCELMODE, 0, 0);
+    });
+    const auto ends = desktop.StartTimer(50, [&] { desktop.End(9); });
+    ::TrackPopupMenu(menu, 0, 100, 100, 0, window, nullptr);
+    open = false;
+  });
+
+  guard.reset();
+  ::DestroyMenu(menu);
+  EXPECT_EQ(status, 9);
+  EXPECT_FALSE(closedByGuard);
 }
 
 TEST_F(EventLoop, A_message_by_its_name_has_the_systems_number) {

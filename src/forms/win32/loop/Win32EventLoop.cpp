@@ -114,6 +114,7 @@ void Win32EventLoop::RunUntil(const std::function<bool()>& done, unsigned leavin
 
 void Win32EventLoop::LeaveLoops() {
   ++leavings_;
+  ::EndMenu(); // else the system's loop would wait for the user
   ::PostMessageW(window_, kWake, 0, 0);
 }
 
