@@ -75,6 +75,16 @@ TEST_F(EventLoop, A_yield_with_nothing_to_do_looks_no_oftener_than_the_systems_t
   EXPECT_LT(::GetTickCount() - start, 500U);
 }
 
+TEST_F(EventLoop, A_yield_goes_on_with_what_an_earlier_one_has_left) {
+  MSG left;
+  for (int i = 0; i < 800; ++i) ::PostThreadMessageW(::GetCurrentThreadId(), WM_APP + 1, 0, 0);
+
+  desktop.PumpOnce();
+  desktop.DoEvents();
+
+  EXPECT_FALSE(::PeekMessageW(&left, nullptr, WM_APP + 1, WM_APP + 1, PM_REMOVE));
+}
+
 TEST_F(EventLoop, The_end_closes_a_menu_that_is_open) {
   const HMENU menu = ::CreatePopupMenu();
   ::AppendMenuW(menu, MF_STRING, 1, L"entry");

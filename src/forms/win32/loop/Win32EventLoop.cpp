@@ -85,16 +85,15 @@ void Win32EventLoop::Dispatch(const MSG& message) {
 bool Win32EventLoop::HandleMessages() {
   MSG message{};
   for (int count = 0; count < kMostMessages; ++count) {
-    if (!::PeekMessageW(&message, nullptr, 0, 0, PM_REMOVE)) return count > 0;
+    if (!::PeekMessageW(&message, nullptr, 0, 0, PM_REMOVE)) return true;
     Dispatch(message);
   }
-  return true;
+  return false;
 }
 
 void Win32EventLoop::PumpOnce() {
   RunWork();
-  HandleMessages();
-  gate_.Pumped();
+  if (HandleMessages()) gate_.Pumped();
   dispatcher_.UnwindIfEnded();
 }
 
@@ -105,9 +104,9 @@ void Win32EventLoop::RunUntil(const std::function<bool()>& done, unsigned leavin
     if (isOver()) return;
     // One message a round, so that what it brought about is seen before the next.
     MSG message{};
-    if (::PeekMessageW(&message, nullptr, 0, 0, PM_REMOVE))
-      Dispatch(message);
-    else if (!arrived_.IsWaiting() && posted_.IsEmpty())
+    if (::PeekMessageW(&message, nullptr, 0, 0, PM_REMOVE)) Dispatch(message);
+    // The look has handled what other threads and programs sent; no message tells of that.
+    else if (!isOver() && !arrived_.IsWaiting() && posted_.IsEmpty())
       ::WaitMessage();
   }
 }

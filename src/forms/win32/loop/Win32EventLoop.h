@@ -46,6 +46,7 @@ class Win32EventLoop {
   void Handle(UINT message, WPARAM wParam);
   void Wake();
   void RunWork();
+  /// False when more is left than one pump handles.
   bool HandleMessages();
   void Dispatch(const MSG& message);
 
