@@ -50,7 +50,7 @@ class Describer : public ControlVisitor {
     Description.role = Role::Grouping;
     Description.name = CaptionOf(frame);
   }
-  void Visit(Image& /*image*/) override { Description.role = Role::Graphic; }
+  void Visit(Image& image) override { VisitPicture(image); }
   void Visit(ImageList& /*images*/) override {}
   void Visit(Label& label) override {
     const Text& caption = label.Caption();
@@ -60,9 +60,16 @@ class Describer : public ControlVisitor {
   void Visit(Line& /*line*/) override { Description.role = Role::Separator; }
   void Visit(ListBox& list) override { Description.name = NameOfField(list, list.Description); }
   void Visit(ListView& list) override { Description.name = VisibleText(list.Description); }
-  void Visit(PictureBox& /*box*/) override { Description.role = Role::Graphic; }
+  void Visit(PictureBox& box) override { VisitPicture(box); }
   void Visit(TextBox& box) override { Description.name = NameOfField(box, box.Description); }
   void Visit(Timer& /*timer*/) override {}
+
+ private:
+  void VisitPicture(const Control& picture) {
+    Description.role = picture.Click ? Role::Button : Role::Graphic;
+    // What shows nothing but such a picture is a window that it closes.
+    if (picture.Click) Description.name = VisibleText(picture.OwnerForm().Caption());
+  }
 };
 
 } // namespace

@@ -18,9 +18,10 @@ struct Accessible {
   Text description{};
 };
 
-/// A label with a handler is a button, and one without a caption has its description for a name. A combo box
-/// is named by the frame around it, a field or a list box by its description, else by the label that stands
-/// before it, else by that frame. Asked for anew each time: a label becomes a button with its handler.
+/// A label with a handler is a button, and one without a caption has its description for a name. So is a
+/// picture with a handler, named by its window. A combo box is named by the frame around it, a field or a
+/// list box by its description, else by the label that stands before it, else by that frame. Asked for anew
+/// each time: a label becomes a button with its handler.
 Accessible AccessibleOf(Control& control);
 
 /// The name of a column: its caption, or what stands for the icon in place of one.

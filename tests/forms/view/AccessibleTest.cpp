@@ -108,6 +108,20 @@ TEST_F(AccessibleTest, Every_kind_has_its_role) {
   EXPECT_EQ(AccessibleOf(list).role, Role::Toolkits);
 }
 
+TEST_F(AccessibleTest, A_picture_that_can_be_clicked_is_a_button_named_by_its_window) {
+  PictureBox box(form, u"box");
+  Image image(form, u"image");
+  form.Caption = Text(u"אודות");
+  EXPECT_EQ(AccessibleOf(image).name, u"");
+
+  box.Click = image.Click = [] {};
+
+  EXPECT_EQ(AccessibleOf(box).role, Role::Button);
+  EXPECT_EQ(AccessibleOf(image).role, Role::Button);
+  EXPECT_EQ(AccessibleOf(image).name, u"אודות");
+  EXPECT_TRUE(OffersPress(image));
+}
+
 TEST_F(AccessibleTest, A_label_becomes_a_button_with_its_handler_for_clicks_and_no_other) {
   label.DoubleClick = [] {};
   EXPECT_EQ(AccessibleOf(label).role, Role::Text);

@@ -22,6 +22,27 @@ class OtherWindow {
   HWND window_;
 };
 
+/// Hears of the alerts that the program's boxes raise.
+class AlertListener {
+ public:
+  AlertListener()
+      : hook_(::SetWinEventHook(EVENT_SYSTEM_ALERT, EVENT_SYSTEM_ALERT, nullptr, Hear,
+                                ::GetCurrentProcessId(), 0, WINEVENT_OUTOFCONTEXT)) {
+    count = 0;
+  }
+  ~AlertListener() { ::UnhookWinEvent(hook_); }
+  AlertListener(const AlertListener&) = delete;
+  AlertListener& operator=(const AlertListener&) = delete;
+
+  static inline int count = 0; ///< the system hands nothing over that would tell one listener from another
+
+ private:
+  static void CALLBACK Hear(HWINEVENTHOOK, DWORD, HWND window, LONG, LONG, DWORD, DWORD) noexcept {
+    if (FormWindow::Around(window)) ++count;
+  }
+  HWINEVENTHOOK hook_;
+};
+
 } // namespace
 
 /// How message boxes lie on the screen, whatever their text, and what keys do in them.
@@ -212,6 +233,14 @@ TEST_F(Boxes, Belong_to_the_form_that_the_user_is_not_kept_from_when_none_is_act
   desktop.Show(modal, Modality::Modal, &form);
 
   EXPECT_EQ(owner, WindowOf(modal).Top());
+}
+
+TEST_F(Boxes, Tell_assistive_technology_that_they_come_up) {
+  AlertListener alerts;
+
+  Show(u"text");
+
+  EXPECT_EQ(alerts.count, 1);
 }
 
 using Lines = std::vector<BoxLine>;

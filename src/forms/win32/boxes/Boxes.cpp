@@ -40,6 +40,8 @@ int ShowBox(const ViewContext& desktops, FormWindow* owner, const BoxContent& co
   box.Attach(&window);
   Sound(content.sign);
   window.RunModal(owner, [&](const std::function<bool()>& done) {
+    // Assistive technology reads out what comes up with an alert.
+    ::NotifyWinEvent(EVENT_SYSTEM_ALERT, window.Top(), OBJID_WINDOW, CHILDID_SELF);
     wait([&] { return failed || done(); });
   });
   window.Release();

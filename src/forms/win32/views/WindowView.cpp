@@ -2,6 +2,7 @@
 
 #include "forms/view/Accessible.h"
 #include "forms/view/FocusOrder.h"
+#include "forms/win32/input/Assistance.h"
 #include "forms/win32/input/MouseInput.h"
 #include "forms/win32/windows/Composition.h"
 #include "forms/win32/windows/WindowClass.h"
@@ -252,10 +253,11 @@ std::optional<LRESULT> WindowView::AnswerCommonly(UINT message, WPARAM wParam, L
   case WM_SETCURSOR: return ShowCursorAt(wParam, lParam);
   default: break;
   }
-  return before_ == ::DefWindowProcW ? AnswerAsOwn(message) : std::nullopt;
+  return before_ == ::DefWindowProcW ? AnswerAsOwn(message, lParam) : std::nullopt;
 }
 
-std::optional<LRESULT> WindowView::AnswerAsOwn(UINT message) {
+std::optional<LRESULT> WindowView::AnswerAsOwn(UINT message, LPARAM lParam) {
+  if (const auto answer = AnswerAssistance(*this, message, lParam)) return answer;
   if (message == WM_ERASEBKGND) return 1;
   if (message != WM_PAINT || !control_) return std::nullopt;
   PaintWindow(*this);

@@ -121,7 +121,7 @@ class WindowView : public View {
   static LRESULT CALLBACK Procedure(HWND window, UINT message, WPARAM wParam, LPARAM lParam) noexcept;
   LRESULT Handle(UINT message, WPARAM wParam, LPARAM lParam);
   std::optional<LRESULT> AnswerCommonly(UINT message, WPARAM wParam, LPARAM lParam);
-  std::optional<LRESULT> AnswerAsOwn(UINT message);
+  std::optional<LRESULT> AnswerAsOwn(UINT message, LPARAM lParam);
   std::optional<LRESULT> ShowCursorAt(WPARAM wParam, LPARAM lParam) const;
   /// What the form's picture shows where the window stands has changed. Gives that place, none without form.
   std::optional<Area> ForgetPlace() const;
