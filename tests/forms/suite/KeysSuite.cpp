@@ -96,6 +96,17 @@ TEST_P(DesktopSuite, Enter_and_Space_press_a_label) {
   EXPECT_EQ(dialog.pressed, "first first ");
 }
 
+TEST_P(DesktopSuite, Keys_with_Alt_press_no_label) {
+  Dialog dialog(form);
+  ShowActive(form);
+
+  user->PressKey(form, kEnterKey, kAlt);
+  EXPECT_EQ(dialog.pressed, "");
+  user->PressKey(form, kEnterKey);
+
+  EXPECT_EQ(dialog.pressed, "first ");
+}
+
 TEST_P(DesktopSuite, Enter_presses_the_label_that_has_the_focus_and_not_the_default_one) {
   Dialog dialog(form);
   form.Default = &dialog.last;
