@@ -87,12 +87,14 @@ TEST_F(Keyboard, The_focus_comes_back_with_the_window) {
 }
 
 TEST_F(Keyboard, Codes_are_those_of_the_character_without_modifiers_and_of_named_keys) {
-  EXPECT_EQ(PressOf('A', 1).code, 'A');
-  EXPECT_EQ(PressOf('7', 1).code, '7');
-  EXPECT_EQ(PressOf(VK_RETURN, 1).code, kEnterKey);
-  EXPECT_EQ(PressOf(VK_DOWN, 1).code, kDownKey);
-  EXPECT_EQ(PressOf(VK_F1 + 4, 1).code, kF1Key + 4);
-  EXPECT_EQ(PressOf(VK_SHIFT, 1).code, 0);
+  KeyInput keys;
+
+  EXPECT_EQ(keys.PressOf('A', 1).code, 'A');
+  EXPECT_EQ(keys.PressOf('7', 1).code, '7');
+  EXPECT_EQ(keys.PressOf(VK_RETURN, 1).code, kEnterKey);
+  EXPECT_EQ(keys.PressOf(VK_DOWN, 1).code, kDownKey);
+  EXPECT_EQ(keys.PressOf(VK_F1 + 4, 1).code, kF1Key + 4);
+  EXPECT_EQ(keys.PressOf(VK_SHIFT, 1).code, 0);
 }
 
 } // namespace quendra::forms::win32
