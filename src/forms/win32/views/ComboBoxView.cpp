@@ -193,7 +193,7 @@ std::optional<LRESULT> ComboBoxView::AnswerInner(UINT message, WPARAM wParam, LP
     if (edit_) ::EnableWindow(edit_->Window(), wParam != 0);
     return std::nullopt;
   case WM_LBUTTONDOWN:
-  case WM_LBUTTONDBLCLK: Drop(); return 0;
+  case WM_LBUTTONDBLCLK: return PressClosed(message, wParam, lParam);
   // Turning the wheel over a closed list would switch what it stands for by accident.
   case WM_MOUSEWHEEL:
     if (!IsDropped()) return ::DefWindowProcW(Inner().Window(), message, wParam, lParam);
@@ -209,9 +209,14 @@ std::optional<LRESULT> ComboBoxView::AnswerInner(UINT message, WPARAM wParam, LP
   }
 }
 
-void ComboBoxView::Drop() {
+// The class lets the list hang down and follows the mouse into it, until the button is let go over an item.
+LRESULT ComboBoxView::PressClosed(UINT message, WPARAM wParam, LPARAM lParam) {
   // A click is what chooses an item, not what opens the list.
   Context().mouse.ReleaseCapture();
+  return Inner().PassOn(message, wParam, lParam);
+}
+
+void ComboBoxView::Drop() {
   const bool drops = !IsDropped();
   // What hangs down has the keys.
   ::SetFocus(drops ? Inner().Window() : KeyWindow());

@@ -34,6 +34,7 @@ class ComboBoxView : public FieldView {
   void FillItems() const;
   void ShowSelection();
   bool IsDropped() const { return Inner().Send(CB_GETDROPPEDSTATE) != 0; }
+  LRESULT PressClosed(UINT message, WPARAM wParam, LPARAM lParam);
   void Drop();
   bool PassesToList(UINT message, WPARAM wParam, LPARAM lParam);
   int RowHeight() const;

@@ -66,9 +66,18 @@ bool InnerWindow::IsTaken(UINT message, WPARAM wParam, LPARAM lParam) const {
 
 LRESULT InnerWindow::Handle(UINT message, WPARAM wParam, LPARAM lParam) {
   const WindowView::Work work(view_);
+  // The window lets go of the mouse before the control is clicked: the handler may show another one.
+  if (message == WM_LBUTTONUP && ::GetCapture() == window_) {
+    const LRESULT answer = Answer(message, wParam, lParam);
+    IsTaken(message, wParam, lParam);
+    return answer;
+  }
   const bool taken = IsTaken(message, wParam, lParam);
   view_.HearForTip(window_, message, lParam);
-  if (taken) return 0;
+  return taken ? 0 : Answer(message, wParam, lParam);
+}
+
+LRESULT InnerWindow::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
   if (const auto answer = hear_(message, wParam, lParam)) return *answer;
   return PassOn(message, wParam, lParam);
 }

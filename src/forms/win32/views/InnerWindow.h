@@ -48,6 +48,7 @@ class InnerWindow {
   /// A message of the mouse, which the view's control hears of.
   bool IsTaken(UINT message, WPARAM wParam, LPARAM lParam) const;
   LRESULT Handle(UINT message, WPARAM wParam, LPARAM lParam);
+  LRESULT Answer(UINT message, WPARAM wParam, LPARAM lParam);
   static LRESULT CALLBACK Procedure(HWND window, UINT message, WPARAM wParam, LPARAM lParam) noexcept;
 
   WindowView& view_;

@@ -403,6 +403,35 @@ TEST_F(FieldWindows,
   EXPECT_EQ(::SendMessageW(window, CB_GETCURSEL, 0, 0), 1);
 }
 
+TEST_F(FieldWindows, An_item_is_chosen_by_a_press_on_the_closed_list_that_is_let_go_over_the_item) {
+  std::vector<int> chosen;
+  for (const char16_t* more : {u"www.three.test", u"www.four.test"}) combo.AddItem(more);
+  combo.FreeText = false;
+  combo.Click = [&] { chosen.push_back(combo.ListIndex()); };
+  Show();
+  const HWND window = Inner(combo);
+  COMBOBOXINFO parts{};
+  parts.cbSize = sizeof parts;
+  ::GetComboBoxInfo(window, &parts);
+  // As the system gives them: to the window that has the mouse to itself, else to the one under it.
+  const auto tell = [&](UINT message, WPARAM held) {
+    const HWND to = ::GetCapture() ? ::GetCapture() : parts.hwndList;
+    POINT place{20, static_cast<int>(::SendMessageW(window, CB_GETITEMHEIGHT, 0, 0)) + 5};
+    ::MapWindowPoints(parts.hwndList, to, &place, 1);
+    Press(to, {static_cast<int>(place.x), static_cast<int>(place.y)}, message, held);
+  };
+
+  Press(window, {10, 10});
+  ASSERT_TRUE(::SendMessageW(window, CB_GETDROPPEDSTATE, 0, 0));
+  tell(WM_MOUSEMOVE, MK_LBUTTON);
+  tell(WM_MOUSEMOVE, MK_LBUTTON);
+  tell(WM_LBUTTONUP, 0);
+  Settle();
+
+  EXPECT_EQ(chosen, std::vector<int>{1});
+  EXPECT_FALSE(::SendMessageW(window, CB_GETDROPPEDSTATE, 0, 0));
+}
+
 TEST_F(FieldWindows, The_wheel_over_a_closed_list_changes_nothing) {
   combo.FreeText = false;
   Show();
