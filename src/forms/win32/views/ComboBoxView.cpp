@@ -18,7 +18,6 @@ constexpr int kArrowRoom = 18;
 constexpr int kRoomRoundLetters = 4;
 constexpr int kMostRows = 10;
 constexpr UINT kChosen = WM_APP + 0x211;
-constexpr UINT kTurn = WM_APP + 0x214;
 
 DWORD StyleOf() {
   return CBS_DROPDOWNLIST | CBS_HASSTRINGS | CBS_OWNERDRAWFIXED | CBS_NOINTEGRALHEIGHT | WS_VSCROLL |
@@ -40,24 +39,21 @@ ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, HWND parent)
 void ComboBoxView::MakeEdit() {
   held_ = reading_;
   const DWORD side = held_ == Direction::RightToLeft ? WS_EX_RTLREADING | WS_EX_RIGHT : 0;
-  auto made = std::make_unique<InnerWindow>(
-      *this, InnerWindow::Kind{L"EDIT", ES_AUTOHSCROLL, side, Inner().Window()},
-      [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerEdit(message, wParam, lParam); });
-  const HWND before = edit_ ? edit_->Window() : nullptr;
-  if (before && edit_->HasFocus()) ::SetFocus(made->Window());
-  edit_ = std::move(made);
-  if (before) ::DestroyWindow(before);
+  if (!editName_) editName_ = MakeName(Inner().Window());
+  InnerWindow::Replace(edit_, std::make_unique<InnerWindow>(
+                                  *this, InnerWindow::Kind{L"EDIT", ES_AUTOHSCROLL, side, Inner().Window()},
+                                  [this](UINT message, WPARAM wParam, LPARAM lParam) {
+                                    return AnswerEdit(message, wParam, lParam);
+                                  }));
   field_->Take(*edit_);
 }
 
-// It can't be replaced while it tells of the text that turned.
 void ComboBoxView::ReadFrom(Direction direction) {
-  if (direction != reading_) ::PostMessageW(Window(), kTurn, 0, 0);
-  reading_ = direction;
+  if (std::exchange(reading_, direction) != direction) TurnSoon();
 }
 
 void ComboBoxView::Turn() {
-  if (!TheControl() || reading_ == held_) return;
+  if (reading_ == held_) return;
   MakeEdit();
   ::EnableWindow(edit_->Window(), IsEnabled());
   edit_->Send(WM_SETFONT, reinterpret_cast<WPARAM>(Letters()));
@@ -68,6 +64,11 @@ void ComboBoxView::Turn() {
 void ComboBoxView::ControlGone() {
   if (field_) field_->Release();
   FieldView::ControlGone();
+}
+
+void ComboBoxView::TellName() {
+  FieldView::TellName();
+  if (editName_) GiveName(*editName_);
 }
 
 HWND ComboBoxView::KeyWindow() const { return edit_ ? edit_->Window() : FieldView::KeyWindow(); }
@@ -158,10 +159,6 @@ void ComboBoxView::PlaceEdit() const {
 
 std::optional<LRESULT> ComboBoxView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
   if (!TheControl()) return FieldView::Answer(message, wParam, lParam);
-  if (message == kTurn) {
-    Turn();
-    return 0;
-  }
   if (message == WM_MEASUREITEM) {
     reinterpret_cast<MEASUREITEMSTRUCT*>(lParam)->itemHeight = static_cast<UINT>(RowHeight());
     return TRUE;

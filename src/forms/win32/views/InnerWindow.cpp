@@ -35,6 +35,15 @@ InnerWindow::~InnerWindow() {
   ::SetWindowLongPtrW(window_, GWLP_USERDATA, 0);
 }
 
+// The new one has its place before it gets the focus: what comes with that is asked of the one in its place.
+void InnerWindow::Replace(std::unique_ptr<InnerWindow>& standing, std::unique_ptr<InnerWindow> made) {
+  const HWND before = standing ? standing->Window() : nullptr;
+  const bool hadFocus = standing && standing->HasFocus();
+  standing = std::move(made);
+  if (hadFocus) ::SetFocus(standing->Window());
+  if (before) ::DestroyWindow(before);
+}
+
 LRESULT InnerWindow::PassOn(UINT message, WPARAM wParam, LPARAM lParam) const {
   return before_ ? ::CallWindowProcW(before_, window_, message, wParam, lParam) : 0;
 }

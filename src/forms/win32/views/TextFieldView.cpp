@@ -2,11 +2,9 @@
 
 #include "forms/view/VisibleText.h"
 
-namespace quendra::forms::win32 {
+#include <utility>
 
-namespace {
-constexpr UINT kTurn = WM_APP + 0x212;
-}
+namespace quendra::forms::win32 {
 
 TextFieldView::TextFieldView(ViewContext& context, TextBox& box, HWND parent)
     : FieldView(context, box, parent),
@@ -22,24 +20,15 @@ void TextFieldView::HoldEdit(DWORD style, DWORD extendedStyle) {
   edit_.Take(Inner());
 }
 
-// Not all systems let an EDIT window turn once it is made, and it can't be replaced while it tells of the
-// text that turned.
 void TextFieldView::ReadFrom(Direction direction) {
-  if (direction != reading_) ::PostMessageW(Window(), kTurn, 0, 0);
-  reading_ = direction;
+  if (std::exchange(reading_, direction) != direction) TurnSoon();
 }
 
 void TextFieldView::Turn() {
-  if (!TheControl() || reading_ == held_) return;
+  if (reading_ == held_) return;
   HoldEdit(style_, extendedStyle_);
   ::EnableWindow(Inner().Window(), IsEnabled());
   Apply(Aspect::All);
-}
-
-std::optional<LRESULT> TextFieldView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
-  if (message != kTurn) return FieldView::Answer(message, wParam, lParam);
-  Turn();
-  return 0;
 }
 
 void TextFieldView::ControlGone() {

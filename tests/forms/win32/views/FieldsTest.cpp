@@ -49,6 +49,12 @@ class FieldWindows : public ViewFixture {
   static DWORD Style(const Control& control, int index = GWL_STYLE) {
     return static_cast<DWORD>(::GetWindowLongW(Inner(control), index));
   }
+  static HWND WindowWithCaret() {
+    GUITHREADINFO thread{};
+    thread.cbSize = sizeof thread;
+    ::GetGUIThreadInfo(::GetCurrentThreadId(), &thread);
+    return thread.hwndCaret;
+  }
   HWND Edit() { return ::FindWindowExW(Inner(combo), nullptr, L"EDIT", nullptr); }
 
   Label label{form, u"Label2"};
@@ -213,6 +219,7 @@ TEST_F(FieldWindows, A_field_turns_to_the_direction_of_its_first_letter_and_keep
   EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
   EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RIGHT);
   EXPECT_EQ(::GetFocus(), Inner(line));
+  EXPECT_EQ(WindowWithCaret(), Inner(line));
   Key('X');
   EXPECT_EQ(line.Value(), u"שלוXם, abc");
 
@@ -233,6 +240,45 @@ TEST_F(FieldWindows, A_field_that_turns_tells_of_the_focus_no_second_time) {
   Settle();
 
   EXPECT_EQ(came, 1);
+}
+
+TEST_F(FieldWindows, A_field_turns_when_its_own_handlers_are_through) {
+  Show();
+  const HWND before = Inner(line);
+  bool stood = false;
+  line.KeyPress = [&](int& keyCode) {
+    keyCode = 0;
+    line.Value = u"שלום";
+    desktop.PumpOnce();
+    stood = ::IsWindow(before);
+  };
+
+  Key('A');
+  EXPECT_TRUE(stood);
+  Settle();
+
+  EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
+  EXPECT_EQ(line.Value(), u"שלום");
+}
+
+TEST_F(FieldWindows, A_combo_box_turns_when_its_own_handlers_are_through) {
+  Show();
+  Key(kTabKey);
+  Key(kTabKey);
+  const HWND before = Edit();
+  bool stood = false;
+  combo.KeyPress = [&](int& keyCode) {
+    keyCode = 0;
+    combo.Value = u"שלום";
+    desktop.PumpOnce();
+    stood = ::IsWindow(before);
+  };
+
+  Key('A');
+  EXPECT_TRUE(stood);
+  Settle();
+
+  EXPECT_TRUE(::GetWindowLongW(Edit(), GWL_EXSTYLE) & WS_EX_RTLREADING);
 }
 
 TEST_F(FieldWindows, A_report_follows_its_end_when_its_handler_says_so) {
@@ -277,6 +323,18 @@ TEST_F(FieldWindows, A_field_is_named_by_a_label_right_before_the_systems_window
   EXPECT_EQ(TextOfWindow(before), u"כתובת מעקב:");
   EXPECT_TRUE(::SendMessageW(before, WM_GETDLGCODE, 0, 0) & DLGC_STATIC);
   EXPECT_EQ(TextOfWindow(As<FieldView>(line).Window()), u"כתובת מעקב:");
+}
+
+TEST_F(FieldWindows, The_text_of_a_combo_box_is_named_by_a_label_right_before_it_also_when_it_has_turned) {
+  combo.Description = u"כתובת לבדיקה";
+  Show();
+  const auto name = [this] { return TextOfWindow(::GetWindow(Edit(), GW_HWNDPREV)); };
+  EXPECT_EQ(name(), u"כתובת לבדיקה");
+
+  combo.Value = u"שלום";
+  Settle();
+
+  EXPECT_EQ(name(), u"כתובת לבדיקה");
 }
 
 TEST_F(FieldWindows, A_field_has_the_border_of_its_state) {
@@ -339,6 +397,7 @@ TEST_F(FieldWindows, A_combo_box_turns_to_the_direction_of_its_text_and_keeps_ca
   Settle();
   EXPECT_TRUE(isTurned());
   EXPECT_EQ(::GetFocus(), Edit());
+  EXPECT_EQ(WindowWithCaret(), Edit());
   Key('X');
   EXPECT_EQ(combo.Value(), u"שלוXם, abc");
 
