@@ -50,7 +50,7 @@ std::optional<LRESULT> EditField::Answer(UINT message, WPARAM wParam, LPARAM lPa
   case WM_CHAR: return Typed(wParam, lParam);
   case WM_CONTEXTMENU: ShowMenu(lParam); return 0;
   case kShowCaret: edit_->Send(EM_SCROLLCARET); return 0;
-  case WM_KEYDOWN: key_ = wParam; break;
+  case WM_KEYDOWN: key_ = LOWORD(wParam); break; // a character that comes without a key stands above it
   case WM_MOUSEMOVE:
     if (!(wParam & MK_LBUTTON)) return std::nullopt;
     break;

@@ -101,6 +101,18 @@ TEST_F(FieldWindows, Harmful_signs_that_are_pasted_are_shown_and_kept_as_visible
   EXPECT_EQ(line.SelStart(), 3);
 }
 
+TEST_F(FieldWindows, A_control_character_that_comes_without_a_key_is_one_of_the_forms_keys_too) {
+  std::vector<int> pressed;
+  line.KeyPress = [&](int& keyCode) { pressed.push_back(keyCode); };
+  form.Cancel = &label;
+  Show();
+
+  ::SendMessageW(Inner(line), WM_KEYDOWN, MAKEWPARAM(VK_PACKET, kEscapeKey), 0);
+  ::SendMessageW(Inner(line), WM_CHAR, kEscapeKey, 0);
+
+  EXPECT_TRUE(pressed.empty());
+}
+
 TEST_F(FieldWindows, Everything_is_selected_by_one_key) {
   line.Value = u"text";
   Show();
