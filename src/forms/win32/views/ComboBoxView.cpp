@@ -13,7 +13,7 @@ namespace quendra::forms::win32 {
 namespace {
 
 /// The room of the field's edge and ring.
-constexpr int kEdge = 3;
+constexpr int kComboEdge = 3;
 constexpr int kArrowRoom = 18;
 constexpr int kRoomRoundLetters = 4;
 constexpr int kMostRows = 10;
@@ -24,13 +24,11 @@ DWORD StyleOf() {
          WS_CLIPCHILDREN;
 }
 
-DWORD BarSide(Direction direction) { return direction == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
-
 } // namespace
 
 ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, HWND parent)
     : FieldView(context, combo, parent), reading_(DirectionOf(combo.Value())), held_(reading_) {
-  Hold(L"COMBOBOX", StyleOf(), BarSide(ReadingDirection()));
+  Hold(L"COMBOBOX", StyleOf(), BarSide());
   if (!combo.FreeText) return;
   field_.emplace(*this, combo, false, [this](Direction direction) { ReadFrom(direction); });
   MakeEdit();
@@ -39,6 +37,7 @@ ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, HWND parent)
 void ComboBoxView::MakeEdit() {
   held_ = reading_;
   const DWORD side = held_ == Direction::RightToLeft ? WS_EX_RTLREADING | WS_EX_RIGHT : 0;
+  field_->Leave();
   if (!editName_) editName_ = MakeName(Inner().Window());
   InnerWindow::Replace(edit_, std::make_unique<InnerWindow>(
                                   *this, InnerWindow::Kind{L"EDIT", ES_AUTOHSCROLL, side, Inner().Window()},
@@ -120,7 +119,7 @@ void ComboBoxView::ShowSelection() {
   showing_ = before;
 }
 
-Area ComboBoxView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kEdge); }
+Area ComboBoxView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kComboEdge); }
 
 // The system counts the list that hangs down into the height, and takes the height of what is closed from
 // that of its letters.
@@ -145,7 +144,7 @@ void ComboBoxView::Arrange() {
 }
 
 Area ComboBoxView::TextRoom(Extent inside) const {
-  constexpr int kAside = kFieldPadding - kEdge;
+  constexpr int kAside = kFieldPadding - kComboEdge;
   const bool fromRight = ReadingDirection() == Direction::RightToLeft;
   return {{fromRight ? kArrowRoom : kAside, 0}, {inside.width - kArrowRoom - kAside, inside.height}};
 }

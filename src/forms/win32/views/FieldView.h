@@ -23,6 +23,8 @@ class FieldView : public WindowView {
   /// to take its place.
   void Hold(const wchar_t* windowClass, DWORD style, DWORD extendedStyle = 0);
   std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;
+  /// The extended style by which the scroll bar of the window stands where its lines end.
+  DWORD BarSide() const { return ReadingDirection() == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
   /// A message to the window of the system's kind.
   virtual std::optional<LRESULT> AnswerInner(UINT message, WPARAM wParam, LPARAM lParam);
   /// The window of the system's kind tells of something.

@@ -16,6 +16,7 @@ void TextFieldView::HoldEdit(DWORD style, DWORD extendedStyle) {
   extendedStyle_ = extendedStyle;
   held_ = reading_;
   const DWORD side = held_ == Direction::RightToLeft ? WS_EX_RTLREADING | WS_EX_RIGHT : 0;
+  edit_.Leave();
   Hold(L"EDIT", style, extendedStyle | side);
   edit_.Take(Inner());
 }
@@ -54,7 +55,7 @@ void TextFieldView::FocusCame() {
 void TextFieldView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Font)) GiveLetters();
   if (Concerns(aspect, Aspect::Look)) Inner().Send(EM_SETREADONLY, Box().ReadOnly());
-  if (Concerns(aspect, Aspect::Entry)) edit_.ShowText();
+  if (Concerns(aspect, Aspect::Entry) || aspect == Aspect::Look) edit_.ShowText();
   if (aspect == Aspect::Caret) edit_.ShowCaret();
 }
 

@@ -1,4 +1,5 @@
 #include "forms/view/Palette.h"
+#include "forms/win32/views/Clipboard.h"
 #include "forms/win32/views/ViewFixture.h"
 
 namespace quendra::forms::win32 {
@@ -6,15 +7,7 @@ namespace quendra::forms::win32 {
 namespace {
 
 /// A text on the clipboard of the bed.
-void PutOnClipboard(const Text& text) {
-  const HGLOBAL memory = ::GlobalAlloc(GMEM_MOVEABLE, (text.size() + 1) * sizeof(char16_t));
-  std::copy_n(text.c_str(), text.size() + 1, static_cast<char16_t*>(::GlobalLock(memory)));
-  ::GlobalUnlock(memory);
-  ::OpenClipboard(nullptr);
-  ::EmptyClipboard();
-  ::SetClipboardData(CF_UNICODETEXT, memory);
-  ::CloseClipboard();
-}
+void PutOnClipboard(const Text& text) { win32::PutOnClipboard(nullptr, text); }
 
 Text OnClipboard() {
   ::OpenClipboard(nullptr);
@@ -304,6 +297,43 @@ TEST_F(FieldWindows, A_report_follows_its_end_when_its_handler_says_so) {
   EXPECT_GT(bar.nPos, 50);
   EXPECT_EQ(bar.nPos, bar.nMax - static_cast<int>(bar.nPage) + 1);
   EXPECT_EQ(Shown(lines), lines.Value());
+}
+
+TEST_F(FieldWindows, Each_line_of_a_report_reads_in_its_own_direction) {
+  lines.ReadOnly = true;
+  lines.Value = u"מטפל...\r\ncalled (RAS)";
+  Show();
+  const auto leftOf = [this](std::size_t line, std::size_t sign) {
+    const LRESULT mark = ::SendMessageW(Inner(lines), EM_LINEINDEX, line, 0);
+    const std::size_t place = static_cast<std::size_t>(mark) + 1 + sign;
+    return static_cast<short>(LOWORD(::SendMessageW(Inner(lines), EM_POSFROMCHAR, place, 0)));
+  };
+
+  EXPECT_LT(leftOf(0, 6), leftOf(0, 1));
+  EXPECT_GT(leftOf(1, 11), leftOf(1, 1));
+}
+
+TEST_F(FieldWindows, What_is_copied_from_a_report_selected_and_read_in_it_knows_of_no_marks) {
+  lines.ReadOnly = true;
+  lines.Value = u"מטפל...\r\ncalled (RAS)";
+  Show();
+  Key(kTabKey);
+  lines.SelStart = 9;
+  lines.SelLength = 6;
+
+  Key('C', kCtrl);
+  EXPECT_EQ(OnClipboard(), u"called");
+  Key('A', kCtrl);
+  EXPECT_EQ(lines.SelStart(), 0);
+  EXPECT_EQ(lines.SelLength(), 21);
+  Key(kInsertKey, kCtrl);
+  EXPECT_EQ(OnClipboard(), lines.Value());
+
+  EXPECT_EQ(Shown(lines), lines.Value());
+  lines.ReadOnly = false;
+  Key(kEndKey, kCtrl);
+  Key('X');
+  EXPECT_EQ(lines.Value(), u"מטפל...\r\ncalled (RAS)X");
 }
 
 TEST_F(FieldWindows, A_report_has_letters_of_one_width_and_a_scroll_bar_inside_its_edge) {
