@@ -97,4 +97,12 @@ TEST_F(Keyboard, Codes_are_those_of_the_character_without_modifiers_and_of_named
   EXPECT_EQ(keys.PressOf(VK_SHIFT, 1).code, 0);
 }
 
+TEST_F(Keyboard, A_character_without_a_key_is_found_where_each_system_tells_it) {
+  KeyInput keys;
+
+  EXPECT_EQ(keys.PressOf(MAKEWPARAM(VK_PACKET, 'a'), 1).code, 'A');
+  EXPECT_EQ(keys.PressOf(MAKEWPARAM(VK_PACKET, 0x5D0), 1).code, 0x5D0);
+  EXPECT_EQ(keys.PressOf(VK_PACKET, MAKELPARAM(1, 0x5D0)).code, 0x5D0);
+}
+
 } // namespace quendra::forms::win32

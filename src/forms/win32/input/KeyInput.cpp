@@ -19,9 +19,9 @@ KeyPress KeyInput::PressOf(WPARAM wParam, LPARAM lParam) {
   constexpr LPARAM kWasDown = 1L << 30;
   KeyPress press{0, ShiftStateNow(), (lParam & kWasDown) != 0};
   const auto key = static_cast<UINT>(LOWORD(wParam));
-  // A key that was typed for its character alone tells it beside its code.
+  // A key that was typed for its character alone tells it beside its code, or where others tell their place.
   if (key == VK_PACKET)
-    press.code = CodeOfCharacter(static_cast<char16_t>(HIWORD(wParam)));
+    press.code = CodeOfCharacter(static_cast<char16_t>(HIWORD(wParam) ? HIWORD(wParam) : HIWORD(lParam)));
   else if (HasOwnCode(key))
     press.code = static_cast<int>(key);
   else
