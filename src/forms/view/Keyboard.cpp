@@ -25,7 +25,9 @@ bool HearsOf(const Form& form, const KeyPress& key, bool aControlHasFocus) {
 }
 
 bool PressesLabel(const Label& label, const KeyPress& key) {
-  return label.IsButton() && !key.repeated && (key.code == kEnterKey || key.code == kSpaceKey);
+  // With Alt they are the window's own.
+  return label.IsButton() && !key.repeated && !(key.shift & kAlt) &&
+         (key.code == kEnterKey || key.code == kSpaceKey);
 }
 
 std::optional<int> ItemReachedBy(const ListBox& list, const KeyPress& key) {

@@ -40,6 +40,7 @@ struct TracedForm : Form {
   }
   void Form_KeyDown(int keyCode, int shift) override {
     Say("key " + std::to_string(keyCode) + " " + std::to_string(shift));
+    if (onKey) onKey();
   }
   void Say(const std::string& what) { trace.push_back(ToUtf8(Name()) + " " + what); }
 
@@ -47,6 +48,7 @@ struct TracedForm : Form {
   Text tagByDesign;
   std::function<void()> onLoad;
   std::function<void()> onUnload;
+  std::function<void()> onKey;
   bool active = false;
 
  private:

@@ -96,6 +96,17 @@ TEST_P(DesktopSuite, Enter_and_Space_press_a_label) {
   EXPECT_EQ(dialog.pressed, "first first ");
 }
 
+TEST_P(DesktopSuite, Keys_with_Alt_press_no_label) {
+  Dialog dialog(form);
+  ShowActive(form);
+
+  user->PressKey(form, kEnterKey, kAlt);
+  EXPECT_EQ(dialog.pressed, "");
+  user->PressKey(form, kEnterKey);
+
+  EXPECT_EQ(dialog.pressed, "first ");
+}
+
 TEST_P(DesktopSuite, Enter_presses_the_label_that_has_the_focus_and_not_the_default_one) {
   Dialog dialog(form);
   form.Default = &dialog.last;
@@ -145,6 +156,20 @@ TEST_P(DesktopSuite, Keys_reach_a_form_with_a_preview_once_and_before_its_contro
   user->PressKey(form, 'I', kCtrl);
 
   EXPECT_EQ(trace, (Trace{"frmOne key 32 0", "frmOne click", "frmOne key 73 2"}));
+}
+
+TEST_P(DesktopSuite, A_key_of_the_form_types_nothing_when_its_handler_waits_until_Ctrl_is_let_go) {
+  TextBox field(form, u"field");
+  field.Move(0, 600, 3000, 450);
+  form.KeyPreview = true;
+  form.onKey = [this] { desktop.DoEvents(); };
+  ShowActive(form);
+  trace.clear();
+
+  user->PressKey(form, 'I', kCtrl);
+
+  EXPECT_EQ(trace, (Trace{"frmOne key 73 2"}));
+  EXPECT_EQ(field.Value(), u"");
 }
 
 TEST_P(DesktopSuite, Keys_of_a_control_pass_a_form_without_a_preview) {

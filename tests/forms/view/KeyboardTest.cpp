@@ -175,6 +175,8 @@ TEST_F(FormKeys, Enter_and_Space_press_a_label_that_is_a_button_once) {
   for (const int key : {kEnterKey, kSpaceKey}) {
     EXPECT_TRUE(PressesLabel(form.ok, {key}));
     EXPECT_FALSE(PressesLabel(form.ok, {key, kNoShift, true}));
+    EXPECT_FALSE(PressesLabel(form.ok, {key, kAlt}));
+    EXPECT_TRUE(PressesLabel(form.ok, {key, kCtrl}));
   }
   EXPECT_FALSE(PressesLabel(form.ok, {'A'}));
   Label text(form, u"text");

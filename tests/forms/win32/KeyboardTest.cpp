@@ -87,12 +87,22 @@ TEST_F(Keyboard, The_focus_comes_back_with_the_window) {
 }
 
 TEST_F(Keyboard, Codes_are_those_of_the_character_without_modifiers_and_of_named_keys) {
-  EXPECT_EQ(PressOf('A', 1).code, 'A');
-  EXPECT_EQ(PressOf('7', 1).code, '7');
-  EXPECT_EQ(PressOf(VK_RETURN, 1).code, kEnterKey);
-  EXPECT_EQ(PressOf(VK_DOWN, 1).code, kDownKey);
-  EXPECT_EQ(PressOf(VK_F1 + 4, 1).code, kF1Key + 4);
-  EXPECT_EQ(PressOf(VK_SHIFT, 1).code, 0);
+  KeyInput keys;
+
+  EXPECT_EQ(keys.PressOf('A', 1).code, 'A');
+  EXPECT_EQ(keys.PressOf('7', 1).code, '7');
+  EXPECT_EQ(keys.PressOf(VK_RETURN, 1).code, kEnterKey);
+  EXPECT_EQ(keys.PressOf(VK_DOWN, 1).code, kDownKey);
+  EXPECT_EQ(keys.PressOf(VK_F1 + 4, 1).code, kF1Key + 4);
+  EXPECT_EQ(keys.PressOf(VK_SHIFT, 1).code, 0);
+}
+
+TEST_F(Keyboard, A_character_without_a_key_is_found_where_each_system_tells_it) {
+  KeyInput keys;
+
+  EXPECT_EQ(keys.PressOf(MAKEWPARAM(VK_PACKET, 'a'), 1).code, 'A');
+  EXPECT_EQ(keys.PressOf(MAKEWPARAM(VK_PACKET, 0x5D0), 1).code, 0x5D0);
+  EXPECT_EQ(keys.PressOf(VK_PACKET, MAKELPARAM(1, 0x5D0)).code, 0x5D0);
 }
 
 } // namespace quendra::forms::win32

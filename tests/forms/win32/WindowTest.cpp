@@ -307,6 +307,32 @@ TEST_F(Window, A_form_that_is_twice_as_wide_as_the_screen_scrolls_at_70_percent_
   EXPECT_EQ(right.x, WindowOf(form).OnScreen().Right());
 }
 
+// Frames of another look.
+
+TEST_F(Window, A_form_keeps_its_inside_when_the_frames_of_the_system_change) {
+  NONCLIENTMETRICSW metrics{};
+  metrics.cbSize = sizeof metrics;
+  ::SystemParametersInfoW(SPI_GETNONCLIENTMETRICS, metrics.cbSize, &metrics, 0);
+  const NONCLIENTMETRICSW before = metrics;
+  desktop.Show(form);
+  const HWND top = WindowOf(form).Top();
+  // The system draws the new frames into windows of the old size, and tells of it.
+  const auto change = [&](const NONCLIENTMETRICSW& wanted, UINT message, WPARAM what) {
+    NONCLIENTMETRICSW set = wanted;
+    ::SystemParametersInfoW(SPI_SETNONCLIENTMETRICS, set.cbSize, &set, 0);
+    ::SetWindowPos(top, nullptr, 0, 0, 0, 0, SWP_NOMOVE | SWP_NOSIZE | SWP_NOZORDER | SWP_FRAMECHANGED);
+    ::SendMessageW(top, message, what, 0);
+    return InsideOf(top);
+  };
+
+  metrics.iCaptionHeight += 20;
+  const Extent changed = change(metrics, WM_SETTINGCHANGE, SPI_SETNONCLIENTMETRICS);
+  const Extent themed = change(before, WM_THEMECHANGED, 0);
+
+  EXPECT_EQ(changed, (Extent{400, 300}));
+  EXPECT_EQ(themed, (Extent{400, 300}));
+}
+
 TEST_F(Window, Tab_brings_what_it_finds_into_view) {
   Label near(form, u"near");
   Label far(form, u"far");

@@ -13,33 +13,19 @@ bool HasOwnCode(WPARAM key) {
          (key >= VK_F1 && key <= VK_F16);
 }
 
-/// What the key gives alone in the active layout; 0 for a key without a character, and for one that waits for
-/// the next.
-char16_t CharacterOf(UINT key, UINT scanCode) {
-  const HKL layout = ::GetKeyboardLayout(0);
-  constexpr UINT kWaitsForNext = 0x80000000;
-  const UINT plain = ::MapVirtualKeyExW(key, MAPVK_VK_TO_CHAR, layout);
-  if (plain == 0 || plain & kWaitsForNext) return u'\0';
-  // The plain map knows letters by their Latin names alone.
-  const BYTE nothingHeld[256] = {};
-  wchar_t given[4] = {};
-  const int count = ::ToUnicodeEx(key, scanCode, nothingHeld, given, 4, 0, layout);
-  return count == 1 && given[0] >= L' ' ? static_cast<char16_t>(given[0]) : static_cast<char16_t>(plain);
-}
-
 } // namespace
 
-KeyPress PressOf(WPARAM wParam, LPARAM lParam) {
+KeyPress KeyInput::PressOf(WPARAM wParam, LPARAM lParam) {
   constexpr LPARAM kWasDown = 1L << 30;
   KeyPress press{0, ShiftStateNow(), (lParam & kWasDown) != 0};
   const auto key = static_cast<UINT>(LOWORD(wParam));
-  // A key that was typed for its character alone tells it beside its code.
+  // A key that was typed for its character alone tells it beside its code, or where others tell their place.
   if (key == VK_PACKET)
-    press.code = CodeOfCharacter(static_cast<char16_t>(HIWORD(wParam)));
+    press.code = CodeOfCharacter(static_cast<char16_t>(HIWORD(wParam) ? HIWORD(wParam) : HIWORD(lParam)));
   else if (HasOwnCode(key))
     press.code = static_cast<int>(key);
   else
-    press.code = CodeOfCharacter(CharacterOf(key, LOBYTE(HIWORD(lParam))));
+    press.code = CodeOfCharacter(characters_.Of(key, ::GetKeyboardLayout(0)));
   return press;
 }
 
@@ -50,7 +36,10 @@ bool KeyInput::Takes(const MSG& message) {
   if (!view || !form || !form->TheForm()) return false;
   const WindowView::Work formAtWork(*form);
   const WindowView::Work viewAtWork(*view);
-  return Handle(*form, *view, PressOf(message.wParam, message.lParam));
+  const KeyPress key = PressOf(message.wParam, message.lParam);
+  if (Handle(*form, *view, key)) return true;
+  // A handler that waited may have seen Ctrl let go, and the system would now make a letter of the key.
+  return ShiftStateNow() != key.shift;
 }
 
 bool KeyInput::Handle(FormWindow& form, WindowView& view, const KeyPress& key) {

@@ -192,6 +192,9 @@ void MouseInput::Enter(WindowView* view) {
   if (before && ShowsMouse(*before)) before->Invalidate();
   if (!view) return;
   if (ShowsMouse(*view)) view->Invalidate();
+  // One that the mouse isn't over, but over a window of the system's in it, would be told at once that it
+  // left.
+  if (!view->TakesMouse()) return;
   TRACKMOUSEEVENT leaving{sizeof leaving, TME_LEAVE, view->Window(), 0};
   ::TrackMouseEvent(&leaving);
 }

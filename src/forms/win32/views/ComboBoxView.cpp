@@ -13,25 +13,22 @@ namespace quendra::forms::win32 {
 namespace {
 
 /// The room of the field's edge and ring.
-constexpr int kEdge = 3;
+constexpr int kComboEdge = 3;
 constexpr int kArrowRoom = 18;
 constexpr int kRoomRoundLetters = 4;
 constexpr int kMostRows = 10;
 constexpr UINT kChosen = WM_APP + 0x211;
-constexpr UINT kTurn = WM_APP + 0x214;
 
 DWORD StyleOf() {
   return CBS_DROPDOWNLIST | CBS_HASSTRINGS | CBS_OWNERDRAWFIXED | CBS_NOINTEGRALHEIGHT | WS_VSCROLL |
          WS_CLIPCHILDREN;
 }
 
-DWORD BarSide(Direction direction) { return direction == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
-
 } // namespace
 
 ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, HWND parent)
     : FieldView(context, combo, parent), reading_(DirectionOf(combo.Value())), held_(reading_) {
-  Hold(L"COMBOBOX", StyleOf(), BarSide(ReadingDirection()));
+  Hold(L"COMBOBOX", StyleOf(), BarSide());
   if (!combo.FreeText) return;
   field_.emplace(*this, combo, false, [this](Direction direction) { ReadFrom(direction); });
   MakeEdit();
@@ -40,24 +37,22 @@ ComboBoxView::ComboBoxView(ViewContext& context, ComboBox& combo, HWND parent)
 void ComboBoxView::MakeEdit() {
   held_ = reading_;
   const DWORD side = held_ == Direction::RightToLeft ? WS_EX_RTLREADING | WS_EX_RIGHT : 0;
-  auto made = std::make_unique<InnerWindow>(
-      *this, InnerWindow::Kind{L"EDIT", ES_AUTOHSCROLL, side, Inner().Window()},
-      [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerEdit(message, wParam, lParam); });
-  const HWND before = edit_ ? edit_->Window() : nullptr;
-  if (before && edit_->HasFocus()) ::SetFocus(made->Window());
-  edit_ = std::move(made);
-  if (before) ::DestroyWindow(before);
+  field_->Leave();
+  if (!editName_) editName_ = MakeName(Inner().Window());
+  InnerWindow::Replace(edit_, std::make_unique<InnerWindow>(
+                                  *this, InnerWindow::Kind{L"EDIT", ES_AUTOHSCROLL, side, Inner().Window()},
+                                  [this](UINT message, WPARAM wParam, LPARAM lParam) {
+                                    return AnswerEdit(message, wParam, lParam);
+                                  }));
   field_->Take(*edit_);
 }
 
-// It can't be replaced while it tells of the text that turned.
 void ComboBoxView::ReadFrom(Direction direction) {
-  if (direction != reading_) ::PostMessageW(Window(), kTurn, 0, 0);
-  reading_ = direction;
+  if (std::exchange(reading_, direction) != direction) TurnSoon();
 }
 
 void ComboBoxView::Turn() {
-  if (!TheControl() || reading_ == held_) return;
+  if (reading_ == held_) return;
   MakeEdit();
   ::EnableWindow(edit_->Window(), IsEnabled());
   edit_->Send(WM_SETFONT, reinterpret_cast<WPARAM>(Letters()));
@@ -68,6 +63,11 @@ void ComboBoxView::Turn() {
 void ComboBoxView::ControlGone() {
   if (field_) field_->Release();
   FieldView::ControlGone();
+}
+
+void ComboBoxView::TellName() {
+  FieldView::TellName();
+  if (editName_) GiveName(*editName_);
 }
 
 HWND ComboBoxView::KeyWindow() const { return edit_ ? edit_->Window() : FieldView::KeyWindow(); }
@@ -119,7 +119,7 @@ void ComboBoxView::ShowSelection() {
   showing_ = before;
 }
 
-Area ComboBoxView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kEdge); }
+Area ComboBoxView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kComboEdge); }
 
 // The system counts the list that hangs down into the height, and takes the height of what is closed from
 // that of its letters.
@@ -144,7 +144,7 @@ void ComboBoxView::Arrange() {
 }
 
 Area ComboBoxView::TextRoom(Extent inside) const {
-  constexpr int kAside = kFieldPadding - kEdge;
+  constexpr int kAside = kFieldPadding - kComboEdge;
   const bool fromRight = ReadingDirection() == Direction::RightToLeft;
   return {{fromRight ? kArrowRoom : kAside, 0}, {inside.width - kArrowRoom - kAside, inside.height}};
 }
@@ -158,10 +158,6 @@ void ComboBoxView::PlaceEdit() const {
 
 std::optional<LRESULT> ComboBoxView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
   if (!TheControl()) return FieldView::Answer(message, wParam, lParam);
-  if (message == kTurn) {
-    Turn();
-    return 0;
-  }
   if (message == WM_MEASUREITEM) {
     reinterpret_cast<MEASUREITEMSTRUCT*>(lParam)->itemHeight = static_cast<UINT>(RowHeight());
     return TRUE;
@@ -193,7 +189,7 @@ std::optional<LRESULT> ComboBoxView::AnswerInner(UINT message, WPARAM wParam, LP
     if (edit_) ::EnableWindow(edit_->Window(), wParam != 0);
     return std::nullopt;
   case WM_LBUTTONDOWN:
-  case WM_LBUTTONDBLCLK: Drop(); return 0;
+  case WM_LBUTTONDBLCLK: return PressClosed(message, wParam, lParam);
   // Turning the wheel over a closed list would switch what it stands for by accident.
   case WM_MOUSEWHEEL:
     if (!IsDropped()) return ::DefWindowProcW(Inner().Window(), message, wParam, lParam);
@@ -209,9 +205,14 @@ std::optional<LRESULT> ComboBoxView::AnswerInner(UINT message, WPARAM wParam, LP
   }
 }
 
-void ComboBoxView::Drop() {
+// The class lets the list hang down and follows the mouse into it, until the button is let go over an item.
+LRESULT ComboBoxView::PressClosed(UINT message, WPARAM wParam, LPARAM lParam) {
   // A click is what chooses an item, not what opens the list.
   Context().mouse.ReleaseCapture();
+  return Inner().PassOn(message, wParam, lParam);
+}
+
+void ComboBoxView::Drop() {
   const bool drops = !IsDropped();
   // What hangs down has the keys.
   ::SetFocus(drops ? Inner().Window() : KeyWindow());

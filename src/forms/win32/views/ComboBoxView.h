@@ -19,6 +19,7 @@ class ComboBoxView : public FieldView {
   std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;
   std::optional<LRESULT> AnswerInner(UINT message, WPARAM wParam, LPARAM lParam) override;
   void Notified(int code) override;
+  void TellName() override;
   HWND KeyWindow() const override;
   void FocusCame() override;
   Area Room(Extent field) const override;
@@ -29,11 +30,12 @@ class ComboBoxView : public FieldView {
   ComboBox& Combo() const { return static_cast<ComboBox&>(*TheControl()); }
   void MakeEdit();
   void ReadFrom(Direction direction);
-  void Turn();
+  void Turn() override;
   std::optional<LRESULT> AnswerEdit(UINT message, WPARAM wParam, LPARAM lParam);
   void FillItems() const;
   void ShowSelection();
   bool IsDropped() const { return Inner().Send(CB_GETDROPPEDSTATE) != 0; }
+  LRESULT PressClosed(UINT message, WPARAM wParam, LPARAM lParam);
   void Drop();
   bool PassesToList(UINT message, WPARAM wParam, LPARAM lParam);
   int RowHeight() const;
@@ -45,6 +47,7 @@ class ComboBoxView : public FieldView {
   Area TextRoom(Extent inside) const;
 
   std::optional<EditField> field_; ///< of a list with free text
+  std::unique_ptr<InnerWindow> editName_;
   std::unique_ptr<InnerWindow> edit_;
   Direction reading_; ///< of the text
   Direction held_;    ///< of the window

@@ -3,7 +3,7 @@
 #include "forms/view/VisibleText.h"
 #include "forms/view/fields/Typing.h"
 #include "forms/win32/views/EditMenu.h"
-#include "forms/win32/views/EditText.h"
+#include "forms/win32/views/MarkedEdit.h"
 
 #include <utility>
 
@@ -45,12 +45,17 @@ void EditField::Take(const InnerWindow& edit) {
 }
 
 std::optional<LRESULT> EditField::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
-  if (!entry_) return std::nullopt;
+  if (!entry_ || !edit_) return std::nullopt;
+  if (Lines() == EditText::Lines::Marked)
+    if (const auto answer = AnswerWithoutMarks(*edit_, message, wParam, lParam)) return answer;
   switch (message) {
   case WM_CHAR: return Typed(wParam, lParam);
   case WM_CONTEXTMENU: ShowMenu(lParam); return 0;
   case kShowCaret: edit_->Send(EM_SCROLLCARET); return 0;
-  case WM_KEYDOWN: key_ = wParam; break;
+  case WM_KEYDOWN:
+    key_ = LOWORD(wParam); // a character that comes without a key stands above it
+    if (key_ != VK_INSERT || !IsDown(VK_CONTROL) || Lines() != EditText::Lines::Marked) break;
+    return edit_->Send(WM_COPY);
   case WM_MOUSEMOVE:
     if (!(wParam & MK_LBUTTON)) return std::nullopt;
     break;
@@ -102,7 +107,9 @@ int EditField::CharacterOf(WPARAM key, char16_t unit) {
 void EditField::Command(int character, LPARAM lParam) {
   enum : int { kSelectAll = 1, kCopy = 3, kPaste = 22, kCut = 24, kUndo = 26 };
   if (character == kSelectAll) edit_->Send(EM_SETSEL, 0, -1);
-  if (character == kCopy || character == kPaste || character == kCut || character == kUndo)
+  if (character == kCopy && Lines() == EditText::Lines::Marked)
+    edit_->Send(WM_COPY);
+  else if (character == kCopy || character == kPaste || character == kCut || character == kUndo)
     edit_->PassOn(WM_CHAR, static_cast<WPARAM>(character), lParam);
 }
 
@@ -112,9 +119,9 @@ void EditField::DeleteBack(LPARAM lParam) {
     edit_->PassOn(WM_CHAR, kBackspaceKey, lParam);
     return;
   }
-  auto [from, to] = HeldSelection();
+  auto [from, to] = HeldSelectionIn(*edit_);
   const bool masked = edit_->Send(EM_GETPASSWORDCHAR) != 0;
-  if (from == to) from = masked ? 0 : WordStart(TextOfWindow(edit_->Window()), to);
+  if (from == to) from = masked ? 0 : WordStart(HeldIn(*edit_), to);
   edit_->Send(EM_SETSEL, static_cast<WPARAM>(from), to);
   edit_->Send(EM_REPLACESEL, TRUE, reinterpret_cast<LPARAM>(L""));
 }
@@ -127,8 +134,8 @@ void EditField::ShowMenu(LPARAM place) {
 
 void EditField::Edited() {
   if (showing_ || !entry_) return;
-  const Text value = EditText::ValueOf(TextOfWindow(edit_->Window()), ofManyLines_);
-  const int caret = EditText(value, ofManyLines_).ValuePlace(HeldSelection().second);
+  const Text value = EditText::ValueOf(HeldIn(*edit_), ofManyLines_);
+  const int caret = EditText(value, Lines()).ValuePlace(HeldSelectionIn(*edit_).second);
   view_.Context().dispatcher.Dispatch([&] {
     if (entry_) entry_->Edited(value, caret);
   });
@@ -139,31 +146,29 @@ void EditField::Edited() {
 
 void EditField::TellSelection() {
   if (showing_ || !entry_) return;
-  const EditText text(entry_->Value(), ofManyLines_);
-  const auto [from, to] = HeldSelection();
+  const EditText text(entry_->Value(), Lines());
+  const auto [from, to] = HeldSelectionIn(*edit_);
   const int start = text.ValuePlace(from);
   entry_->Selected(start, text.ValuePlace(to) - start);
 }
 
-std::pair<int, int> EditField::HeldSelection() const {
-  DWORD from = 0;
-  DWORD to = 0;
-  edit_->Send(EM_GETSEL, reinterpret_cast<WPARAM>(&from), reinterpret_cast<LPARAM>(&to));
-  return {static_cast<int>(from), static_cast<int>(to)};
+EditText::Lines EditField::Lines() const {
+  if (!ofManyLines_) return EditText::Lines::One;
+  return edit_->Has(ES_READONLY) ? EditText::Lines::Marked : EditText::Lines::Many;
 }
 
 void EditField::ShowText() {
   const bool before = std::exchange(showing_, true);
   // The caret of an empty field stands where Latin letters, which all fields here are for, begin.
   readFrom_(DirectionOf(entry_->Value()));
-  Hold(EditText(entry_->Value(), ofManyLines_).Held());
+  Hold(EditText(entry_->Value(), Lines()).Held());
   showing_ = before;
   ShowCaret();
 }
 
 // A text that only grows keeps what stands there: it doesn't flicker, and undoing ends there.
 void EditField::Hold(const Text& text) {
-  const Text held = TextOfWindow(edit_->Window());
+  const Text held = HeldIn(*edit_);
   if (held == text) return;
   if (!ofManyLines_ || held.empty() || text.compare(0, held.size(), held) != 0) {
     ::SetWindowTextW(edit_->Window(), winapi::Wide(text));
@@ -176,10 +181,10 @@ void EditField::Hold(const Text& text) {
 }
 
 void EditField::ShowCaret() {
-  const EditText text(entry_->Value(), ofManyLines_);
+  const EditText text(entry_->Value(), Lines());
   const int from = text.HeldPlace(entry_->SelStart());
   const int to = text.HeldPlace(entry_->SelStart() + entry_->SelLength());
-  if (HeldSelection() == std::pair(from, to)) return;
+  if (HeldSelectionIn(*edit_) == std::pair(from, to)) return;
   const bool before = std::exchange(showing_, true);
   edit_->Send(EM_SETSEL, static_cast<WPARAM>(from), to);
   showing_ = before;

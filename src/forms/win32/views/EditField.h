@@ -1,6 +1,7 @@
 #pragma once
 
 #include "forms/controls/TextEntry.h"
+#include "forms/win32/views/EditText.h"
 #include "forms/win32/views/InnerWindow.h"
 
 namespace quendra::forms::win32 {
@@ -12,8 +13,9 @@ class EditField {
   EditField(WindowView& view, TextEntry& entry, bool ofManyLines, std::function<void(Direction)> readFrom)
       : view_(view), entry_(&entry), ofManyLines_(ofManyLines), readFrom_(std::move(readFrom)) {}
 
-  /// The window, which must stay until another one is taken.
+  /// The window, which must stay until it is left for another one.
   void Take(const InnerWindow& edit);
+  void Leave() { edit_ = nullptr; }
   /// nullptr once released.
   TextEntry* Entry() const { return entry_; }
   /// The control goes or is let go of.
@@ -35,7 +37,8 @@ class EditField {
   void TellSelection();
   void Hold(const Text& text);
   void ShowMenu(LPARAM place);
-  std::pair<int, int> HeldSelection() const;
+  /// What can't be edited has marks in it.
+  EditText::Lines Lines() const;
 
   WindowView& view_;
   TextEntry* entry_;

@@ -5,10 +5,11 @@
 namespace quendra::forms::win32 {
 
 /// The text of a field as an EDIT window holds it, and what stands where in both: a line break has two
-/// characters there, however it is written in the field.
+/// characters there, however it is written in the field, and lines may have marks of their direction.
 class EditText {
  public:
-  EditText(TextView value, bool ofManyLines);
+  enum class Lines { One, Many, Marked };
+  EditText(TextView value, Lines lines);
 
   const Text& Held() const { return held_; }
   int HeldPlace(int valuePlace) const;
@@ -18,8 +19,6 @@ class EditText {
 
  private:
   FieldText text_;
-  bool ofManyLines_;
-  Text shown_;
   Text held_;
 };
 

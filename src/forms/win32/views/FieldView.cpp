@@ -7,20 +7,42 @@
 
 namespace quendra::forms::win32 {
 
+namespace {
+constexpr UINT kTurn = WM_APP + 0x212;
+}
+
 FieldView::FieldView(ViewContext& context, Control& control, HWND parent) : WindowView(context, control) {
   Create(parent);
 }
 
 void FieldView::Hold(const wchar_t* windowClass, DWORD style, DWORD extendedStyle) {
+  if (!name_) name_ = MakeName(Window());
+  InnerWindow::Replace(
+      inner_, std::make_unique<InnerWindow>(*this, InnerWindow::Kind{windowClass, style, extendedStyle},
+                                            [this](UINT message, WPARAM wParam, LPARAM lParam) {
+                                              return AnswerInner(message, wParam, lParam);
+                                            }));
+}
+
+std::unique_ptr<InnerWindow> FieldView::MakeName(HWND parent) {
   const auto leave = [](UINT, WPARAM, LPARAM) -> std::optional<LRESULT> { return std::nullopt; };
-  if (!name_) name_ = std::make_unique<InnerWindow>(*this, InnerWindow::Kind{L"STATIC"}, leave);
-  auto made = std::make_unique<InnerWindow>(
-      *this, InnerWindow::Kind{windowClass, style, extendedStyle},
-      [this](UINT message, WPARAM wParam, LPARAM lParam) { return AnswerInner(message, wParam, lParam); });
-  const HWND before = inner_ ? inner_->Window() : nullptr;
-  if (before && inner_->HasFocus()) ::SetFocus(made->Window());
-  inner_ = std::move(made);
-  if (before) ::DestroyWindow(before);
+  return std::make_unique<InnerWindow>(*this, InnerWindow::Kind{L"STATIC", 0, 0, parent}, leave);
+}
+
+void FieldView::GiveName(const InnerWindow& name) const {
+  ::SetWindowTextW(name.Window(), winapi::Wide(AccessibleOf(*TheControl()).name));
+}
+
+void FieldView::TurnSoon() { ::PostMessageW(Window(), kTurn, 0, 0); }
+
+// The window that is to be replaced may be waiting for a handler, which handles messages.
+void FieldView::TurnOrWait() {
+  turnWaits_ = !IsAlone();
+  if (!turnWaits_ && TheControl()) Turn();
+}
+
+void FieldView::Rested() {
+  if (std::exchange(turnWaits_, false)) TurnSoon();
 }
 
 FieldState FieldView::State() const { return {IsEnabled(), IsReadOnly(), HasFocus(), UsesKeys()}; }
@@ -40,6 +62,7 @@ std::optional<LRESULT> FieldView::Answer(UINT message, WPARAM wParam, LPARAM lPa
     // A handler may have moved it on.
     if (::GetFocus() == Window()) ::SetFocus(KeyWindow());
     return 0;
+  case kTurn: TurnOrWait(); return 0;
   case WM_SIZE: Arrange(); return std::nullopt;
   case WM_ENABLE: ::EnableWindow(inner_->Window(), wParam != 0); return std::nullopt;
   case WM_COMMAND:
@@ -77,7 +100,7 @@ LRESULT FieldView::ColourText(HDC device) const {
 
 void FieldView::TellName() {
   WindowView::TellName();
-  if (name_) ::SetWindowTextW(name_->Window(), winapi::Wide(AccessibleOf(*TheControl()).name));
+  if (name_) GiveName(*name_);
 }
 
 HFONT FieldView::Letters() const { return Context().fonts.FontOf(TheControl()->TextFont(), Context().scale); }

@@ -23,11 +23,16 @@ class FieldView : public WindowView {
   /// to take its place.
   void Hold(const wchar_t* windowClass, DWORD style, DWORD extendedStyle = 0);
   std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;
+  /// The extended style by which the scroll bar of the window stands where its lines end.
+  DWORD BarSide() const { return ReadingDirection() == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
   /// A message to the window of the system's kind.
   virtual std::optional<LRESULT> AnswerInner(UINT message, WPARAM wParam, LPARAM lParam);
   /// The window of the system's kind tells of something.
   virtual void Notified(int /*code*/) {}
   void TellName() override;
+  /// A window without extent, for the name of the one that is made after it.
+  std::unique_ptr<InnerWindow> MakeName(HWND parent);
+  void GiveName(const InnerWindow& name) const;
   /// The window of the system's that has the keys.
   virtual HWND KeyWindow() const { return inner_->Window(); }
   /// The focus has come to a window of the system's inside the field.
@@ -40,12 +45,21 @@ class FieldView : public WindowView {
   /// Puts the window of the system's kind in its place.
   virtual void Arrange();
   FieldState State() const;
+  /// Has Turn called when the messages that are there are handled, and nothing of the field is under way: not
+  /// all systems let an EDIT window turn once it is made, and it can't be replaced while it tells of
+  /// something.
+  void TurnSoon();
+  /// Puts a window that reads in the other direction in the place of the one that is there.
+  virtual void Turn() {}
+  void Rested() override;
 
  private:
   LRESULT ColourText(HDC device) const;
+  void TurnOrWait();
 
   std::unique_ptr<InnerWindow> name_;
   std::unique_ptr<InnerWindow> inner_;
+  bool turnWaits_ = false;
 };
 
 } // namespace quendra::forms::win32

@@ -1,7 +1,9 @@
 #include "forms/win32/views/HoverTip.h"
 
 #include "forms/view/VisibleText.h"
+#include "forms/win32/windows/TopWindow.h"
 
+#include <algorithm>
 #include <commctrl.h>
 
 namespace quendra::forms::win32 {
@@ -9,6 +11,7 @@ namespace quendra::forms::win32 {
 namespace {
 
 constexpr int kBelowMouse = 20;
+constexpr int kAboveMouse = 4;
 constexpr LPARAM kWidest = 600;
 
 /// The record of the one tool that a tip window has; the length is that of all systems.
@@ -24,6 +27,15 @@ TTTOOLINFOW ToolOf(HWND tip, const Text& text) {
 
 void Send(HWND tip, UINT message, WPARAM wParam, const TTTOOLINFOW& tool) {
   ::SendMessageW(tip, message, wParam, reinterpret_cast<LPARAM>(&tool));
+}
+
+/// Below the mouse, above it where the screen ends, and nowhere off the screen: a tip that follows the mouse
+/// is shown where it is told.
+Spot PlaceOf(const Area& screen, Extent tip, Spot mouse) {
+  const int below = mouse.top + kBelowMouse;
+  const bool fits = below + tip.height <= screen.Bottom();
+  return {std::max(screen.corner.left, std::min(mouse.left, screen.Right() - tip.width)),
+          fits ? below : mouse.top - kAboveMouse - tip.height};
 }
 
 } // namespace
@@ -54,7 +66,10 @@ void HoverTip::Show(HWND over, const Text& tip) {
   ::SendMessageW(window_, TTM_SETMAXTIPWIDTH, 0, kWidest);
   POINT mouse{};
   ::GetCursorPos(&mouse);
-  ::SendMessageW(window_, TTM_TRACKPOSITION, 0, MAKELPARAM(mouse.x, mouse.y + kBelowMouse));
+  const LRESULT size = ::SendMessageW(window_, TTM_GETBUBBLESIZE, 0, reinterpret_cast<LPARAM>(&tool));
+  const Spot place = PlaceOf(UsableScreenRound(over), {LOWORD(size), HIWORD(size)},
+                             {static_cast<int>(mouse.x), static_cast<int>(mouse.y)});
+  ::SendMessageW(window_, TTM_TRACKPOSITION, 0, MAKELPARAM(place.left, place.top));
   Send(window_, TTM_TRACKACTIVATE, TRUE, tool);
   shown_ = tip;
 }

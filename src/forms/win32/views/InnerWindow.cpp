@@ -35,6 +35,15 @@ InnerWindow::~InnerWindow() {
   ::SetWindowLongPtrW(window_, GWLP_USERDATA, 0);
 }
 
+// The new one has its place before it gets the focus: what comes with that is asked of the one in its place.
+void InnerWindow::Replace(std::unique_ptr<InnerWindow>& standing, std::unique_ptr<InnerWindow> made) {
+  const HWND before = standing ? standing->Window() : nullptr;
+  const bool hadFocus = standing && standing->HasFocus();
+  standing = std::move(made);
+  if (hadFocus) ::SetFocus(standing->Window());
+  if (before) ::DestroyWindow(before);
+}
+
 LRESULT InnerWindow::PassOn(UINT message, WPARAM wParam, LPARAM lParam) const {
   return before_ ? ::CallWindowProcW(before_, window_, message, wParam, lParam) : 0;
 }
@@ -66,9 +75,18 @@ bool InnerWindow::IsTaken(UINT message, WPARAM wParam, LPARAM lParam) const {
 
 LRESULT InnerWindow::Handle(UINT message, WPARAM wParam, LPARAM lParam) {
   const WindowView::Work work(view_);
+  // The window lets go of the mouse before the control is clicked: the handler may show another one.
+  if (message == WM_LBUTTONUP && ::GetCapture() == window_) {
+    const LRESULT answer = Answer(message, wParam, lParam);
+    IsTaken(message, wParam, lParam);
+    return answer;
+  }
   const bool taken = IsTaken(message, wParam, lParam);
   view_.HearForTip(window_, message, lParam);
-  if (taken) return 0;
+  return taken ? 0 : Answer(message, wParam, lParam);
+}
+
+LRESULT InnerWindow::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
   if (const auto answer = hear_(message, wParam, lParam)) return *answer;
   return PassOn(message, wParam, lParam);
 }

@@ -3,6 +3,7 @@
 #include "forms/win32/views/WindowView.h"
 
 #include <functional>
+#include <memory>
 
 namespace quendra::forms::win32 {
 
@@ -24,6 +25,8 @@ class InnerWindow {
   /// Takes one that a window of the system has made.
   InnerWindow(WindowView& view, HWND window, Hearer hear);
   ~InnerWindow();
+  /// Puts one in the place of another, or of none, and gives it the focus that that one had.
+  static void Replace(std::unique_ptr<InnerWindow>& standing, std::unique_ptr<InnerWindow> made);
   InnerWindow(const InnerWindow&) = delete;
   InnerWindow& operator=(const InnerWindow&) = delete;
 
@@ -48,6 +51,7 @@ class InnerWindow {
   /// A message of the mouse, which the view's control hears of.
   bool IsTaken(UINT message, WPARAM wParam, LPARAM lParam) const;
   LRESULT Handle(UINT message, WPARAM wParam, LPARAM lParam);
+  LRESULT Answer(UINT message, WPARAM wParam, LPARAM lParam);
   static LRESULT CALLBACK Procedure(HWND window, UINT message, WPARAM wParam, LPARAM lParam) noexcept;
 
   WindowView& view_;

@@ -12,23 +12,21 @@ namespace quendra::forms::win32 {
 
 namespace {
 /// The room of the field's edge and ring.
-constexpr int kEdge = 4;
-constexpr int kRoomRoundLetters = 4;
-
-DWORD BarSide(Direction direction) { return direction == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
+constexpr int kItemsEdge = 4;
+constexpr int kRoomRoundItem = 4;
 } // namespace
 
 ListBoxView::ListBoxView(ViewContext& context, ListBox& list, HWND parent)
     : FieldView(context, list, parent) {
   Hold(L"LISTBOX", LBS_NOTIFY | LBS_HASSTRINGS | LBS_OWNERDRAWFIXED | LBS_NOINTEGRALHEIGHT | WS_VSCROLL,
-       BarSide(ReadingDirection()));
+       BarSide());
 }
 
 int ListBoxView::RowHeight() const {
-  return Context().fonts.LineHeight(Letters()) + Context().scale.Pixels(kRoomRoundLetters);
+  return Context().fonts.LineHeight(Letters()) + Context().scale.Pixels(kRoomRoundItem);
 }
 
-Area ListBoxView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kEdge); }
+Area ListBoxView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kItemsEdge); }
 
 void ListBoxView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Font)) {

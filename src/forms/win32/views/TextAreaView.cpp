@@ -4,17 +4,15 @@ namespace quendra::forms::win32 {
 
 namespace {
 /// The room of the field's edge and ring, inside of which the scroll bar stands.
-constexpr int kEdge = 3;
+constexpr int kAreaEdge = 3;
 /// Pixels between it and the text.
 constexpr int kMargin = 6;
-
-DWORD BarSide(Direction direction) { return direction == Direction::RightToLeft ? WS_EX_LEFTSCROLLBAR : 0; }
 } // namespace
 
 TextAreaView::TextAreaView(ViewContext& context, TextBox& box, HWND parent)
     : TextFieldView(context, box, parent) {
   HoldEdit(ES_MULTILINE | ES_AUTOVSCROLL | ES_WANTRETURN | (box.VerticalScrollBar() ? WS_VSCROLL : 0),
-           BarSide(ReadingDirection()));
+           BarSide());
 }
 
 void TextAreaView::Apply(Aspect aspect) {
@@ -27,6 +25,6 @@ void TextAreaView::Apply(Aspect aspect) {
     Inner().Send(EM_SETMARGINS, EC_LEFTMARGIN | EC_RIGHTMARGIN, MAKELPARAM(kMargin, kMargin));
 }
 
-Area TextAreaView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kEdge); }
+Area TextAreaView::Room(Extent field) const { return Area{{}, field}.GrownBy(-kAreaEdge); }
 
 } // namespace quendra::forms::win32

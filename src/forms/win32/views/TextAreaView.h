@@ -4,7 +4,8 @@
 
 namespace quendra::forms::win32 {
 
-/// A text box of many lines. All are read in the direction of their first letter.
+/// A text box of many lines. On which side all begin is decided by the first letter of them all; so is the
+/// direction of lines that can be edited, where each of the others has its own.
 class TextAreaView : public TextFieldView {
  public:
   TextAreaView(ViewContext& context, TextBox& box, HWND parent);

@@ -2,11 +2,9 @@
 
 #include "forms/view/VisibleText.h"
 
-namespace quendra::forms::win32 {
+#include <utility>
 
-namespace {
-constexpr UINT kTurn = WM_APP + 0x212;
-}
+namespace quendra::forms::win32 {
 
 TextFieldView::TextFieldView(ViewContext& context, TextBox& box, HWND parent)
     : FieldView(context, box, parent),
@@ -18,28 +16,20 @@ void TextFieldView::HoldEdit(DWORD style, DWORD extendedStyle) {
   extendedStyle_ = extendedStyle;
   held_ = reading_;
   const DWORD side = held_ == Direction::RightToLeft ? WS_EX_RTLREADING | WS_EX_RIGHT : 0;
+  edit_.Leave();
   Hold(L"EDIT", style, extendedStyle | side);
   edit_.Take(Inner());
 }
 
-// Not all systems let an EDIT window turn once it is made, and it can't be replaced while it tells of the
-// text that turned.
 void TextFieldView::ReadFrom(Direction direction) {
-  if (direction != reading_) ::PostMessageW(Window(), kTurn, 0, 0);
-  reading_ = direction;
+  if (std::exchange(reading_, direction) != direction) TurnSoon();
 }
 
 void TextFieldView::Turn() {
-  if (!TheControl() || reading_ == held_) return;
+  if (reading_ == held_) return;
   HoldEdit(style_, extendedStyle_);
   ::EnableWindow(Inner().Window(), IsEnabled());
   Apply(Aspect::All);
-}
-
-std::optional<LRESULT> TextFieldView::Answer(UINT message, WPARAM wParam, LPARAM lParam) {
-  if (message != kTurn) return FieldView::Answer(message, wParam, lParam);
-  Turn();
-  return 0;
 }
 
 void TextFieldView::ControlGone() {
@@ -65,7 +55,7 @@ void TextFieldView::FocusCame() {
 void TextFieldView::Apply(Aspect aspect) {
   if (Concerns(aspect, Aspect::Font)) GiveLetters();
   if (Concerns(aspect, Aspect::Look)) Inner().Send(EM_SETREADONLY, Box().ReadOnly());
-  if (Concerns(aspect, Aspect::Entry)) edit_.ShowText();
+  if (Concerns(aspect, Aspect::Entry) || aspect == Aspect::Look) edit_.ShowText();
   if (aspect == Aspect::Caret) edit_.ShowCaret();
 }
 

@@ -16,7 +16,6 @@ class TextFieldView : public FieldView {
  protected:
   /// Makes the window, in the constructor of the kind.
   void HoldEdit(DWORD style, DWORD extendedStyle = 0);
-  std::optional<LRESULT> Answer(UINT message, WPARAM wParam, LPARAM lParam) override;
   std::optional<LRESULT> AnswerInner(UINT message, WPARAM wParam, LPARAM lParam) override;
   void Notified(int code) override;
   void FocusCame() override;
@@ -27,7 +26,7 @@ class TextFieldView : public FieldView {
 
  private:
   void ReadFrom(Direction direction);
-  void Turn();
+  void Turn() override;
 
   EditField edit_;
   Direction reading_; ///< of the text

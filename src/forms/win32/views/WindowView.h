@@ -79,7 +79,9 @@ class WindowView : public View {
   class Work {
    public:
     explicit Work(WindowView& view) : view_(view) { ++view_.underWay_; }
-    ~Work() { --view_.underWay_; }
+    ~Work() {
+      if (--view_.underWay_ == 0) view_.Rested();
+    }
     Work(const Work&) = delete;
     Work& operator=(const Work&) = delete;
 
@@ -105,6 +107,10 @@ class WindowView : public View {
   virtual std::optional<LRESULT> AnswerReflected(UINT message, WPARAM wParam, LPARAM lParam);
   /// The focus came to this window from elsewhere in the program, not with the form's window.
   virtual void FocusCame() {}
+  /// Nothing of this view is at work any more.
+  virtual void Rested() {}
+  /// What is being handled is the only work that is under way.
+  bool IsAlone() const { return underWay_ == 1; }
   /// The parts of the state that only this kind of control has.
   virtual void Apply(Aspect /*aspect*/) {}
   virtual void PutInPlace();

@@ -309,9 +309,10 @@ std::optional<LRESULT> FormWindow::AnswerTop(UINT message, WPARAM wParam, LPARAM
   case WM_SETFOCUS: RestoreFocus(); return 0;
   case WM_ERASEBKGND: return 1;
   case WM_PAINT: PaintGround(); return 0;
-  case WM_DISPLAYCHANGE: Refit(); break;
+  case WM_DISPLAYCHANGE:
+  case WM_THEMECHANGED: Refit(); break;
   case WM_SETTINGCHANGE:
-    if (wParam == SPI_SETWORKAREA) Refit();
+    if (wParam == SPI_SETWORKAREA || wParam == SPI_SETNONCLIENTMETRICS) Refit();
     break;
   default:
     if (lParam == 0 || message == WM_MOUSEWHEEL)

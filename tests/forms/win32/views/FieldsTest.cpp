@@ -1,4 +1,5 @@
 #include "forms/view/Palette.h"
+#include "forms/win32/views/Clipboard.h"
 #include "forms/win32/views/ViewFixture.h"
 
 namespace quendra::forms::win32 {
@@ -6,15 +7,7 @@ namespace quendra::forms::win32 {
 namespace {
 
 /// A text on the clipboard of the bed.
-void PutOnClipboard(const Text& text) {
-  const HGLOBAL memory = ::GlobalAlloc(GMEM_MOVEABLE, (text.size() + 1) * sizeof(char16_t));
-  std::copy_n(text.c_str(), text.size() + 1, static_cast<char16_t*>(::GlobalLock(memory)));
-  ::GlobalUnlock(memory);
-  ::OpenClipboard(nullptr);
-  ::EmptyClipboard();
-  ::SetClipboardData(CF_UNICODETEXT, memory);
-  ::CloseClipboard();
-}
+void PutOnClipboard(const Text& text) { win32::PutOnClipboard(nullptr, text); }
 
 Text OnClipboard() {
   ::OpenClipboard(nullptr);
@@ -48,6 +41,12 @@ class FieldWindows : public ViewFixture {
   static Text Shown(const Control& control) { return TextOfWindow(Inner(control)); }
   static DWORD Style(const Control& control, int index = GWL_STYLE) {
     return static_cast<DWORD>(::GetWindowLongW(Inner(control), index));
+  }
+  static HWND WindowWithCaret() {
+    GUITHREADINFO thread{};
+    thread.cbSize = sizeof thread;
+    ::GetGUIThreadInfo(::GetCurrentThreadId(), &thread);
+    return thread.hwndCaret;
   }
   HWND Edit() { return ::FindWindowExW(Inner(combo), nullptr, L"EDIT", nullptr); }
 
@@ -93,6 +92,18 @@ TEST_F(FieldWindows, Harmful_signs_that_are_pasted_are_shown_and_kept_as_visible
   EXPECT_EQ(line.Value(), u"a\uFFFDb");
   EXPECT_EQ(Shown(line), u"a\uFFFDb");
   EXPECT_EQ(line.SelStart(), 3);
+}
+
+TEST_F(FieldWindows, A_control_character_that_comes_without_a_key_is_one_of_the_forms_keys_too) {
+  std::vector<int> pressed;
+  line.KeyPress = [&](int& keyCode) { pressed.push_back(keyCode); };
+  form.Cancel = &label;
+  Show();
+
+  ::SendMessageW(Inner(line), WM_KEYDOWN, MAKEWPARAM(VK_PACKET, kEscapeKey), 0);
+  ::SendMessageW(Inner(line), WM_CHAR, kEscapeKey, 0);
+
+  EXPECT_TRUE(pressed.empty());
 }
 
 TEST_F(FieldWindows, Everything_is_selected_by_one_key) {
@@ -213,6 +224,7 @@ TEST_F(FieldWindows, A_field_turns_to_the_direction_of_its_first_letter_and_keep
   EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
   EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RIGHT);
   EXPECT_EQ(::GetFocus(), Inner(line));
+  EXPECT_EQ(WindowWithCaret(), Inner(line));
   Key('X');
   EXPECT_EQ(line.Value(), u"שלוXם, abc");
 
@@ -235,6 +247,45 @@ TEST_F(FieldWindows, A_field_that_turns_tells_of_the_focus_no_second_time) {
   EXPECT_EQ(came, 1);
 }
 
+TEST_F(FieldWindows, A_field_turns_when_its_own_handlers_are_through) {
+  Show();
+  const HWND before = Inner(line);
+  bool stood = false;
+  line.KeyPress = [&](int& keyCode) {
+    keyCode = 0;
+    line.Value = u"שלום";
+    desktop.PumpOnce();
+    stood = ::IsWindow(before);
+  };
+
+  Key('A');
+  EXPECT_TRUE(stood);
+  Settle();
+
+  EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
+  EXPECT_EQ(line.Value(), u"שלום");
+}
+
+TEST_F(FieldWindows, A_combo_box_turns_when_its_own_handlers_are_through) {
+  Show();
+  Key(kTabKey);
+  Key(kTabKey);
+  const HWND before = Edit();
+  bool stood = false;
+  combo.KeyPress = [&](int& keyCode) {
+    keyCode = 0;
+    combo.Value = u"שלום";
+    desktop.PumpOnce();
+    stood = ::IsWindow(before);
+  };
+
+  Key('A');
+  EXPECT_TRUE(stood);
+  Settle();
+
+  EXPECT_TRUE(::GetWindowLongW(Edit(), GWL_EXSTYLE) & WS_EX_RTLREADING);
+}
+
 TEST_F(FieldWindows, A_report_follows_its_end_when_its_handler_says_so) {
   lines.Change = [this] { lines.SelStart = static_cast<int>(lines.Value().size()); };
   Show();
@@ -246,6 +297,43 @@ TEST_F(FieldWindows, A_report_follows_its_end_when_its_handler_says_so) {
   EXPECT_GT(bar.nPos, 50);
   EXPECT_EQ(bar.nPos, bar.nMax - static_cast<int>(bar.nPage) + 1);
   EXPECT_EQ(Shown(lines), lines.Value());
+}
+
+TEST_F(FieldWindows, Each_line_of_a_report_reads_in_its_own_direction) {
+  lines.ReadOnly = true;
+  lines.Value = u"מטפל...\r\ncalled (RAS)";
+  Show();
+  const auto leftOf = [this](std::size_t line, std::size_t sign) {
+    const LRESULT mark = ::SendMessageW(Inner(lines), EM_LINEINDEX, line, 0);
+    const std::size_t place = static_cast<std::size_t>(mark) + 1 + sign;
+    return static_cast<short>(LOWORD(::SendMessageW(Inner(lines), EM_POSFROMCHAR, place, 0)));
+  };
+
+  EXPECT_LT(leftOf(0, 6), leftOf(0, 1));
+  EXPECT_GT(leftOf(1, 11), leftOf(1, 1));
+}
+
+TEST_F(FieldWindows, What_is_copied_from_a_report_selected_and_read_in_it_knows_of_no_marks) {
+  lines.ReadOnly = true;
+  lines.Value = u"מטפל...\r\ncalled (RAS)";
+  Show();
+  Key(kTabKey);
+  lines.SelStart = 9;
+  lines.SelLength = 6;
+
+  Key('C', kCtrl);
+  EXPECT_EQ(OnClipboard(), u"called");
+  Key('A', kCtrl);
+  EXPECT_EQ(lines.SelStart(), 0);
+  EXPECT_EQ(lines.SelLength(), 21);
+  Key(kInsertKey, kCtrl);
+  EXPECT_EQ(OnClipboard(), lines.Value());
+
+  EXPECT_EQ(Shown(lines), lines.Value());
+  lines.ReadOnly = false;
+  Key(kEndKey, kCtrl);
+  Key('X');
+  EXPECT_EQ(lines.Value(), u"מטפל...\r\ncalled (RAS)X");
 }
 
 TEST_F(FieldWindows, A_report_has_letters_of_one_width_and_a_scroll_bar_inside_its_edge) {
@@ -277,6 +365,18 @@ TEST_F(FieldWindows, A_field_is_named_by_a_label_right_before_the_systems_window
   EXPECT_EQ(TextOfWindow(before), u"כתובת מעקב:");
   EXPECT_TRUE(::SendMessageW(before, WM_GETDLGCODE, 0, 0) & DLGC_STATIC);
   EXPECT_EQ(TextOfWindow(As<FieldView>(line).Window()), u"כתובת מעקב:");
+}
+
+TEST_F(FieldWindows, The_text_of_a_combo_box_is_named_by_a_label_right_before_it_also_when_it_has_turned) {
+  combo.Description = u"כתובת לבדיקה";
+  Show();
+  const auto name = [this] { return TextOfWindow(::GetWindow(Edit(), GW_HWNDPREV)); };
+  EXPECT_EQ(name(), u"כתובת לבדיקה");
+
+  combo.Value = u"שלום";
+  Settle();
+
+  EXPECT_EQ(name(), u"כתובת לבדיקה");
 }
 
 TEST_F(FieldWindows, A_field_has_the_border_of_its_state) {
@@ -339,6 +439,7 @@ TEST_F(FieldWindows, A_combo_box_turns_to_the_direction_of_its_text_and_keeps_ca
   Settle();
   EXPECT_TRUE(isTurned());
   EXPECT_EQ(::GetFocus(), Edit());
+  EXPECT_EQ(WindowWithCaret(), Edit());
   Key('X');
   EXPECT_EQ(combo.Value(), u"שלוXם, abc");
 
@@ -401,6 +502,35 @@ TEST_F(FieldWindows,
   Settle();
   EXPECT_EQ(chosen, std::vector<int>{1});
   EXPECT_EQ(::SendMessageW(window, CB_GETCURSEL, 0, 0), 1);
+}
+
+TEST_F(FieldWindows, An_item_is_chosen_by_a_press_on_the_closed_list_that_is_let_go_over_the_item) {
+  std::vector<int> chosen;
+  for (const char16_t* more : {u"www.three.test", u"www.four.test"}) combo.AddItem(more);
+  combo.FreeText = false;
+  combo.Click = [&] { chosen.push_back(combo.ListIndex()); };
+  Show();
+  const HWND window = Inner(combo);
+  COMBOBOXINFO parts{};
+  parts.cbSize = sizeof parts;
+  ::GetComboBoxInfo(window, &parts);
+  // As the system gives them: to the window that has the mouse to itself, else to the one under it.
+  const auto tell = [&](UINT message, WPARAM held) {
+    const HWND to = ::GetCapture() ? ::GetCapture() : parts.hwndList;
+    POINT place{20, static_cast<int>(::SendMessageW(window, CB_GETITEMHEIGHT, 0, 0)) + 5};
+    ::MapWindowPoints(parts.hwndList, to, &place, 1);
+    Press(to, {static_cast<int>(place.x), static_cast<int>(place.y)}, message, held);
+  };
+
+  Press(window, {10, 10});
+  ASSERT_TRUE(::SendMessageW(window, CB_GETDROPPEDSTATE, 0, 0));
+  tell(WM_MOUSEMOVE, MK_LBUTTON);
+  tell(WM_MOUSEMOVE, MK_LBUTTON);
+  tell(WM_LBUTTONUP, 0);
+  Settle();
+
+  EXPECT_EQ(chosen, std::vector<int>{1});
+  EXPECT_FALSE(::SendMessageW(window, CB_GETDROPPEDSTATE, 0, 0));
 }
 
 TEST_F(FieldWindows, The_wheel_over_a_closed_list_changes_nothing) {

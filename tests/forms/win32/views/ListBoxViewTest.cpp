@@ -35,6 +35,20 @@ TEST_F(ListBoxWindow, A_click_of_the_mouse_chooses_once_and_again_on_what_is_cho
   EXPECT_EQ(Ask(LB_GETCURSEL), 1);
 }
 
+TEST_F(ListBoxWindow, A_click_comes_when_the_window_has_let_go_of_the_mouse) {
+  HWND captured = nullptr;
+  list.Click = [&] {
+    captured = ::GetCapture();
+    chosen.push_back(list.ListIndex());
+  };
+  Show();
+
+  Click(Inner(list), PlaceOf(1));
+
+  EXPECT_EQ(chosen, std::vector<int>{1});
+  EXPECT_EQ(captured, nullptr);
+}
+
 TEST_F(ListBoxWindow, A_click_below_the_last_item_leaves_the_choice_as_it_is) {
   Show();
   list.SelectItem(0);

@@ -92,6 +92,24 @@ TEST_F(Tips, What_is_shown_goes_when_the_mouse_does_with_a_press_and_with_the_fo
   EXPECT_FALSE(::IsWindowVisible(Tip().Window()));
 }
 
+TEST_F(Tips, A_tip_at_the_edge_of_the_screen_stays_on_it_and_beside_the_mouse) {
+  label.Caption = kLong;
+  Show();
+  const Area screen = WindowOf(form).UsableScreen();
+  const POINT mouse{screen.Right() - 3, screen.Bottom() - 3};
+
+  ::SetCursorPos(mouse.x, mouse.y);
+  At(ViewOf(label).Window(), {5, 5});
+  ::SetCursorPos(0, 0);
+
+  RECT shown{};
+  ::GetWindowRect(Tip().Window(), &shown);
+  EXPECT_LE(shown.right, screen.Right());
+  EXPECT_LE(shown.bottom, screen.Bottom());
+  EXPECT_GE(shown.left, screen.corner.left);
+  EXPECT_FALSE(::PtInRect(&shown, mouse));
+}
+
 TEST_F(Tips, A_mouse_that_rests_brings_up_the_tip_beside_it) {
   label.Caption = kLong;
   Show();
