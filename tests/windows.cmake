@@ -27,7 +27,8 @@ target_sources(app_windows_test PRIVATE forms/win32/Win32DriverFixture.cpp ${as_
 add_subdirectory(app/windows/programs)
 add_dependencies(platform_test idle_program) # which it starts
 add_subdirectory(standins/windows/planted)
-add_dependencies(app_windows_test quendra_windows standin_planted standin_careless timed_start idle_program odd_program)
+add_dependencies(app_windows_test quendra_windows standin_planted standin_careless standin_wpcap timed_start idle_program
+                 odd_program port_talker loopback_recorder)
 # The installer runs in the bed as on a machine of a subscriber.
 add_subdirectory(${PROJECT_SOURCE_DIR}/packaging/windows ${CMAKE_BINARY_DIR}/packaging)
 quendra_test(packaging/windows quendra_winapi quendra_runtime)

@@ -6,6 +6,8 @@ namespace quendra::platform {
 
 /// What a test puts in the place of a machine's families; nullptr leaves the machine its own.
 struct Replacements {
+  CaptureControls* captureControls = nullptr;
+  CaptureLibrary* captureLibrary = nullptr;
   HostNames* hostNames = nullptr;
   InstalledProducts* installedProducts = nullptr;
   Sockets* sockets = nullptr;
@@ -14,8 +16,8 @@ struct Replacements {
 
 inline Machine WithReplaced(const Machine& own, const Replacements& by) {
   return {own.adapters,
-          own.captureControls,
-          own.captureLibrary,
+          by.captureControls ? *by.captureControls : own.captureControls,
+          by.captureLibrary ? *by.captureLibrary : own.captureLibrary,
           own.dialling,
           own.files,
           own.handles,
