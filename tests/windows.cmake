@@ -13,6 +13,9 @@ target_link_libraries(foundation_test PRIVATE quendra_platform_windows ws2_32)
 target_sources(foundation_test PRIVATE platform/windows/WindowsLoopFixture.cpp platform/windows/WineDeviationsTest.cpp)
 add_subdirectory(standins/windows/wpcap)
 add_dependencies(platform_test standin_wpcap) # which it loads
+quendra_test(standins/windows quendra_window_reading quendra_platform_windows comctl32)
+target_sources(standins_windows_test PRIVATE app/windows/TestFolderFixture.cpp)
+add_dependencies(standins_windows_test standin_wpcap) # likewise
 quendra_test(forms/win32 quendra_forms_win32)
 if(TARGET forms_win32_test)
   target_sources(forms_win32_test PRIVATE ${desktop_suite})

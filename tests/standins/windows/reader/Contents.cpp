@@ -14,13 +14,19 @@ namespace {
 
 constexpr LRESULT kMostRows = 5000;
 constexpr LRESULT kMostColumns = 40;
-constexpr const char* kNoAnswer = "null";
 /// Milliseconds for a whole table: a program may hang between two cells.
 constexpr DWORD kPatience = 5000;
 
-/// How many of something there are; 0 without an answer.
+/// Nothing is told of a window that leaves a question open: a part would be taken for the whole.
+struct NoAnswer {};
+
+LRESULT AnswerOf(HWND window, UINT message, WPARAM wParam = 0, LPARAM lParam = 0) {
+  if (const auto answer = Ask(window, message, wParam, lParam)) return *answer;
+  throw NoAnswer();
+}
+
 int Counted(HWND window, UINT message, LRESULT most) {
-  return static_cast<int>(std::clamp<LRESULT>(Ask(window, message).value_or(0), 0, most));
+  return static_cast<int>(std::clamp<LRESULT>(AnswerOf(window, message), 0, most));
 }
 
 Text CellIn(HWND table, const ForeignMemory& memory, int row, int column) {
@@ -28,10 +34,10 @@ Text CellIn(HWND table, const ForeignMemory& memory, int row, int column) {
   asked.iSubItem = column;
   asked.pszText = memory.TextAddress();
   asked.cchTextMax = ForeignMemory::kMostCharacters;
-  if (!memory.Put(asked)) return {};
-  const auto length = Ask(table, LVM_GETITEMTEXTW, static_cast<WPARAM>(row), memory.Address());
-  // The window may hand out a text of its own in place of filling ours.
-  return length.value_or(0) > 0 ? memory.TakeText() : Text();
+  if (!memory.Put(asked)) throw NoAnswer();
+  const bool told = AnswerOf(table, LVM_GETITEMTEXTW, static_cast<WPARAM>(row), memory.Address()) > 0;
+  // For an empty text the window may leave ours as it was.
+  return told ? memory.TakeText() : Text();
 }
 
 Text CaptionIn(HWND header, const ForeignMemory& memory, int column) {
@@ -39,23 +45,23 @@ Text CaptionIn(HWND header, const ForeignMemory& memory, int column) {
   asked.mask = HDI_TEXT;
   asked.pszText = memory.TextAddress();
   asked.cchTextMax = ForeignMemory::kMostCharacters;
-  if (!memory.Put(asked)) return {};
-  const bool told = Ask(header, HDM_GETITEMW, static_cast<WPARAM>(column), memory.Address()).value_or(0) != 0;
+  if (!memory.Put(asked)) throw NoAnswer();
+  const bool told = AnswerOf(header, HDM_GETITEMW, static_cast<WPARAM>(column), memory.Address()) != 0;
   return told ? memory.TakeText() : Text();
 }
 
 /// The middle of a header on the screen: [x, y].
 std::string PlaceIn(HWND header, const ForeignMemory& memory, int column) {
   RECT place{};
-  if (!Ask(header, HDM_GETITEMRECT, static_cast<WPARAM>(column), memory.Address()) || !memory.Take(place))
-    return kNoAnswer;
+  AnswerOf(header, HDM_GETITEMRECT, static_cast<WPARAM>(column), memory.Address());
+  if (!memory.Take(place)) throw NoAnswer();
   POINT middle{(place.left + place.right) / 2, (place.top + place.bottom) / 2};
   ::ClientToScreen(header, &middle);
   return Listed({std::to_string(middle.x), std::to_string(middle.y)});
 }
 
 std::string HeadersIn(HWND table, const ForeignMemory& memory, int& columns) {
-  const auto header = reinterpret_cast<HWND>(Ask(table, LVM_GETHEADER).value_or(0));
+  const auto header = reinterpret_cast<HWND>(AnswerOf(table, LVM_GETHEADER));
   columns = header ? Counted(header, HDM_GETITEMCOUNT, kMostColumns) : 0;
   std::vector<std::string> headers;
   for (int column = 0; column < columns; ++column)
@@ -68,7 +74,7 @@ std::string SelectedIn(HWND table) {
   std::vector<std::string> selected;
   LRESULT row = -1;
   for (int count = 0; count < kMostRows; ++count) {
-    row = Ask(table, LVM_GETNEXTITEM, static_cast<WPARAM>(row), LVNI_SELECTED).value_or(-1);
+    row = AnswerOf(table, LVM_GETNEXTITEM, static_cast<WPARAM>(row), LVNI_SELECTED);
     if (row < 0) break;
     selected.push_back(std::to_string(row));
   }
@@ -81,30 +87,26 @@ bool IsCombo(HWND window) {
   return ::lstrcmpiW(name.data(), L"COMBOBOX") == 0;
 }
 
-} // namespace
-
-std::string FieldIn(HWND window) {
-  const auto length = Ask(window, WM_GETTEXTLENGTH);
-  if (!length) return kNoAnswer;
-  const std::string told = "{\"length\":" + std::to_string(*length);
+std::string ToldOfField(HWND window) {
+  const LRESULT length = AnswerOf(window, WM_GETTEXTLENGTH);
+  const std::string told = "{\"length\":" + std::to_string(length);
   if (::GetWindowLongW(window, GWL_STYLE) & ES_PASSWORD) return told + "}";
-  std::vector<wchar_t> text(static_cast<std::size_t>(*length) + 1);
-  const auto taken = Ask(window, WM_GETTEXT, text.size(), reinterpret_cast<LPARAM>(text.data()));
-  if (!taken) return kNoAnswer;
-  const auto count = std::min(static_cast<std::size_t>(*taken), text.size());
+  std::vector<wchar_t> text(static_cast<std::size_t>(length) + 1);
+  const LRESULT taken = AnswerOf(window, WM_GETTEXT, text.size(), reinterpret_cast<LPARAM>(text.data()));
+  const auto count = std::min(static_cast<std::size_t>(taken), text.size());
   return told + ",\"text\":" + Quoted(winapi::TextOf(text.data(), count)) + "}";
 }
 
-std::string TableIn(HWND window) {
-  const auto count = Ask(window, LVM_GETITEMCOUNT);
+std::string ToldOfTable(HWND window) {
+  const int count = Counted(window, LVM_GETITEMCOUNT, kMostRows);
   const ForeignMemory memory(window);
-  if (!count || !memory.IsThere()) return kNoAnswer;
+  if (!memory.IsThere()) throw NoAnswer();
   const DWORD begin = ::GetTickCount();
   int columns = 0;
   const std::string headers = HeadersIn(window, memory, columns);
   std::vector<std::string> rows;
-  for (int row = 0; row < std::min(*count, kMostRows); ++row) {
-    if (::GetTickCount() - begin > kPatience) return kNoAnswer;
+  for (int row = 0; row < count; ++row) {
+    if (::GetTickCount() - begin > kPatience) throw NoAnswer();
     std::vector<std::string> cells;
     for (int column = 0; column < columns; ++column)
       cells.push_back(Quoted(CellIn(window, memory, row, column)));
@@ -114,21 +116,36 @@ std::string TableIn(HWND window) {
          "}";
 }
 
-std::string ItemsIn(HWND window) {
+std::string ToldOfItems(HWND window) {
   const bool combo = IsCombo(window);
   std::vector<std::string> items;
   const int count = Counted(window, combo ? CB_GETCOUNT : LB_GETCOUNT, kMostRows);
   for (int item = 0; item < count; ++item) {
     const auto number = static_cast<WPARAM>(item);
-    const LRESULT length = Ask(window, combo ? CB_GETLBTEXTLEN : LB_GETTEXTLEN, number).value_or(-1);
-    if (length < 0) return kNoAnswer;
+    const LRESULT length = AnswerOf(window, combo ? CB_GETLBTEXTLEN : LB_GETTEXTLEN, number);
+    if (length < 0) throw NoAnswer(); // it went meanwhile
     std::vector<wchar_t> text(static_cast<std::size_t>(length) + 1);
-    Ask(window, combo ? CB_GETLBTEXT : LB_GETTEXT, number, reinterpret_cast<LPARAM>(text.data()));
+    AnswerOf(window, combo ? CB_GETLBTEXT : LB_GETTEXT, number, reinterpret_cast<LPARAM>(text.data()));
     items.push_back(Quoted(winapi::TextOf(text.data(), static_cast<std::size_t>(length))));
   }
-  const auto chosen = Ask(window, combo ? CB_GETCURSEL : LB_GETCURSEL);
-  if (!chosen) return kNoAnswer;
-  return "{\"items\":" + Listed(items) + ",\"chosen\":" + std::to_string(*chosen) + "}";
+  const LRESULT chosen = AnswerOf(window, combo ? CB_GETCURSEL : LB_GETCURSEL);
+  return "{\"items\":" + Listed(items) + ",\"chosen\":" + std::to_string(chosen) + "}";
 }
+
+std::string AllOrNothing(std::string (*toldOf)(HWND window), HWND window) {
+  try {
+    return toldOf(window);
+  } catch (const NoAnswer&) {
+    return "null";
+  }
+}
+
+} // namespace
+
+std::string FieldIn(HWND window) { return AllOrNothing(ToldOfField, window); }
+
+std::string TableIn(HWND window) { return AllOrNothing(ToldOfTable, window); }
+
+std::string ItemsIn(HWND window) { return AllOrNothing(ToldOfItems, window); }
 
 } // namespace quendra::standins

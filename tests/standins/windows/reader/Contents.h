@@ -7,7 +7,7 @@
 namespace quendra::standins {
 
 // What stands in windows of the system's kinds, as a screen reader asks for it. Each is a value of JSON;
-// "null" when the window doesn't answer in time.
+// "null" when the window leaves a question open for too long.
 
 /// An object: the text of an EDIT window, or of any other that tells one; of a secret one its length alone.
 std::string FieldIn(HWND window);

@@ -35,6 +35,15 @@ std::string FolderOfFrames() {
   return length < folder.size() ? std::string(folder.data(), length) : std::string();
 }
 
+/// Where the next record of the device begins; nullptr while there is no file.
+File OpenAtNext(WpcapScript::Device& device) {
+  if (device.file.empty()) return nullptr;
+  File file(std::fopen(device.file.c_str(), "rb"));
+  if (device.taken == 0) device.taken = kFileHeaderBytes;
+  if (file && std::fseek(file.get(), device.taken, SEEK_SET) != 0) return nullptr;
+  return file;
+}
+
 /// False while the record isn't whole: its other part is to come.
 bool ReadFrame(std::FILE* file, std::vector<std::uint8_t>& frame) {
   RecordHeader header{};
@@ -64,14 +73,16 @@ std::vector<WpcapScript::Device> RecordedDevices() {
   return devices;
 }
 
-void TakeRecordedFrames(WpcapScript::Device& device, int most) {
-  if (device.file.empty()) return;
-  const File file(std::fopen(device.file.c_str(), "rb"));
-  if (!file) return;
-  if (device.taken == 0) device.taken = kFileHeaderBytes;
-  if (std::fseek(file.get(), device.taken, SEEK_SET) != 0) return;
+void PassOverRecordedFrames(WpcapScript::Device& device) {
+  const File file = OpenAtNext(device);
   std::vector<std::uint8_t> frame;
-  for (int count = 0; count < most && ReadFrame(file.get(), frame); ++count) {
+  while (file && ReadFrame(file.get(), frame)) device.taken = std::ftell(file.get());
+}
+
+void TakeRecordedFrames(WpcapScript::Device& device, int most) {
+  const File file = OpenAtNext(device);
+  std::vector<std::uint8_t> frame;
+  for (int count = 0; file && count < most && ReadFrame(file.get(), frame); ++count) {
     device.taken = std::ftell(file.get());
     device.waiting.push_back(frame);
   }

@@ -9,6 +9,9 @@ namespace quendra::standins {
 /// without such a folder.
 std::vector<WpcapScript::Device> RecordedDevices();
 
+/// What is recorded so far isn't delivered, as a capture that begins gets nothing of what was before.
+void PassOverRecordedFrames(WpcapScript::Device& device);
+
 /// Has some more of the frames that were recorded meanwhile wait, as many as `most`.
 void TakeRecordedFrames(WpcapScript::Device& device, int most);
 

@@ -64,6 +64,7 @@ EXPORTED PcapHandle* pcap_open_live(const char* name, int snapshot, int promiscu
   *error = '\0';
   if (device == nullptr || !device->canBeOpened) return nullptr;
   ++device->open;
+  quendra::standins::PassOverRecordedFrames(*device);
   device->snapshot = snapshot;
   device->promiscuous = promiscuous;
   device->isNonBlocking = false;
