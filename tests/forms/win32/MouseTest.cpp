@@ -128,6 +128,19 @@ TEST_F(Mouse, A_caption_press_drags_the_window_and_the_release_is_no_click) {
   EXPECT_EQ(clicks, 0);
 }
 
+TEST_F(Mouse, Nothing_is_under_the_mouse_in_a_form_that_the_user_is_kept_from) {
+  desktop.Show(form);
+  MoveMouse(label, {5, 5});
+  ASSERT_TRUE(ViewOf(label).IsUnderMouse());
+
+  ::EnableWindow(WindowOf(form).Top(), FALSE);
+  EXPECT_FALSE(ViewOf(label).IsUnderMouse());
+  ::EnableWindow(WindowOf(form).Top(), TRUE);
+  MoveMouse(label, {6, 5});
+
+  EXPECT_TRUE(ViewOf(label).IsUnderMouse());
+}
+
 TEST_F(Mouse, A_press_hides_the_ring_of_those_who_use_the_keys) {
   Label button(form, u"button");
   button.Click = [] {};

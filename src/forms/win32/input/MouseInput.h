@@ -26,6 +26,8 @@ class MouseInput {
   /// and controls hear nothing of it.
   void DragWindow(HWND window, HWND holder);
   bool IsOver(const WindowView& view) const { return over_ == &view; }
+  /// The mouse is over no control until it moves again.
+  void Leave() { Enter(nullptr); }
 
  private:
   /// A message of the mouse.

@@ -1,6 +1,7 @@
 #include "forms/win32/windows/FormWindow.h"
 
 #include "forms/view/VisibleText.h"
+#include "forms/win32/input/MouseInput.h"
 
 #include <algorithm>
 #include <utility>
@@ -309,6 +310,10 @@ std::optional<LRESULT> FormWindow::AnswerTop(UINT message, WPARAM wParam, LPARAM
   case WM_SETFOCUS: RestoreFocus(); return 0;
   case WM_ERASEBKGND: return 1;
   case WM_PAINT: PaintGround(); return 0;
+  case WM_ENABLE:
+    // No leaving is told of a control while another window keeps the user from it.
+    if (!wParam) Context().mouse.Leave();
+    break;
   case WM_DISPLAYCHANGE:
   case WM_THEMECHANGED: Refit(); break;
   case WM_SETTINGCHANGE:
