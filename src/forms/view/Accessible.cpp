@@ -67,7 +67,7 @@ class Describer : public ControlVisitor {
  private:
   void VisitPicture(const Control& picture) {
     Description.role = picture.Click ? Role::Button : Role::Graphic;
-    // What shows nothing but such a picture is a window that it closes.
+    // It says nothing of itself, and goes by the title of the window that it fills or stands in.
     if (picture.Click) Description.name = VisibleText(picture.OwnerForm().Caption());
   }
 };

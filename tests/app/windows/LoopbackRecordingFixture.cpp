@@ -53,7 +53,9 @@ bool LoopbackRecording::End() {
   if (!runs_) return false;
   runs_ = false;
   const Text end = file_ + u".end";
-  ::CloseHandle(::CreateFileW(winapi::Wide(end), GENERIC_WRITE, 0, nullptr, CREATE_ALWAYS, 0, nullptr));
+  const HANDLE file = ::CreateFileW(winapi::Wide(end), GENERIC_WRITE, 0, nullptr, CREATE_ALWAYS, 0, nullptr);
+  if (file == INVALID_HANDLE_VALUE) return false;
+  ::CloseHandle(file);
   return Until([&] { return !IsThere(end); });
 }
 

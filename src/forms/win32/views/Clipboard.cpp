@@ -19,12 +19,13 @@ HGLOBAL MemoryOf(const Text& text) {
 } // namespace
 
 void PutOnClipboard(HWND owner, const Text& text) {
-  if (!::OpenClipboard(owner)) return;
-  ::EmptyClipboard();
   const HGLOBAL memory = MemoryOf(text);
-  // The system owns it from now on, unless it doesn't take it.
-  if (memory && !::SetClipboardData(CF_UNICODETEXT, memory)) ::GlobalFree(memory);
-  ::CloseClipboard();
+  if (!memory) return;
+  const bool isOpen = ::OpenClipboard(owner) != FALSE;
+  if (isOpen) ::EmptyClipboard();
+  // The system owns it once it has taken it.
+  if (!isOpen || !::SetClipboardData(CF_UNICODETEXT, memory)) ::GlobalFree(memory);
+  if (isOpen) ::CloseClipboard();
 }
 
 } // namespace quendra::forms::win32

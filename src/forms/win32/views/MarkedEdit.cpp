@@ -19,10 +19,9 @@ LRESULT GiveText(const Text& text, WPARAM room, LPARAM to) {
 
 void CopySelection(const InnerWindow& edit) {
   const auto [from, to] = HeldSelectionIn(edit);
-  if (from == to) return;
-  const Text selected =
-      HeldIn(edit).substr(static_cast<std::size_t>(from), static_cast<std::size_t>(to - from));
-  PutOnClipboard(edit.Window(), WithoutLineMarks(selected));
+  const Text selected = WithoutLineMarks(
+      HeldIn(edit).substr(static_cast<std::size_t>(from), static_cast<std::size_t>(to - from)));
+  if (!selected.empty()) PutOnClipboard(edit.Window(), selected);
 }
 
 } // namespace

@@ -51,6 +51,18 @@ class Ownership {
   HWND window_;
 };
 
+/// The block of a modal form, where the form finds it to end it early, for as long as this lives.
+class Standing {
+ public:
+  Standing(ModalBlock*& where, ModalBlock& block) : where_(where) { where_ = &block; }
+  ~Standing() { where_ = nullptr; }
+  Standing(const Standing&) = delete;
+  Standing& operator=(const Standing&) = delete;
+
+ private:
+  ModalBlock*& where_;
+};
+
 } // namespace
 
 FormWindow::FormWindow(const ViewContext& desktops, Form& form, WindowHandle handle, ViewMaker makeView)
@@ -224,13 +236,11 @@ void FormWindow::RunModal(FormWindow* owner, const Waiter& wait) {
   if (owner) ownersWork.emplace(*owner);
   const Ownership ownership(Top(), owner ? owner->Top() : nullptr);
   ModalBlock block(Top());
-  block_ = &block;
+  const Standing standing(block_, block);
   // Who opens a form by the keyboard sees the ring at its first stop, too.
   if (owner) state_.usesKeys = owner->state_.usesKeys;
   ShowOver(owner);
   wait([this] { return !TheForm() || !TheForm()->Visible(); });
-  block_ = nullptr;
-  block.Lift();
 }
 
 void FormWindow::FocusFirst() {
@@ -270,7 +280,10 @@ void FormWindow::RestoreFocus() {
 
 void FormWindow::KeepFocus() {
   const HWND focused = ::GetFocus();
-  if (::IsChild(Top(), focused)) lastFocus_ = focused;
+  if (!::IsChild(Top(), focused)) return;
+  // What stands inside a view's window is made anew where a field turns.
+  const WindowView* const view = WindowView::Around(focused);
+  lastFocus_ = view ? view->Window() : focused;
 }
 
 void FormWindow::Activated(bool active, bool minimised) {

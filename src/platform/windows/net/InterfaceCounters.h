@@ -18,6 +18,8 @@ class InterfaceCounters {
   void CountFromStart(InterfaceRow& row);
 
  private:
+  static bool BeganAnew(const InterfaceRow& now, const InterfaceRow& start);
+
   static constexpr std::array kCounters{
       InterfaceRow::kInOctets,    InterfaceRow::kInUnicast,  InterfaceRow::kInNonunicast,
       InterfaceRow::kInDiscards,  InterfaceRow::kInErrors,   InterfaceRow::kInUnknownProtocols,

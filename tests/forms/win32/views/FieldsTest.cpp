@@ -247,6 +247,23 @@ TEST_F(FieldWindows, A_field_that_turns_tells_of_the_focus_no_second_time) {
   EXPECT_EQ(came, 1);
 }
 
+TEST_F(FieldWindows, A_field_that_turns_while_another_form_is_active_has_the_focus_when_its_own_is_again) {
+  TestForm other;
+  Show();
+  ASSERT_EQ(::GetFocus(), Inner(line));
+  desktop.Show(other);
+  Settle();
+  ASSERT_NE(::GetFocus(), Inner(line));
+
+  line.Value = u"שלום";
+  Settle();
+  ::SetActiveWindow(WindowOf(form).Top());
+  Settle();
+
+  EXPECT_TRUE(Style(line, GWL_EXSTYLE) & WS_EX_RTLREADING);
+  EXPECT_EQ(::GetFocus(), Inner(line));
+}
+
 TEST_F(FieldWindows, A_field_turns_when_its_own_handlers_are_through) {
   Show();
   const HWND before = Inner(line);

@@ -99,11 +99,13 @@ TEST_F(Tips, A_tip_at_the_edge_of_the_screen_stays_on_it_and_beside_the_mouse) {
   const POINT mouse{screen.Right() - 3, screen.Bottom() - 3};
 
   ::SetCursorPos(mouse.x, mouse.y);
-  At(ViewOf(label).Window(), {5, 5});
+  ASSERT_EQ(At(ViewOf(label).Window(), {5, 5}), kLong);
   ::SetCursorPos(0, 0);
 
   RECT shown{};
-  ::GetWindowRect(Tip().Window(), &shown);
+  ASSERT_TRUE(::GetWindowRect(Tip().Window(), &shown));
+  EXPECT_LT(shown.left, shown.right);
+  EXPECT_GT(shown.top, screen.Bottom() - 100);
   EXPECT_LE(shown.right, screen.Right());
   EXPECT_LE(shown.bottom, screen.Bottom());
   EXPECT_GE(shown.left, screen.corner.left);

@@ -123,6 +123,17 @@ TEST(LinkPollTest, A_look_that_fails_is_no_change) {
   EXPECT_EQ(changes, 0);
 }
 
+TEST(LinkPollTest, The_first_look_that_succeeds_after_none_has_is_a_change) {
+  forms::headless::HeadlessDesktop desktop;
+  std::optional<std::vector<CaptureLink>> links;
+  int changes = 0;
+  const LinkPoll poll(
+      desktop, [&] { return links; }, [&] { ++changes; });
+  links.emplace(1);
+  desktop.Advance(3 * LinkPoll::kMilliseconds);
+  EXPECT_EQ(changes, 1);
+}
+
 TEST(CaptureLinks, A_table_that_the_system_cannot_give_is_not_one_without_links) {
   IpHelperLibrary library;
   library.GetAdaptersInfo = [](IP_ADAPTER_INFO*, ULONG*) WINAPI -> DWORD { return ERROR_INVALID_DATA; };

@@ -19,9 +19,9 @@ InterfaceRow RowWithOctets(std::uint32_t index, std::uint32_t in, std::uint32_t 
   return row;
 }
 
-TEST(InterfaceCountersTest, Count_from_the_start_and_from_0_where_they_began_anew_or_later) {
+TEST(InterfaceCountersTest, Count_from_the_start_and_from_0_where_they_began_later) {
   InterfaceCounters counters(std::vector{RowWithOctets(1, 3'000'000'000u, 500)});
-  InterfaceRow now = RowWithOctets(1, 3'000'000'100u, 20);
+  InterfaceRow now = RowWithOctets(1, 3'000'000'100u, 520);
   InterfaceRow newcomer = RowWithOctets(2, 7);
 
   counters.CountFromStart(now);
@@ -32,7 +32,17 @@ TEST(InterfaceCountersTest, Count_from_the_start_and_from_0_where_they_began_ane
   EXPECT_EQ(newcomer.Get(InterfaceRow::kInOctets), 7u);
 }
 
-TEST(InterfaceCountersTest, One_that_began_anew_does_not_fall_back_when_it_passes_its_old_start) {
+TEST(InterfaceCountersTest, One_that_passes_its_32_bits_goes_on) {
+  InterfaceCounters counters(std::vector{RowWithOctets(1, 4'294'967'290u, 500)});
+  InterfaceRow now = RowWithOctets(1, 4, 510);
+
+  counters.CountFromStart(now);
+
+  EXPECT_EQ(now.Get(InterfaceRow::kInOctets), 10u);
+  EXPECT_EQ(now.Get(InterfaceRow::kOutOctets), 10u);
+}
+
+TEST(InterfaceCountersTest, Those_that_began_anew_do_not_fall_back_when_they_pass_their_old_start) {
   InterfaceCounters counters(std::vector{RowWithOctets(1, 100)});
   std::vector<std::uint32_t> told;
   for (const std::uint32_t octets : {150u, 20u, 99u, 101u}) {

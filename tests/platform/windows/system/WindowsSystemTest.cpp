@@ -66,14 +66,6 @@ TEST_F(WindowsSystemTest, A_message_that_finds_no_room_for_its_NUL_is_not_told) 
   EXPECT_EQ(Message(System::kFromSystem, 5, length + 1).size(), length);
 }
 
-TEST_F(WindowsSystemTest, The_processors_are_those_of_the_machine_and_not_what_a_program_of_32_bits_is_told) {
-  SYSTEM_INFO machine{};
-  ::GetNativeSystemInfo(&machine);
-  SystemInfo info;
-  system.GetSystemInfo(info);
-  EXPECT_EQ(info.numberOfProcessors, machine.dwNumberOfProcessors);
-}
-
 TEST_F(WindowsSystemTest, Flags_that_would_have_the_system_take_the_buffer_for_something_else_are_refused) {
   EXPECT_EQ(Message(System::kFromSystem | FORMAT_MESSAGE_ALLOCATE_BUFFER, 5), "");
   EXPECT_EQ(Message(FORMAT_MESSAGE_FROM_STRING, 5), "");
