@@ -54,8 +54,12 @@ void SessionTest::AddProgram(const std::string& name) {
 
 std::string SessionTest::GivenTo(const std::string& name) {
   std::optional<std::string> given;
-  Wait([&] { return (given = ReadFile(folder / "programs/" + name + ".given", 10'000)).has_value(); });
+  WaitLong([&] { return (given = ReadFile(folder / "programs/" + name + ".given", 10'000)).has_value(); });
   return given.value_or("not started");
+}
+
+bool SessionTest::WasStarted(const std::string& name) {
+  return Wait([&] { return ReadFile(folder / "programs/" + name + ".given", 10'000).has_value(); });
 }
 
 void SessionTest::StartBus() {

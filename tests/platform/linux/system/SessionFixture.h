@@ -16,8 +16,10 @@ class SessionTest : public testing::Test {
 
   /// A program of the session that writes down what it is given.
   void AddProgram(const std::string& name);
-  /// Waits for the program; "not started" when it isn't.
+  /// Waits for the program, long on a machine that is busy; "not started" when it isn't.
   std::string GivenTo(const std::string& name);
+  /// Within two seconds.
+  bool WasStarted(const std::string& name);
 
   /// Starts the session's bus. A service that `AddService` tells of can be started by it.
   void StartBus();
